@@ -1,0 +1,64 @@
+# What every target is built with.
+
+set(CMAKE_C_STANDARD 11)
+set(CMAKE_C_STANDARD_REQUIRED ON)
+set(CMAKE_C_EXTENSIONS OFF)
+set(CMAKE_CXX_STANDARD 20)
+set(CMAKE_CXX_STANDARD_REQUIRED ON)
+set(CMAKE_CXX_EXTENSIONS OFF)
+set(CMAKE_EXPORT_COMPILE_COMMANDS ON)
+set(CMAKE_POSITION_INDEPENDENT_CODE ON)
+set(CMAKE_C_VISIBILITY_PRESET hidden)
+set(CMAKE_CXX_VISIBILITY_PRESET hidden)
+set(CMAKE_VISIBILITY_INLINES_HIDDEN ON)
+
+option(MAYASCENE_SANITIZE "Build with the address, leak and undefined behaviour sanitizers" OFF)
+option(MAYASCENE_COVERAGE "Build for line and branch coverage" OFF)
+
+# bin/ holds the tool, lib/ the utility library and the module; they find each other from where they lie.
+set(CMAKE_RUNTIME_OUTPUT_DIRECTORY ${CMAKE_BINARY_DIR}/bin)
+set(CMAKE_LIBRARY_OUTPUT_DIRECTORY ${CMAKE_BINARY_DIR}/lib)
+set(CMAKE_BUILD_RPATH_USE_ORIGIN ON)
+
+add_library(mayascene_options INTERFACE)
+target_include_directories(mayascene_options INTERFACE ${PROJECT_SOURCE_DIR})
+target_compile_options(
+  mayascene_options
+  INTERFACE -Wall
+            -Wextra
+            -Werror
+            -Wconversion
+            -Wshadow
+            # Arithmetic gives the same bits on every processor.
+            -ffp-contract=off)
+if(MAYASCENE_SANITIZE)
+  target_compile_options(
+    mayascene_options INTERFACE -fsanitize=address,undefined,float-cast-overflow -fno-sanitize-recover=all
+                                -fno-omit-frame-pointer)
+  target_link_options(mayascene_options INTERFACE -fsanitize=address,undefined,float-cast-overflow)
+endif()
+if(MAYASCENE_COVERAGE)
+  target_compile_options(mayascene_options INTERFACE --coverage -fprofile-update=atomic)
+  target_link_options(mayascene_options INTERFACE --coverage)
+endif()
+
+# add_room(NAME KIND SOURCES ... [LINKS ...]): one library of the house. KIND is STATIC, SHARED or MODULE.
+function(add_room name kind)
+  cmake_parse_arguments(ROOM "" "" "SOURCES;LINKS" ${ARGN})
+  add_library(${name} ${kind} ${ROOM_SOURCES})
+  target_link_libraries(${name} PUBLIC ${ROOM_LINKS} PRIVATE $<BUILD_INTERFACE:mayascene_options>)
+  target_include_directories(${name} PUBLIC ${PROJECT_SOURCE_DIR})
+endfunction()
+
+# add_room_test(NAME SOURCES ... [LINKS ...]): one GoogleTest program; each of its tests is a test of ctest.
+function(add_room_test name)
+  cmake_parse_arguments(TEST "" "" "SOURCES;LINKS" ${ARGN})
+  add_executable(${name} ${TEST_SOURCES})
+  target_link_libraries(${name} PRIVATE ${TEST_LINKS} mayascene_options GTest::gmock_main)
+  target_compile_definitions(
+    ${name}
+    PRIVATE MAYASCENE_SOURCE_DIR="${PROJECT_SOURCE_DIR}" MAYASCENE_TOOL="$<TARGET_FILE:mayascene>"
+            MAYASCENE_MODULE="$<TARGET_FILE:MayaImport>")
+  add_dependencies(${name} mayascene MayaImport)
+  gtest_discover_tests(${name} PROPERTIES TIMEOUT 300)
+endfunction()

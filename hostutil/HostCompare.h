@@ -1,0 +1,26 @@
+/* Comparison without regard to case. Only the letters A to Z are folded, whatever the locale. */
+#ifndef HOSTUTIL_HOSTCOMPARE_H
+#define HOSTUTIL_HOSTCOMPARE_H
+
+#include "hostapi/HostTypes.h"
+#include "hostutil/Export.h"
+
+#ifdef __cplusplus
+extern "C" {
+#endif
+
+/* Compares two NUL-terminated texts: less than, equal to or greater than 0. */
+HOSTUTIL_API int32_t HostCompareNoCase(const char* a, const char* b);
+
+#ifdef __cplusplus
+}
+
+/* The lower-case form of one byte. */
+inline unsigned char FoldCase(unsigned char byte) {
+  return byte >= 'A' && byte <= 'Z' ? static_cast<unsigned char>(byte | 0x20) : byte;
+}
+
+inline bool EqualNoCase(const char* a, const char* b) { return HostCompareNoCase(a, b) == 0; }
+#endif
+
+#endif

@@ -1,0 +1,39 @@
+/* Numbers and ratios: scanning, comparing, and conversion to integers. Nothing here looks at the locale. */
+#ifndef HOSTUTIL_HOSTNUMBERS_H
+#define HOSTUTIL_HOSTNUMBERS_H
+
+#include "hostapi/HostTypes.h"
+#include "hostutil/Export.h"
+
+#ifdef __cplusplus
+extern "C" {
+#endif
+
+/* Reads one number out of `length` bytes (a NUL among them ends the text): an optional sign, decimal digits
+ * with an optional fraction and exponent (".5" and "5." too), then nothing or letters only, which are
+ * ignored ("23.976fps" is 23.976; "1e" is 1). Underflow gives 0, a denormal stays one.
+ * HOST_ERR_NUMBER_SYNTAX for anything else ("", "-", "--x", "0x10", "1.#QNAN"), HOST_ERR_NUMBER_RANGE when
+ * the number is too large; *value is then unchanged. Neither an infinity nor a NaN comes out. */
+HOSTUTIL_API HostError HostNumberScan(const char* text, int64_t length, double* value);
+
+/* Compares two ratios: *order becomes -1, 0 or 1 as a is less than, equal to or greater than b. Exact for
+ * all values; HOST_ERR_NUMBER_RANGE when a denominator is 0. */
+HOSTUTIL_API HostError HostRatioCompare(const HostRatio* a, const HostRatio* b, int32_t* order);
+
+#ifdef __cplusplus
+}
+
+/* A double as an integer: truncated toward zero, held at the ends of the type's range, NaN as 0. */
+inline int32_t TruncateToInt32(double value) {
+  if (value >= 2147483647.0) return 2147483647;
+  if (value <= -2147483648.0) return -2147483647 - 1;
+  return value == value ? static_cast<int32_t>(value) : 0;
+}
+
+inline uint32_t TruncateToUInt32(double value) {
+  if (value >= 4294967295.0) return 4294967295u;
+  return value > 0.0 ? static_cast<uint32_t>(value) : 0u;
+}
+#endif
+
+#endif

@@ -1,0 +1,39 @@
+// The preference store: a small text file of sections and 32-bit integers.
+//
+//   [Maya Camera]
+//   Use Linear Units=0
+//
+// A file that is missing counts as empty. It is written beside and renamed, and only by the host when it is
+// missing, or by a user who sets a preference; failing to write it changes nothing else.
+#pragma once
+
+#include <cstdint>
+#include <filesystem>
+#include <map>
+#include <optional>
+#include <string>
+
+namespace refhost {
+
+class Preferences {
+ public:
+  // Reads the file. Lines that are no entry are dropped. A path that is empty: in memory only.
+  explicit Preferences(std::filesystem::path file);
+
+  std::optional<std::int32_t> find(const std::string& section, const std::string& key) const;
+  void set(const std::string& section, const std::string& key, std::int32_t value);
+
+  bool fileExists() const;                 // whether the file was there when it was read
+  bool write(std::string* failure) const;  // false with a sentence when it cannot be written
+
+  // Where the user's own store lies: $XDG_CONFIG_HOME or ~/.config, then mayascene/preferences. Empty when
+  // neither is known.
+  static std::filesystem::path userFile();
+
+ private:
+  std::filesystem::path file_;
+  bool existed_ = false;
+  std::map<std::string, std::map<std::string, std::int32_t>> sections_;
+};
+
+}  // namespace refhost
