@@ -1,0 +1,79 @@
+// Values and keyframe batches on layer streams. Reads nothing of the scene; calls the stream and keyframe
+// suites.
+#include "hostapi/KeyframeSuite.h"
+#include "maya/MAYA_Parse.h"
+#include "plugin/Globals.h"
+#include "plugin/Guarded.h"
+
+VOR_Stream* MAYA_Parse::AcquireStream(VOR_Layer* layer, std::int32_t streamId) {
+  VOR_Stream* stream = nullptr;
+  ThrowOnError(StreamSuite7().AcquireLayerStream(G_plugin_idL, layer, streamId, &stream));
+  return stream;
+}
+
+// Works with a stream of the layer and releases it, whatever happens. The code of the release is ignored.
+template <typename Work>
+void MAYA_Parse::UseStream(VOR_Layer* layer, std::int32_t streamId, Work&& work) {
+  VOR_Stream* const stream = AcquireStream(layer, streamId);
+  const auto release = [&] {
+    if (stream != nullptr) StreamSuite7().ReleaseStream(stream);
+  };
+  HostError code = kNoError;
+  try {
+    code = Guarded([&] { work(stream); });
+  } catch (...) {
+    release();
+    throw;
+  }
+  release();
+  ThrowOnError(code);
+}
+
+void MAYA_Parse::SetStream(VOR_Layer* layer, std::int32_t streamId, double x, double y, double z) {
+  UseStream(layer, streamId, [&](VOR_Stream* stream) {
+    const StreamValueRecord value{stream, {x, y, z, 0.0}};
+    ThrowOnError(StreamSuite8().SetStreamValue(G_plugin_idL, stream, &value));
+  });
+}
+
+void MAYA_Parse::SetOneDStream(VOR_Layer* layer, std::int32_t streamId, double value) {
+  SetStream(layer, streamId, value, 0.0, 0.0);
+}
+
+void MAYA_Parse::SetTwoDStream(VOR_Layer* layer, std::int32_t streamId, double x, double y) {
+  SetStream(layer, streamId, x, y, 0.0);
+}
+
+void MAYA_Parse::SetThreeDStream(VOR_Layer* layer, std::int32_t streamId, double x, double y, double z) {
+  SetStream(layer, streamId, x, y, z);
+}
+
+void MAYA_Parse::StartAddingKeyframes(VOR_Layer* layer, std::int32_t streamId, VOR_AddKeyframesInfo** batch) {
+  UseStream(layer, streamId,
+            [&](VOR_Stream* stream) { ThrowOnError(KeyframeSuite3().BeginKeyframeBatch(stream, batch)); });
+}
+
+void MAYA_Parse::InsertKeyframe(VOR_AddKeyframesInfo* batch, VOR_Layer* layer, std::int32_t streamId,
+                                const T_Time* time, double x, double y, double z) {
+  UseStream(layer, streamId, [&](VOR_Stream* stream) {
+    std::int32_t index = 0;
+    ThrowOnError(KeyframeSuite3().AddBatchKeyframe(batch, HOST_TIME_MODE_COMP, time, &index));
+    const StreamValueRecord value{stream, {x, y, z, 0.0}};
+    ThrowOnError(KeyframeSuite4().SetBatchKeyframeValue(batch, index, &value));
+  });
+}
+
+void MAYA_Parse::InsertOneDKeyframe(VOR_AddKeyframesInfo* batch, VOR_Layer* layer, std::int32_t streamId,
+                                    const T_Time* time, double value) {
+  InsertKeyframe(batch, layer, streamId, time, value, 0.0, 0.0);
+}
+
+void MAYA_Parse::InsertThreeDKeyframe(VOR_AddKeyframesInfo* batch, VOR_Layer* layer, std::int32_t streamId,
+                                      const T_Time* time, double x, double y, double z) {
+  InsertKeyframe(batch, layer, streamId, time, x, y, z);
+}
+
+void MAYA_Parse::EndAddingKeyframes(VOR_AddKeyframesInfo* batch) {
+  constexpr std::int32_t kCommit = 1;
+  KeyframeSuite3().EndKeyframeBatch(kCommit, batch);
+}

@@ -1,0 +1,66 @@
+// Keys of a node's position, rotation and scale: for every sampled key the node's matrix is rebuilt, taken
+// apart and written to five streams. Reads `curves` and the units; keys go through MAYA_Parse_Streams.cpp.
+#include <algorithm>
+#include <iterator>
+
+#include "comp/Conversions.h"
+#include "comp/LayerStreams.h"
+#include "comp/NodeChannels.h"
+#include "comp/UnwrapAngle.h"
+#include "maya/MAYA_Parse.h"
+#include "plugin/Guarded.h"
+
+namespace {
+
+// The animated streams, in the order in which their batches are opened, filled and closed.
+enum Batch : std::size_t { kScaleBatch, kXBatch, kYBatch, kZBatch, kPositionBatch, kBatchCount };
+constexpr LayerStreamId kBatchStreams[kBatchCount] = {kScaleStream, kRotationXStream, kRotationYStream,
+                                                      kRotationZStream, kPositionStream};
+
+}  // namespace
+
+void MAYA_Parse::ApplyTransformAnimation(VOR_Layer* layer, const MAYA_Transform* node) {
+  const NodeChannels channels = VerifyChannels(*node);
+  if (channels.sharedCount < 1) return;
+
+  VOR_AddKeyframesInfo* batches[kBatchCount] = {};
+  HostError kept = Guarded([&] {
+    for (std::size_t i = 0; i < kBatchCount; ++i) StartAddingKeyframes(layer, kBatchStreams[i], &batches[i]);
+    InsertTransformKeys(layer, *node, channels, batches);
+  });
+  for (VOR_AddKeyframesInfo* const batch : batches) {
+    if (batch != nullptr) KeepFirst(&kept, Guarded([&] { EndAddingKeyframes(batch); }));
+  }
+  ThrowOnError(kept);
+}
+
+void MAYA_Parse::InsertTransformKeys(VOR_Layer* layer, const MAYA_Transform& node,
+                                     const NodeChannels& channels, VOR_AddKeyframesInfo* const* batches) {
+  double previous[kAxisCount] = {};
+  for (std::int32_t n = 0; n < channels.sharedCount; ++n) {
+    const T_Time time = KeyTime(channels, n);
+    double scale[kAxisCount];
+    double rotate[kAxisCount];
+    double translate[kAxisCount];
+    std::copy(std::begin(node.scale), std::end(node.scale), scale);
+    std::copy(std::begin(node.rotate), std::end(node.rotate), rotate);
+    std::copy(std::begin(node.translate), std::end(node.translate), translate);
+    channels.Extract(kScaleGroup, n, scale);
+    channels.Extract(kRotateGroup, n, rotate);
+    channels.Extract(kTranslateGroup, n, translate);
+
+    const MatrixComponents at = DecomposeTransform(node, scale, rotate, translate);
+    double angles[kAxisCount];
+    for (int axis = 0; axis < kAxisCount; ++axis) {
+      angles[axis] = n > 0 ? UnwrapAngle(at.rotation[axis], previous[axis]) : at.rotation[axis];
+      previous[axis] = angles[axis];
+    }
+    InsertThreeDKeyframe(batches[kScaleBatch], layer, kScaleStream, &time, at.scale[0] * kPercent,
+                         at.scale[1] * kPercent, at.scale[2] * kPercent);
+    InsertOneDKeyframe(batches[kXBatch], layer, kRotationXStream, &time, angles[0] * kRadiansToDegrees);
+    InsertOneDKeyframe(batches[kYBatch], layer, kRotationYStream, &time, angles[1] * kRadiansToDegrees);
+    InsertOneDKeyframe(batches[kZBatch], layer, kRotationZStream, &time, angles[2] * kRadiansToDegrees);
+    InsertThreeDKeyframe(batches[kPositionBatch], layer, kPositionStream, &time, at.translation[0],
+                         at.translation[1], at.translation[2]);
+  }
+}

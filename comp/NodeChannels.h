@@ -1,0 +1,21 @@
+// The animated channels of one node, fetched once, so that its keys can be read without its curves' records.
+#pragma once
+
+#include <array>
+#include <cstdint>
+
+#include "maya/SceneRecords.h"
+
+struct NodeChannels {
+  struct Channel {
+    const RecordList* keys = nullptr;  // null when the channel has no curve, or its curve no keys
+    std::int64_t count = 0;
+  };
+
+  std::array<Channel, kChannelCount> channels;  // by curve slot
+  std::int32_t sharedCount = 0;                 // of the channels that have two keys or more; 0 when none has
+
+  // Overwrites the animated axes of `values` with key n of the group; a channel of one key gives that one.
+  // Throws the list's code when a channel has no key n.
+  void Extract(std::int32_t group, std::int32_t n, double (&values)[kAxisCount]) const;
+};

@@ -1,0 +1,40 @@
+// The host's lists as typed records. A code that a list returns is thrown.
+#pragma once
+
+#include <cstdint>
+
+#include "hostutil/RecordList.h"
+#include "plugin/ErrorCodes.h"
+
+// A copy of a record; zero-filled where the host hands nothing out.
+template <typename Record>
+Record FetchRecord(const RecordList* list, std::int64_t index) {
+  Record record{};
+  ThrowOnError(RecordListGet(list, index, &record));
+  return record;
+}
+
+// The number of records; 0 for a null list.
+inline std::int64_t RecordCount(const RecordList* list) {
+  std::int64_t count = 0;
+  if (list != nullptr) ThrowOnError(RecordListCount(list, &count));
+  return count;
+}
+
+// Appends to a list that is made on first use.
+template <typename Record>
+void AppendRecord(RecordList** list, const Record& record) {
+  constexpr std::int64_t kGrowthStep = 10;
+  if (*list == nullptr) ThrowOnError(RecordListCreate(sizeof(Record), kGrowthStep, 0, list));
+  ThrowOnError(RecordListAppend(*list, &record));
+}
+
+// Changes a record in its place. A list that hands out no address is taken as one without the record.
+template <typename Record, typename Change>
+void ChangeRecord(RecordList* list, std::int64_t index, Change&& change) {
+  void* record = nullptr;
+  ThrowOnError(RecordListLock(list, index, &record));
+  if (record == nullptr) throw int{HOST_ERR_LIST_INDEX};
+  change(*static_cast<Record*>(record));
+  ThrowOnError(RecordListUnlock(list, index));
+}

@@ -1,0 +1,193 @@
+// The lexer: white space, words, strings and comments. Reads and writes `tokenStart`, `position` and `line`;
+// calls the host only to show its two messages.
+#include "maya/MAYA_Lex.h"
+
+#include <cstring>
+#include <string_view>
+
+#include "maya/CharacterClasses.h"
+#include "maya/Words.h"
+#include "plugin/ErrorCodes.h"
+#include "plugin/Globals.h"
+
+namespace {
+
+struct Keyword {
+  std::string_view word;
+  MayaToken kind;
+};
+
+constexpr Keyword kKeywords[] = {
+    {"file", File},
+    {"requires", Requires},
+    {"createnode", CreateNode},
+    {"setattr", SetAttr},
+    {"addattr", AddAttr},
+    {"parent", Parent},
+    {"connectattr", ConnectAttr},
+    {"disconnectattr", DisconnectAttr},
+    {"select", Select},
+    {"currentunit", CurrentUnit},
+};
+
+MayaToken KeywordOrIdentifier(std::string_view word) {
+  for (const Keyword& keyword : kKeywords) {
+    if (SameWord(word, keyword.word)) return keyword.kind;
+  }
+  return Identifier;
+}
+
+}  // namespace
+
+MAYA_Lex::MAYA_Lex(const WNBasicSuite* basicSuite, const char* text, const char* end)
+    : QZGP_SuiteHandler(basicSuite),
+      buffer(text != nullptr ? text : ""),
+      tokenStart(buffer),
+      position(buffer),
+      end_(text != nullptr && end != nullptr ? end : buffer + std::strlen(buffer)) {}
+
+MayaToken MAYA_Lex::GetNextToken(const char** start, const char** last) {
+  if (position > end_) {
+    *start = *last = end_;
+    return EndOfFile;
+  }
+  SkipWhiteSpace();
+  MayaToken kind = Unknown;
+  switch (*position) {
+    case '\0':
+      kind = EndOfFile;
+      break;
+    case '"':
+      kind = ParseQuote();
+      break;
+    case '/':
+      kind = ParseComment();
+      break;
+    case '(':
+      kind = OpenParen;
+      break;
+    case ')':
+      kind = CloseParen;
+      break;
+    case '+':
+      kind = Plus;
+      break;
+    case ';':
+      kind = Semicolon;
+      break;
+    case ':':
+      kind = Colon;
+      break;
+    case '-':
+      if (IsLetter(position[1])) {
+        kind = ParseOption();
+      } else if (IsNumberStart(position[1])) {
+        kind = ParseID();
+      }
+      break;
+    default:
+      kind = ParseID();
+      break;
+  }
+  *start = tokenStart;
+  *last = position;
+  tokenStart = ++position;
+  return kind;
+}
+
+void MAYA_Lex::SkipWhiteSpace() {
+  while (IsWhiteSpace(*position)) {
+    if (*position == '\n') ++line;
+    ++position;
+  }
+  tokenStart = position;
+}
+
+std::int32_t MAYA_Lex::SkipCharacters(const char* set) {
+  while (*position != '\0' && std::strchr(set, *position) != nullptr) {
+    if (*position == '\n') ++line;
+    ++position;
+  }
+  tokenStart = position;
+  return 0;
+}
+
+MayaToken MAYA_Lex::ParseQuote() {
+  // Deliberate: a backslash is looked at only as the byte before a quote, so that an escaped backslash before
+  // a quote keeps the string open. Reading escapes in pairs would end strings that have always run on.
+  do {
+    ++position;
+    if (*position == '\0') FailAtEnd();
+  } while (*position != '"' || position[-1] == '\\');
+  return String;
+}
+
+MayaToken MAYA_Lex::ParseComment() {
+  if (position[1] == '/') {
+    ParseLineComment();
+  } else if (position[1] == '*') {
+    ParseBlockComment();
+  } else {
+    FailReading();
+  }
+  return Comment;
+}
+
+void MAYA_Lex::ParseLineComment() {
+  // Deliberate: a line comment that the text ends in is an error, and its line end is part of it. A scene cut
+  // off in its last comment is refused rather than taken for whole.
+  while (*position != '\n' && *position != '\r') {
+    if (*position == '\0') FailAtEnd();
+    ++position;
+  }
+}
+
+void MAYA_Lex::ParseBlockComment() {
+  // Deliberate: after a "*" the byte behind it is consumed too, so that in "/***/" the closing pair is missed
+  // and the comment runs on. Looking for the plain pair would bring text to life that is commented out today.
+  ++position;
+  for (;;) {
+    ++position;
+    if (*position == '\0') FailAtEnd();
+    if (*position != '*') continue;
+    ++position;
+    if (*position == '\0') FailAtEnd();
+    if (*position == '/') return;
+  }
+}
+
+MayaToken MAYA_Lex::ParseOption() {
+  ScanWord();
+  return Option;
+}
+
+MayaToken MAYA_Lex::ParseID() {
+  const char first = *position;
+  const bool number = IsNumberStart(first);
+  if (!number && !IsLetter(first)) FailReading();
+  const char* const start = position;
+  ScanWord();
+  if (number) return Number;
+  return KeywordOrIdentifier(std::string_view(start, static_cast<std::size_t>(position - start) + 1));
+}
+
+void MAYA_Lex::ScanWord() {
+  // An embedded NUL is part of the word; only the end of the text is not.
+  while (!IsWordTerminator(*position)) {
+    if (position == end_) FailAtEnd();
+    ++position;
+  }
+  --position;
+}
+
+void MAYA_Lex::ReportError(const char* message) { UtilitySuite7().ShowMessage(G_plugin_idL, message); }
+
+void MAYA_Lex::FailReading() {
+  ReportError(LocalizedText(kReadingMessage));
+  throw int{kReadingError};
+}
+
+void MAYA_Lex::FailAtEnd() {
+  ReportError(LocalizedText(kUnexpectedEndMessage));
+  throw int{kUnexpectedEnd};
+}

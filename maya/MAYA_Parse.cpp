@@ -1,0 +1,118 @@
+// The parser's lifetime, its main loop, and what every command parser uses. Reads and writes `currentKind`
+// and `current`; calls no suite.
+#include "maya/MAYA_Parse.h"
+
+#include <cstring>
+
+#include "maya/ListAccess.h"
+#include "maya/TokenText.h"
+
+MAYA_Parse::MAYA_Parse(const WNBasicSuite* basicSuite, const char* text, const char* end)
+    : MAYA_Lex(basicSuite, text, end) {
+  ClearCurrent();
+}
+
+MAYA_Parse::~MAYA_Parse() {
+  RecordListDispose(cameras);
+  RecordListDispose(transforms);
+  // A failure between a curve's first key and the end of its command leaves keys that only `current` holds.
+  RecordList* loose = currentKind == kCurveNode ? current.curve.keys : nullptr;
+  for (std::int64_t i = 0;; ++i) {
+    const auto* curve = static_cast<const MAYA_AnimCurve*>(RecordListPeek(curves, i));
+    if (curve == nullptr) break;
+    if (curve->keys == loose) loose = nullptr;
+    RecordListDispose(curve->keys);
+  }
+  RecordListDispose(loose);
+  RecordListDispose(curves);
+  RecordListDispose(locators);
+}
+
+void MAYA_Parse::Parse() {
+  for (;;) {
+    const char* first = nullptr;
+    const char* last = nullptr;
+    switch (GetNextToken(&first, &last)) {
+      case CreateNode:
+        ParseCreateNode();
+        break;
+      case SetAttr:
+        ParseSetAttr();
+        break;
+      case ConnectAttr:
+        ParseConnectAttr();
+        break;
+      case Select:
+        ParseSelect();
+        break;
+      case CurrentUnit:
+        ParseCurrentUnit();
+        break;
+      case EndOfFile:
+        return;
+      default:
+        break;  // Deliberate: a keyword acts wherever it stands, also inside a command that is ignored.
+    }
+  }
+}
+
+void MAYA_Parse::ParseSetAttr() {
+  switch (currentKind) {
+    case kTransformNode:
+      ParseTransformSetAttr();
+      break;
+    case kCameraNode:
+      ParseCameraSetAttr();
+      break;
+    case kCurveNode:
+      ParseAnimSetAttr();
+      break;
+    case kRenderSettings:
+      ParseRenderSetAttr();
+      break;
+    default:
+      break;
+  }
+}
+
+void MAYA_Parse::ParseParent() {}
+void MAYA_Parse::ParseTransformParent() {}
+void MAYA_Parse::ParseCameraParent() {}
+void MAYA_Parse::ParseLocatorSetAttr() {}
+
+void MAYA_Parse::BuildString(const char* first, const char* last, std::int32_t* length,
+                             char (&text)[kNameCapacity]) {
+  const auto size = static_cast<std::size_t>(last - first) + 1;
+  *length = size > kLongestToken ? 0 : static_cast<std::int32_t>(size);
+  std::memcpy(text, first, static_cast<std::size_t>(*length));
+  text[*length] = '\0';
+}
+
+void MAYA_Parse::BuildQuote(const char* first, const char* last, std::int32_t* length,
+                            char (&text)[kNameCapacity]) {
+  BuildString(first, last, length, text);
+  if (*length < 2) return;
+  const auto inner = static_cast<std::size_t>(*length) - 2;
+  std::memmove(text, text + 1, inner);
+  text[inner] = '\0';
+}
+
+// The next token of a command that is read up to its ";". The end of the text is an error there.
+MayaToken MAYA_Parse::NextInCommand(const char** first, const char** last) {
+  const MayaToken kind = GetNextToken(first, last);
+  if (kind == EndOfFile) FailAtEnd();
+  return kind;
+}
+
+double MAYA_Parse::ScanNumber(const char* first, const char* last) {
+  const std::string_view text = WordText(first, last);
+  double value = 0.0;
+  ThrowOnError(HostNumberScan(text.data(), static_cast<std::int64_t>(text.size()), &value));
+  return value;
+}
+
+void MAYA_Parse::ClearCurrent() {
+  currentKind = kNoNode;
+  currentRecord_ = kNoIndex;
+  std::memset(static_cast<void*>(&current), 0, sizeof current);
+}

@@ -1,0 +1,175 @@
+// "setAttr" on transforms and cameras: reads one attribute into `current` and writes `current` back over the
+// first record of its name. Calls no suite.
+#include <algorithm>
+#include <cmath>
+#include <iterator>
+
+#include "maya/ListAccess.h"
+#include "maya/MAYA_Parse.h"
+#include "maya/TokenText.h"
+#include "maya/Words.h"
+
+namespace {
+
+// The triples of a transform, and what a component is that the command does not give.
+struct TripleAttribute {
+  std::string_view shortName;
+  std::string_view longName;
+  double (MAYA_Transform::*field)[kAxisCount];
+  double start;
+};
+
+constexpr TripleAttribute kTriples[] = {
+    {".t", ".translate", &MAYA_Transform::translate, 0.0},
+    {".r", ".rotate", &MAYA_Transform::rotate, 0.0},
+    {".s", ".scale", &MAYA_Transform::scale, 1.0},
+    {".rp", ".rotatePivot", &MAYA_Transform::rotatePivot, 0.0},
+    {".sp", ".scalePivot", &MAYA_Transform::scalePivot, 0.0},
+};
+
+enum class CameraAttribute { Orthographic, CenterOfInterest, FilmFit, FocalLength, Aperture, None };
+
+struct CameraAttributeName {
+  std::string_view shortName;
+  std::string_view longName;
+  CameraAttribute attribute;
+};
+
+constexpr CameraAttributeName kCameraAttributes[] = {
+    {".o", ".orthographic", CameraAttribute::Orthographic},
+    {".wci", ".worldCenterOfInterest", CameraAttribute::CenterOfInterest},
+    {".ff", ".filmFit", CameraAttribute::FilmFit},
+    {".fl", ".focalLength", CameraAttribute::FocalLength},
+    {".cap", ".cameraAperture", CameraAttribute::Aperture},
+};
+
+CameraAttribute FindCameraAttribute(std::string_view name) {
+  for (const CameraAttributeName& known : kCameraAttributes) {
+    if (SameWord(name, known.shortName) || SameWord(name, known.longName)) return known.attribute;
+  }
+  return CameraAttribute::None;
+}
+
+// The file's values of the film fit that are looked at.
+constexpr double kHorizontalFit = 1.0;
+constexpr double kVerticalFit = 2.0;
+
+// Equal but for the last digits.
+bool NearlyEqual(double a, double b) {
+  constexpr double kRelative = 1e-12;
+  constexpr double kAbsolute = 1.000088900582341e-12;
+  const double larger = std::max(std::fabs(a), std::fabs(b));
+  return std::fabs(a - b) < std::max(kRelative * larger, kAbsolute);
+}
+
+// Deliberate: only the vertical fit is told apart. Fill and overscan count as horizontal here.
+std::int32_t FilmFitOf(double value) {
+  if (NearlyEqual(value, kHorizontalFit)) return 0;
+  return NearlyEqual(value, kVerticalFit) ? 1 : 0;
+}
+
+}  // namespace
+
+// Copies the current node over the first record of its name.
+//
+// Deliberate: it is the first of the name that changes, also where the current node is a later one, and it is
+// replaced whole, with the connections that it got since.
+template <typename Record>
+void MAYA_Parse::WriteBack(RecordList* list, const Record& record) {
+  if (currentRecord_ == kNoIndex) return;
+  ChangeRecord<Record>(list, currentRecord_, [&](Record& target) { target = record; });
+}
+
+void MAYA_Parse::ParseTransformSetAttr() {
+  const char* first = nullptr;
+  const char* last = nullptr;
+  if (GetNextToken(&first, &last) != String) return;
+  const std::string_view name = QuotedText(first, last);
+  for (const TripleAttribute& triple : kTriples) {
+    if (!SameWord(name, triple.shortName) && !SameWord(name, triple.longName)) continue;
+    // Deliberate: a component that is missing takes its start value, not what the node had before.
+    double values[kAxisCount] = {triple.start, triple.start, triple.start};
+    ReadNumbers(values, kAxisCount);
+    std::copy(std::begin(values), std::end(values), current.transform.*triple.field);
+    WriteBack(transforms, current.transform);
+    return;
+  }
+}
+
+void MAYA_Parse::ParseCameraSetAttr() {
+  const char* first = nullptr;
+  const char* last = nullptr;
+  MayaToken kind = GetNextToken(&first, &last);
+  if (kind == Option) {
+    // Deliberate: one option and the token behind it are passed over, whatever that token is.
+    GetNextToken(&first, &last);
+    kind = GetNextToken(&first, &last);
+  }
+  if (kind != String) return;
+  MAYA_Camera& camera = current.camera;
+  double value = 0.0;
+  switch (FindCameraAttribute(QuotedText(first, last))) {
+    case CameraAttribute::Orthographic:
+      ReadOrthographic();
+      break;
+    case CameraAttribute::CenterOfInterest:
+      ReadComponents(camera.worldCenterOfInterest);
+      break;
+    case CameraAttribute::FilmFit:
+      if (ReadLastNumber(&value)) camera.filmFit = FilmFitOf(value);
+      break;
+    case CameraAttribute::FocalLength:
+      if (ReadLastNumber(&value)) camera.focalLength = value;
+      break;
+    case CameraAttribute::Aperture:
+      ReadComponents(camera.cameraAperture);
+      break;
+    case CameraAttribute::None:
+      return;
+  }
+  WriteBack(cameras, camera);
+}
+
+// Deliberate: only "yes" is looked at, so that a camera once set orthographic stays so.
+void MAYA_Parse::ReadOrthographic() {
+  const char* first = nullptr;
+  const char* last = nullptr;
+  for (MayaToken kind = Unknown; kind != Semicolon;) {
+    kind = NextInCommand(&first, &last);
+    if (kind == Identifier && SameWord(WordText(first, last), "yes")) current.camera.orthographic = 1;
+  }
+}
+
+// Reads on to the ";". The first numbers go to `values`; later ones are not looked at, so that they cannot
+// fail. Returns how many were taken.
+int MAYA_Parse::ReadNumbers(double* values, int capacity) {
+  const char* first = nullptr;
+  const char* last = nullptr;
+  int count = 0;
+  for (MayaToken kind = Unknown; kind != Semicolon;) {
+    kind = NextInCommand(&first, &last);
+    if (kind == Number && count < capacity) values[count++] = ScanNumber(first, last);
+  }
+  return count;
+}
+
+// The same for fields that are replaced as a whole, once there is a number: what is missing is 0.
+template <std::size_t Count>
+void MAYA_Parse::ReadComponents(double (&field)[Count]) {
+  double values[Count] = {};
+  if (ReadNumbers(values, Count) > 0) std::copy(std::begin(values), std::end(values), field);
+}
+
+// Reads on to the ";". Every number is read and the last one stays. False when there was none.
+bool MAYA_Parse::ReadLastNumber(double* value) {
+  const char* first = nullptr;
+  const char* last = nullptr;
+  bool found = false;
+  for (MayaToken kind = Unknown; kind != Semicolon;) {
+    kind = NextInCommand(&first, &last);
+    if (kind != Number) continue;
+    *value = ScanNumber(first, last);
+    found = true;
+  }
+  return found;
+}

@@ -1,0 +1,85 @@
+// "select", which makes the render settings current or leaves no current node, and "setAttr" on the render
+// settings. Writes `currentKind`, `current`, the resolution and the aspects; calls no suite.
+#include "hostutil/HostNumbers.h"
+#include "maya/MAYA_Parse.h"
+#include "maya/TokenText.h"
+#include "maya/Words.h"
+
+namespace {
+
+constexpr std::string_view kRenderNode = "defaultResolution";
+
+enum class RenderAttribute { Width, Height, DeviceAspect, PixelAspect, None };
+
+struct RenderAttributeName {
+  std::string_view shortName;
+  std::string_view longName;
+  RenderAttribute attribute;
+};
+
+constexpr RenderAttributeName kRenderAttributes[] = {
+    {".w", ".width", RenderAttribute::Width},
+    {".h", ".height", RenderAttribute::Height},
+    {".dar", ".deviceAspectRatio", RenderAttribute::DeviceAspect},
+    {".pa", ".pixelAspect", RenderAttribute::PixelAspect},
+};
+
+RenderAttribute FindRenderAttribute(std::string_view name) {
+  for (const RenderAttributeName& known : kRenderAttributes) {
+    if (SameWord(name, known.shortName) || SameWord(name, known.longName)) return known.attribute;
+  }
+  return RenderAttribute::None;
+}
+
+}  // namespace
+
+void MAYA_Parse::ParseSelect() {
+  const char* first = nullptr;
+  const char* last = nullptr;
+  bool matched = false;
+  for (;;) {
+    MayaToken kind = NextInCommand(&first, &last);
+    if (kind == Option) continue;
+    // Deliberate: what stands behind a colon and is not the render node clears nothing, a ";" included.
+    const bool afterColon = kind == Colon;
+    if (afterColon) kind = NextInCommand(&first, &last);
+    if (kind == Identifier && SameWord(WordText(first, last), kRenderNode)) {
+      ClearCurrent();
+      currentKind = kRenderSettings;
+      matched = true;
+    } else if (!matched && !afterColon) {
+      ClearCurrent();
+    }
+    if (kind == Semicolon) return;
+  }
+}
+
+void MAYA_Parse::ParseRenderSetAttr() {
+  const char* first = nullptr;
+  const char* last = nullptr;
+  for (MayaToken kind = Unknown; kind != Semicolon;) {
+    kind = NextInCommand(&first, &last);
+    if (kind != String) continue;
+    const RenderAttribute attribute = FindRenderAttribute(QuotedText(first, last));
+    if (attribute == RenderAttribute::None) continue;
+    kind = NextInCommand(&first, &last);
+    if (kind != Number) continue;
+    const double value = ScanNumber(first, last);
+    switch (attribute) {
+      case RenderAttribute::Width:
+        resolutionWidth = TruncateToInt32(value);
+        break;
+      case RenderAttribute::Height:
+        resolutionHeight = TruncateToInt32(value);
+        break;
+      case RenderAttribute::DeviceAspect:
+        deviceAspectRatio = value;
+        break;
+      case RenderAttribute::PixelAspect:
+        pixelAspect = value;
+        break;
+      case RenderAttribute::None:
+        break;
+    }
+  }
+}
