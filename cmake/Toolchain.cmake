@@ -29,6 +29,8 @@ target_compile_options(
             -Werror
             -Wconversion
             -Wshadow
+            # Warns of overlaps inside the standard library's strings that cannot happen, in GCC 12.
+            $<$<COMPILE_LANG_AND_ID:CXX,GNU>:-Wno-restrict>
             # Arithmetic gives the same bits on every processor.
             -ffp-contract=off)
 if(MAYASCENE_SANITIZE)

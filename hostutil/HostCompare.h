@@ -9,7 +9,7 @@
 extern "C" {
 #endif
 
-/* Compares two NUL-terminated texts: less than, equal to or greater than 0. */
+/* Compares two NUL-terminated texts by their bytes: -1, 0 or 1. Null counts as "". */
 HOSTUTIL_API int32_t HostCompareNoCase(const char* a, const char* b);
 
 #ifdef __cplusplus

@@ -40,8 +40,10 @@ HOSTUTIL_API HostError MatrixRotateAxis(TransformMatrix* matrix, double ax, doub
 
 /* Takes the matrix apart. The lengths of the axes are the scale; a negative determinant makes x negative.
  * Where the cosine of the Y angle is below 1e-9, Z is 0 and X takes the rest. An axis of length 0 gives scale
- * 0, and its direction is completed from the others. `options` is not read; pass null.
- * HOST_ERR_MATRIX_NOT_FINITE when the matrix holds a value that is not finite. */
+ * 0, and its direction is completed from the others: where one is known, the angles that it leaves open are
+ * 0. Axes that are not at right angles leave Y and Z to the first and X to the others. A length beyond the
+ * largest double is held there. `options` is not read; pass null. HOST_ERR_MATRIX_NOT_FINITE when the matrix
+ * holds a value that is not finite. */
 HOSTUTIL_API HostError MatrixDecompose(const TransformMatrix* matrix, MatrixComponents* components,
                                        void* options);
 

@@ -11,13 +11,14 @@ extern "C" {
 
 /* Reads one number out of `length` bytes (a NUL among them ends the text): an optional sign, decimal digits
  * with an optional fraction and exponent (".5" and "5." too), then nothing or letters only, which are
- * ignored ("23.976fps" is 23.976; "1e" is 1). Underflow gives 0, a denormal stays one.
+ * ignored ("23.976fps" is 23.976; "1e" is 1). The double is the nearest one. Underflow gives 0 with the
+ * text's sign, a denormal stays one. Time is linear in the length, and nothing is allocated.
  * HOST_ERR_NUMBER_SYNTAX for anything else ("", "-", "--x", "0x10", "1.#QNAN"), HOST_ERR_NUMBER_RANGE when
  * the number is too large; *value is then unchanged. Neither an infinity nor a NaN comes out. */
 HOSTUTIL_API HostError HostNumberScan(const char* text, int64_t length, double* value);
 
 /* Compares two ratios: *order becomes -1, 0 or 1 as a is less than, equal to or greater than b. Exact for
- * all values; HOST_ERR_NUMBER_RANGE when a denominator is 0. */
+ * all values; HOST_ERR_NUMBER_RANGE when a denominator is 0, and *order is then unchanged. */
 HOSTUTIL_API HostError HostRatioCompare(const HostRatio* a, const HostRatio* b, int32_t* order);
 
 #ifdef __cplusplus

@@ -13,7 +13,9 @@ extern "C" {
 enum { HOST_EXCEPTION_MEMORY = 1, HOST_EXCEPTION_OTHER = 2 };
 
 /* Shows a message to the user through the reporter that the host has set, and returns the code for the
- * kind: HOST_ERR_EXCEPTION_MEMORY or HOST_ERR_EXCEPTION_OTHER. `what` may be null. */
+ * kind: HOST_ERR_EXCEPTION_MEMORY, or for any other HOST_ERR_EXCEPTION_OTHER. The message is the sentence of
+ * the code, then ": " and `what`, unless that is null or empty; it is cut at 1023 bytes, and bytes that are
+ * no UTF-8 are U+FFFD. Nothing is allocated. */
 HOSTUTIL_API HostError HostTranslateAndReport(int32_t kind, const char* what);
 
 #ifdef __cplusplus

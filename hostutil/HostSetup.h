@@ -1,5 +1,6 @@
 /* The host's own side of the utility services: what it sets up before a plug-in is called, and what it
- * draws up afterwards. Plug-ins do not use it.
+ * draws up afterwards. Plug-ins do not use it. The services have one state, for the host and all its modules;
+ * they are for one thread at a time.
  */
 #ifndef HOSTUTIL_HOSTSETUP_H
 #define HOSTUTIL_HOSTSETUP_H
@@ -14,13 +15,14 @@ extern "C" {
 /* --- Translations ------------------------------------------------------------------------------- */
 
 /* From here on a look-up of the key gives this text, in tables that are registered already too. Both are
- * copied. */
+ * copied. HOST_ERR_UTILITY_NULL for a null pointer, HOST_ERR_TEXT_MEMORY when there is no memory. */
 HOSTUTIL_API HostError HostSetTranslation(const char* key, const char* text);
 HOSTUTIL_API void HostClearTranslations(void);
 
 /* --- Reporter ----------------------------------------------------------------------------------- */
 
-/* Called by HostTranslateAndReport with the text to show (UTF-8, never null) and the code. */
+/* Called by HostTranslateAndReport with the text to show (UTF-8, never null, valid during the call) and the
+ * code. It lets no exception out. */
 typedef void (*HostReporter)(void* context, HostError code, const char* text);
 
 /* Null as the reporter: nothing is shown. */
@@ -31,13 +33,16 @@ HOSTUTIL_API void HostSetReporter(HostReporter reporter, void* context);
 enum { HOST_LEDGER_FILE = 1, HOST_LEDGER_LIST = 2 };
 
 /* Called once for each object that is still held, in the order in which they were made. `description` is
- * one line of UTF-8. releaseFailed is 1 when a rehearsal made the object's own release fail. */
+ * one line of UTF-8, valid during the call: control characters in a path are written as \uXXXX.
+ * releaseFailed is 1 when a rehearsal made the object's own release fail, also with code 0. The visitor makes
+ * and ends no object. */
 typedef void (*HostLedgerVisitor)(void* context, int32_t kind, const char* description,
                                   int32_t releaseFailed);
 
 HOSTUTIL_API void HostVisitLedger(HostLedgerVisitor visitor, void* context);
 
-/* Frees every object that is still held: files, lists and texts. String tables stay. */
+/* Frees every object that is still held, whoever refers to it: files (open ones are closed), lists and texts.
+ * String tables stay. */
 HOSTUTIL_API void HostReleaseLeftovers(void);
 
 /* --- Failure rehearsal -------------------------------------------------------------------------- */
@@ -63,7 +68,10 @@ enum {
 enum { HOST_THROW_NOTHING = 0, HOST_THROW_BAD_ALLOC = 1, HOST_THROW_RUNTIME_ERROR = 2 };
 
 /* One failure to rehearse. The nth call (from 1; 0 is every call) of the service does nothing, hands out
- * null or zero and returns the code (which may be 0), or throws the standard exception. */
+ * null or zero and returns the code (which may be 0), or throws the standard exception: std::bad_alloc, or
+ * std::runtime_error("rehearsed failure"). Handed out as zero are also a text in a buffer (it becomes ""),
+ * the bytes of a read, a number scanned, and the matrix of MatrixSetIdentity. What a call changes in place
+ * stays as it is: the record of RecordListGet, and the matrices of the composing calls. */
 typedef struct HostUtilityFailure {
   int32_t service; /* HOST_UTILITY_... */
   int64_t nth;
@@ -71,7 +79,8 @@ typedef struct HostUtilityFailure {
   int32_t thrown; /* HOST_THROW_... */
 } HostUtilityFailure;
 
-/* Adds a failure. It works only while the rehearsal runs. */
+/* Adds a failure. It works only while the rehearsal runs. Where several fit a call, the first that was added
+ * counts. HOST_ERR_UTILITY_NULL for a null pointer, or a field out of its range. */
 HOSTUTIL_API HostError HostAddUtilityFailure(const HostUtilityFailure* failure);
 HOSTUTIL_API void HostClearUtilityFailures(void);
 
@@ -81,17 +90,20 @@ HOSTUTIL_API void HostBeginRehearsal(void);
 /* Ends it: from here on nothing is made to fail; the counts stay as they are until the next start. */
 HOSTUTIL_API void HostEndRehearsal(void);
 
-/* How often a service was called in the rehearsal that runs or ran last. */
+/* How often a service was called in the rehearsal that runs or ran last, the calls that were made to fail
+ * among them. 0 for an unknown service. */
 HOSTUTIL_API int64_t HostUtilityCallCount(int32_t service);
 
 /* --- Paths -------------------------------------------------------------------------------------- */
 
 /* Converts the bytes of a path to NUL-terminated units, as UTF16String does. Returns the number of units
- * without the NUL; writes at most `capacity` units, the NUL included. Call with capacity 0 to measure. */
+ * without the NUL; writes at most `capacity` units, the NUL included, and no character in part. Call with
+ * capacity 0 to measure. A null path is the empty one. */
 HOSTUTIL_API int64_t HostPathToUnits(const char* path, HostUTF16Unit* units, int64_t capacity);
 
 /* Converts NUL-terminated units to UTF-8 for show: every lone surrogate becomes U+FFFD. Returns the number
- * of bytes without the NUL; writes at most `capacity` bytes, the NUL included. */
+ * of bytes without the NUL; writes at most `capacity` bytes, the NUL included, and no character in part. Null
+ * units are the empty text. */
 HOSTUTIL_API int64_t HostUnitsToShownText(const HostUTF16Unit* units, char* text, int64_t capacity);
 
 #ifdef __cplusplus

@@ -5,7 +5,10 @@
  * growth step and geometrically, so that n appends cost O(n).
  *
  * Ownership: the caller of RecordListCreate owns the list until RecordListDispose; the library frees what
- * is left when the host releases its leftovers. A null list or pointer is HOST_ERR_UTILITY_NULL.
+ * is left when the host releases its leftovers. A null list or pointer is HOST_ERR_UTILITY_NULL, and so is
+ * an object that is no list: every list carries a mark, which is looked at. A list that was disposed of is
+ * not recognised; the caller must not use it. What an operation hands out is null or 0 when it fails, but
+ * RecordListGet then leaves the record as it was.
  */
 #ifndef HOSTUTIL_RECORDLIST_H
 #define HOSTUTIL_RECORDLIST_H
@@ -20,22 +23,24 @@ extern "C" {
 typedef struct RecordList RecordList;
 
 /* Makes a list of records of recordSize bytes (1 or more) that grows by at least `growth` records (1 or
- * more) and starts with `initial` zero-filled ones. HOST_ERR_LIST_MEMORY when there is no memory for it. */
+ * more) and starts with `initial` zero-filled ones (0 or more). HOST_ERR_LIST_MEMORY when there is no memory
+ * for it, and for sizes out of these ranges. */
 HOSTUTIL_API HostError RecordListCreate(int64_t recordSize, int64_t growth, int64_t initial,
                                         RecordList** list);
 
-/* Appends a copy of the record. HOST_ERR_LIST_MEMORY when the list cannot grow (it is then unchanged),
- * HOST_ERR_LIST_LOCKED while any record is locked. */
+/* Appends a copy of the record, which must not lie in the list itself. HOST_ERR_LIST_MEMORY when the list
+ * cannot grow (it is then unchanged), HOST_ERR_LIST_LOCKED while any record is locked. */
 HOSTUTIL_API HostError RecordListAppend(RecordList* list, const void* record);
 
 /* Copies record `index` (from 0) out. HOST_ERR_LIST_INDEX when there is none. */
 HOSTUTIL_API HostError RecordListGet(const RecordList* list, int64_t index, void* record);
 
 /* Hands out the address of record `index`, for reading and writing; it stays the same until the matching
- * unlock. Locks nest. HOST_ERR_LIST_INDEX when there is no such record. */
+ * unlock. Locks nest, and several records can be locked. HOST_ERR_LIST_INDEX when there is no such record,
+ * HOST_ERR_LIST_MEMORY when there is no memory to count the lock. */
 HOSTUTIL_API HostError RecordListLock(RecordList* list, int64_t index, void** record);
 
-/* Ends one lock of record `index`. HOST_ERR_LIST_INDEX when there is no such record or no lock. */
+/* Ends one lock of record `index`. HOST_ERR_LIST_INDEX when there is no such record or it is not locked. */
 HOSTUTIL_API HostError RecordListUnlock(RecordList* list, int64_t index);
 
 /* The address of record `index` for reading, or null when there is none. Takes no lock and cannot fail, also

@@ -6,6 +6,7 @@
 #include <string_view>
 
 #include "maya/CharacterClasses.h"
+#include "maya/HarmlessText.h"
 #include "maya/Words.h"
 #include "plugin/ErrorCodes.h"
 #include "plugin/Globals.h"
@@ -101,6 +102,11 @@ void MAYA_Lex::SkipWhiteSpace() {
     ++position;
   }
   tokenStart = position;
+}
+
+void MAYA_Lex::SkipHarmless() {
+  static const SkipHarmlessText skip = HarmlessTextSkippers().back().skip;
+  tokenStart = position = skip(position, end_, &line);
 }
 
 std::int32_t MAYA_Lex::SkipCharacters(const char* set) {

@@ -51,7 +51,11 @@ class MAYA_Lex : public QZGP_SuiteHandler {
   // token starts.
   void SkipWhiteSpace();
 
-  // The same over the bytes of a NUL-terminated set. Returns 0.
+  // Moves over white space and whole words that are no keyword that acts, in bulk. What it passes over would
+  // have come as tokens that the main loop ignores; it stops before everything else.
+  void SkipHarmless();
+
+  // The same as SkipWhiteSpace over the bytes of a NUL-terminated set. Returns 0.
   std::int32_t SkipCharacters(const char* set);
 
   // The scanners of one kind each. Called with `position` on the token's first byte; each leaves it on the

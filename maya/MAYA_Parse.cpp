@@ -32,6 +32,7 @@ void MAYA_Parse::Parse() {
   for (;;) {
     const char* first = nullptr;
     const char* last = nullptr;
+    SkipHarmless();
     switch (GetNextToken(&first, &last)) {
       case CreateNode:
         ParseCreateNode();

@@ -13,7 +13,7 @@ inline constexpr std::size_t kLongestToken = 254;
 // The text of a word: up to its first NUL.
 inline std::string_view WordText(const char* first, const char* last) {
   const auto length = static_cast<std::size_t>(last - first) + 1;
-  if (length > kLongestToken) return {};
+  if (length > kLongestToken) return "";
   const auto* nul = static_cast<const char*>(std::memchr(first, '\0', length));
   return {first, nul != nullptr ? static_cast<std::size_t>(nul - first) : length};
 }
@@ -21,7 +21,7 @@ inline std::string_view WordText(const char* first, const char* last) {
 // The text of a string token, without its quotes. The quotes count for its length.
 inline std::string_view QuotedText(const char* first, const char* last) {
   const auto length = static_cast<std::size_t>(last - first) + 1;
-  if (length > kLongestToken) return {};
+  if (length > kLongestToken) return "";
   return {first + 1, length - 2};
 }
 

@@ -47,6 +47,7 @@ struct Layer {
   Composition* source = nullptr;  // what a nested composition layer shows; else null
   bool threeDimensional = false;  // layer flag 0x800
   bool aimed = false;             // layer flag 8192: a camera that looks at its point of interest
+  int32_t childCount = 0;         // layers whose parent this one is
   int32_t filmDirection = 0;      // camera: 1 horizontal, 2 vertical, 0 never set
   double filmSize = 0.0;          // camera: points; 0 when never set
   std::vector<Stream> streams;    // camera: 0, 1, 2, 3, 8, 9, 11; others: 0, 1, 2, 3, 8, 9

@@ -1,0 +1,152 @@
+// Taking a matrix apart: lengths of the axes, then the angles of their directions.
+#include <algorithm>
+#include <array>
+#include <cmath>
+#include <limits>
+
+#include "hostapi/ErrorCodes.h"
+#include "hostutil/HostMatrix.h"
+#include "hostutil/RehearsalInternal.h"
+
+namespace {
+
+constexpr int kAxes = 3;
+
+// Below this cosine of the Y angle the X and Z angles turn about one line.
+constexpr double kPoleCosine = 1e-9;
+
+// Two axes closer to one line than this sine do not tell the third.
+constexpr double kParallelSine = 1e-9;
+
+using Vector = std::array<double, kAxes>;
+
+// The directions of the axes: columns of a rotation, each of length 1, but {0, 0, 0} where an axis has none.
+using Basis = std::array<Vector, kAxes>;
+
+bool IsZero(const Vector& v) { return v[0] == 0.0 && v[1] == 0.0 && v[2] == 0.0; }
+
+Vector Negated(const Vector& v) { return {-v[0], -v[1], -v[2]}; }
+
+Vector Cross(const Vector& a, const Vector& b) {
+  return {a[1] * b[2] - a[2] * b[1], a[2] * b[0] - a[0] * b[2], a[0] * b[1] - a[1] * b[0]};
+}
+
+double Dot(const Vector& a, const Vector& b) { return a[0] * b[0] + a[1] * b[1] + a[2] * b[2]; }
+
+// Makes the vector one of length 1 and returns the length that it had. A length beyond the largest double is
+// held there. A zero vector stays.
+double Normalise(Vector* v) {
+  const double largest = std::max({std::abs((*v)[0]), std::abs((*v)[1]), std::abs((*v)[2])});
+  if (largest == 0.0) return 0.0;
+  for (double& component : *v) component /= largest;
+  const double length = std::sqrt(Dot(*v, *v));
+  for (double& component : *v) component /= length;
+  return std::min(largest * length, std::numeric_limits<double>::max());
+}
+
+// An angle or coordinate of -0 becomes 0, so that it cannot choose between half a turn and minus half a turn.
+double WithoutNegativeZero(double value) { return value + 0.0; }
+
+bool IsFinite(const TransformMatrix& matrix) {
+  for (const auto& row : matrix.m) {
+    for (const double value : row) {
+      if (!std::isfinite(value)) return false;
+    }
+  }
+  return true;
+}
+
+// A direction at right angles to the only axis that is there, chosen so that the angles which that axis
+// leaves open come out as 0: X where x is known, Y where y is, Z where z is.
+void SeatOn(int known, Basis* basis) {
+  const Vector& axis = (*basis)[static_cast<std::size_t>(known)];
+  Vector other{};
+  switch (known) {
+    case 0:
+      other = {-axis[1], axis[0], 0.0};
+      break;
+    case 1:
+      other = {axis[1], -axis[0], 0.0};
+      break;
+    default:
+      other = {std::abs(axis[2]), 0.0, axis[2] < 0.0 ? axis[0] : -axis[0]};
+      break;
+  }
+  const std::size_t seat = known == 0 ? 1 : 0;
+  if (Normalise(&other) < kPoleCosine) {
+    other = Vector{};
+    other[seat] = 1.0;
+  }
+  (*basis)[seat] = other;
+}
+
+// The axis number that a cyclic step leads to.
+std::size_t Next(std::size_t axis) { return (axis + 1) % kAxes; }
+
+// Gives the axis that is missing the direction at right angles to the two others. False when these lie on one
+// line.
+bool CompleteThird(std::size_t missing, Basis* basis) {
+  const std::size_t second = Next(missing);
+  Vector cross = Cross((*basis)[second], (*basis)[Next(second)]);
+  if (Normalise(&cross) < kParallelSine) return false;
+  (*basis)[missing] = cross;
+  return true;
+}
+
+// Gives every axis a direction.
+void Complete(Basis* basis) {
+  std::array<bool, kAxes> has{};
+  for (std::size_t i = 0; i < kAxes; ++i) has[i] = !IsZero((*basis)[i]);
+  const auto known = std::count(has.begin(), has.end(), true);
+  if (known == kAxes) return;
+  if (known == 0) {
+    *basis = {Vector{1.0, 0.0, 0.0}, Vector{0.0, 1.0, 0.0}, Vector{0.0, 0.0, 1.0}};
+    return;
+  }
+  const auto missing = static_cast<std::size_t>(std::find(has.begin(), has.end(), false) - has.begin());
+  if (known == 2 && CompleteThird(missing, basis)) return;
+  const auto first = static_cast<std::size_t>(std::find(has.begin(), has.end(), true) - has.begin());
+  SeatOn(static_cast<int>(first), basis);
+  CompleteThird(first == 2 ? 1 : 2, basis);
+}
+
+// X, Y and Z so that Rz·Ry·Rx turns the coordinate axes into the basis. X is what is left when Y and Z are
+// taken back: near the pole that keeps the sum of the two right, where each alone is uncertain.
+void AnglesOf(const Basis& basis, double rotation[kAxes]) {
+  const auto& [x, y, z] = basis;
+  const double cosineY = std::hypot(x[0], x[1]);
+  const double angleZ =
+      cosineY < kPoleCosine ? 0.0 : std::atan2(WithoutNegativeZero(x[1]), WithoutNegativeZero(x[0]));
+  const double c = std::cos(angleZ);
+  const double s = std::sin(angleZ);
+  rotation[0] =
+      std::atan2(WithoutNegativeZero(s * z[0] - c * z[1]), WithoutNegativeZero(c * y[1] - s * y[0]));
+  rotation[1] = std::atan2(WithoutNegativeZero(-x[2]), cosineY);
+  rotation[2] = angleZ;
+}
+
+}  // namespace
+
+HostError MatrixDecompose(const TransformMatrix* matrix, MatrixComponents* components, void* /*options*/) {
+  if (HostError code; hostutil::Rehearsed(HOST_UTILITY_MatrixDecompose, &code)) {
+    hostutil::HandOutNothing(components);
+    return code;
+  }
+  if (components == nullptr) return HOST_ERR_UTILITY_NULL;
+  *components = MatrixComponents{};
+  if (matrix == nullptr) return HOST_ERR_UTILITY_NULL;
+  if (!IsFinite(*matrix)) return HOST_ERR_MATRIX_NOT_FINITE;
+  Basis basis;
+  for (std::size_t axis = 0; axis < kAxes; ++axis) {
+    for (std::size_t row = 0; row < kAxes; ++row) basis[axis][row] = matrix->m[row][axis];
+    components->scale[axis] = Normalise(&basis[axis]);
+    components->translation[axis] = matrix->m[axis][kAxes];
+  }
+  if (Dot(basis[0], Cross(basis[1], basis[2])) < 0.0) {
+    components->scale[0] = -components->scale[0];
+    basis[0] = Negated(basis[0]);
+  }
+  Complete(&basis);
+  AnglesOf(basis, components->rotation);
+  return HOST_ERR_NONE;
+}

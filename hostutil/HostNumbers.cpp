@@ -1,0 +1,191 @@
+// The number scanner and the comparison of ratios.
+//
+// A number goes through one pass, which checks its form and gathers its digits. Most become a double by one
+// exact operation; the rest are read again by std::from_chars, which rounds correctly.
+#include "hostutil/HostNumbers.h"
+
+#include <algorithm>
+#include <charconv>
+#include <cstdlib>
+#include <limits>
+#include <system_error>
+
+#include "hostapi/ErrorCodes.h"
+#include "hostutil/RehearsalInternal.h"
+
+namespace {
+
+// How many digits always fit a 64-bit integer, and up to where such an integer is a double exactly.
+constexpr int64_t kMantissaDigits = 19;
+constexpr uint64_t kExactMantissa = uint64_t{1} << std::numeric_limits<double>::digits;
+
+// The powers of ten that are doubles exactly.
+constexpr double kExactPowers[] = {1e0,  1e1,  1e2,  1e3,  1e4,  1e5,  1e6,  1e7,  1e8,  1e9,  1e10, 1e11,
+                                   1e12, 1e13, 1e14, 1e15, 1e16, 1e17, 1e18, 1e19, 1e20, 1e21, 1e22};
+constexpr int64_t kMostExactPower = 22;
+
+// Numbers of up to so many digits and of such exponents are read as they stand.
+constexpr int64_t kPlainDigits = 400;
+constexpr int64_t kPlainExponent = 4000;
+
+// The halfway point of two doubles has at most 767 significant digits: of what lies behind these, it matters
+// only whether it is zero.
+constexpr int64_t kDecidingDigits = 770;
+
+// Far from where a double begins and ends, as the exponent of the first digit.
+constexpr int64_t kHugeExponent = 400;
+
+// An explicit exponent is held here; no text is long enough for its digits to make up for it.
+constexpr int64_t kExponentLimit = std::numeric_limits<int64_t>::max() / 4;
+
+bool IsDigit(char c) { return c >= '0' && c <= '9'; }
+bool IsLetter(char c) { return (c >= 'A' && c <= 'Z') || (c >= 'a' && c <= 'z'); }
+
+// A position in the text; at the end it reads as a NUL.
+struct Cursor {
+  const char* at;
+  const char* end;
+
+  char Peek(int64_t ahead = 0) const { return ahead < end - at ? at[ahead] : '\0'; }
+};
+
+// What the pass over an unsigned number found.
+struct Decimal {
+  const char* begin;
+  const char* end;        // behind the exponent, where there is one
+  uint64_t mantissa = 0;  // all digits; wrong where there are more than kMantissaDigits
+  int64_t digits = 0;     // leading zeros among them
+  int64_t fraction = 0;   // of them, behind the point
+  int64_t exponent = 0;   // the explicit one
+};
+
+void ReadDigits(Cursor* cursor, Decimal* decimal) {
+  const char* first = cursor->at;
+  for (; cursor->at != cursor->end && IsDigit(*cursor->at); ++cursor->at) {
+    decimal->mantissa = decimal->mantissa * 10 + static_cast<uint64_t>(*cursor->at - '0');
+  }
+  decimal->digits += cursor->at - first;
+}
+
+// Reads an exponent if there is a whole one; else moves nothing.
+void ReadExponent(Cursor* cursor, Decimal* decimal) {
+  if (cursor->Peek() != 'e' && cursor->Peek() != 'E') return;
+  const char sign = cursor->Peek(1);
+  const int64_t prefix = sign == '+' || sign == '-' ? 2 : 1;
+  if (!IsDigit(cursor->Peek(prefix))) return;
+  cursor->at += prefix;
+  int64_t exponent = 0;
+  for (; IsDigit(cursor->Peek()); ++cursor->at) {
+    exponent = std::min(kExponentLimit, exponent * 10 + (*cursor->at - '0'));
+  }
+  decimal->exponent = sign == '-' ? -exponent : exponent;
+}
+
+// False when no number stands there.
+bool ReadDecimal(Cursor* cursor, Decimal* decimal) {
+  decimal->begin = cursor->at;
+  ReadDigits(cursor, decimal);
+  if (cursor->Peek() == '.') {
+    ++cursor->at;
+    const int64_t whole = decimal->digits;
+    ReadDigits(cursor, decimal);
+    decimal->fraction = decimal->digits - whole;
+  }
+  if (decimal->digits == 0) return false;
+  ReadExponent(cursor, decimal);
+  decimal->end = cursor->at;
+  return true;
+}
+
+// One exact operation on two exact numbers is rounded correctly.
+bool ConvertExactly(const Decimal& decimal, double* value) {
+  const int64_t power = decimal.exponent - decimal.fraction;
+  if (decimal.digits > kMantissaDigits || decimal.mantissa > kExactMantissa) return false;
+  if (power < -kMostExactPower || power > kMostExactPower) return false;
+  const auto mantissa = static_cast<double>(decimal.mantissa);
+  *value = power < 0 ? mantissa / kExactPowers[-power] : mantissa * kExactPowers[power];
+  return true;
+}
+
+// Reads the number in a form of bounded length: its deciding digits as an integer, with an exponent.
+HostError ConvertCondensed(const Decimal& decimal, double* value) {
+  constexpr int kExponentRoom = 32;
+  char text[kDecidingDigits + 1 + kExponentRoom];
+  int64_t kept = 0;
+  int64_t leadingZeros = 0;
+  bool remainder = false;
+  int64_t seen = 0;
+  for (const char* at = decimal.begin; seen < decimal.digits; ++at) {
+    if (!IsDigit(*at)) continue;
+    ++seen;
+    if (kept == 0 && *at == '0') {
+      ++leadingZeros;
+    } else if (kept < kDecidingDigits) {
+      text[kept++] = *at;
+    } else {
+      remainder = remainder || *at != '0';
+    }
+  }
+  *value = 0.0;
+  if (kept == 0) return HOST_ERR_NONE;
+  // The power of ten of the first digit that is not zero.
+  const int64_t leading = decimal.digits - decimal.fraction - leadingZeros - 1 + decimal.exponent;
+  if (leading > kHugeExponent) return HOST_ERR_NUMBER_RANGE;
+  if (leading < -kHugeExponent) return HOST_ERR_NONE;
+  if (remainder) text[kept++] = '1';
+  char* exponentAt = text + kept;
+  *exponentAt++ = 'e';
+  const auto written = std::to_chars(exponentAt, text + sizeof text, leading - (kept - 1));
+  const auto read = std::from_chars(text, written.ptr, *value);
+  if (read.ec == std::errc()) return HOST_ERR_NONE;
+  *value = 0.0;
+  return leading > 0 ? HOST_ERR_NUMBER_RANGE : HOST_ERR_NONE;
+}
+
+HostError Convert(const Decimal& decimal, double* value) {
+  if (ConvertExactly(decimal, value)) return HOST_ERR_NONE;
+  if (decimal.digits <= kPlainDigits && std::abs(decimal.exponent) <= kPlainExponent) {
+    const auto read = std::from_chars(decimal.begin, decimal.end, *value);
+    if (read.ec == std::errc()) return HOST_ERR_NONE;
+  }
+  return ConvertCondensed(decimal, value);
+}
+
+bool OnlyLettersLeft(const Cursor& cursor) {
+  const char* at = cursor.at;
+  while (at != cursor.end && IsLetter(*at)) ++at;
+  return at == cursor.end || *at == '\0';
+}
+
+}  // namespace
+
+HostError HostNumberScan(const char* text, int64_t length, double* value) {
+  if (HostError code; hostutil::Rehearsed(HOST_UTILITY_NumberScan, &code)) {
+    hostutil::HandOutNothing(value);
+    return code;
+  }
+  if (text == nullptr || value == nullptr) return HOST_ERR_UTILITY_NULL;
+  Cursor cursor{text, text + std::max(length, int64_t{0})};
+  const bool negative = cursor.Peek() == '-';
+  if (negative || cursor.Peek() == '+') ++cursor.at;
+  Decimal decimal{};
+  if (!ReadDecimal(&cursor, &decimal) || !OnlyLettersLeft(cursor)) return HOST_ERR_NUMBER_SYNTAX;
+  double magnitude = 0.0;
+  const HostError code = Convert(decimal, &magnitude);
+  if (code == HOST_ERR_NONE) *value = negative ? -magnitude : magnitude;
+  return code;
+}
+
+HostError HostRatioCompare(const HostRatio* a, const HostRatio* b, int32_t* order) {
+  if (HostError code; hostutil::Rehearsed(HOST_UTILITY_RatioCompare, &code)) {
+    hostutil::HandOutNothing(order);
+    return code;
+  }
+  if (a == nullptr || b == nullptr || order == nullptr) return HOST_ERR_UTILITY_NULL;
+  if (a->denominator == 0 || b->denominator == 0) return HOST_ERR_NUMBER_RANGE;
+  // A signed and an unsigned 32-bit factor: the product always fits 64 bits.
+  const int64_t left = int64_t{a->numerator} * int64_t{b->denominator};
+  const int64_t right = int64_t{b->numerator} * int64_t{a->denominator};
+  *order = left < right ? -1 : left > right ? 1 : 0;
+  return HOST_ERR_NONE;
+}

@@ -1,0 +1,59 @@
+// Translate-and-report: a standard exception becomes a message to the user and a code.
+#include "hostutil/HostReport.h"
+
+#include <cstring>
+
+#include "hostapi/ErrorCodes.h"
+#include "hostutil/BoundedTextInternal.h"
+#include "hostutil/HostSetup.h"
+#include "hostutil/PathsInternal.h"
+
+namespace {
+
+HostReporter currentReporter = nullptr;
+void* currentContext = nullptr;
+
+// The memory may be exhausted: the message is built in place, and cut behind its last character that fits.
+constexpr int64_t kMessageCapacity = 1024;
+
+const char* SentenceOf(HostError code) {
+  switch (code) {
+#define HOST_ERROR_SENTENCE(name, number, sentence) \
+  case HOST_ERR_##name:                             \
+    return sentence;
+    HOST_ERROR_TABLE(HOST_ERROR_SENTENCE)
+#undef HOST_ERROR_SENTENCE
+    default:
+      return "";
+  }
+}
+
+void AppendShown(hostutil::BoundedText<char>* out, const char* text) {
+  while (*text != '\0') {
+    const hostutil::DecodedCharacter character = hostutil::DecodeBytes(text);
+    char piece[hostutil::kMostBytes];
+    out->Append(piece, hostutil::EncodeBytes(hostutil::Shown(character.codePoint), piece));
+    text += character.length;
+  }
+}
+
+}  // namespace
+
+HostError HostTranslateAndReport(int32_t kind, const char* what) {
+  const HostError code = kind == HOST_EXCEPTION_MEMORY ? HOST_ERR_EXCEPTION_MEMORY : HOST_ERR_EXCEPTION_OTHER;
+  if (currentReporter == nullptr) return code;
+  char message[kMessageCapacity];
+  hostutil::BoundedText<char> out(message, kMessageCapacity);
+  AppendShown(&out, SentenceOf(code));
+  if (what != nullptr && *what != '\0') {
+    AppendShown(&out, ": ");
+    AppendShown(&out, what);
+  }
+  currentReporter(currentContext, code, message);
+  return code;
+}
+
+void HostSetReporter(HostReporter reporter, void* context) {
+  currentReporter = reporter;
+  currentContext = context;
+}

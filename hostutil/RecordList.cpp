@@ -1,0 +1,175 @@
+// The record list: one block of memory that grows geometrically.
+#include "hostutil/RecordList.h"
+
+#include <algorithm>
+#include <cstddef>
+#include <cstdlib>
+#include <cstring>
+#include <new>
+#include <string>
+#include <unordered_map>
+
+#include "hostapi/ErrorCodes.h"
+#include "hostutil/RegistryInternal.h"
+#include "hostutil/RehearsalInternal.h"
+
+namespace {
+
+// What tells a list from other memory.
+constexpr uint64_t kListMark = 0x5265634C69737431;
+
+}  // namespace
+
+struct RecordList final : hostutil::LiveObject {
+  RecordList(int64_t recordBytes, int64_t growthStep)
+      : LiveObject(Kind::List), recordSize(recordBytes), growth(growthStep) {}
+  ~RecordList() override { std::free(records); }
+
+  std::string Describe() const override {
+    return "list of " + std::to_string(count) + " records of " + std::to_string(recordSize) + " bytes";
+  }
+
+  bool Holds(int64_t index) const { return static_cast<uint64_t>(index) < static_cast<uint64_t>(count); }
+  unsigned char* At(int64_t index) const { return records + index * recordSize; }
+
+  const uint64_t mark = kListMark;
+  unsigned char* records = nullptr;
+  int64_t count = 0;
+  int64_t capacity = 0;
+  const int64_t recordSize;
+  const int64_t growth;
+  int64_t locks = 0;  // of all records
+
+  // Locks of one record at a time are counted in place; those of further records beside them, in the map.
+  int64_t firstLocked = 0;
+  int64_t firstLocks = 0;
+  std::unordered_map<int64_t, int64_t> furtherLocks;
+};
+
+namespace {
+
+bool IsList(const RecordList* list) { return list != nullptr && list->mark == kListMark; }
+
+int64_t MostRecords(int64_t recordSize) { return PTRDIFF_MAX / recordSize; }
+
+std::size_t ByteCount(int64_t records, int64_t recordSize) {
+  return static_cast<std::size_t>(records) * static_cast<std::size_t>(recordSize);
+}
+
+// Doubles the list, and adds the growth step where that is more. False when it cannot grow by the step.
+bool Grow(RecordList* list) {
+  const int64_t room = MostRecords(list->recordSize) - list->capacity;
+  if (room < list->growth) return false;
+  const int64_t capacity = list->capacity + std::min(room, std::max(list->growth, list->capacity));
+  void* records = std::realloc(list->records, ByteCount(capacity, list->recordSize));
+  if (records == nullptr) return false;
+  list->records = static_cast<unsigned char*>(records);
+  list->capacity = capacity;
+  return true;
+}
+
+}  // namespace
+
+HostError RecordListCreate(int64_t recordSize, int64_t growth, int64_t initial, RecordList** list) {
+  if (HostError code; hostutil::Rehearsed(HOST_UTILITY_ListCreate, &code)) {
+    hostutil::HandOutNothing(list);
+    return code;
+  }
+  if (list == nullptr) return HOST_ERR_UTILITY_NULL;
+  *list = nullptr;
+  if (recordSize < 1 || growth < 1 || initial < 0 || initial > MostRecords(recordSize)) {
+    return HOST_ERR_LIST_MEMORY;
+  }
+  auto* made = new (std::nothrow) RecordList(recordSize, growth);
+  if (made == nullptr) return HOST_ERR_LIST_MEMORY;
+  if (initial > 0) {
+    made->records = static_cast<unsigned char*>(
+        std::calloc(static_cast<std::size_t>(initial), static_cast<std::size_t>(recordSize)));
+    if (made->records == nullptr) {
+      delete made;
+      return HOST_ERR_LIST_MEMORY;
+    }
+    made->count = made->capacity = initial;
+  }
+  *list = made;
+  return HOST_ERR_NONE;
+}
+
+HostError RecordListAppend(RecordList* list, const void* record) {
+  if (HostError code; hostutil::Rehearsed(HOST_UTILITY_ListAppend, &code)) return code;
+  if (!IsList(list) || record == nullptr) return HOST_ERR_UTILITY_NULL;
+  if (list->locks != 0) return HOST_ERR_LIST_LOCKED;
+  if (list->count == list->capacity && !Grow(list)) return HOST_ERR_LIST_MEMORY;
+  std::memcpy(list->At(list->count), record, static_cast<std::size_t>(list->recordSize));
+  ++list->count;
+  return HOST_ERR_NONE;
+}
+
+HostError RecordListGet(const RecordList* list, int64_t index, void* record) {
+  if (HostError code; hostutil::Rehearsed(HOST_UTILITY_ListGet, &code)) return code;
+  if (!IsList(list) || record == nullptr) return HOST_ERR_UTILITY_NULL;
+  if (!list->Holds(index)) return HOST_ERR_LIST_INDEX;
+  std::memcpy(record, list->At(index), static_cast<std::size_t>(list->recordSize));
+  return HOST_ERR_NONE;
+}
+
+HostError RecordListLock(RecordList* list, int64_t index, void** record) {
+  if (HostError code; hostutil::Rehearsed(HOST_UTILITY_ListLock, &code)) {
+    hostutil::HandOutNothing(record);
+    return code;
+  }
+  if (record == nullptr) return HOST_ERR_UTILITY_NULL;
+  *record = nullptr;
+  if (!IsList(list)) return HOST_ERR_UTILITY_NULL;
+  if (!list->Holds(index)) return HOST_ERR_LIST_INDEX;
+  if (list->firstLocks == 0 || list->firstLocked == index) {
+    list->firstLocked = index;
+    ++list->firstLocks;
+  } else {
+    try {
+      ++list->furtherLocks[index];
+    } catch (const std::bad_alloc&) {
+      return HOST_ERR_LIST_MEMORY;
+    }
+  }
+  ++list->locks;
+  *record = list->At(index);
+  return HOST_ERR_NONE;
+}
+
+HostError RecordListUnlock(RecordList* list, int64_t index) {
+  if (HostError code; hostutil::Rehearsed(HOST_UTILITY_ListUnlock, &code)) return code;
+  if (!IsList(list)) return HOST_ERR_UTILITY_NULL;
+  if (list->firstLocks > 0 && list->firstLocked == index) {
+    --list->firstLocks;
+  } else {
+    const auto found = list->furtherLocks.find(index);
+    if (found == list->furtherLocks.end()) return HOST_ERR_LIST_INDEX;
+    if (--found->second == 0) list->furtherLocks.erase(found);
+  }
+  --list->locks;
+  return HOST_ERR_NONE;
+}
+
+const void* RecordListPeek(const RecordList* list, int64_t index) {
+  return IsList(list) && list->Holds(index) ? list->At(index) : nullptr;
+}
+
+HostError RecordListCount(const RecordList* list, int64_t* count) {
+  if (HostError code; hostutil::Rehearsed(HOST_UTILITY_ListCount, &code)) {
+    hostutil::HandOutNothing(count);
+    return code;
+  }
+  if (count == nullptr) return HOST_ERR_UTILITY_NULL;
+  *count = 0;
+  if (!IsList(list)) return HOST_ERR_UTILITY_NULL;
+  *count = list->count;
+  return HOST_ERR_NONE;
+}
+
+HostError RecordListDispose(RecordList* list) {
+  if (list == nullptr) return HOST_ERR_NONE;
+  if (!IsList(list)) return HOST_ERR_UTILITY_NULL;
+  delete list;
+  return HOST_ERR_NONE;
+}

@@ -1,0 +1,66 @@
+// The registry of live objects, and the ledger that the host draws up from it.
+#include <new>
+#include <string>
+
+#include "hostutil/HostSetup.h"
+#include "hostutil/RegistryInternal.h"
+
+namespace hostutil {
+namespace {
+
+// Objects in the order in which they were made.
+struct Chain {
+  LiveObject* first = nullptr;
+  LiveObject* last = nullptr;
+};
+
+// Texts are no part of the ledger. They lie apart so that drawing it up costs nothing for them, and are freed
+// last, because files hold references to them.
+constinit Chain held;
+constinit Chain texts;
+
+Chain& ChainOf(LiveObject::Kind kind) { return kind == LiveObject::Kind::Text ? texts : held; }
+
+void DestroyAll(const Chain& chain) {
+  while (chain.first != nullptr) delete chain.first;
+}
+
+// Without the memory for a description, the ledger still names the kind.
+std::string DescribeOrName(const LiveObject& object) {
+  try {
+    return object.Describe();
+  } catch (const std::bad_alloc&) {
+    return object.GetKind() == LiveObject::Kind::File ? "file" : "list";
+  }
+}
+
+}  // namespace
+
+LiveObject::LiveObject(Kind kind) : previous_(ChainOf(kind).last), kind_(kind) {
+  Chain& chain = ChainOf(kind);
+  (previous_ != nullptr ? previous_->next_ : chain.first) = this;
+  chain.last = this;
+}
+
+LiveObject::~LiveObject() {
+  Chain& chain = ChainOf(kind_);
+  (previous_ != nullptr ? previous_->next_ : chain.first) = next_;
+  (next_ != nullptr ? next_->previous_ : chain.last) = previous_;
+}
+
+}  // namespace hostutil
+
+void HostVisitLedger(HostLedgerVisitor visitor, void* context) {
+  if (visitor == nullptr) return;
+  for (const hostutil::LiveObject* object = hostutil::held.first; object != nullptr;
+       object = object->Next()) {
+    const std::string description = hostutil::DescribeOrName(*object);
+    visitor(context, static_cast<int32_t>(object->GetKind()), description.c_str(),
+            object->ReleaseFailed() ? 1 : 0);
+  }
+}
+
+void HostReleaseLeftovers(void) {
+  hostutil::DestroyAll(hostutil::held);
+  hostutil::DestroyAll(hostutil::texts);
+}

@@ -1,0 +1,21 @@
+// What a text consists of.
+#pragma once
+
+#include <cstdint>
+#include <string>
+#include <utility>
+#include <vector>
+
+#include "hostutil/RegistryInternal.h"
+#include "hostutil/UTF16String.h"
+
+struct UTF16String final : hostutil::LiveObject {
+  // The units come with their NUL.
+  explicit UTF16String(std::vector<HostUTF16Unit> terminated)
+      : LiveObject(Kind::Text), units(std::move(terminated)) {}
+
+  std::string Describe() const override { return "text"; }
+
+  const std::vector<HostUTF16Unit> units;
+  int64_t references = 1;
+};

@@ -1,0 +1,46 @@
+// The loop that every HarmlessTextSkipper runs around its own classification of 64 bytes.
+#pragma once
+
+#include <bit>
+#include <cstddef>
+#include <cstdint>
+
+#include "maya/CharacterClasses.h"
+
+inline constexpr std::ptrdiff_t kSkipBlock = 64;
+
+// One bit per byte of a block, the first byte in the lowest bit.
+struct BlockMasks {
+  std::uint64_t terminator;  // white space and ";"
+  std::uint64_t lineFeed;
+  std::uint64_t harmless;  // may begin a word that is passed over
+  std::uint64_t dash;      // "-"
+  std::uint64_t wordByte;  // letters, digits, "-" and ".": what makes a "-" before it begin a word
+};
+
+inline constexpr bool IsWordByte(char c) { return IsLetter(c) || IsNumberStart(c); }
+
+template <typename Classify>
+[[gnu::always_inline]] inline const char* SkipBlocks(const char* position, const char* end,
+                                                     std::int32_t* lines, Classify classify) {
+  std::uint64_t boundary = 1;  // whether a token may start at the block's first byte
+  const char* block = position;
+  for (; end - block >= kSkipBlock; block += kSkipBlock) {
+    const BlockMasks masks = classify(block);
+    const std::uint64_t starts = ~masks.terminator & (masks.terminator << 1 | boundary);
+    const std::uint64_t beforeWord = masks.wordByte >> 1 | std::uint64_t{IsWordByte(block[kSkipBlock])} << 63;
+    const std::uint64_t stops = starts & ~(masks.harmless | (masks.dash & beforeWord));
+    if (stops != 0) {
+      const int at = std::countr_zero(stops);
+      *lines += std::popcount(masks.lineFeed & ((std::uint64_t{1} << at) - 1));
+      return block + at;
+    }
+    *lines += std::popcount(masks.lineFeed);
+    boundary = masks.terminator >> 63;
+  }
+  // A word that the last block cuts is left to be read whole.
+  if (boundary == 0) {
+    while (block != position && !IsWordTerminator(block[-1])) --block;
+  }
+  return block;
+}

@@ -1,0 +1,12 @@
+// The skippers of x86-64 processors.
+#pragma once
+
+#if defined(__x86_64__)
+#include <cstdint>
+
+const char* SkipHarmlessTextSse2(const char* position, const char* end, std::int32_t* lines);
+
+// Only where HasAvx2.
+bool HasAvx2();
+const char* SkipHarmlessTextAvx2(const char* position, const char* end, std::int32_t* lines);
+#endif

@@ -1,0 +1,74 @@
+#include "refhost/Batches.h"
+
+#include <algorithm>
+#include <numeric>
+#include <utility>
+
+namespace refhost {
+namespace {
+
+void dropKeysWithoutValue(Batch& batch) {
+  if (batch.valuedCount == batch.times.size()) return;
+  const std::size_t dimension = static_cast<std::size_t>(batch.stream->dimension);
+  std::size_t kept = 0;
+  for (std::size_t key = 0; key < batch.times.size(); ++key) {
+    if (batch.valued[key] == 0) continue;
+    batch.times[kept] = batch.times[key];
+    for (std::size_t i = 0; i < dimension; ++i) {
+      batch.values[kept * dimension + i] = batch.values[key * dimension + i];
+    }
+    ++kept;
+  }
+  batch.times.resize(kept);
+  batch.values.resize(kept * dimension);
+}
+
+bool isAscending(const std::vector<T_Time>& times) {
+  return std::adjacent_find(times.begin(), times.end(),
+                            [](const T_Time& a, const T_Time& b) { return !timeLess(a, b); }) == times.end();
+}
+
+KeyColumns sorted(const KeyColumns& keys, std::size_t dimension) {
+  std::vector<std::size_t> order(keys.times.size());
+  std::iota(order.begin(), order.end(), std::size_t{0});
+  std::stable_sort(order.begin(), order.end(),
+                   [&](std::size_t a, std::size_t b) { return timeLess(keys.times[a], keys.times[b]); });
+  KeyColumns result;
+  result.times.reserve(order.size());
+  result.values.reserve(order.size() * dimension);
+  for (std::size_t place = 0; place < order.size(); ++place) {
+    const bool laterOfSameTime =
+        place + 1 < order.size() && !timeLess(keys.times[order[place]], keys.times[order[place + 1]]);
+    if (laterOfSameTime) continue;
+    result.times.push_back(keys.times[order[place]]);
+    const auto first = keys.values.begin() + static_cast<std::ptrdiff_t>(order[place] * dimension);
+    result.values.insert(result.values.end(), first, first + static_cast<std::ptrdiff_t>(dimension));
+  }
+  return result;
+}
+
+}  // namespace
+
+bool timeLess(const T_Time& a, const T_Time& b) {
+  if (a.scale == 0 || b.scale == 0) {
+    if (a.scale == 0 && b.scale == 0) return a.value < b.value;
+    return b.scale == 0;
+  }
+  return std::int64_t{a.value} * std::int64_t{b.scale} < std::int64_t{b.value} * std::int64_t{a.scale};
+}
+
+void commitKeys(Batch& batch, std::unique_ptr<KeyColumns>& keys) {
+  dropKeysWithoutValue(batch);
+  if (batch.times.empty()) return;
+  if (keys == nullptr) {
+    keys = std::make_unique<KeyColumns>(KeyColumns{std::move(batch.times), std::move(batch.values)});
+  } else {
+    keys->times.insert(keys->times.end(), batch.times.begin(), batch.times.end());
+    keys->values.insert(keys->values.end(), batch.values.begin(), batch.values.end());
+  }
+  if (!isAscending(keys->times)) {
+    *keys = sorted(*keys, static_cast<std::size_t>(batch.stream->dimension));
+  }
+}
+
+}  // namespace refhost

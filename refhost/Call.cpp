@@ -1,0 +1,110 @@
+#include "refhost/Call.h"
+
+#include <cmath>
+#include <new>
+#include <stdexcept>
+
+namespace refhost {
+
+void Call::refuse(HostError code, const std::string& sentence) {
+  error_ = code;
+  host_.refuse(std::string(factsOf(operation_).name) + ": " + sentence);
+}
+
+void Call::refuseHandle(const void* handle, HandleKind wanted, const char* what) {
+  const HandleKind kind = host_.codec.kindOf(handle);
+  const bool stale = host_.streams.wasGivenBack(handle) || host_.batches.wasGivenBack(handle) ||
+                     host_.memory.wasGivenBack(handle);
+  std::string sentence = what;
+  if (handle == nullptr) {
+    sentence += " is a null handle";
+  } else if (kind == HandleKind::None) {
+    sentence += " is no handle of this host";
+  } else if (kind != wanted) {
+    sentence += " is " + host_.codec.describe(handle) + ", which is no " + kindName(wanted) + " handle";
+  } else if (stale) {
+    sentence += " is " + host_.codec.describe(handle) + ", which was given back before";
+  } else {
+    sentence += " is " + host_.codec.describe(handle) + ", which was never handed out";
+  }
+  refuse(HOST_ERR_BAD_HANDLE, sentence);
+}
+
+void Call::refuseNull(const char* what) {
+  refuse(HOST_ERR_BAD_POINTER, std::string(what) + " is a null pointer");
+}
+
+void Call::refusePluginId(std::int32_t pluginId) {
+  refuse(HOST_ERR_BAD_PLUGIN_ID,
+         "the plug-in id " + std::to_string(pluginId) + " is not " + std::to_string(host_.options.pluginId));
+}
+
+Composition* Call::composition(VOR_CompItem* handle, const char* what) {
+  Composition* found = host_.codec.isOf(HandleKind::Comp, handle)
+                           ? host_.editor.composition(HandleCodec::lastingNumber(handle))
+                           : nullptr;
+  if (found == nullptr) refuseHandle(handle, HandleKind::Comp, what);
+  return found;
+}
+
+Item* Call::item(VOR_Item* handle, const char* what) {
+  Item* found = host_.codec.isOf(HandleKind::Item, handle)
+                    ? host_.editor.item(HandleCodec::lastingNumber(handle))
+                    : nullptr;
+  if (found == nullptr) refuseHandle(handle, HandleKind::Item, what);
+  return found;
+}
+
+MemoryBlock* Call::memory(HostMemHandle* handle) {
+  MemoryBlock* found = host_.memory.find(handle);
+  if (found == nullptr) refuseHandle(handle, HandleKind::Memory, "the memory handle");
+  return found;
+}
+
+bool Call::isStore(HostPrefsStore* handle) {
+  constexpr std::size_t onlyStore = 1;
+  const bool known =
+      host_.codec.isOf(HandleKind::Store, handle) && HandleCodec::lastingNumber(handle) == onlyStore;
+  if (!known) refuseHandle(handle, HandleKind::Store, "the preference store");
+  return known;
+}
+
+bool Call::areFinite(const double* values, std::int32_t count, const char* what) {
+  if (host_.options.permissive) return true;
+  for (std::int32_t i = 0; i < count; ++i) {
+    if (std::isfinite(values[i])) continue;
+    refuse(HOST_ERR_BAD_VALUE, std::string(what) + " is not finite");
+    return false;
+  }
+  return true;
+}
+
+TraceLine& Call::startLine() {
+  const OperationFacts& facts = factsOf(operation_);
+  return *traced(facts.suite, facts.version);
+}
+
+TraceLine* Call::traced(const char* suite, std::int32_t version) {
+  if (!host_.trace.on()) return nullptr;
+  line_.emplace(host_.codec, factsOf(operation_).name, didItsWork());
+  line_->text("suite", suite).integer("version", version);
+  return &*line_;
+}
+
+void Call::conclude() {
+  const bool outOfMemory = verdict_.kind == Failure::Kind::BadAlloc;
+  if (line_.has_value()) {
+    if (verdict_.throws()) {
+      line_->text("error", outOfMemory ? "bad_alloc" : "runtime_error");
+    } else {
+      line_->integer("error", error_);
+    }
+    line_->end();
+    host_.trace.write(*line_);
+  }
+  if (!verdict_.throws()) return;
+  if (outOfMemory) throw std::bad_alloc();
+  throw std::runtime_error(std::string("rehearsed failure of ") + factsOf(operation_).name);
+}
+
+}  // namespace refhost

@@ -1,0 +1,106 @@
+// One suite call, from its count to its line in the trace.
+//
+// A thunk makes a Call, does its work when goesOn() says so, describes itself when traced() says so, and
+// returns finish(). The work refuses what breaks a promise: each refusal has a code and a sentence. finish()
+// throws when the rehearsal asked for an exception, so nothing that has to happen may come after it.
+#pragma once
+
+#include <cstdint>
+#include <optional>
+#include <string>
+
+#include "hostapi/ErrorCodes.h"
+#include "refhost/HostState.h"
+#include "refhost/Operations.h"
+
+namespace refhost {
+
+class Call {
+ public:
+  explicit Call(Operation operation)
+      : host_(HostState::live()), operation_(operation), verdict_(host_.rehearsal.count(operation)) {
+    if (verdict_.rehearsed) error_ = verdict_.code;
+  }
+  Call(const Call&) = delete;
+  Call& operator=(const Call&) = delete;
+
+  HostState& host() { return host_; }
+
+  // False when the rehearsal has the call do nothing. A call that then returns 0 hands out null and 0.
+  template <typename... Outs>
+  bool goesOn(Outs*... outs) {
+    if (!verdict_.rehearsed) return true;
+    if (!verdict_.throws() && verdict_.code == 0) ((outs != nullptr ? void(*outs = Outs{}) : void()), ...);
+    return false;
+  }
+
+  // Whether the call did what it was asked for.
+  bool didItsWork() const { return !verdict_.rehearsed && error_ == 0; }
+  bool failed() const { return verdict_.throws() || error_ != 0; }
+
+  void refuse(HostError code, const std::string& sentence);
+
+  // A refusal with a code of its own that is nobody's broken promise.
+  void fail(HostError code) { error_ = code; }
+
+  // The objects behind handles. Null after a refusal that says what is wrong; `what` names the handle's part
+  // in the call, such as "the parent".
+  Composition* composition(VOR_CompItem* handle, const char* what = "the composition");
+  Item* item(VOR_Item* handle, const char* what);
+  Layer* layer(VOR_Layer* handle, const char* what = "the layer") {
+    if (host_.codec.isOf(HandleKind::Layer, handle)) {
+      Layer* found = host_.editor.layer(HandleCodec::lastingNumber(handle));
+      if (found != nullptr) return found;
+    }
+    refuseHandle(handle, HandleKind::Layer, what);
+    return nullptr;
+  }
+  HeldStream* stream(VOR_Stream* handle, const char* what = "the stream") {
+    HeldStream* found = host_.streams.find(handle);
+    if (found == nullptr) refuseHandle(handle, HandleKind::Stream, what);
+    return found;
+  }
+  Batch* batch(VOR_AddKeyframesInfo* handle) {
+    Batch* found = host_.batches.find(handle);
+    if (found == nullptr) refuseHandle(handle, HandleKind::Batch, "the batch");
+    return found;
+  }
+  MemoryBlock* memory(HostMemHandle* handle);
+  bool isStore(HostPrefsStore* handle);
+
+  // False after a refusal.
+  bool given(const void* pointer, const char* what) {
+    if (pointer == nullptr) refuseNull(what);
+    return pointer != nullptr;
+  }
+  bool isPluginId(std::int32_t pluginId) {
+    if (pluginId != host_.options.pluginId) refusePluginId(pluginId);
+    return pluginId == host_.options.pluginId;
+  }
+  bool areFinite(const double* values, std::int32_t count, const char* what);
+
+  // The line to describe the arguments in, null when there is no trace.
+  TraceLine* traced() { return host_.trace.on() ? &startLine() : nullptr; }
+  // The same for the basic suite's operations, whose suite is an argument.
+  TraceLine* traced(const char* suite, std::int32_t version);
+
+  HostError finish() {
+    if (line_.has_value() || verdict_.throws()) conclude();
+    return error_;
+  }
+
+ private:
+  TraceLine& startLine();
+  void refuseHandle(const void* handle, HandleKind wanted, const char* what);
+  void refuseNull(const char* what);
+  void refusePluginId(std::int32_t pluginId);
+  void conclude();
+
+  HostState& host_;
+  Operation operation_;
+  Verdict verdict_;
+  HostError error_ = 0;
+  std::optional<TraceLine> line_;
+};
+
+}  // namespace refhost

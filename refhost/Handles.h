@@ -1,0 +1,176 @@
+// Handles: opaque pointers that are never addresses.
+//
+// A handle packs its kind, its trace number and, for what can be given back, the slot of the object behind
+// it. Checking one is a mask, a compare and a look into a table by index; no handle is ever dereferenced, so
+// a foreign pointer is told from a handle without touching it. A slot is used again after its handle was
+// given back, with a new number: the old handle stays recognisable as stale.
+//
+// With 64-bit pointers the top byte makes every handle a non-canonical address and holds the low six bits of
+// the host's serial number, so that a handle of an earlier host is foreign (until 64 hosts later). With
+// 32-bit pointers neither fits: an earlier host's handle is taken for one of this host's, and a stale handle
+// may pass for a live one after 8192 acquisitions.
+#pragma once
+
+#include <algorithm>
+#include <cstddef>
+#include <cstdint>
+#include <string>
+#include <utility>
+#include <vector>
+
+namespace refhost {
+
+enum class HandleKind : std::uint8_t { None, Item, Comp, Layer, Stream, Batch, Memory, Store };
+
+const char* kindName(HandleKind kind);  // as in the trace: "item", "comp", ...
+
+class HandleCodec {
+ public:
+  static constexpr bool kWide = sizeof(std::uintptr_t) == 8;
+  static constexpr unsigned kKindBits = 3;
+  static constexpr unsigned kSlotBits = kWide ? 21 : 16;
+  static constexpr unsigned kNumberBits = kWide ? 32 : 13;
+  static constexpr unsigned kMarkShift = kKindBits + kSlotBits + kNumberBits;
+  static constexpr std::uintptr_t kKindMask = (std::uintptr_t{1} << kKindBits) - 1;
+  static constexpr std::uintptr_t kSlotMask = (std::uintptr_t{1} << kSlotBits) - 1;
+  static constexpr std::uintptr_t kNumberMask = (std::uintptr_t{1} << kNumberBits) - 1;
+
+  explicit HandleCodec(unsigned hostSerial) {
+    if constexpr (kWide) {
+      constexpr std::uintptr_t nonCanonical = 0x80;
+      constexpr std::uintptr_t serialMask = 0x3f;
+      mark_ = (nonCanonical | (hostSerial & serialMask)) << kMarkShift;
+    }
+  }
+
+  // For kinds that live as long as the project: the number alone.
+  std::uintptr_t lasting(HandleKind kind, std::size_t number) const {
+    return mark_ | (static_cast<std::uintptr_t>(number) << kKindBits) | static_cast<std::uintptr_t>(kind);
+  }
+
+  // For kinds that are given back: slot and number.
+  std::uintptr_t held(HandleKind kind, std::size_t slot, std::uint32_t number) const {
+    return mark_ | ((number & kNumberMask) << (kKindBits + kSlotBits)) |
+           (static_cast<std::uintptr_t>(slot) << kKindBits) | static_cast<std::uintptr_t>(kind);
+  }
+
+  bool isOf(HandleKind kind, const void* handle) const {
+    return (bits(handle) & tagMask()) == (mark_ | static_cast<std::uintptr_t>(kind));
+  }
+
+  // The parts of a handle of which isOf() is true.
+  static std::size_t lastingNumber(const void* handle) {
+    return static_cast<std::size_t>((bits(handle) & ~tagMask()) >> kKindBits);
+  }
+  static std::size_t heldSlot(const void* handle) {
+    return static_cast<std::size_t>((bits(handle) >> kKindBits) & kSlotMask);
+  }
+  static std::uintptr_t heldNumber(const void* handle) {
+    return (bits(handle) >> (kKindBits + kSlotBits)) & kNumberMask;
+  }
+
+  HandleKind kindOf(const void* handle) const;  // None for what is no handle of this host
+
+  // "layer:7"; "foreign" for what is no handle of this host. Not for null.
+  std::string describe(const void* handle) const;
+
+ private:
+  static std::uintptr_t bits(const void* handle) { return reinterpret_cast<std::uintptr_t>(handle); }
+  static constexpr std::uintptr_t tagMask() {
+    if constexpr (kWide) return kKindMask | (std::uintptr_t{0xff} << kMarkShift);
+    return kKindMask;
+  }
+
+  std::uintptr_t mark_ = 0;
+};
+
+// What is handed out and given back again: the live objects of one kind, each in a slot. Pointers to objects
+// are valid until the next add().
+template <typename Object>
+class HandlePool {
+ public:
+  HandlePool(const HandleCodec& codec, HandleKind kind) : codec_(codec), kind_(kind) {}
+
+  Object* find(const void* handle) {
+    if (!codec_.isOf(kind_, handle)) return nullptr;
+    const std::size_t slot = HandleCodec::heldSlot(handle);
+    if (slot >= slots_.size()) return nullptr;
+    Slot& found = slots_[slot];
+    const bool live =
+        found.number != 0 && (found.number & HandleCodec::kNumberMask) == HandleCodec::heldNumber(handle);
+    return live ? &found.object : nullptr;
+  }
+
+  // Whether the handle was handed out and given back since.
+  bool wasGivenBack(const void* handle) {
+    return codec_.isOf(kind_, handle) && find(handle) == nullptr &&
+           HandleCodec::heldSlot(handle) < slots_.size() && HandleCodec::heldNumber(handle) != 0 &&
+           (HandleCodec::heldNumber(handle) <= handedOut_ || !HandleCodec::kWide);
+  }
+
+  // Null when there are no more numbers or slots.
+  void* add(Object object) {
+    if (handedOut_ == UINT32_MAX) return nullptr;
+    std::size_t slot = slots_.size();
+    if (!free_.empty()) {
+      slot = free_.back();
+      free_.pop_back();
+    } else if (slot > HandleCodec::kSlotMask) {
+      return nullptr;
+    } else {
+      slots_.emplace_back();
+    }
+    slots_[slot].object = std::move(object);
+    slots_[slot].number = ++handedOut_;
+    return reinterpret_cast<void*>(codec_.held(kind_, slot, handedOut_));
+  }
+
+  // The handle is live.
+  void remove(const void* handle) {
+    const std::size_t slot = HandleCodec::heldSlot(handle);
+    slots_[slot].object = Object{};
+    slots_[slot].number = 0;
+    free_.push_back(static_cast<std::uint32_t>(slot));
+  }
+
+  template <typename Predicate>
+  bool any(Predicate predicate) const {
+    return std::any_of(slots_.begin(), slots_.end(),
+                       [&](const Slot& slot) { return slot.number != 0 && predicate(slot.object); });
+  }
+
+  std::uint32_t handedOut() const { return handedOut_; }
+
+  // The numbers and objects that are still held, in the order in which they were handed out.
+  std::vector<std::pair<std::uint32_t, Object*>> held() {
+    std::vector<std::pair<std::uint32_t, Object*>> all;
+    for (Slot& slot : slots_) {
+      if (slot.number != 0) all.emplace_back(slot.number, &slot.object);
+    }
+    std::sort(all.begin(), all.end(), [](const auto& a, const auto& b) { return a.first < b.first; });
+    return all;
+  }
+
+  void removeAll() {
+    free_.clear();
+    for (std::size_t slot = slots_.size(); slot-- > 0;) {
+      slots_[slot].object = Object{};
+      slots_[slot].number = 0;
+      free_.push_back(static_cast<std::uint32_t>(slot));
+    }
+  }
+
+ private:
+  struct Slot {
+    std::uint32_t number = 0;  // 0: free
+    Object object{};
+  };
+
+  const HandleCodec& codec_;
+  HandleKind kind_;
+  std::uint32_t handedOut_ = 0;
+  std::vector<Slot> slots_;
+  std::vector<std::uint32_t> free_;
+};
+
+}  // namespace refhost

@@ -1,0 +1,102 @@
+// Everything that the one live Host holds. The suites' thunks find it here, since their tables carry no
+// context.
+#pragma once
+
+#include <cstdint>
+#include <memory>
+#include <string>
+#include <vector>
+
+#include "hostapi/FileImportManagerSuite.h"
+#include "hostapi/HostTypes.h"
+#include "hostapi/RegisterSuite.h"
+#include "refhost/Handles.h"
+#include "refhost/Host.h"
+#include "refhost/MessageBoard.h"
+#include "refhost/ModuleLoader.h"
+#include "refhost/Preferences.h"
+#include "refhost/ProjectEditor.h"
+#include "refhost/RehearsalRunner.h"
+#include "refhost/SuiteShelf.h"
+#include "refhost/Trace.h"
+
+namespace refhost {
+
+// One acquisition of a stream.
+struct HeldStream {
+  Layer* layer = nullptr;
+  Stream* stream = nullptr;
+  bool valueSet = false;       // the last SetStreamValue on this handle succeeded
+  bool valueFailed = false;    // the last SetStreamValue on this handle failed or threw
+  bool heldKeys = false;       // GetStreamKeyframeCount gave at least one key
+  bool releaseFailed = false;  // a rehearsal made its ReleaseStream fail
+};
+
+struct FreeDelete {
+  void operator()(void* memory) const { ::operator delete(memory); }
+};
+
+struct MemoryBlock {
+  std::string name;
+  std::int64_t size = 0;
+  std::unique_ptr<void, FreeDelete> memory;
+  std::int64_t locks = 0;
+  std::int64_t failedLocks = 0;  // each allows one unlock more
+  bool freeFailed = false;       // a rehearsal made its FreeMemHandle fail
+};
+
+// What a plug-in registered under one name.
+struct Importer {
+  std::string name;
+  std::vector<std::string> extensions;
+  HostImporterCallbacks callbacks{};
+};
+
+class HostState {
+ public:
+  explicit HostState(HostOptions given);
+  ~HostState();
+  HostState(const HostState&) = delete;
+  HostState& operator=(const HostState&) = delete;
+
+  static HostState& live() { return *live_; }
+
+  VOR_Item* begin(Callback callback, const std::string& path);
+  // canImport is written to the trace for verify only.
+  CallbackResult end(HostError code, bool canImport);
+
+  void refuse(std::string sentence) { result.refusals.push_back(std::move(sentence)); }
+
+  // An importer with callbacks, the first registered; null when there is none.
+  const Importer* usableImporter() const;
+
+  const HostOptions options;
+  const HandleCodec codec;
+  ProjectEditor editor;
+  HandlePool<HeldStream> streams{codec, HandleKind::Stream};
+  HandlePool<Batch> batches{codec, HandleKind::Batch};
+  HandlePool<MemoryBlock> memory{codec, HandleKind::Memory};
+  SuiteShelf suites;
+  RehearsalRunner rehearsal;
+  Trace trace;
+  Preferences preferences;
+  MessageBoard messages;
+  std::vector<Importer> importers;  // by id - 1
+  HostDeathHook deathHook = nullptr;
+  std::intptr_t deathHookRefcon = 0;
+  ModuleLoader module;
+  bool loaded = false;  // the entry was called
+
+  Callback callback = Callback::Entry;  // the one that runs or ran last
+  CallbackResult result;                // of the callback that runs, as far as it is known
+
+  // The number of the stream that was handed out last when version 8 of the stream suite could not be
+  // acquired: the value of no stream up to it could be set from then on.
+  std::uint32_t streamsWithoutValueSuite = 0;
+  bool silenceEndFailed = false;  // a rehearsal made an EndSilentErrors of this callback fail
+
+ private:
+  static HostState* live_;
+};
+
+}  // namespace refhost

@@ -1,0 +1,43 @@
+#include "refhost/ModuleLoader.h"
+
+#include <dlfcn.h>
+
+#include <system_error>
+
+#include "refhost/ShownText.h"
+
+namespace refhost {
+namespace {
+
+std::string loaderComplaint() {
+  const char* complaint = dlerror();
+  return complaint == nullptr ? std::string("the loader gives no reason") : shownText(complaint);
+}
+
+}  // namespace
+
+ModuleLoader::~ModuleLoader() { unload(); }
+
+HostPluginEntry ModuleLoader::load(const std::filesystem::path& file, std::string* failure) {
+  // With a bare name the loader would search the system's folders and not look where the user stands.
+  std::error_code error;
+  const std::filesystem::path absolute = std::filesystem::absolute(file, error);
+  library_ = dlopen(error ? file.c_str() : absolute.c_str(), RTLD_NOW | RTLD_LOCAL);
+  if (library_ == nullptr) {
+    *failure = "the module cannot be loaded: " + loaderComplaint();
+    return nullptr;
+  }
+  const auto entry = reinterpret_cast<HostPluginEntry>(dlsym(library_, HOST_PLUGIN_ENTRY_SYMBOL));
+  if (entry == nullptr) {
+    *failure = "the module has no entry: " + loaderComplaint();
+    unload();
+  }
+  return entry;
+}
+
+void ModuleLoader::unload() {
+  if (library_ != nullptr) dlclose(library_);
+  library_ = nullptr;
+}
+
+}  // namespace refhost

@@ -1,0 +1,62 @@
+// "QZGP Persistent Data Suite" 3: the preference store.
+#include <string_view>
+
+#include "refhost/Call.h"
+#include "refhost/SuiteShelf.h"
+
+namespace refhost {
+namespace {
+
+constexpr std::size_t kStoreNumber = 1;
+// The entry that an option of the host stands for.
+constexpr std::string_view kLinearUnitsSection = "Maya Camera";
+constexpr std::string_view kLinearUnitsKey = "Use Linear Units";
+
+HostError GetAppPrefsBlob(HostPrefsStore** store) {
+  Call call(Operation::GetAppPrefsBlob);
+  if (call.goesOn(store) && call.given(store, "the place for the store")) {
+    *store = reinterpret_cast<HostPrefsStore*>(call.host().codec.lasting(HandleKind::Store, kStoreNumber));
+  }
+  if (TraceLine* line = call.traced()) line->handed("store", store);
+  return call.finish();
+}
+
+void getPrefLong(Call& call, HostPrefsStore* store, const char* section, const char* key,
+                 std::int32_t defaultValue, std::int32_t* value) {
+  if (!call.isStore(store) || !call.given(section, "the section") || !call.given(key, "the key") ||
+      !call.given(value, "the place for the value")) {
+    return;
+  }
+  Preferences& preferences = call.host().preferences;
+  if (!preferences.find(section, key)) preferences.set(section, key, defaultValue);
+  const auto& linearUnits = call.host().options.linearUnits;
+  if (linearUnits && section == kLinearUnitsSection && key == kLinearUnitsKey) {
+    *value = *linearUnits;
+  } else {
+    *value = *preferences.find(section, key);
+  }
+}
+
+HostError GetPrefLong(HostPrefsStore* store, const char* section, const char* key, std::int32_t defaultValue,
+                      std::int32_t* value) {
+  Call call(Operation::GetPrefLong);
+  if (call.goesOn(value)) getPrefLong(call, store, section, key, defaultValue, value);
+  if (TraceLine* line = call.traced()) {
+    line->handle("store", store).text("section", section).text("key", key);
+    line->integer("default", defaultValue).handedInteger("value", value);
+  }
+  return call.finish();
+}
+
+constexpr QZGP_PersistentDataSuite3 table() {
+  QZGP_PersistentDataSuite3 suite{};
+  suite.GetAppPrefsBlob = GetAppPrefsBlob;
+  suite.GetPrefLong = GetPrefLong;
+  return suite;
+}
+
+}  // namespace
+
+constinit const QZGP_PersistentDataSuite3 kPersistentDataSuite3 = table();
+
+}  // namespace refhost

@@ -1,0 +1,136 @@
+#include "refhost/ProjectEditor.h"
+
+#include <set>
+#include <utility>
+
+#include "hostapi/LayerSuite.h"
+#include "refhost/StreamTable.h"
+
+namespace refhost {
+
+const Stream* Layer::findStream(int32_t id) const {
+  for (const Stream& stream : streams) {
+    if (stream.id == id) return &stream;
+  }
+  return nullptr;
+}
+
+Folder& ProjectEditor::addFolder() {
+  Folder& folder = project_.folders_.emplace_back();
+  items_.push_back({&folder, nullptr});
+  folder.itemNumber = static_cast<int32_t>(items_.size());
+  return folder;
+}
+
+Composition& ProjectEditor::addComposition(Folder& folder, CompositionSettings settings) {
+  Composition& composition = project_.compositions_.emplace_back();
+  composition.number = static_cast<int32_t>(project_.compositions_.size());
+  composition.name = std::move(settings.name);
+  composition.width = settings.width;
+  composition.height = settings.height;
+  composition.pixelAspect = settings.pixelAspect;
+  composition.duration = settings.duration;
+  composition.frameRate = settings.frameRate;
+  folder.compositions.push_back(&composition);
+  return composition;
+}
+
+void ProjectEditor::makeItem(Composition& composition) {
+  if (composition.itemNumber != 0) return;
+  items_.push_back({nullptr, &composition});
+  composition.itemNumber = static_cast<int32_t>(items_.size());
+}
+
+Layer& ProjectEditor::addLayer(Composition& composition, LayerKind kind, std::string name) {
+  Layer& layer = project_.layers_.emplace_back();
+  layer.number = static_cast<int32_t>(project_.layers_.size());
+  layer.kind = kind;
+  layer.name = std::move(name);
+  layer.composition = &composition;
+  composition.layers.push_back(&layer);
+  layer.streams = makeStreams(kind);
+  return layer;
+}
+
+Layer& ProjectEditor::addCameraLayer(Composition& composition, const char* name, const double (&interest)[2],
+                                     int32_t zoomKeys) {
+  Layer& layer = addLayer(composition, LayerKind::Camera, name);
+  for (Stream& stream : layer.streams) {
+    if (stream.id == kAnchorStream) {
+      stream.value[0] = interest[0];
+      stream.value[1] = interest[1];
+    } else if (stream.id == kZoomStream) {
+      stream.value[0] = composition.width;
+      if (zoomKeys > 0) stream.keys = std::make_unique<KeyColumns>();
+      for (int32_t key = 0; key < zoomKeys; ++key) {
+        stream.keys->times.push_back({key, 1});
+        stream.keys->values.push_back(stream.value[0]);
+      }
+    }
+  }
+  return layer;
+}
+
+Layer& ProjectEditor::addNullLayer(Composition& composition, const char* name) {
+  return addLayer(composition, LayerKind::Null, name);
+}
+
+Layer& ProjectEditor::addCompositionLayer(Composition& composition, Composition& source) {
+  Layer& layer = addLayer(composition, LayerKind::Composition, source.name);
+  layer.source = &source;
+  return layer;
+}
+
+void ProjectEditor::setParent(Layer& layer, Layer& parent) {
+  if (layer.parent != nullptr) --layer.parent->childCount;
+  layer.parent = &parent;
+  ++parent.childCount;
+}
+
+void ProjectEditor::setFlag(Layer& layer, int32_t flag, bool on) {
+  if ((flag & HOST_LAYER_FLAG_3D) != 0) layer.threeDimensional = on;
+  if ((flag & HOST_LAYER_FLAG_AIMED) != 0) layer.aimed = on;
+}
+
+void ProjectEditor::setFilm(Layer& camera, int32_t direction, double size) {
+  camera.filmDirection = direction;
+  camera.filmSize = size;
+}
+
+void ProjectEditor::commit(Batch& batch) { commitKeys(batch, batch.stream->keys); }
+
+Stream* ProjectEditor::findStream(Layer& layer, int32_t id) {
+  for (Stream& stream : layer.streams) {
+    if (stream.id == id) return &stream;
+  }
+  return nullptr;
+}
+
+void ProjectEditor::setValue(Stream& stream, const double* value) {
+  for (int32_t i = 0; i < stream.dimension; ++i) stream.value[i] = value[i];
+}
+
+bool ProjectEditor::isSameOrAbove(const Layer& layer, const Layer& other) {
+  if (&layer == &other) return true;
+  if (layer.childCount == 0) return false;
+  for (const Layer* above = other.parent; above != nullptr; above = above->parent) {
+    if (above == &layer) return true;
+  }
+  return false;
+}
+
+bool ProjectEditor::contains(const Composition& composition, const Composition& other) {
+  std::vector<const Composition*> open{&composition};
+  std::set<const Composition*> seen{&composition};
+  while (!open.empty()) {
+    const Composition* current = open.back();
+    open.pop_back();
+    if (current == &other) return true;
+    for (const Layer* layer : current->layers) {
+      if (layer->source != nullptr && seen.insert(layer->source).second) open.push_back(layer->source);
+    }
+  }
+  return false;
+}
+
+}  // namespace refhost

@@ -1,0 +1,72 @@
+// The only writer of the Project. It takes what was checked before; it refuses nothing itself.
+#pragma once
+
+#include <cstddef>
+#include <string>
+#include <vector>
+
+#include "refhost/Batches.h"
+#include "refhost/Project.h"
+
+namespace refhost {
+
+// What a project item is: exactly one of the two is not null.
+struct Item {
+  Folder* folder = nullptr;
+  Composition* composition = nullptr;
+};
+
+struct CompositionSettings {
+  std::string name;
+  int32_t width = 0;
+  int32_t height = 0;
+  HostRatio pixelAspect{};
+  T_Time duration{};
+  HostRatio frameRate{};
+};
+
+class ProjectEditor {
+ public:
+  const Project& project() const { return project_; }
+
+  // Objects by number, from 1; null when there is none of that number.
+  Item* item(std::size_t number) { return number - 1 < items_.size() ? &items_[number - 1] : nullptr; }
+  Composition* composition(std::size_t number) {
+    return number - 1 < project_.compositions_.size() ? &project_.compositions_[number - 1] : nullptr;
+  }
+  Layer* layer(std::size_t number) {
+    return number - 1 < project_.layers_.size() ? &project_.layers_[number - 1] : nullptr;
+  }
+
+  Folder& addFolder();
+  Composition& addComposition(Folder& folder, CompositionSettings settings);
+  void makeItem(Composition& composition);  // gives it an item number if it has none
+
+  // The layers' streams are there at once, with their defaults. interest is a camera's point of interest.
+  Layer& addCameraLayer(Composition& composition, const char* name, const double (&interest)[2],
+                        int32_t zoomKeys);
+  Layer& addNullLayer(Composition& composition, const char* name);
+  Layer& addCompositionLayer(Composition& composition, Composition& source);
+
+  static void setParent(Layer& layer, Layer& parent);
+  static void setFlag(Layer& layer, int32_t flag, bool on);  // flags that mean nothing here are forgotten
+  static void setFilm(Layer& camera, int32_t direction, double size);
+  static void setValue(Stream& stream, const double* value);
+  static void commit(Batch& batch);
+
+  static Stream* findStream(Layer& layer, int32_t id);  // null when the layer has none of that id
+
+  // Whether the layer is the other one or stands above it.
+  static bool isSameOrAbove(const Layer& layer, const Layer& other);
+
+  // Whether the composition is the other one or shows it in a nested layer, at any depth.
+  static bool contains(const Composition& composition, const Composition& other);
+
+ private:
+  Layer& addLayer(Composition& composition, LayerKind kind, std::string name);
+
+  Project project_;
+  std::vector<Item> items_;
+};
+
+}  // namespace refhost

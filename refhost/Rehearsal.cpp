@@ -1,0 +1,138 @@
+#include "refhost/Rehearsal.h"
+
+#include <charconv>
+#include <cstdint>
+#include <limits>
+#include <system_error>
+
+#include "refhost/Operations.h"
+#include "refhost/SuiteShelf.h"
+
+namespace refhost {
+namespace {
+
+// A text cut in two at a separator; nothing when the separator is missing.
+struct Cut {
+  std::string_view before;
+  std::string_view after;
+};
+
+std::optional<Cut> cutAt(std::string_view text, std::size_t place) {
+  if (place == std::string_view::npos) return std::nullopt;
+  return Cut{text.substr(0, place), text.substr(place + 1)};
+}
+
+template <typename Integer>
+std::optional<Integer> integerOf(std::string_view text, Integer least) {
+  Integer value = 0;
+  const auto result = std::from_chars(text.data(), text.data() + text.size(), value);
+  const bool whole = result.ec == std::errc{} && result.ptr == text.data() + text.size();
+  if (!whole || value < least) return std::nullopt;
+  return value;
+}
+
+bool complain(std::string* complaint, std::string_view text, std::string_view what) {
+  *complaint = "\"" + std::string(text) + "\": " + std::string(what);
+  return false;
+}
+
+bool setCode(Failure* failure, std::string_view code, std::string* complaint) {
+  const auto value = integerOf<HostError>(code, std::numeric_limits<HostError>::min());
+  if (!value) return complain(complaint, code, "a code is a 32-bit integer");
+  failure->kind = Failure::Kind::Code;
+  failure->code = *value;
+  return true;
+}
+
+bool setKind(Failure* failure, std::string_view kind, std::string* complaint) {
+  if (kind == "bad_alloc") {
+    failure->kind = Failure::Kind::BadAlloc;
+  } else if (kind == "runtime_error") {
+    failure->kind = Failure::Kind::RuntimeError;
+  } else {
+    return complain(complaint, kind, "an exception is bad_alloc or runtime_error");
+  }
+  return true;
+}
+
+using SetEffect = bool (*)(Failure*, std::string_view, std::string*);
+
+// "OPERATION:NTH=EFFECT".
+std::optional<Failure> parseNamed(std::string_view text, SetEffect setEffect, std::string* complaint) {
+  const auto halves = cutAt(text, text.find('='));
+  const auto call = halves ? cutAt(halves->before, halves->before.find(':')) : std::nullopt;
+  if (!call) {
+    complain(complaint, text, "the form is OPERATION:NTH=EFFECT");
+    return std::nullopt;
+  }
+  if (!findOperation(call->before) && !findUtilityService(call->before)) {
+    complain(complaint, call->before, "the host has no such operation");
+    return std::nullopt;
+  }
+  const auto nth = integerOf<std::int64_t>(call->after, 0);
+  if (!nth) {
+    complain(complaint, call->after, "calls are numbered from 1, and 0 is every call");
+    return std::nullopt;
+  }
+  Failure failure;
+  failure.operation = call->before;
+  failure.nth = *nth;
+  if (!setEffect(&failure, halves->after, complaint)) return std::nullopt;
+  return failure;
+}
+
+// "K=EFFECT" and "K+=EFFECT".
+std::optional<Failure> parseNumbered(std::string_view text, SetEffect setEffect, std::string* complaint) {
+  auto halves = cutAt(text, text.find('='));
+  if (!halves) {
+    complain(complaint, text, "the form is K=EFFECT or K+=EFFECT");
+    return std::nullopt;
+  }
+  Failure failure;
+  if (halves->before.ends_with('+')) {
+    failure.onwards = true;
+    halves->before.remove_suffix(1);
+  }
+  const auto nth = integerOf<std::int64_t>(halves->before, 1);
+  if (!nth) {
+    complain(complaint, halves->before, "calls are numbered from 1");
+    return std::nullopt;
+  }
+  failure.nth = *nth;
+  if (!setEffect(&failure, halves->after, complaint)) return std::nullopt;
+  return failure;
+}
+
+}  // namespace
+
+std::optional<Failure> parseFail(std::string_view text, std::string* complaint) {
+  return parseNamed(text, setCode, complaint);
+}
+
+std::optional<Failure> parseThrow(std::string_view text, std::string* complaint) {
+  return parseNamed(text, setKind, complaint);
+}
+
+std::optional<Failure> parseFailAt(std::string_view text, std::string* complaint) {
+  return parseNumbered(text, setCode, complaint);
+}
+
+std::optional<Failure> parseThrowAt(std::string_view text, std::string* complaint) {
+  return parseNumbered(text, setKind, complaint);
+}
+
+std::optional<RefusedSuite> parseRefuse(std::string_view text, std::string* complaint) {
+  const auto halves = cutAt(text, text.rfind(':'));
+  const auto version = halves ? integerOf<std::int32_t>(halves->after, 0) : std::nullopt;
+  if (!version) {
+    complain(complaint, text, "the form is SUITE:VERSION");
+    return std::nullopt;
+  }
+  if (SuiteShelf().find(halves->before, *version) == nullptr) {
+    complain(complaint, text, "the host offers no such suite");
+    return std::nullopt;
+  }
+  return RefusedSuite{std::string(halves->before), *version};
+}
+
+}  // namespace refhost

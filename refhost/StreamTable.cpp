@@ -1,0 +1,52 @@
+#include "refhost/StreamTable.h"
+
+#include <cstddef>
+
+namespace refhost {
+namespace {
+
+constexpr double kFullScale = 100.0;  // percent
+
+struct StreamFacts {
+  int32_t id;
+  int32_t dimension;
+  double standard;  // the default of each component
+  const char* name;
+};
+
+// The zoom stands last, so that the layers without one have the table's beginning.
+constexpr StreamFacts kStreams[] = {
+    {kAnchorStream, 3, 0.0, "anchor point"},
+    {kPositionStream, 3, 0.0, "position"},
+    {kScaleStream, 3, kFullScale, "scale"},
+    {kZRotationStream, 1, 0.0, "Z rotation"},
+    {kXRotationStream, 1, 0.0, "X rotation"},
+    {kYRotationStream, 1, 0.0, "Y rotation"},
+    {kZoomStream, 1, 0.0, "zoom"},
+};
+constexpr std::size_t kStreamCount = sizeof(kStreams) / sizeof(kStreams[0]);
+
+}  // namespace
+
+std::vector<Stream> makeStreams(LayerKind kind) {
+  const std::size_t count = kind == LayerKind::Camera ? kStreamCount : kStreamCount - 1;
+  std::vector<Stream> streams(count);
+  for (std::size_t i = 0; i < count; ++i) {
+    streams[i].id = kStreams[i].id;
+    streams[i].dimension = kStreams[i].dimension;
+    for (int32_t component = 0; component < kStreams[i].dimension; ++component) {
+      streams[i].value[component] = kStreams[i].standard;
+    }
+  }
+  return streams;
+}
+
+const char* streamName(int32_t id, LayerKind kind) {
+  if (id == kAnchorStream && kind == LayerKind::Camera) return "point of interest";
+  for (const StreamFacts& facts : kStreams) {
+    if (facts.id == id) return facts.name;
+  }
+  return "stream";
+}
+
+}  // namespace refhost

@@ -1,0 +1,261 @@
+#include "tools/mayascene/Arguments.h"
+
+#include <CLI/CLI.hpp>
+#include <algorithm>
+#include <filesystem>
+#include <map>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <system_error>
+
+#include "refhost/Rehearsal.h"
+#include "tools/mayascene/OutputFile.h"
+#include "tools/mayascene/TerminalText.h"
+#include "tools/mayascene/Version.h"
+
+namespace mayascene {
+namespace {
+
+constexpr std::int32_t kMostZoomKeys = 1'000'000;
+constexpr std::size_t kNameColumn = 36;
+
+constexpr const char* kFooter =
+    "Exit status:\n"
+    "  0  all imported, all taken, or shown\n"
+    "  1  a scene was refused, its import returned a code, or it left something behind\n"
+    "  2  wrong usage\n"
+    "  3  a file cannot be read\n"
+    "  4  the import module cannot be loaded\n"
+    "  5  an output cannot be written, or the memory is exhausted\n"
+    "With several scenes it is the highest of theirs. An interrupted run ends with 130.";
+
+// The words of the command line before they are turned into what the host takes.
+struct Words {
+  std::vector<std::string> fail, failAt, throwing, throwAt, refuse;
+  std::string during;
+};
+
+template <typename Parsed>
+using Parser = std::optional<Parsed> (*)(std::string_view, std::string*);
+
+template <typename Parsed>
+void parseEach(const std::string& option, const std::vector<std::string>& words, Parser<Parsed> parse,
+               std::vector<Parsed>* parsed) {
+  for (const std::string& word : words) {
+    std::string complaint;
+    std::optional<Parsed> one = parse(word, &complaint);
+    if (!one) throw CLI::ValidationError(option, complaint);
+    parsed->push_back(std::move(*one));
+  }
+}
+
+CLI::Option* addRepeated(CLI::App* verb, const std::string& name, std::vector<std::string>* words,
+                         const std::string& form, const std::string& description) {
+  return verb->add_option(name, *words, description)->allow_extra_args(false)->option_text(form + " ...");
+}
+
+void addPreferences(CLI::App* verb, std::string* file) {
+  verb->add_option("--preferences", *file, "the preference store, instead of the user's own")
+      ->option_text("FILE");
+}
+
+void addHostOptions(CLI::App* verb, HostArguments* host, Words* words) {
+  verb->add_option(
+          "--linear-units", host->linearUnits,
+          "for this run: 1 converts distances from the scene's\nlinear unit to points, 0 takes them as "
+          "they stand")
+      ->option_text("N");
+  addPreferences(verb, &host->preferences);
+  verb->add_option("--translations", host->translations, "the host's translations, lines of KEY=TEXT")
+      ->option_text("FILE");
+  verb->add_option("--module", host->module, "the import module, instead of the one beside the tool")
+      ->option_text("FILE");
+  verb->add_option("--trace", host->trace, "write every call of the importer; - is standard output")
+      ->option_text("FILE");
+  verb->add_option("--plugin-id", host->pluginId, "the plug-in id that the host gives (1)")->option_text("N");
+  verb->add_flag("--permissive", host->permissive, "record any number instead of refusing it");
+
+  constexpr const char* group = "Rehearsing failures";
+  addRepeated(verb, "--fail", &words->fail, "OPERATION:NTH=CODE",
+              "the NTH call (0: each) of the operation fails with CODE")
+      ->group(group);
+  addRepeated(verb, "--fail-at", &words->failAt, "K[+]=CODE",
+              "the K-th suite call fails with CODE; +: and all after it")
+      ->group(group);
+  addRepeated(verb, "--throw", &words->throwing, "OPERATION:NTH=KIND",
+              "the call throws instead: bad_alloc or runtime_error")
+      ->group(group);
+  addRepeated(verb, "--throw-at", &words->throwAt, "K[+]=KIND", "the K-th suite call throws")->group(group);
+  addRepeated(verb, "--refuse", &words->refuse, "SUITE:VERSION", "the suite cannot be acquired")
+      ->group(group);
+  verb->add_option("--zoom-keys", host->zoomKeys, "keys that each new camera layer has on its zoom")
+      ->option_text("N")
+      ->check(CLI::Range(std::int32_t{0}, kMostZoomKeys))
+      ->group(group);
+  verb->add_option("--during", words->during,
+                   "the callback that the rehearsal is for: entry, import,\nverify or death")
+      ->option_text("CALLBACK")
+      ->check(CLI::IsMember({"entry", "import", "verify", "death"}))
+      ->group(group);
+}
+
+void translateWords(const Words& words, HostArguments* host) {
+  parseEach<refhost::Failure>("--fail", words.fail, refhost::parseFail, &host->failures);
+  parseEach<refhost::Failure>("--fail-at", words.failAt, refhost::parseFailAt, &host->failures);
+  parseEach<refhost::Failure>("--throw", words.throwing, refhost::parseThrow, &host->failures);
+  parseEach<refhost::Failure>("--throw-at", words.throwAt, refhost::parseThrowAt, &host->failures);
+  parseEach<refhost::RefusedSuite>("--refuse", words.refuse, refhost::parseRefuse, &host->refusedSuites);
+  const std::map<std::string, refhost::Callback> callbacks = {{"entry", refhost::Callback::Entry},
+                                                              {"import", refhost::Callback::Import},
+                                                              {"verify", refhost::Callback::Verify},
+                                                              {"death", refhost::Callback::Death}};
+  if (!words.during.empty()) host->during = callbacks.at(words.during);
+}
+
+bool sameFile(const std::string& a, const std::string& b) {
+  std::error_code ignored;
+  return std::filesystem::path(a).lexically_normal() == std::filesystem::path(b).lexically_normal() ||
+         std::filesystem::equivalent(a, b, ignored);
+}
+
+// An output that would be written over the other one, over a scene, or into the middle of the other one.
+void checkOutputs(const std::string& json, const std::string& trace, const std::vector<std::string>& scenes) {
+  if (json == kStandardOutput && trace == kStandardOutput) {
+    throw CLI::ValidationError("--json and --trace", "only one output can go to standard output");
+  }
+  std::error_code ignored;
+  if (!json.empty() && !trace.empty() && sameFile(json, trace) &&
+      !std::filesystem::is_character_file(json, ignored)) {
+    throw CLI::ValidationError("--json and --trace", "the two outputs need two files");
+  }
+  for (const std::string& scene : scenes) {
+    for (const std::string& output : {json, trace}) {
+      if (output.empty() || output == kStandardOutput || !sameFile(output, scene)) continue;
+      throw CLI::ValidationError("output", output + " is one of the scenes and would be overwritten");
+    }
+  }
+}
+
+// A file name can be empty nowhere but where the option is left out.
+void refuseEmptyValues(const CLI::App& verb) {
+  for (const CLI::Option* option : verb.get_options()) {
+    for (const std::string& value : option->results()) {
+      if (value.empty()) throw CLI::ValidationError(option->get_name(), "an empty value");
+    }
+  }
+}
+
+// The command line library takes "[a,b]" as a list of two; here it is the name of a file.
+std::vector<std::string> wordsOf(int argc, const char* const* argv) {
+  std::vector<std::string> words(argv + std::min(argc, 1), argv + argc);
+  for (std::string& word : words) {
+    if (word.size() > 1 && word.front() == '[' && word.back() == ']') word.insert(0, "./");
+  }
+  std::reverse(words.begin(), words.end());  // the order in which the library takes them
+  return words;
+}
+
+// The whole command line, and where its parts go.
+struct CommandLine {
+  CLI::App app{"Imports baked Maya ASCII scenes into a project in memory and shows what came of it.",
+               "mayascene"};
+  ImportArguments import;
+  VerifyArguments verify;
+  PrefsArguments prefs;
+  Words importWords, verifyWords;
+  std::string preferenceName, preferenceValue;
+  CLI::App* importVerb = nullptr;
+  CLI::App* verifyVerb = nullptr;
+  CLI::App* prefsVerb = nullptr;
+  CLI::App* setVerb = nullptr;
+
+  CommandLine() {
+    app.get_formatter()->column_width(kNameColumn);
+    app.set_version_flag("--version", std::string("mayascene ") + kVersion, "show the version and leave");
+    app.set_help_flag("-h,--help", "show this help and leave");
+    app.require_subcommand(1);
+    app.footer(kFooter);
+    addImport();
+    addVerify();
+    addPrefs();
+  }
+
+  void addScenes(CLI::App* verb, std::vector<std::string>* scenes) {
+    verb->add_option("SCENE", *scenes, "a Maya ASCII scene with baked animation")
+        ->required()
+        ->option_text(" ");
+  }
+
+  void addImport() {
+    importVerb = app.add_subcommand("import", "import scenes and print an outline of what was made");
+    addScenes(importVerb, &import.scenes);
+    importVerb->add_option("--json", import.json, "write all of it, keys included; - is standard output")
+        ->option_text("FILE");
+    importVerb->add_flag("-q,--quiet", import.quiet, "print nothing but errors");
+    addHostOptions(importVerb, &import.host, &importWords);
+  }
+
+  void addVerify() {
+    verifyVerb = app.add_subcommand("verify", "answer for each file whether the importer takes it");
+    addScenes(verifyVerb, &verify.scenes);
+    verifyVerb->add_flag("-q,--quiet", verify.quiet, "print nothing but errors");
+    addHostOptions(verifyVerb, &verify.host, &verifyWords);
+  }
+
+  void addPrefs() {
+    prefsVerb = app.add_subcommand("prefs", "show the preference, or set it");
+    prefsVerb->footer("");
+    addPreferences(prefsVerb, &prefs.preferences);
+    setVerb = prefsVerb->add_subcommand("set", "set a preference");
+    setVerb->fallthrough();
+    setVerb->add_option("NAME", preferenceName, "linear-units")
+        ->required()
+        ->option_text(" ")
+        ->check(CLI::IsMember({"linear-units"}));
+    setVerb
+        ->add_option("VALUE", preferenceValue,
+                     "1 converts distances from the scene's linear unit, 0 does not")
+        ->required()
+        ->option_text(" ")
+        ->check(CLI::IsMember({"0", "1"}));
+  }
+
+  Arguments parse(std::vector<std::string> words) {
+    app.parse(std::move(words));
+    for (const CLI::App* verb : {importVerb, verifyVerb, prefsVerb, setVerb}) refuseEmptyValues(*verb);
+    Arguments arguments;
+    if (importVerb->parsed()) {
+      translateWords(importWords, &import.host);
+      checkOutputs(import.json, import.host.trace, import.scenes);
+      arguments.import = import;
+    } else if (verifyVerb->parsed()) {
+      translateWords(verifyWords, &verify.host);
+      checkOutputs("", verify.host.trace, verify.scenes);
+      arguments.verify = verify;
+    } else {
+      if (setVerb->parsed()) prefs.linearUnits = preferenceValue == "1" ? 1 : 0;
+      arguments.prefs = prefs;
+    }
+    return arguments;
+  }
+};
+
+}  // namespace
+
+Arguments parseArguments(int argc, const char* const* argv, std::ostream& out, std::ostream& err) {
+  CommandLine line;
+  try {
+    return line.parse(wordsOf(argc, argv));
+  } catch (const CLI::Success& shown) {
+    line.app.exit(shown, out, err);
+    return {};
+  } catch (const CLI::ParseError& wrong) {
+    err << "mayascene: " << terminalText(wrong.what()) << "\nRun mayascene --help for how it is used.\n";
+    Arguments arguments;
+    arguments.over = ExitStatus::WrongUsage;
+    return arguments;
+  }
+}
+
+}  // namespace mayascene

@@ -1,0 +1,59 @@
+// What the user asks for on the command line.
+#pragma once
+
+#include <cstdint>
+#include <optional>
+#include <ostream>
+#include <string>
+#include <vector>
+
+#include "refhost/Host.h"
+#include "tools/mayascene/ExitStatus.h"
+
+namespace mayascene {
+
+// What `import` and `verify` ask of the embedded host.
+struct HostArguments {
+  std::string module;        // empty: the one that lies with the tool
+  std::string preferences;   // empty: the user's own store
+  std::string translations;  // empty: none
+  std::string trace;         // empty: none; "-": standard output
+  std::int32_t pluginId = 1;
+  std::optional<std::int32_t> linearUnits;  // none: what the preference store holds
+  std::int32_t zoomKeys = 0;
+  bool permissive = false;
+  std::vector<refhost::Failure> failures;
+  std::vector<refhost::RefusedSuite> refusedSuites;
+  std::optional<refhost::Callback> during;  // none: the verb's own callback
+};
+
+struct ImportArguments {
+  HostArguments host;
+  std::vector<std::string> scenes;
+  std::string json;  // empty: none; "-": standard output
+  bool quiet = false;
+};
+
+struct VerifyArguments {
+  HostArguments host;
+  std::vector<std::string> scenes;
+  bool quiet = false;
+};
+
+struct PrefsArguments {
+  std::string preferences;                  // empty: the user's own store
+  std::optional<std::int32_t> linearUnits;  // the value to set; none: show
+};
+
+// Exactly one of the three is there, or none and the run is over: help was shown, or usage was wrong.
+struct Arguments {
+  std::optional<ImportArguments> import;
+  std::optional<VerifyArguments> verify;
+  std::optional<PrefsArguments> prefs;
+  ExitStatus over = ExitStatus::Done;
+};
+
+// Help goes to `out`, complaints to `err`.
+Arguments parseArguments(int argc, const char* const* argv, std::ostream& out, std::ostream& err);
+
+}  // namespace mayascene

@@ -1,0 +1,41 @@
+// What the tool has to say on standard error, one line each.
+#pragma once
+
+#include <ostream>
+#include <string>
+#include <string_view>
+
+#include "refhost/Host.h"
+#include "tools/mayascene/ExitStatus.h"
+#include "tools/mayascene/TerminalText.h"
+
+namespace mayascene {
+
+class Diagnostics {
+ public:
+  // The stream outlives the object. Quiet: errors only.
+  Diagnostics(std::ostream& stream, Style style, bool quiet);
+
+  // "mayascene: SUBJECT: SENTENCE"; without the subject where that is empty. Both may hold anything.
+  void complain(std::string_view subject, std::string_view sentence);
+  void remark(std::string_view subject, std::string_view sentence);  // not when quiet
+
+  // What was wrong with a callback: the code that it returned, what the host refused, what it left behind.
+  // Refused where the code is not 0 or the ledger is not clean.
+  ExitStatus judge(std::string_view subject, const refhost::CallbackResult& result);
+
+  // The messages that the host showed, for runs that print no outline.
+  void messages(std::string_view subject, const refhost::CallbackResult& result);
+
+ private:
+  void line(std::string_view subject, std::string_view sentence, bool alarming);
+
+  std::ostream& stream_;
+  Style style_;
+  bool quiet_;
+};
+
+// "error 2021 (FILE_OPEN): the file cannot be opened, or is no regular file"
+std::string describeCode(HostError code);
+
+}  // namespace mayascene

@@ -1,0 +1,76 @@
+#include "tools/mayascene/HostSession.h"
+
+#include <string>
+#include <system_error>
+#include <utility>
+
+#include "refhost/Preferences.h"
+#include "refhost/Translations.h"
+
+namespace mayascene {
+namespace {
+
+constexpr const char* kModuleBesideTool = "../lib/MayaImport.so";
+
+// The tool finds the module from where it lies itself, so that a build can be moved and run from any folder.
+std::filesystem::path moduleBesideTool() {
+  std::error_code failed;
+  const std::filesystem::path self = std::filesystem::read_symlink("/proc/self/exe", failed);
+  return (self.parent_path() / kModuleBesideTool).lexically_normal();
+}
+
+}  // namespace
+
+std::filesystem::path preferenceFile(const std::string& named) {
+  return named.empty() ? refhost::Preferences::userFile() : std::filesystem::path(named);
+}
+
+HostSession::HostSession(const HostArguments& arguments, refhost::Callback own, std::ostream* trace,
+                         Diagnostics& diagnostics)
+    : arguments_(arguments), own_(own), trace_(trace), diagnostics_(diagnostics) {}
+
+ExitStatus HostSession::start() {
+  refhost::HostOptions options;
+  options.module = arguments_.module.empty() ? moduleBesideTool() : std::filesystem::path(arguments_.module);
+  options.pluginId = arguments_.pluginId;
+  options.preferences = preferenceFile(arguments_.preferences);
+  options.linearUnits = arguments_.linearUnits;
+  options.trace = trace_;
+  options.failures = arguments_.failures;
+  options.refusedSuites = arguments_.refusedSuites;
+  options.during = arguments_.during.value_or(own_);
+  options.zoomKeys = arguments_.zoomKeys;
+  options.permissive = arguments_.permissive;
+  std::string complaint;
+  if (!arguments_.translations.empty()) {
+    auto translations = refhost::readTranslations(arguments_.translations, &complaint);
+    if (!translations) {
+      diagnostics_.complain("", complaint);
+      return ExitStatus::Unreadable;
+    }
+    options.translations = std::move(*translations);
+  }
+
+  host_ = std::make_unique<refhost::Host>(std::move(options));
+  if (!host_->load(&entry_, &complaint)) {
+    diagnostics_.complain("", complaint);
+    return ExitStatus::NoModule;
+  }
+  const ExitStatus status = diagnostics_.judge("the module's entry", entry_);
+  if (entry_.code == 0) return status;
+  diagnostics_.messages("the module's entry", entry_);
+  return ExitStatus::NoModule;
+}
+
+ExitStatus HostSession::finish() {
+  deathHook_ = host_->unload();
+  return diagnostics_.judge("the module's death hook", deathHook_);
+}
+
+std::int32_t HostSession::linearUnits() const {
+  if (arguments_.linearUnits) return *arguments_.linearUnits;
+  const refhost::Preferences store(preferenceFile(arguments_.preferences));
+  return store.find(kPreferenceSection, kLinearUnitsKey).value_or(0);
+}
+
+}  // namespace mayascene

@@ -1,0 +1,14 @@
+// What becomes of half-written files when the run is interrupted.
+#pragma once
+
+namespace mayascene {
+
+// From here on a run that a signal ends (SIGINT, SIGTERM, SIGHUP, SIGPIPE) takes its unfinished files away
+// and ends with 128 and the signal's number; one that std::terminate ends says so first.
+void handleInterruptions();
+
+// Remembers a file that is not finished yet. The name stays the caller's, unchanged, until it is forgotten.
+void rememberUnfinished(const char* name);
+void forgetUnfinished(const char* name);
+
+}  // namespace mayascene

@@ -1,0 +1,198 @@
+#include "tools/mayascene/Outline.h"
+
+#include <algorithm>
+#include <cstddef>
+#include <string>
+#include <string_view>
+#include <unordered_map>
+#include <vector>
+
+#include "tools/mayascene/Quantities.h"
+
+namespace mayascene {
+namespace {
+
+using refhost::Composition;
+using refhost::Layer;
+using refhost::LayerKind;
+using refhost::Stream;
+
+constexpr std::size_t kStep = 2;          // blanks by which a child layer stands further in than its parent
+constexpr std::size_t kPropertyStep = 4;  // and a property than its layer
+constexpr std::size_t kDeepest = 24;      // from here on depth is told in figures: the page ends somewhere
+constexpr std::size_t kLabelWidth = 19;
+constexpr double kPointsPerInch = 72.0;
+constexpr double kMillimetresPerInch = 25.4;
+
+// The streams in the order in which a person asks for them.
+struct Property {
+  int32_t streamId;
+  std::string_view label;
+  std::string_view cameraLabel;
+  std::string_view unit;
+};
+constexpr Property kProperties[] = {
+    {11, "zoom", "zoom", " px"},
+    {1, "position", "position", " pt"},
+    {8, "X rotation", "X rotation", " deg"},
+    {9, "Y rotation", "Y rotation", " deg"},
+    {3, "Z rotation", "Z rotation", " deg"},
+    {2, "scale", "scale", " %"},
+    {0, "anchor point", "point of interest", " pt"},
+};
+
+struct Row {
+  std::string_view label;
+  std::string value;  // the static value; in parentheses where keys stand over it
+  std::string keys;
+};
+
+std::string padded(std::string_view text, std::size_t width) {
+  std::string result(text);
+  if (result.size() < width) result.append(width - result.size(), ' ');
+  return result;
+}
+
+std::string filmText(const Layer& camera) {
+  const double millimetres = camera.filmSize / kPointsPerInch * kMillimetresPerInch;
+  return numberText(camera.filmSize) + " pt (" + numberText(millimetres) + " mm) " +
+         (camera.filmDirection == 2 ? "vertically" : "horizontally");
+}
+
+std::vector<Row> rowsOf(const Layer& layer) {
+  std::vector<Row> rows;
+  for (const Property& property : kProperties) {
+    const Stream* stream = layer.findStream(property.streamId);
+    if (stream == nullptr) continue;
+    Row row;
+    row.label = layer.kind == LayerKind::Camera ? property.cameraLabel : property.label;
+    row.value = valueText(*stream) + std::string(property.unit);
+    if (stream->keyCount() > 0) {
+      row.value = '(' + row.value + ')';
+      row.keys = keysText(*stream, layer.composition->frameRate);
+    }
+    rows.push_back(std::move(row));
+    if (property.streamId == 11 && layer.filmDirection != 0)
+      rows.push_back({"film size", filmText(layer), ""});
+  }
+  return rows;
+}
+
+std::string layerTitle(const Layer& layer, const Style& style) {
+  const std::string name = style.strong(quotedTerminalText(layer.name));
+  switch (layer.kind) {
+    case LayerKind::Camera:
+      return "camera " + name + (layer.aimed ? ", aimed at its point of interest" : "");
+    case LayerKind::Composition:
+      return "composition " + name;
+    case LayerKind::Null:
+      break;
+  }
+  return "null " + name;
+}
+
+void printLayer(std::ostream& out, const Layer& layer, std::size_t depth, const Style& style) {
+  const std::string indent(kStep * (1 + std::min(depth, kDeepest)), ' ');
+  out << indent;
+  if (depth > kDeepest) out << style.faint("[depth " + std::to_string(depth) + "] ");
+  out << layerTitle(layer, style) << '\n';
+  const std::vector<Row> rows = rowsOf(layer);
+  std::size_t widest = 0;
+  for (const Row& row : rows) {
+    if (!row.keys.empty()) widest = std::max(widest, row.value.size());
+  }
+  for (const Row& row : rows) {
+    out << indent << std::string(kPropertyStep, ' ') << style.faint(padded(row.label, kLabelWidth));
+    if (row.keys.empty()) {
+      out << row.value << '\n';
+    } else {
+      out << padded(row.value, widest) << "   " << row.keys << '\n';
+    }
+  }
+}
+
+// Parents before their children, and what stands on one level in the order in which it was made. Written
+// without recursion: a chain of parents can be longer than the stack is deep.
+void printLayers(std::ostream& out, const Composition& composition, const Style& style) {
+  std::unordered_map<const Layer*, std::vector<const Layer*>> children;
+  for (const Layer* layer : composition.layers) children[layer->parent].push_back(layer);
+  struct Pending {
+    const Layer* layer;
+    std::size_t depth;
+  };
+  std::vector<Pending> pending;
+  const auto push = [&](const Layer* parent, std::size_t depth) {
+    const auto found = children.find(parent);
+    if (found == children.end()) return;
+    for (auto child = found->second.rbegin(); child != found->second.rend(); ++child) {
+      pending.push_back({*child, depth});
+    }
+  };
+  push(nullptr, 0);
+  while (!pending.empty()) {
+    const Pending next = pending.back();
+    pending.pop_back();
+    printLayer(out, *next.layer, next.depth, style);
+    push(next.layer, next.depth + 1);
+  }
+}
+
+void printComposition(std::ostream& out, const Composition& composition, const Style& style) {
+  out << '\n'
+      << style.strong(quotedTerminalText(composition.name)) << "   " << composition.width << " x "
+      << composition.height << " px, pixel aspect " << ratioText(composition.pixelAspect) << ", "
+      << ratioText(composition.frameRate) << " fps, "
+      << durationText(composition.duration, composition.frameRate) << '\n';
+  if (composition.layers.empty()) out << "  no layers\n";
+  printLayers(out, composition, style);
+}
+
+// "1 composition, 1 camera, 2 nulls, 840 keys"
+std::string summary(const refhost::Folder& folder) {
+  std::size_t cameras = 0, nulls = 0, keys = 0;
+  for (const Composition* composition : folder.compositions) {
+    for (const Layer* layer : composition->layers) {
+      if (layer->kind == LayerKind::Camera) ++cameras;
+      if (layer->kind == LayerKind::Null) ++nulls;
+      for (const Stream& stream : layer->streams) keys += stream.keyCount();
+    }
+  }
+  return countText(folder.compositions.size(), "composition") + ", " + countText(cameras, "camera") + ", " +
+         countText(nulls, "null") + ", " + countText(keys, "key");
+}
+
+bool madeSomething(const SceneReport& scene) {
+  return scene.result.folder != nullptr && !scene.result.folder->compositions.empty();
+}
+
+std::string headline(const SceneReport& scene) {
+  switch (scene.outcome) {
+    case Outcome::Imported:
+      return summary(*scene.result.folder);
+    case Outcome::Nothing:
+      return "nothing to import, the scene has no cameras";
+    case Outcome::Failed:
+      if (madeSomething(scene)) return summary(*scene.result.folder) + " (incomplete)";
+      break;
+    case Outcome::Refused:
+    case Outcome::Unreadable:
+      break;
+  }
+  return "nothing was imported";
+}
+
+}  // namespace
+
+void printOutline(std::ostream& out, const SceneReport& scene, const Style& style) {
+  out << terminalText(scene.path) << ": " << headline(scene) << '\n';
+  if (madeSomething(scene)) {
+    for (const Composition* composition : scene.result.folder->compositions) {
+      printComposition(out, *composition, style);
+    }
+  }
+  if (scene.result.messages.empty()) return;
+  out << "\nmessages\n";
+  for (const std::string& message : scene.result.messages) out << "  " << terminalText(message) << '\n';
+}
+
+}  // namespace mayascene

@@ -1,0 +1,132 @@
+#include "tools/mayascene/OutputFile.h"
+
+#include <fcntl.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <cerrno>
+#include <cstdio>
+#include <cstring>
+#include <filesystem>
+#include <optional>
+#include <system_error>
+#include <utility>
+
+#include "tools/mayascene/DescriptorBuffer.h"
+#include "tools/mayascene/Interruption.h"
+
+namespace mayascene {
+namespace {
+
+constexpr mode_t kNewFileMode = 0666;  // less what the user's mask takes away
+constexpr mode_t kPermissionBits = 07777;
+
+std::string cannotWrite(const std::string& target, int number) {
+  const std::string name = target == kStandardOutput ? "standard output" : target;
+  return name + " cannot be written: " + std::strerror(number);
+}
+
+// A name in the same folder that nobody else uses.
+std::string nameBeside(const std::filesystem::path& place) {
+  static int serial = 0;
+  const std::string name = ".mayascene-" + std::to_string(::getpid()) + '-' + std::to_string(++serial);
+  return (place.parent_path() / name).string();
+}
+
+// Where a file belongs: a symbolic link is followed, so that the link stays one.
+std::filesystem::path placeOf(const std::string& target) {
+  std::error_code failed;
+  std::filesystem::path place = std::filesystem::canonical(target, failed);
+  return failed ? std::filesystem::path(target) : place;
+}
+
+}  // namespace
+
+struct OutputFile::State {
+  explicit State(std::string shownName) : target(std::move(shownName)) {}
+  ~State() {
+    if (!beside.empty()) {
+      ::unlink(beside.c_str());
+      forgetUnfinished(beside.c_str());
+    }
+    closeDescriptor();
+  }
+  State(const State&) = delete;
+  State& operator=(const State&) = delete;
+
+  void attach(int fileDescriptor) {
+    descriptor = fileDescriptor;
+    buffer.emplace(fileDescriptor);
+    stream.rdbuf(&*buffer);
+  }
+
+  int closeDescriptor() {
+    const int held = std::exchange(descriptor, -1);
+    return held > STDERR_FILENO ? ::close(held) : 0;
+  }
+
+  // Opens a new file beside the place of a regular file.
+  bool openBeside(const struct stat* existing) {
+    place = placeOf(target).string();
+    beside = nameBeside(place);
+    rememberUnfinished(beside.c_str());
+    const int opened = ::open(beside.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, kNewFileMode);
+    if (opened < 0) return false;
+    attach(opened);
+    return existing == nullptr || ::fchmod(opened, existing->st_mode & kPermissionBits) == 0;
+  }
+
+  std::string target;  // as the user named it
+  std::string place;   // where the file belongs
+  std::string beside;  // where it is written until it is whole; empty: written as it is, or whole already
+  int descriptor = -1;
+  std::optional<DescriptorBuffer> buffer;
+  std::ostream stream{nullptr};
+};
+
+OutputFile::OutputFile(std::unique_ptr<State> state) : state_(std::move(state)) {}
+OutputFile::~OutputFile() = default;
+std::ostream& OutputFile::stream() { return state_->stream; }
+
+std::unique_ptr<OutputFile> OutputFile::open(const std::string& target, std::string* failure) {
+  auto state = std::make_unique<State>(target);
+  struct stat existing {};
+  const bool standardOutput = target == kStandardOutput;
+  const bool exists = !standardOutput && ::stat(target.c_str(), &existing) == 0;
+  bool opened = true;
+  if (standardOutput) {
+    state->attach(STDOUT_FILENO);
+  } else if (exists && !S_ISREG(existing.st_mode)) {
+    const int descriptor = ::open(target.c_str(), O_WRONLY | O_CLOEXEC);
+    opened = descriptor >= 0;
+    if (opened) state->attach(descriptor);
+  } else {
+    // A file that its owner has made read-only is not replaced, although the folder would allow it.
+    opened =
+        (!exists || ::access(target.c_str(), W_OK) == 0) && state->openBeside(exists ? &existing : nullptr);
+  }
+  if (!opened) {
+    *failure = cannotWrite(target, errno);
+    return nullptr;
+  }
+  return std::unique_ptr<OutputFile>(new OutputFile(std::move(state)));
+}
+
+bool OutputFile::commit(std::string* failure) {
+  State& state = *state_;
+  state.stream.flush();
+  int number = state.buffer->failure();
+  if (state.closeDescriptor() != 0 && number == 0) number = errno;
+  if (number == 0 && !state.beside.empty()) {
+    if (std::rename(state.beside.c_str(), state.place.c_str()) != 0) {
+      number = errno;
+    } else {
+      forgetUnfinished(state.beside.c_str());
+      state.beside.clear();
+    }
+  }
+  if (number != 0) *failure = cannotWrite(state.target, number);
+  return number == 0;
+}
+
+}  // namespace mayascene

@@ -1,0 +1,39 @@
+// Where one output of the tool goes: a file that appears under its name whole or not at all, or standard
+// output.
+#pragma once
+
+#include <memory>
+#include <ostream>
+#include <string>
+
+namespace mayascene {
+
+// What stands for standard output as the name of an output.
+inline constexpr const char* kStandardOutput = "-";
+
+class OutputFile {
+ public:
+  // Opens an output for writing. A regular file is written beside its place and takes the place on commit();
+  // until then what lay there stays. A device or a FIFO is written as it is. Null with a sentence in *failure
+  // when it cannot be written.
+  static std::unique_ptr<OutputFile> open(const std::string& target, std::string* failure);
+
+  // What was not committed is taken away again.
+  ~OutputFile();
+  OutputFile(const OutputFile&) = delete;
+  OutputFile& operator=(const OutputFile&) = delete;
+
+  // Lives as long as the output. Its badbit is set once a write has failed.
+  std::ostream& stream();
+
+  // Puts everything written where it belongs; call it once, at the end. False with a sentence in *failure
+  // when a write has failed or the file cannot take its place.
+  bool commit(std::string* failure);
+
+ private:
+  struct State;
+  explicit OutputFile(std::unique_ptr<State> state);
+  std::unique_ptr<State> state_;
+};
+
+}  // namespace mayascene

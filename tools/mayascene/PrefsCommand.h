@@ -1,0 +1,13 @@
+// mayascene prefs
+#pragma once
+
+#include "tools/mayascene/Arguments.h"
+#include "tools/mayascene/Diagnostics.h"
+#include "tools/mayascene/ExitStatus.h"
+
+namespace mayascene {
+
+// Sets the preference if a value is given, and prints it and where it is kept. Showing writes nothing.
+ExitStatus runPrefs(const PrefsArguments& arguments, Diagnostics& diagnostics);
+
+}  // namespace mayascene

@@ -1,0 +1,35 @@
+// What came of a run, as the outline and the JSON tell it.
+#pragma once
+
+#include <cstdint>
+#include <string>
+#include <vector>
+
+#include "refhost/Host.h"
+#include "tools/mayascene/ExitStatus.h"
+
+namespace mayascene {
+
+enum class Outcome {
+  Imported,    // a composition was made
+  Nothing,     // a Maya ASCII scene without a camera: nothing was made, and nothing is wrong
+  Refused,     // no Maya ASCII scene: the importer made nothing and returned no code
+  Failed,      // the importer returned a code; what was made before stays
+  Unreadable,  // the file cannot be opened, or is no regular file; the importer was not called
+};
+
+struct SceneReport {
+  std::string path;  // as the user named it; bytes
+  Outcome outcome = Outcome::Unreadable;
+  ExitStatus status = ExitStatus::Unreadable;
+  refhost::CallbackResult result;  // its folder lives as long as the host
+};
+
+struct RunReport {
+  std::int32_t linearUnits = 0;  // the preference that the scenes were imported with
+  refhost::CallbackResult entry;
+  std::vector<SceneReport> scenes;
+  refhost::CallbackResult deathHook;
+};
+
+}  // namespace mayascene

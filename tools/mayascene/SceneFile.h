@@ -1,0 +1,18 @@
+// A look at a scene's file before the importer gets its path.
+#pragma once
+
+#include <filesystem>
+#include <string>
+
+namespace mayascene {
+
+struct SceneLook {
+  bool readable = false;    // a regular file that can be opened
+  std::string failure;      // where it is not readable: why, in words
+  bool mayaHeader = false;  // it begins with "//Maya", in capitals or not
+};
+
+// Never waits: a FIFO without a writer and a directory are told from a regular file at once.
+SceneLook lookAtScene(const std::filesystem::path& path);
+
+}  // namespace mayascene
