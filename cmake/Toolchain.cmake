@@ -52,15 +52,26 @@ function(add_room name kind)
   target_include_directories(${name} PUBLIC ${PROJECT_SOURCE_DIR})
 endfunction()
 
-# add_room_test(NAME SOURCES ... [LINKS ...]): one GoogleTest program; each of its tests is a test of ctest.
-function(add_room_test name)
-  cmake_parse_arguments(TEST "" "" "SOURCES;LINKS" ${ARGN})
-  add_executable(${name} ${TEST_SOURCES})
-  target_link_libraries(${name} PRIVATE ${TEST_LINKS} mayascene_options GTest::gmock_main)
+# What every test program is compiled with. Lightly optimised, because that compiles faster. GCC 12 sees overflows
+# inside the standard library's strings that cannot happen.
+function(set_test_options name)
+  target_compile_options(${name} PRIVATE $<$<NOT:$<CONFIG:Debug>>:-O1>
+                                         $<$<CXX_COMPILER_ID:GNU>:-Wno-array-bounds;-Wno-stringop-overflow>)
+  target_link_libraries(${name} PRIVATE mayascene_options GTest::gmock)
   target_compile_definitions(
     ${name}
     PRIVATE MAYASCENE_SOURCE_DIR="${PROJECT_SOURCE_DIR}" MAYASCENE_TOOL="$<TARGET_FILE:mayascene>"
             MAYASCENE_MODULE="$<TARGET_FILE:MayaImport>")
+endfunction()
+
+# add_room_test(NAME SOURCES ... [LINKS ...]): one GoogleTest program; each of its tests is a test of ctest. The
+# headers that all test sources include are compiled once, for all programs.
+function(add_room_test name)
+  cmake_parse_arguments(TEST "" "" "SOURCES;LINKS" ${ARGN})
+  add_executable(${name} ${TEST_SOURCES})
+  target_link_libraries(${name} PRIVATE ${TEST_LINKS} GTest::gmock_main)
+  set_test_options(${name})
+  target_precompile_headers(${name} REUSE_FROM test_headers)
   add_dependencies(${name} mayascene MayaImport)
   gtest_discover_tests(${name} PROPERTIES TIMEOUT 300)
 endfunction()

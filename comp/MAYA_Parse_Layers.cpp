@@ -52,12 +52,12 @@ void MAYA_Parse::CreateParentNulls(VOR_CompItem* comp, VOR_Layer* child, std::in
   chainOfTransform_.resize(static_cast<std::size_t>(RecordCount(transforms)), 0);
   ++chain_;
   for (;;) {
-    chainOfTransform_[static_cast<std::size_t>(transform)] = chain_;
+    chainOfTransform_.at(static_cast<std::size_t>(transform)) = chain_;
     const auto below = FetchRecord<MAYA_Transform>(transforms, transform);
     if (below.parent[0] == '\0') return;
     transform = transformNames_.Find(transforms, below.parent);
     const bool found = transform != kNoIndex;
-    if (found && chainOfTransform_[static_cast<std::size_t>(transform)] == chain_) return;
+    if (found && chainOfTransform_.at(static_cast<std::size_t>(transform)) == chain_) return;
 
     VOR_Layer* const null = NewNull(comp, below.parent);
     ThrowOnError(LayerSuite10().SetLayerParent(child, null));
@@ -83,7 +83,7 @@ VOR_Layer* MAYA_Parse::NewNull(VOR_CompItem* comp, const char* name) {
 void MAYA_Parse::LookAtPass(VOR_Layer* layer, const MAYA_Camera* camera, std::int32_t transform) {
   if (transform == kNoIndex) return;
   if (constraintOfTransform_.empty()) CollectConstraints();
-  const std::int32_t constraint = constraintOfTransform_[static_cast<std::size_t>(transform)];
+  const std::int32_t constraint = constraintOfTransform_.at(static_cast<std::size_t>(transform));
   if (constraint == kNoIndex) return;
   const auto record = FetchRecord<MAYA_Transform>(transforms, constraint);
   SetCameraLookAt(layer, camera, &record);

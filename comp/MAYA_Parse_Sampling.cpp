@@ -15,13 +15,17 @@ NodeChannels::Channel FetchChannel(const RecordList* curves, std::int32_t curve)
   return {record.keys, RecordCount(record.keys)};
 }
 
+// Writes key n of a channel; a channel of one key gives that one, a channel without keys leaves the value.
+void ReadKey(const NodeChannels::Channel& channel, std::int32_t n, double* value) {
+  if (channel.count == 0) return;
+  *value = FetchRecord<MAYA_Key>(channel.keys, channel.count == 1 ? 0 : n).value;
+}
+
 }  // namespace
 
 void NodeChannels::Extract(std::int32_t group, std::int32_t n, double (&values)[kAxisCount]) const {
   for (std::int32_t axis = 0; axis < kAxisCount; ++axis) {
-    const Channel& channel = channels[static_cast<std::size_t>(kAxisCount * group + axis)];
-    if (channel.count == 0) continue;
-    values[axis] = FetchRecord<MAYA_Key>(channel.keys, channel.count == 1 ? 0 : n).value;
+    ReadKey(channels[static_cast<std::size_t>(kAxisCount * group + axis)], n, &values[axis]);
   }
 }
 
@@ -30,26 +34,27 @@ std::int32_t MAYA_Parse::VerifyAnimInfo(const MAYA_Transform* node) {
 }
 
 T_Time MAYA_Parse::GetKeyTime(const MAYA_Transform* node, std::int32_t n) {
-  return KeyTime(FetchChannels(*node), n);
+  NodeChannels fetched;
+  for (std::size_t slot = 0; slot < kChannelCount; ++slot) {
+    fetched.channels[slot] = FetchChannel(curves, node->curve[slot]);
+    if (fetched.channels[slot].count > n) break;  // a curve behind it is not looked at
+  }
+  return KeyTime(fetched, n);
 }
 
 void MAYA_Parse::ExtractAnimInfo(const MAYA_Transform* node, std::int32_t group, std::int32_t n,
                                  double (&values)[kAxisCount]) {
-  FetchChannels(*node).Extract(group, n, values);
-}
-
-NodeChannels MAYA_Parse::FetchChannels(const MAYA_Transform& node) const {
-  NodeChannels fetched;
-  for (std::size_t slot = 0; slot < kChannelCount; ++slot) {
-    fetched.channels[slot] = FetchChannel(curves, node.curve[slot]);
+  for (std::int32_t axis = 0; axis < kAxisCount; ++axis) {
+    ReadKey(FetchChannel(curves, node->curve[kAxisCount * group + axis]), n, &values[axis]);
   }
-  return fetched;
 }
 
 NodeChannels MAYA_Parse::VerifyChannels(const MAYA_Transform& node) {
-  NodeChannels fetched = FetchChannels(node);
+  NodeChannels fetched;
   std::int64_t shared = 0;
-  for (const NodeChannels::Channel& channel : fetched.channels) {
+  for (std::size_t slot = 0; slot < kChannelCount; ++slot) {
+    NodeChannels::Channel& channel = fetched.channels[slot];
+    channel = FetchChannel(curves, node.curve[slot]);
     if (channel.count < kAnimatedKeyCount) continue;
     if (shared == 0) shared = channel.count;
     if (channel.count == shared) continue;

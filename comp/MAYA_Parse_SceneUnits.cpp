@@ -9,8 +9,8 @@ double MAYA_Parse::ConvertDist(double distance) const {
   switch (linearUnit) {
     case kMillimeter:
       return distance / 25.4 * kPointsPerInch;
-    // Deliberate: metres come out 10000 times larger than the same length in centimetres, and kilometres lack
-    // the step from centimetres to inches. Scenes in these units have always been placed so.
+    // Deliberate: metres come out 10000 times as far as the same number of centimetres, and kilometres lack
+    // the step from centimetres to inches. Consistent rows would move every layer of a scene in these units.
     case kMeter:
       return distance * 100.0 / 0.0254 * kPointsPerInch;
     case kKilometer:

@@ -1,23 +1,46 @@
 #include "comp/UnwrapAngle.h"
 
+#include <algorithm>
 #include <cmath>
 
 namespace {
 
 constexpr double kHalfTurn = 3.141592653589793;
 constexpr double kTurn = 6.283185307179586;
-constexpr double kManyTurns = 4.0;
+constexpr double kFewTurns = 4.0;
 
 bool TurnChanges(double angle) {
   return std::isfinite(angle) && angle - kTurn != angle && angle + kTurn != angle;
+}
+
+// The angle moved by turns (of either sign) until few are left to the previous one. Between two powers of two
+// every turn changes a double by the same amount, so that as many as fit there are taken at once, and the
+// result has the bits of one turn at a time.
+double TakeManyTurns(double angle, double previous, double turn) {
+  while ((previous - angle) / turn > kFewTurns) {
+    const double first = angle + turn;
+    const double second = first + turn;
+    const double step = second - first;
+    const bool sameSpacing =
+        std::ilogb(angle) == std::ilogb(second) && std::signbit(angle) == std::signbit(second);
+    angle = first;
+    if (!sameSpacing) continue;
+    angle = second;
+    const double low = std::ldexp(1.0, std::ilogb(angle));
+    const double room =
+        std::signbit(angle) == std::signbit(turn) ? 2.0 * low - std::fabs(angle) : std::fabs(angle) - low;
+    const double turns =
+        std::floor(std::min(room / std::fabs(step), (previous - angle) / step - kFewTurns)) - 1.0;
+    if (turns > 0.0) angle += turns * step;
+  }
+  return angle;
 }
 
 }  // namespace
 
 double UnwrapAngle(double angle, double previous) {
   if (!TurnChanges(angle) || !TurnChanges(previous)) return angle;
-  const double turns = std::trunc((angle - previous) / kTurn);
-  if (std::fabs(turns) > kManyTurns) angle -= turns * kTurn;
+  angle = TakeManyTurns(angle, previous, angle > previous ? -kTurn : kTurn);
   while (angle - previous >= kHalfTurn) angle += -kTurn;
   while (angle - previous <= -kHalfTurn) angle += kTurn;
   return angle;

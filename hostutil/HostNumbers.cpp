@@ -5,8 +5,10 @@
 #include "hostutil/HostNumbers.h"
 
 #include <algorithm>
+#include <bit>
 #include <charconv>
 #include <cstdlib>
+#include <cstring>
 #include <limits>
 #include <system_error>
 
@@ -35,8 +37,12 @@ constexpr int64_t kDecidingDigits = 770;
 // Far from where a double begins and ends, as the exponent of the first digit.
 constexpr int64_t kHugeExponent = 400;
 
-// An explicit exponent is held here; no text is long enough for its digits to make up for it.
-constexpr int64_t kExponentLimit = std::numeric_limits<int64_t>::max() / 4;
+// An explicit exponent is held here: one more digit still fits the type, and no text is long enough for its
+// digits to make up for it.
+constexpr int64_t kExponentLimit = 100'000'000'000'000'000;
+
+// A longer number is left to the caller, who may have a limit of its own.
+constexpr int64_t kLongestPlainNumber = 64;
 
 bool IsDigit(char c) { return c >= '0' && c <= '9'; }
 bool IsLetter(char c) { return (c >= 'A' && c <= 'Z') || (c >= 'a' && c <= 'z'); }
@@ -151,6 +157,69 @@ HostError Convert(const Decimal& decimal, double* value) {
   return ConvertCondensed(decimal, value);
 }
 
+constexpr uint64_t kEachByte = 0x0101010101010101;
+
+// The value of eight digits, the first in the lowest byte; false when they are not all digits.
+bool EightDigits(const char* at, uint64_t* value) {
+  uint64_t bytes = 0;
+  std::memcpy(&bytes, at, sizeof bytes);
+  if constexpr (std::endian::native == std::endian::big) return false;
+  const uint64_t digits = bytes - '0' * kEachByte;
+  if (((bytes + 0x46 * kEachByte) | digits) & (0x80 * kEachByte)) return false;
+  const uint64_t pairs = digits * 10 + (digits >> 8);
+  constexpr uint64_t kEvery4 = 0x000000ff000000ff;
+  *value = ((pairs & kEvery4) * (100 + (uint64_t{1000000} << 32)) +
+            ((pairs >> 16) & kEvery4) * (1 + (uint64_t{10000} << 32))) >>
+           32;
+  return true;
+}
+
+// Reads digits on to the mantissa, which may overflow.
+const char* PlainDigits(const char* at, const char* end, uint64_t* mantissa) {
+  uint64_t eight = 0;
+  while (end - at >= 8 && EightDigits(at, &eight)) {
+    *mantissa = *mantissa * 100000000 + eight;
+    at += 8;
+  }
+  for (; IsDigit(*at); ++at) *mantissa = *mantissa * 10 + static_cast<uint64_t>(*at - '0');
+  return at;
+}
+
+bool EndsWord(char c) { return c == ' ' || c == '\n' || c == ';' || c == '\t' || c == '\r'; }
+
+// Passes over white space and reads one number of plain form. False, with nothing to rely on, when there is
+// none.
+bool ScanPlain(const char** text, const char* end, double* value, int32_t* lines) {
+  const char* at = *text;
+  for (; *at == ' ' || *at == '\n' || *at == '\t' || *at == '\r'; ++at) *lines += *at == '\n' ? 1 : 0;
+  const bool negative = *at == '-';
+  Cursor cursor{at + (negative ? 1 : 0), end};
+  Decimal decimal{};
+  decimal.begin = cursor.at;
+  for (; IsDigit(*cursor.at); ++cursor.at) {
+    decimal.mantissa = decimal.mantissa * 10 + static_cast<uint64_t>(*cursor.at - '0');
+  }
+  decimal.digits = cursor.at - decimal.begin;
+  if (*cursor.at == '.') {
+    const char* const fraction = ++cursor.at;
+    cursor.at = PlainDigits(fraction, end, &decimal.mantissa);
+    decimal.fraction = cursor.at - fraction;
+    decimal.digits += decimal.fraction;
+  }
+  if (decimal.digits == 0) return false;
+  if (!EndsWord(*cursor.at)) {
+    ReadExponent(&cursor, &decimal);
+    if (!EndsWord(*cursor.at)) return false;
+  }
+  if (cursor.at - at > kLongestPlainNumber) return false;
+  decimal.end = cursor.at;
+  double magnitude = 0.0;
+  if (Convert(decimal, &magnitude) != HOST_ERR_NONE) return false;
+  *value = negative ? -magnitude : magnitude;
+  *text = cursor.at;
+  return true;
+}
+
 bool OnlyLettersLeft(const Cursor& cursor) {
   const char* at = cursor.at;
   while (at != cursor.end && IsLetter(*at)) ++at;
@@ -174,6 +243,24 @@ HostError HostNumberScan(const char* text, int64_t length, double* value) {
   const HostError code = Convert(decimal, &magnitude);
   if (code == HOST_ERR_NONE) *value = negative ? -magnitude : magnitude;
   return code;
+}
+
+int64_t HostNumberScanPairs(const char* text, const char* end, double (*pairs)[2], int64_t capacity,
+                            const char** behind, int32_t* lineFeeds) {
+  *behind = text;
+  if (!hostutil::MayWorkInBulk()) return 0;
+  int64_t count = 0;
+  int32_t lines = 0;
+  for (; count < capacity; ++count) {
+    const char* at = *behind;
+    if (!ScanPlain(&at, end, &pairs[count][0], &lines) || !ScanPlain(&at, end, &pairs[count][1], &lines))
+      break;
+    *behind = at;
+    *lineFeeds += lines;
+    lines = 0;
+  }
+  hostutil::CountCalls(HOST_UTILITY_NumberScan, 2 * count);
+  return count;
 }
 
 HostError HostRatioCompare(const HostRatio* a, const HostRatio* b, int32_t* order) {

@@ -17,6 +17,15 @@ extern "C" {
  * the number is too large; *value is then unchanged. Neither an infinity nor a NaN comes out. */
 HOSTUTIL_API HostError HostNumberScan(const char* text, int64_t length, double* value);
 
+/* Reads pairs of numbers that stand one behind the other, apart by white space (space, tab, carriage return,
+ * line feed), each in plain decimal form (digits with an optional "-", fraction and exponent) and followed by
+ * white space or ";". Reads up to `capacity` pairs and returns how many; *behind is right behind the last
+ * number read, and the line feeds before it are added to *lineFeeds. What does not fit this form is left for
+ * HostNumberScan, which gives the same values. Counts as one call of it for each number; reads nothing where
+ * a rehearsal plans a failure. `end` is readable and holds a NUL; nothing behind it is read. */
+HOSTUTIL_API int64_t HostNumberScanPairs(const char* text, const char* end, double (*pairs)[2],
+                                         int64_t capacity, const char** behind, int32_t* lineFeeds);
+
 /* Compares two ratios: *order becomes -1, 0 or 1 as a is less than, equal to or greater than b. Exact for
  * all values; HOST_ERR_NUMBER_RANGE when a denominator is 0, and *order is then unchanged. */
 HOSTUTIL_API HostError HostRatioCompare(const HostRatio* a, const HostRatio* b, int32_t* order);

@@ -32,6 +32,14 @@ HOSTUTIL_API HostError RecordListCreate(int64_t recordSize, int64_t growth, int6
  * cannot grow (it is then unchanged), HOST_ERR_LIST_LOCKED while any record is locked. */
 HOSTUTIL_API HostError RecordListAppend(RecordList* list, const void* record);
 
+/* Appends copies of `count` records (0 or more) that lie one behind the other; all or, after a failure, none.
+ * Counts as one append, and fails as one. */
+HOSTUTIL_API HostError RecordListAppendRun(RecordList* list, const void* records, int64_t count);
+
+/* Makes room for `count` more records, so that they will be appended without growing. A hint: where there is
+ * no room to be had, nothing happens. */
+HOSTUTIL_API void RecordListReserve(RecordList* list, int64_t count);
+
 /* Copies record `index` (from 0) out. HOST_ERR_LIST_INDEX when there is none. */
 HOSTUTIL_API HostError RecordListGet(const RecordList* list, int64_t index, void* record);
 

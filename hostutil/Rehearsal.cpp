@@ -11,14 +11,14 @@
 namespace hostutil {
 
 constinit bool rehearsalRunning = false;
+constinit bool failuresPlanned = false;
+constinit std::array<int64_t, HOST_UTILITY_COUNT> callCounts{};
 
 namespace {
 
 constexpr int64_t kEveryCall = 0;
 
 std::array<std::vector<HostUtilityFailure>, HOST_UTILITY_COUNT> failures;
-std::array<int64_t, HOST_UTILITY_COUNT> callCounts{};
-
 bool IsService(int32_t service) { return service >= 0 && service < HOST_UTILITY_COUNT; }
 
 bool IsSound(const HostUtilityFailure& failure) {
@@ -28,9 +28,9 @@ bool IsSound(const HostUtilityFailure& failure) {
 
 }  // namespace
 
-bool CountCall(int32_t service, HostError* code) {
+bool IsPlannedToFail(int32_t service, HostError* code) {
   const auto slot = static_cast<std::size_t>(service);
-  const int64_t call = ++callCounts[slot];
+  const int64_t call = callCounts[slot];
   for (const HostUtilityFailure& failure : failures[slot]) {
     if (failure.nth != kEveryCall && failure.nth != call) continue;
     if (failure.thrown == HOST_THROW_BAD_ALLOC) throw std::bad_alloc();
@@ -47,6 +47,7 @@ HostError HostAddUtilityFailure(const HostUtilityFailure* failure) {
   if (failure == nullptr || !hostutil::IsSound(*failure)) return HOST_ERR_UTILITY_NULL;
   try {
     hostutil::failures[static_cast<std::size_t>(failure->service)].push_back(*failure);
+    hostutil::failuresPlanned = true;
   } catch (const std::bad_alloc&) {
     return HOST_ERR_EXCEPTION_MEMORY;
   }
@@ -55,6 +56,7 @@ HostError HostAddUtilityFailure(const HostUtilityFailure* failure) {
 
 void HostClearUtilityFailures(void) {
   for (auto& list : hostutil::failures) list.clear();
+  hostutil::failuresPlanned = false;
 }
 
 void HostBeginRehearsal(void) {

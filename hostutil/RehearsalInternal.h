@@ -1,23 +1,34 @@
 // The fault points of the services.
 #pragma once
 
+#include <array>
+#include <cstddef>
+
 #include "hostutil/HostSetup.h"
 
 namespace hostutil {
 
 extern constinit bool rehearsalRunning;
+extern constinit bool failuresPlanned;
+extern constinit std::array<int64_t, HOST_UTILITY_COUNT> callCounts;
 
-// Counts a call of the service in the rehearsal that runs. True when the call is to do nothing and return
-// *code; throws when it is to throw.
-bool CountCall(int32_t service, HostError* code);
+// Whether the call that was counted last is to do nothing and return *code; throws when it is to throw.
+bool IsPlannedToFail(int32_t service, HostError* code);
 
-// What every service in HOST_UTILITY_TABLE begins with. While no rehearsal runs it costs one load and one
-// predicted branch.
+// What every service in HOST_UTILITY_TABLE begins with. Counts the call while a rehearsal runs; true when it
+// is to do nothing and return *code. Costs a few loads and predicted branches where nothing is planned to
+// fail.
 inline bool Rehearsed(int32_t service, HostError* code) {
-  if (!rehearsalRunning) [[likely]] {
-    return false;
-  }
-  return CountCall(service, code);
+  if (!rehearsalRunning) return false;
+  ++callCounts[static_cast<std::size_t>(service)];
+  return failuresPlanned && IsPlannedToFail(service, code);
+}
+
+// For a service that does the work of many calls at once: it may not where a failure is planned, so that the
+// calls are then made one by one; else it counts them all.
+inline bool MayWorkInBulk() { return !rehearsalRunning || !failuresPlanned; }
+inline void CountCalls(int32_t service, int64_t calls) {
+  if (rehearsalRunning) callCounts[static_cast<std::size_t>(service)] += calls;
 }
 
 // Hands out null or zero, where the caller gave a place for it.

@@ -21,11 +21,17 @@ inline std::int64_t RecordCount(const RecordList* list) {
   return count;
 }
 
+// Makes an empty list.
+template <typename Record>
+void MakeList(RecordList** list) {
+  constexpr std::int64_t kGrowthStep = 10;
+  ThrowOnError(RecordListCreate(sizeof(Record), kGrowthStep, 0, list));
+}
+
 // Appends to a list that is made on first use.
 template <typename Record>
 void AppendRecord(RecordList** list, const Record& record) {
-  constexpr std::int64_t kGrowthStep = 10;
-  if (*list == nullptr) ThrowOnError(RecordListCreate(sizeof(Record), kGrowthStep, 0, list));
+  if (*list == nullptr) MakeList<Record>(list);
   ThrowOnError(RecordListAppend(*list, &record));
 }
 

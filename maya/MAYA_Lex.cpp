@@ -32,8 +32,11 @@ constexpr Keyword kKeywords[] = {
 };
 
 MayaToken KeywordOrIdentifier(std::string_view word) {
+  const unsigned char first = FoldCase(static_cast<unsigned char>(word.front()));
   for (const Keyword& keyword : kKeywords) {
-    if (SameWord(word, keyword.word)) return keyword.kind;
+    if (first == static_cast<unsigned char>(keyword.word.front()) && SameWord(word, keyword.word)) {
+      return keyword.kind;
+    }
   }
   return Identifier;
 }
@@ -57,6 +60,7 @@ MayaToken MAYA_Lex::GetNextToken(const char** start, const char** last) {
   switch (*position) {
     case '\0':
       kind = EndOfFile;
+      end_ = position;  // nothing behind this NUL is ever read
       break;
     case '"':
       kind = ParseQuote();
@@ -120,11 +124,14 @@ std::int32_t MAYA_Lex::SkipCharacters(const char* set) {
 
 MayaToken MAYA_Lex::ParseQuote() {
   // Deliberate: a backslash is looked at only as the byte before a quote, so that an escaped backslash before
-  // a quote keeps the string open. Reading escapes in pairs would end strings that have always run on.
+  // a quote keeps the string open. Reading escapes in pairs would end such a string earlier.
+  const char* at = position;
   do {
-    ++position;
-    if (*position == '\0') FailAtEnd();
-  } while (*position != '"' || position[-1] == '\\');
+    ++at;
+    while (*at != '"' && *at != '\0') ++at;
+  } while (*at == '"' && at[-1] == '\\');
+  position = at;
+  if (*at == '\0') FailAtEnd();
   return String;
 }
 
@@ -178,12 +185,16 @@ MayaToken MAYA_Lex::ParseID() {
 }
 
 void MAYA_Lex::ScanWord() {
-  // An embedded NUL is part of the word; only the end of the text is not.
-  while (!IsWordTerminator(*position)) {
-    if (position == end_) FailAtEnd();
-    ++position;
+  const char* at = position;
+  for (;;) {
+    while (!IsAny(*at, kTerminatorClass | kNulClass)) ++at;
+    // An embedded NUL is part of the word; only the end of the text is not.
+    if (*at != '\0') break;
+    position = at;
+    if (at == end_) FailAtEnd();
+    ++at;
   }
-  --position;
+  position = at - 1;
 }
 
 void MAYA_Lex::ReportError(const char* message) { UtilitySuite7().ShowMessage(G_plugin_idL, message); }

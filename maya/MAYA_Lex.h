@@ -79,6 +79,10 @@ class MAYA_Lex : public QZGP_SuiteHandler {
   const char* position;    // the scan position
   std::int32_t line = 0;   // line feeds passed over as white space
 
+ protected:
+  // The terminating NUL.
+  const char* end() const { return end_; }
+
  private:
   void ScanWord();
   void ParseLineComment();

@@ -13,17 +13,14 @@ MAYA_Parse::MAYA_Parse(const WNBasicSuite* basicSuite, const char* text, const c
 }
 
 MAYA_Parse::~MAYA_Parse() {
+  DisposeLooseKeys();
   RecordListDispose(cameras);
   RecordListDispose(transforms);
-  // A failure between a curve's first key and the end of its command leaves keys that only `current` holds.
-  RecordList* loose = currentKind == kCurveNode ? current.curve.keys : nullptr;
   for (std::int64_t i = 0;; ++i) {
     const auto* curve = static_cast<const MAYA_AnimCurve*>(RecordListPeek(curves, i));
     if (curve == nullptr) break;
-    if (curve->keys == loose) loose = nullptr;
     RecordListDispose(curve->keys);
   }
-  RecordListDispose(loose);
   RecordListDispose(curves);
   RecordListDispose(locators);
 }
@@ -112,7 +109,16 @@ double MAYA_Parse::ScanNumber(const char* first, const char* last) {
   return value;
 }
 
+// Keys that only `current` holds: a failure kept them from their record, or there is no record to write back
+// to.
+void MAYA_Parse::DisposeLooseKeys() {
+  if (currentKind != kCurveNode) return;
+  const auto* record = static_cast<const MAYA_AnimCurve*>(RecordListPeek(curves, currentRecord_));
+  if (record == nullptr || record->keys != current.curve.keys) RecordListDispose(current.curve.keys);
+}
+
 void MAYA_Parse::ClearCurrent() {
+  DisposeLooseKeys();
   currentKind = kNoNode;
   currentRecord_ = kNoIndex;
   std::memset(static_cast<void*>(&current), 0, sizeof current);

@@ -220,6 +220,7 @@ class MAYA_Parse : public MAYA_Lex {
   MayaToken NextInCommand(const char** first, const char** last);
   static double ScanNumber(const char* first, const char* last);
   void ClearCurrent();
+  void DisposeLooseKeys();
 
   // maya/MAYA_Parse_Nodes.cpp
   template <typename Record>
@@ -236,8 +237,10 @@ class MAYA_Parse : public MAYA_Lex {
   bool ReadLastNumber(double* value);
 
   // maya/MAYA_Parse_Keys.cpp
-  bool FindKeyAttribute();
-  void ReadKeys();
+  bool FindKeyAttribute(std::string_view* lastNumber);
+  void ReadKeys(std::int64_t countHint);
+  void ReadPlainKeys(std::int64_t countHint);
+  void AppendKeys(const void* keys, std::int64_t count, std::int64_t countHint);
   void WriteBackCurve();
 
   // maya/MAYA_Parse_Connections.cpp
@@ -273,7 +276,6 @@ class MAYA_Parse : public MAYA_Lex {
                                       const double (&translate)[kAxisCount]) const;
 
   // comp/MAYA_Parse_Sampling.cpp
-  NodeChannels FetchChannels(const MAYA_Transform& node) const;
   NodeChannels VerifyChannels(const MAYA_Transform& node);
   T_Time KeyTime(const NodeChannels& channels, std::int32_t n) const;
 

@@ -1,5 +1,9 @@
 // "setAttr" on animation curves: reads time and value pairs into the curve's key list. Writes `current` and
 // the curve list; calls no suite.
+#include <algorithm>
+#include <charconv>
+#include <cstddef>
+
 #include "maya/ListAccess.h"
 #include "maya/MAYA_Parse.h"
 #include "maya/TokenText.h"
@@ -13,10 +17,19 @@ bool NamesKeys(std::string_view text) {
   return text.find(".ktv") != std::string_view::npos || text.find(".keyTimeValue") != std::string_view::npos;
 }
 
+// How many keys to make room for: what the command says, but never more than the rest of the text could hold.
+std::int64_t KeyCountHint(std::string_view text, std::int64_t bytesLeft) {
+  constexpr std::int64_t kShortestKey = 4;  // two digits and two blanks
+  std::int64_t count = 0;
+  std::from_chars(text.data(), text.data() + text.size(), count);
+  return std::clamp(count, std::int64_t{0}, bytesLeft / kShortestKey);
+}
+
 }  // namespace
 
 void MAYA_Parse::ParseAnimSetAttr() {
-  if (FindKeyAttribute()) ReadKeys();
+  std::string_view keyCount;
+  if (FindKeyAttribute(&keyCount)) ReadKeys(KeyCountHint(keyCount, end() - position));
   WriteBackCurve();
 }
 
@@ -30,8 +43,9 @@ void MAYA_Parse::WriteBackCurve() {
   });
 }
 
-// Reads to behind the key attribute. False when the command ends without one.
-bool MAYA_Parse::FindKeyAttribute() {
+// Reads to behind the key attribute; hands out the last number before it, the key count as a rule. False when
+// the command ends without one.
+bool MAYA_Parse::FindKeyAttribute(std::string_view* lastNumber) {
   for (;;) {
     const char* first = nullptr;
     const char* last = nullptr;
@@ -43,6 +57,9 @@ bool MAYA_Parse::FindKeyAttribute() {
         // Deliberate: any other option eats the token behind it, a ";" too; the command then runs on.
         if (!SameWord(WordText(first, last), "-s")) GetNextToken(&first, &last);
         break;
+      case Number:
+        *lastNumber = WordText(first, last);
+        break;
       case Semicolon:
         return false;
       default:
@@ -53,8 +70,9 @@ bool MAYA_Parse::FindKeyAttribute() {
 
 // Reads on to the ";". Every number begins a key; the number behind it is its value, anything else is dropped
 // and makes the value 0.
-void MAYA_Parse::ReadKeys() {
+void MAYA_Parse::ReadKeys(std::int64_t countHint) {
   for (bool ended = false; !ended;) {
+    ReadPlainKeys(countHint);
     const char* first = nullptr;
     const char* last = nullptr;
     const MayaToken kind = NextInCommand(&first, &last);
@@ -65,6 +83,30 @@ void MAYA_Parse::ReadKeys() {
     const MayaToken next = NextInCommand(&first, &last);
     if (next == Number) key.value = ScanNumber(first, last);
     ended = next == Semicolon;
-    AppendRecord(&current.curve.keys, key);
+    AppendKeys(&key, 1, countHint);
   }
+}
+
+// Reads the keys that stand there as pairs of plain numbers, many at a time. What it leaves is read token by
+// token.
+void MAYA_Parse::ReadPlainKeys(std::int64_t countHint) {
+  constexpr std::int64_t kRun = 256;
+  static_assert(sizeof(MAYA_Key) == sizeof(double[2]) && offsetof(MAYA_Key, value) == sizeof(double));
+  double pairs[kRun][2];
+  for (std::int64_t count = kRun; count == kRun;) {
+    const char* behind = position;
+    count = HostNumberScanPairs(position, end(), pairs, kRun, &behind, &line);
+    if (count > 0) AppendKeys(pairs, count, countHint);
+    tokenStart = position = behind;
+  }
+}
+
+// Appends records of MAYA_Key to the current curve, whose list is made on first use.
+void MAYA_Parse::AppendKeys(const void* keys, std::int64_t count, std::int64_t countHint) {
+  RecordList** const list = &current.curve.keys;
+  if (*list == nullptr) {
+    MakeList<MAYA_Key>(list);
+    RecordListReserve(*list, countHint);
+  }
+  ThrowOnError(RecordListAppendRun(*list, keys, count));
 }

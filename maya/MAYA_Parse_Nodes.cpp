@@ -89,8 +89,9 @@ void MAYA_Parse::CreateNodeRecord(Record record, NodeKind kind, RecordList** lis
   }
   AppendRecord(list, record);
   const auto index = static_cast<std::int32_t>(RecordCount(*list) - 1);
-  ClearCurrent();
+  DisposeLooseKeys();
   currentKind = kind;
+  currentRecord_ = kNoIndex;
   std::memcpy(static_cast<void*>(&current), &record, sizeof record);
   if (names != nullptr) currentRecord_ = names->Append(*list, index, record.name);
 }

@@ -48,9 +48,26 @@ std::uint32_t HashName(std::string_view name) {
   return static_cast<std::uint32_t>(Mix(state, seed) >> 16);
 }
 
-std::string_view NameOf(const RecordList* list, std::int32_t index) {
-  const auto* name = static_cast<const char*>(RecordListPeek(list, index));
-  return name != nullptr ? std::string_view(name) : std::string_view();
+std::uint64_t LoadEight(const char* at) {
+  std::uint64_t bytes = 0;
+  std::memcpy(&bytes, at, sizeof bytes);
+  return bytes;
+}
+
+// Whether the record that begins with `field`, a name filled up with NULs, is one of that name.
+bool IsNamed(const char* field, std::string_view name) {
+  constexpr std::size_t kEight = sizeof(std::uint64_t);
+  if (name.size() >= kNameCapacity || field[name.size()] != '\0') return false;
+  std::size_t at = 0;
+  for (; at + kEight <= name.size(); at += kEight) {
+    if (FoldEight(LoadEight(field + at)) != FoldEight(LoadEight(name.data() + at))) return false;
+  }
+  return SameWord({field + at, name.size() - at}, name.substr(at));
+}
+
+bool IsNamed(const RecordList* list, std::int32_t index, std::string_view name) {
+  const auto* field = static_cast<const char*>(RecordListPeek(list, index));
+  return field != nullptr && IsNamed(field, name);
 }
 
 }  // namespace
@@ -76,7 +93,7 @@ std::size_t NameIndex::Locate(const RecordList* list, std::string_view name, std
   const std::size_t mask = entries_.size() - 1;
   std::size_t at = hash & mask;
   while (entries_[at].index != kNoIndex) {
-    if (entries_[at].hash == hash && SameWord(NameOf(list, entries_[at].index), name)) break;
+    if (entries_[at].hash == hash && IsNamed(list, entries_[at].index, name)) break;
     at = (at + 1) & mask;
   }
   return at;

@@ -8,10 +8,13 @@ namespace refhost {
 namespace {
 
 void dropKeysWithoutValue(Batch& batch) {
-  if (batch.valuedCount == batch.times.size()) return;
   const std::size_t dimension = static_cast<std::size_t>(batch.stream->dimension);
+  if (batch.valued.empty()) {
+    batch.times.resize(batch.values.size() / dimension);
+    return;
+  }
   std::size_t kept = 0;
-  for (std::size_t key = 0; key < batch.times.size(); ++key) {
+  for (std::size_t key = 0; key < batch.valued.size(); ++key) {
     if (batch.valued[key] == 0) continue;
     batch.times[kept] = batch.times[key];
     for (std::size_t i = 0; i < dimension; ++i) {
@@ -48,6 +51,17 @@ KeyColumns sorted(const KeyColumns& keys, std::size_t dimension) {
 }
 
 }  // namespace
+
+void Batch::setValueOutOfOrder(std::size_t index, const double* value) {
+  const std::size_t dimension = static_cast<std::size_t>(stream->dimension);
+  if (valued.empty()) valued.assign(values.size() / dimension, 1);
+  if (index >= valued.size()) {
+    valued.resize(index + 1, 0);
+    values.resize(valued.size() * dimension, 0.0);
+  }
+  valued[index] = 1;
+  std::copy(value, value + dimension, values.begin() + static_cast<std::ptrdiff_t>(index * dimension));
+}
 
 bool timeLess(const T_Time& a, const T_Time& b) {
   if (a.scale == 0 || b.scale == 0) {

@@ -17,23 +17,25 @@ struct Batch {
   Layer* layer = nullptr;
   Stream* stream = nullptr;
   std::vector<T_Time> times;
-  std::vector<double> values;        // dimension numbers per key; 0 until the key has its value
-  std::vector<std::uint8_t> valued;  // 1 when the key has its value
-  std::size_t valuedCount = 0;
+  std::vector<double> values;  // dimension numbers per key, as far as keys got values
+  // Which keys have a value, 1 or 0. Empty as long as they got theirs in their order: those that `values`
+  // holds.
+  std::vector<std::uint8_t> valued;
   bool endFailed = false;  // a rehearsal made its EndKeyframeBatch fail
 
-  void addKey(const T_Time& time) {
-    times.push_back(time);
-    values.resize(values.size() + static_cast<std::size_t>(stream->dimension), 0.0);
-    valued.push_back(0);
-  }
+  void addKey(const T_Time& time) { times.push_back(time); }
 
+  // There is a key of that index.
   void setValue(std::size_t index, const double* value) {
     const std::size_t dimension = static_cast<std::size_t>(stream->dimension);
-    for (std::size_t i = 0; i < dimension; ++i) values[index * dimension + i] = value[i];
-    if (valued[index] == 0) ++valuedCount;
-    valued[index] = 1;
+    if (index * dimension == values.size() && valued.empty()) {
+      for (std::size_t i = 0; i < dimension; ++i) values.push_back(value[i]);
+    } else {
+      setValueOutOfOrder(index, value);
+    }
   }
+
+  void setValueOutOfOrder(std::size_t index, const double* value);
 };
 
 // Moves the keys of the batch into the columns (null: there are none yet): sorted by time, stably, of equal

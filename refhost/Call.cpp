@@ -79,6 +79,13 @@ bool Call::areFinite(const double* values, std::int32_t count, const char* what)
   return true;
 }
 
+void Call::judge() {
+  const Verdict verdict = host_.rehearsal.judge(operation_);
+  rehearsed_ = verdict.rehearsed;
+  error_ = verdict.code;
+  if (verdict.throws()) thrown_ = verdict.kind;
+}
+
 TraceLine& Call::startLine() {
   const OperationFacts& facts = factsOf(operation_);
   return *traced(facts.suite, facts.version);
@@ -86,15 +93,15 @@ TraceLine& Call::startLine() {
 
 TraceLine* Call::traced(const char* suite, std::int32_t version) {
   if (!host_.trace.on()) return nullptr;
-  line_.emplace(host_.codec, factsOf(operation_).name, didItsWork());
+  line_ = &host_.traceLine.emplace(host_.codec, factsOf(operation_).name, didItsWork());
   line_->text("suite", suite).integer("version", version);
-  return &*line_;
+  return line_;
 }
 
 void Call::conclude() {
-  const bool outOfMemory = verdict_.kind == Failure::Kind::BadAlloc;
-  if (line_.has_value()) {
-    if (verdict_.throws()) {
+  const bool outOfMemory = thrown_ == Failure::Kind::BadAlloc;
+  if (line_ != nullptr) {
+    if (thrown_.has_value()) {
       line_->text("error", outOfMemory ? "bad_alloc" : "runtime_error");
     } else {
       line_->integer("error", error_);
@@ -102,7 +109,7 @@ void Call::conclude() {
     line_->end();
     host_.trace.write(*line_);
   }
-  if (!verdict_.throws()) return;
+  if (!thrown_.has_value()) return;
   if (outOfMemory) throw std::bad_alloc();
   throw std::runtime_error(std::string("rehearsed failure of ") + factsOf(operation_).name);
 }

@@ -17,9 +17,9 @@ namespace refhost {
 
 class Call {
  public:
-  explicit Call(Operation operation)
-      : host_(HostState::live()), operation_(operation), verdict_(host_.rehearsal.count(operation)) {
-    if (verdict_.rehearsed) error_ = verdict_.code;
+  explicit Call(Operation operation) : host_(HostState::live()), operation_(operation) {
+    if (host_.rehearsal.count(operation)) [[unlikely]]
+      judge();
   }
   Call(const Call&) = delete;
   Call& operator=(const Call&) = delete;
@@ -29,14 +29,14 @@ class Call {
   // False when the rehearsal has the call do nothing. A call that then returns 0 hands out null and 0.
   template <typename... Outs>
   bool goesOn(Outs*... outs) {
-    if (!verdict_.rehearsed) return true;
-    if (!verdict_.throws() && verdict_.code == 0) ((outs != nullptr ? void(*outs = Outs{}) : void()), ...);
+    if (!rehearsed_) return true;
+    if (!thrown_.has_value() && error_ == 0) ((outs != nullptr ? void(*outs = Outs{}) : void()), ...);
     return false;
   }
 
   // Whether the call did what it was asked for.
-  bool didItsWork() const { return !verdict_.rehearsed && error_ == 0; }
-  bool failed() const { return verdict_.throws() || error_ != 0; }
+  bool didItsWork() const { return !rehearsed_ && error_ == 0; }
+  bool failed() const { return thrown_.has_value() || error_ != 0; }
 
   void refuse(HostError code, const std::string& sentence);
 
@@ -85,11 +85,13 @@ class Call {
   TraceLine* traced(const char* suite, std::int32_t version);
 
   HostError finish() {
-    if (line_.has_value() || verdict_.throws()) conclude();
+    if (line_ != nullptr || rehearsed_) [[unlikely]]
+      conclude();
     return error_;
   }
 
  private:
+  void judge();
   TraceLine& startLine();
   void refuseHandle(const void* handle, HandleKind wanted, const char* what);
   void refuseNull(const char* what);
@@ -98,9 +100,10 @@ class Call {
 
   HostState& host_;
   Operation operation_;
-  Verdict verdict_;
   HostError error_ = 0;
-  std::optional<TraceLine> line_;
+  bool rehearsed_ = false;
+  std::optional<Failure::Kind> thrown_;  // the exception to throw at the end
+  TraceLine* line_ = nullptr;            // the host's, while this call writes it
 };
 
 }  // namespace refhost

@@ -111,14 +111,13 @@ class HandlePool {
   // Null when there are no more numbers or slots.
   void* add(Object object) {
     if (handedOut_ == UINT32_MAX) return nullptr;
-    std::size_t slot = slots_.size();
-    if (!free_.empty()) {
-      slot = free_.back();
-      free_.pop_back();
-    } else if (slot > HandleCodec::kSlotMask) {
-      return nullptr;
-    } else {
+    std::size_t slot = firstFree_;
+    if (slot == kNoSlot) {
+      slot = slots_.size();
+      if (slot > HandleCodec::kSlotMask) return nullptr;
       slots_.emplace_back();
+    } else {
+      firstFree_ = slots_[slot].nextFree;
     }
     slots_[slot].object = std::move(object);
     slots_[slot].number = ++handedOut_;
@@ -126,12 +125,7 @@ class HandlePool {
   }
 
   // The handle is live.
-  void remove(const void* handle) {
-    const std::size_t slot = HandleCodec::heldSlot(handle);
-    slots_[slot].object = Object{};
-    slots_[slot].number = 0;
-    free_.push_back(static_cast<std::uint32_t>(slot));
-  }
+  void remove(const void* handle) { release(HandleCodec::heldSlot(handle)); }
 
   template <typename Predicate>
   bool any(Predicate predicate) const {
@@ -152,25 +146,30 @@ class HandlePool {
   }
 
   void removeAll() {
-    free_.clear();
-    for (std::size_t slot = slots_.size(); slot-- > 0;) {
-      slots_[slot].object = Object{};
-      slots_[slot].number = 0;
-      free_.push_back(static_cast<std::uint32_t>(slot));
-    }
+    firstFree_ = kNoSlot;
+    for (std::size_t slot = slots_.size(); slot-- > 0;) release(slot);
   }
 
  private:
   struct Slot {
-    std::uint32_t number = 0;  // 0: free
+    std::uint32_t number = 0;    // 0: free
+    std::uint32_t nextFree = 0;  // of a free slot: the next one, or kNoSlot
     Object object{};
   };
+  static constexpr std::uint32_t kNoSlot = UINT32_MAX;
+
+  void release(std::size_t slot) {
+    slots_[slot].object = Object{};
+    slots_[slot].number = 0;
+    slots_[slot].nextFree = firstFree_;
+    firstFree_ = static_cast<std::uint32_t>(slot);
+  }
 
   const HandleCodec& codec_;
   HandleKind kind_;
   std::uint32_t handedOut_ = 0;
   std::vector<Slot> slots_;
-  std::vector<std::uint32_t> free_;
+  std::uint32_t firstFree_ = kNoSlot;
 };
 
 }  // namespace refhost

@@ -74,6 +74,8 @@ struct CallbackResult {
 
 class Host {
  public:
+  // Throws std::invalid_argument when a failure names an operation that the host does not have, and
+  // std::logic_error while another Host lives.
   explicit Host(HostOptions options);
   ~Host();  // unloads the module; calls the death hook first if unload() did not
   Host(const Host&) = delete;

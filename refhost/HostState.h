@@ -4,6 +4,7 @@
 
 #include <cstdint>
 #include <memory>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -79,6 +80,7 @@ class HostState {
   SuiteShelf suites;
   RehearsalRunner rehearsal;
   Trace trace;
+  std::optional<TraceLine> traceLine;  // of the call that runs; calls do not nest
   Preferences preferences;
   MessageBoard messages;
   std::vector<Importer> importers;  // by id - 1

@@ -52,6 +52,8 @@ void RehearsalRunner::planUtilityFailure(std::int32_t service, const Failure& fa
 void RehearsalRunner::begin(Callback callback) {
   calls_ = 0;
   active_ = callback == during_;
+  watching_ = active_ && !planned_.empty();
+  tally_ = active_ ? &counts_ : &others_;
   if (!active_) return;
   counts_.fill(0);
   HostBeginRehearsal();
@@ -59,7 +61,8 @@ void RehearsalRunner::begin(Callback callback) {
 
 void RehearsalRunner::end() {
   if (active_) HostEndRehearsal();
-  active_ = false;
+  active_ = watching_ = false;
+  tally_ = &others_;
 }
 
 Verdict RehearsalRunner::judge(Operation operation) const {

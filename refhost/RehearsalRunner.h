@@ -33,13 +33,15 @@ class RehearsalRunner {
   void begin(Callback callback);
   void end();
 
-  Verdict count(Operation operation) {
+  // Counts a call. True when its verdict is to be asked for; a call without one goes on.
+  bool count(Operation operation) {
     ++calls_;
-    if (!active_) return {};
-    ++counts_[static_cast<std::size_t>(operation)];
-    if (planned_.empty()) return {};
-    return judge(operation);
+    ++(*tally_)[static_cast<std::size_t>(operation)];
+    return watching_;
   }
+
+  // The verdict on the call that was counted last.
+  Verdict judge(Operation operation) const;
 
   bool refuses(std::string_view suite, std::int32_t version) const;
 
@@ -53,14 +55,17 @@ class RehearsalRunner {
   };
 
   void planUtilityFailure(std::int32_t service, const Failure& failure);
-  Verdict judge(Operation operation) const;
 
   Callback during_;
   const std::vector<RefusedSuite> refused_;
   std::vector<Planned> planned_;
   bool active_ = false;
   std::int64_t calls_ = 0;
-  std::array<std::int64_t, kOperationCount> counts_{};
+  using Tally = std::array<std::int64_t, kOperationCount>;
+  Tally counts_{};           // of the callback that the rehearsal is for
+  Tally others_{};           // of the other callbacks; nobody asks for them
+  Tally* tally_ = &others_;  // where the calls of the callback that runs are counted
+  bool watching_ = false;    // whether any call of the callback that runs may be rehearsed
 };
 
 }  // namespace refhost

@@ -1,0 +1,93 @@
+// Maya ASCII commands with made-up numbers.
+#pragma once
+
+#include <charconv>
+#include <cmath>
+#include <cstdint>
+#include <ostream>
+#include <random>
+#include <string>
+#include <string_view>
+
+namespace bench {
+
+class SceneText {
+ public:
+  SceneText(std::ostream& out, std::uint64_t seed) : out_(out), random_(seed) {
+    buffer_.reserve(kBufferBytes * 2);
+  }
+  ~SceneText() { flush(); }
+  SceneText(const SceneText&) = delete;
+  SceneText& operator=(const SceneText&) = delete;
+
+  SceneText& text(std::string_view part) {
+    buffer_.append(part);
+    if (buffer_.size() >= kBufferBytes) flush();
+    return *this;
+  }
+
+  SceneText& integer(std::int64_t value) {
+    char digits[32];
+    return text({digits, std::to_chars(digits, digits + sizeof digits, value).ptr});
+  }
+
+  SceneText& real(double value, int decimals) {
+    char digits[64];
+    return text(
+        {digits,
+         std::to_chars(digits, digits + sizeof digits, value, std::chars_format::fixed, decimals).ptr});
+  }
+
+  // Between -range and range; the same on every machine.
+  double number(double range) {
+    constexpr double kUnit = 1.0 / 9007199254740992.0;
+    return (static_cast<double>(random_() >> 11) * kUnit * 2.0 - 1.0) * range;
+  }
+
+  std::int64_t below(std::int64_t limit) {
+    return static_cast<std::int64_t>(random_() % static_cast<std::uint64_t>(limit));
+  }
+
+  void header(std::string_view timeUnit) {
+    text("//Maya ASCII 2024 scene\n//Name: measured.ma\nrequires maya \"2024\";\n");
+    text("currentUnit -l centimeter -a degree -t ").text(timeUnit).text(";\n");
+    text("fileInfo \"application\" \"bench\";\n");
+  }
+
+  void footer() {
+    text("select -ne :defaultResolution;\n\tsetAttr \".w\" 1920;\n\tsetAttr \".h\" 1080;\n");
+    text("\tsetAttr \".dar\" 1.7777777910232544;\n\tsetAttr \".pa\" 1;\n// End of measured.ma\n");
+  }
+
+  // A curve of baked keys from frame 1 on.
+  void curve(std::string_view type, const std::string& name, int keys, int decimals, double range) {
+    text("createNode ")
+        .text(type)
+        .text(" -n \"")
+        .text(name)
+        .text("\";\n\tsetAttr \".tan\" 18;\n\tsetAttr -s ");
+    integer(keys).text(" \".ktv[0:").integer(keys - 1).text("]\" ");
+    for (int k = 0; k < keys; ++k) {
+      text(k % 8 == 7 ? "\n\t\t" : " ").integer(k + 1).text(" ").real(number(range), decimals);
+    }
+    text(";\n");
+  }
+
+  void connect(const std::string& source, const std::string& destination) {
+    text("connectAttr \"").text(source).text("\" \"").text(destination).text("\";\n");
+  }
+
+ private:
+  static constexpr std::size_t kBufferBytes = 1 << 20;
+
+  void flush() {
+    out_.write(buffer_.data(), static_cast<std::streamsize>(buffer_.size()));
+    buffer_.clear();
+  }
+
+  std::ostream& out_;
+  std::mt19937_64 random_;
+  std::string buffer_;
+};
+
+}  // namespace bench

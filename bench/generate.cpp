@@ -1,0 +1,26 @@
+// bench-generate WORKLOAD FILE [SCALE]: writes a scene to measure the import with.
+#include <cstdlib>
+#include <fstream>
+#include <iostream>
+
+#include "bench/SceneGenerator.h"
+
+int main(int argc, char** argv) {
+  constexpr int kWrongUsage = 2;
+  constexpr int kNotWritten = 3;
+  constexpr std::uint64_t kSeed = 20240229;
+  const bench::Workload* workload = argc >= 3 ? bench::findWorkload(argv[1]) : nullptr;
+  const double scale = argc >= 4 ? std::atof(argv[3]) : 1.0;
+  if (workload == nullptr || !(scale > 0.0)) {
+    std::cerr << "usage: bench-generate mesh|keys|nodes|composition FILE [SCALE]\n";
+    return kWrongUsage;
+  }
+  std::ofstream out(argv[2], std::ios::binary);
+  workload->write(out, scale, kSeed);
+  out.close();
+  if (!out) {
+    std::cerr << "bench-generate: " << argv[2] << " could not be written\n";
+    return kNotWritten;
+  }
+  return 0;
+}

@@ -1,0 +1,84 @@
+// What an import owes the host after a failure, told from the calls that it made before.
+#pragma once
+
+#include <cstddef>
+#include <map>
+#include <set>
+#include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
+
+#include "hostapi/HostTypes.h"
+#include "tests/support/BuilderRun.h"
+
+namespace testsupport {
+
+// The name of a line's call.
+std::string CallName(std::string_view line);
+
+// A line without its error and what follows; the calls that clean up hand nothing out.
+std::string WithoutError(const std::string& line);
+std::vector<std::string> WithoutErrors(const std::vector<std::string>& lines);
+
+// Whether the call gave back 0.
+bool Succeeded(std::string_view line);
+
+// Follows a trace line by line and knows what is held.
+class HeldByImport {
+ public:
+  // A call that did nothing counts as failed, whatever its code.
+  void Take(std::string_view line, bool failed);
+
+  // The calls, in order, that end an import that fails now: the stream in use, open batches, the zoom stream,
+  // the parser's suites, the text, the driver's suites.
+  std::vector<std::string> CleanUp() const;
+
+  // Whether the handle's value is set without a guard: the first position and the first zoom of a camera
+  // layer.
+  bool IsUnguarded(std::string_view stream) const;
+
+  // Whether the batch has no key yet.
+  bool IsEmptyBatch(std::string_view batch) const { return keyed_.count(std::string(batch)) == 0; }
+
+ private:
+  struct Stream {
+    std::string handle;
+    bool unguarded;
+    bool zoom;
+    bool left;  // kept because its stream already had keys
+  };
+  using Suite = std::pair<std::size_t, std::string>;  // its place in the order of release, its line
+
+  void TakeStream(std::string_view line);
+
+  std::set<Suite> driverSuites_;
+  std::set<Suite> parserSuites_;
+  bool reading_ = true;  // until the text is locked
+  std::string memory_;
+  bool unlocked_ = false;
+  std::set<std::string> cameraLayers_;
+  std::map<std::pair<std::string, std::string>, int> acquisitions_;  // by layer and stream number
+  std::set<std::string> unguarded_;
+  std::vector<Stream> streams_;
+  std::vector<std::string> batches_;
+  std::set<std::string> keyed_;
+};
+
+// What is held after the first `count` calls of the trace; with `lastFailed` the last of them had failed.
+HeldByImport HeldAfter(const std::vector<std::string>& trace, std::size_t count, bool lastFailed);
+
+// Whether a code that the call gives back changes nothing.
+bool IsCodeIgnored(const std::vector<std::string>& trace, std::size_t index);
+
+// What a trace says that the host has made, but for the call `idle` (from 0), which did nothing.
+struct Made {
+  std::size_t compositions = 0;
+  std::size_t layers = 0;
+  std::size_t keys = 0;
+  std::size_t leftovers = 0;  // on the ledger, but for the file object
+};
+inline constexpr std::size_t kNoCall = static_cast<std::size_t>(-1);
+Made MadeBy(const std::vector<std::string>& trace, std::size_t idle = kNoCall);
+
+}  // namespace testsupport

@@ -1,0 +1,116 @@
+"""The documents themselves: links, names of files, and what README.md takes from the code."""
+
+import re
+import unittest
+
+from project import ROOT, read
+
+DOCUMENTS = ["README.md", "CHANGELOG.md"] + sorted(
+    path.relative_to(ROOT).as_posix() for path in (ROOT / "docs").glob("**/*.md")
+)
+LINK = re.compile(r"\[[^\]]*\]\(([^)\s]+)\)")
+FENCED = re.compile(r"^```.*?^```$", re.MULTILINE | re.DOTALL)
+QUOTED_FILE = re.compile(r"`((?:[\w.]+/)*[\w.]+\.(?:h|cpp|ma|md|json|txt))`")
+
+
+def anchors(text):
+    """The anchors of a document's headings, as they are derived from the words."""
+    found = set()
+    for heading in re.findall(r"^#+ (.+)$", FENCED.sub("", text), re.MULTILINE):
+        words = re.sub(r"[^\w\- ]", "", heading.lower())
+        found.add(words.replace(" ", "-"))
+    return found
+
+
+def links():
+    for name in DOCUMENTS:
+        for target in LINK.findall(FENCED.sub("", read(name))):
+            yield name, target
+
+
+class Documents(unittest.TestCase):
+    def test_every_relative_link_leads_somewhere(self):
+        followed = 0
+        for name, target in links():
+            if re.match(r"\w+:", target):
+                continue
+            path, _, anchor = target.partition("#")
+            file = (ROOT / name).parent / path if path else ROOT / name
+            self.assertTrue(file.exists(), f"{name}: {target}")
+            if anchor:
+                self.assertIn(anchor, anchors(file.read_text(encoding="utf-8")), f"{name}: {target}")
+            followed += 1
+        self.assertGreater(followed, 20)
+
+    def test_no_link_leads_out_of_the_project(self):
+        for name, target in links():
+            self.assertTrue(
+                ((ROOT / name).parent / target.partition("#")[0]).resolve().is_relative_to(ROOT), f"{name}: {target}"
+            )
+
+    def test_every_file_that_is_named_exists(self):
+        for name in DOCUMENTS:
+            for file in QUOTED_FILE.findall(read(name)):
+                if "/" in file:
+                    self.assertTrue((ROOT / file).exists(), f"{name} names {file}")
+
+    def test_the_architecture_lists_every_file_of_the_builder(self):
+        listed = set(re.findall(r"^\| `(MAYA_Parse_\w+\.cpp)` \|", read("docs/architecture.md"), re.MULTILINE))
+        self.assertEqual(listed, {path.name for path in (ROOT / "comp").glob("MAYA_Parse_*.cpp")})
+
+    def test_no_document_names_a_folder_of_this_machine(self):
+        home = r"(?<![\w.])/(?:home|root|work|tmp|mnt|Users)/"
+        for name in DOCUMENTS + ["LICENSE"]:
+            text = read(name)
+            self.assertIsNone(re.search(home, text), name)
+            self.assertNotIn(str(ROOT), text, name)
+
+    def test_no_document_has_lines_that_end_in_blanks_or_tabs(self):
+        for name in DOCUMENTS:
+            for line in read(name).splitlines():
+                self.assertIsNone(re.search(r"[ \t]$|\t", line), f"{name}: {line}")
+
+
+class Readme(unittest.TestCase):
+    readme = read("README.md")
+
+    def test_the_two_commands_are_its_first_lines(self):
+        self.assertTrue(self.readme.startswith("    scripts/import examples/crane_shot.ma\n    scripts/test\n"))
+        for file in ("scripts/import", "scripts/test", "examples/crane_shot.ma"):
+            self.assertTrue((ROOT / file).is_file(), file)
+
+    def test_it_has_the_exit_statuses_of_the_tool(self):
+        statuses = re.findall(r"^  \w+ = (\d),", read("tools/mayascene/ExitStatus.h"), re.MULTILINE)
+        self.assertTrue(statuses)
+        self.assertEqual(re.findall(r"^\| (\d) \| ", self.readme, re.MULTILINE), statuses)
+
+    def test_it_has_every_example(self):
+        listed = set(re.findall(r"\(examples/(\w+\.ma)\)", self.readme))
+        self.assertEqual(listed, {path.name for path in (ROOT / "examples").glob("*.ma")})
+
+    def test_every_option_in_the_documents_is_one_of_the_tool(self):
+        arguments = read("tools/mayascene/Arguments.cpp") + read("README.md").partition("Building by hand")[2]
+        for name in DOCUMENTS:
+            for option in re.findall(r"(?<![\w-])(--[a-z][\w-]+)", read(name)):
+                self.assertIn(option, arguments + "--help --version", f"{name} names {option}")
+
+    def test_it_has_every_preset(self):
+        line = re.search(r"The presets are (.*?):", self.readme, re.DOTALL)[1]
+        presets = re.findall(r'"name": "(\w+)",\n\s+"displayName"', read("CMakePresets.json"))
+        self.assertEqual(re.findall(r"`(\w+)`", line), presets)
+
+    def test_it_has_every_node_type_that_is_read(self):
+        table = re.search(r"kNodeTypes\[\] = \{(.*?)\};", read("maya/MAYA_Parse_Nodes.cpp"), re.DOTALL)[1]
+        for node_type in re.findall(r'\{"(\w+)"', table):
+            if "ransform" not in node_type:
+                self.assertIn(f"`{node_type}`", self.readme)
+
+
+class Changelog(unittest.TestCase):
+    def test_its_first_entry_is_the_projects_version(self):
+        version = re.search(r"project\(\w+ VERSION ([\d.]+)", read("CMakeLists.txt"))[1]
+        self.assertEqual(re.search(r"^## ([\d.]+)$", read("CHANGELOG.md"), re.MULTILINE)[1], version)
+
+
+if __name__ == "__main__":
+    unittest.main()

@@ -1,0 +1,109 @@
+#include "maya/NameIndex.h"
+
+#include <gtest/gtest.h>
+
+#include <cstring>
+#include <memory>
+#include <string>
+
+#include "maya/SceneRecords.h"
+
+namespace testsupport {
+namespace {
+
+class NameIndexTest : public ::testing::Test {
+ protected:
+  NameIndexTest() { EXPECT_EQ(RecordListCreate(sizeof(MAYA_Locator), 10, 0, &list_), 0); }
+  ~NameIndexTest() override { RecordListDispose(list_); }
+
+  // Appends a record of that name to the list and takes it in.
+  std::int32_t Add(const std::string& name) {
+    MAYA_Locator record{};
+    name.copy(record.name, kNameCapacity - 1);
+    EXPECT_EQ(RecordListAppend(list_, &record), 0);
+    return index_.Append(list_, count_++, name);
+  }
+
+  std::int32_t Find(const std::string& name) const { return index_.Find(list_, name); }
+
+  RecordList* list_ = nullptr;
+  NameIndex index_;
+  std::int32_t count_ = 0;
+};
+
+TEST_F(NameIndexTest, AnEmptyIndexFindsNothing) {
+  EXPECT_EQ(index_.Find(nullptr, "a"), kNoIndex);
+  EXPECT_EQ(index_.Find(nullptr, ""), kNoIndex);
+  EXPECT_EQ(Find("a"), kNoIndex);
+}
+
+TEST_F(NameIndexTest, AppendGivesTheFirstRecordOfTheName) {
+  EXPECT_EQ(Add("a"), 0);
+  EXPECT_EQ(Add("b"), 1);
+  EXPECT_EQ(Add("A"), 0);
+  EXPECT_EQ(Add("B"), 1);
+  EXPECT_EQ(Add("c"), 4);
+  EXPECT_EQ(Add("a"), 0);
+}
+
+TEST_F(NameIndexTest, FindGivesTheFirstRecordInAnyCase) {
+  Add("Camera1");
+  Add("camera1");
+  Add("CAMERA2");
+  EXPECT_EQ(Find("cAMERA1"), 0);
+  EXPECT_EQ(Find("camera2"), 2);
+  EXPECT_EQ(Find("camera"), kNoIndex);
+  EXPECT_EQ(Find("camera11"), kNoIndex);
+}
+
+TEST_F(NameIndexTest, TheEmptyNameIsANameLikeAnyOther) {
+  Add("a");
+  EXPECT_EQ(Find(""), kNoIndex);
+  EXPECT_EQ(Add(""), 1);
+  EXPECT_EQ(Add(""), 1);
+  EXPECT_EQ(Find(""), 1);
+}
+
+TEST_F(NameIndexTest, OnlyTheLettersAToZAreFolded) {
+  EXPECT_EQ(Add("[x"), 0);
+  EXPECT_EQ(Add("{x"), 1);
+  EXPECT_EQ(Add("@"), 2);
+  EXPECT_EQ(Add("`"), 3);
+  EXPECT_EQ(Add("\xc3\x89"), 4);
+  EXPECT_EQ(Add("\xc3\xa9"), 5);
+  EXPECT_EQ(Add("_"), 6);
+  EXPECT_EQ(Add("\x7f"), 7);
+  EXPECT_EQ(Add("0"), 8);
+  EXPECT_EQ(Add("\x10"), 9);
+  EXPECT_EQ(Find("{X"), 1);
+}
+
+TEST_F(NameIndexTest, TheLongestNamesAreToldApart) {
+  const std::string common(254, 'n');
+  EXPECT_EQ(Add(common + "a"), 0);
+  EXPECT_EQ(Add(common + "b"), 1);
+  EXPECT_EQ(Add(common), 2);
+  EXPECT_EQ(Find(common + "B"), 1);
+}
+
+TEST_F(NameIndexTest, ManyNamesAreAllFound) {
+  constexpr std::int32_t kNames = 20000;
+  for (std::int32_t number = 0; number < kNames; ++number)
+    ASSERT_EQ(Add("node_" + std::to_string(number)), number);
+  for (std::int32_t number = 0; number < kNames; ++number)
+    ASSERT_EQ(Find("NODE_" + std::to_string(number)), number);
+  EXPECT_EQ(Find("node_" + std::to_string(kNames)), kNoIndex);
+}
+
+TEST_F(NameIndexTest, ARecordMayChangeTheCaseOfItsName) {
+  Add("rig");
+  void* record = nullptr;
+  ASSERT_EQ(RecordListLock(list_, 0, &record), 0);
+  std::strcpy(static_cast<MAYA_Locator*>(record)->name, "RIG");
+  ASSERT_EQ(RecordListUnlock(list_, 0), 0);
+  EXPECT_EQ(Find("Rig"), 0);
+  EXPECT_EQ(Add("rIG"), 0);
+}
+
+}  // namespace
+}  // namespace testsupport

@@ -1,0 +1,111 @@
+#include "refhost/Handles.h"
+
+#include "tests/refhost/StandIn.h"
+
+namespace refhost {
+namespace {
+
+using ::testing::ElementsAre;
+
+struct Thing {
+  int worth = 0;
+};
+
+TEST(Handles, HandleFindsItsObjectUntilItIsGivenBack) {
+  const HandleCodec codec(1);
+  HandlePool<Thing> pool(codec, HandleKind::Stream);
+  void* handle = pool.add({41});
+  ASSERT_NE(pool.find(handle), nullptr);
+  EXPECT_EQ(pool.find(handle)->worth, 41);
+  EXPECT_FALSE(pool.wasGivenBack(handle));
+  pool.remove(handle);
+  EXPECT_EQ(pool.find(handle), nullptr);
+  EXPECT_TRUE(pool.wasGivenBack(handle));
+}
+
+TEST(Handles, RecycledSlotDoesNotReviveAStaleHandle) {
+  const HandleCodec codec(1);
+  HandlePool<Thing> pool(codec, HandleKind::Stream);
+  void* first = pool.add({1});
+  pool.remove(first);
+  void* second = pool.add({2});
+  EXPECT_EQ(HandleCodec::heldSlot(first), HandleCodec::heldSlot(second));
+  EXPECT_NE(first, second);
+  EXPECT_EQ(pool.find(first), nullptr);
+  EXPECT_TRUE(pool.wasGivenBack(first));
+  EXPECT_EQ(pool.find(second)->worth, 2);
+}
+
+TEST(Handles, EachAcquisitionHasANumberOfItsOwn) {
+  const HandleCodec codec(3);
+  HandlePool<Thing> pool(codec, HandleKind::Batch);
+  EXPECT_EQ(codec.describe(pool.add({1})), "batch:1");
+  void* second = pool.add({2});
+  EXPECT_EQ(codec.describe(second), "batch:2");
+  pool.remove(second);
+  EXPECT_EQ(codec.describe(pool.add({3})), "batch:3");
+  EXPECT_EQ(codec.describe(second), "batch:2");
+}
+
+TEST(Handles, HeldObjectsComeInTheOrderInWhichTheyWereHandedOut) {
+  const HandleCodec codec(0);
+  HandlePool<Thing> pool(codec, HandleKind::Memory);
+  void* first = pool.add({10});
+  pool.add({20});
+  pool.remove(first);
+  pool.add({30});  // in the first slot again
+  std::vector<int> worths;
+  for (const auto& [number, thing] : pool.held()) worths.push_back(thing->worth);
+  EXPECT_THAT(worths, ElementsAre(20, 30));
+}
+
+TEST(Handles, PointerToAnObjectOfTheProcessIsForeign) {
+  const HandleCodec codec(0);
+  HandlePool<Thing> pool(codec, HandleKind::Stream);
+  pool.add({1});
+  int local = 0;
+  EXPECT_EQ(codec.kindOf(&local), HandleKind::None);
+  EXPECT_EQ(pool.find(&local), nullptr);
+  EXPECT_FALSE(pool.wasGivenBack(&local));
+  EXPECT_EQ(codec.describe(&local), "foreign");
+}
+
+TEST(Handles, NumberThatWasNeverHandedOutIsNoStaleHandle) {
+  const HandleCodec codec(0);
+  HandlePool<Thing> pool(codec, HandleKind::Stream);
+  pool.add({1});
+  const void* invented = reinterpret_cast<const void*>(codec.held(HandleKind::Stream, 0, 9));
+  EXPECT_EQ(pool.find(invented), nullptr);
+  EXPECT_FALSE(pool.wasGivenBack(invented));
+}
+
+TEST(Handles, EveryKindHasItsNameInTheTrace) {
+  const HandleCodec codec(5);
+  const std::pair<HandleKind, const char*> kinds[] = {
+      {HandleKind::Item, "item:6"},     {HandleKind::Comp, "comp:6"},   {HandleKind::Layer, "layer:6"},
+      {HandleKind::Stream, "stream:6"}, {HandleKind::Batch, "batch:6"}, {HandleKind::Memory, "mem:6"},
+      {HandleKind::Store, "store:6"}};
+  for (const auto& [kind, text] : kinds) {
+    const bool givenBack =
+        kind == HandleKind::Stream || kind == HandleKind::Batch || kind == HandleKind::Memory;
+    const std::uintptr_t bits = givenBack ? codec.held(kind, 11, 6) : codec.lasting(kind, 6);
+    EXPECT_EQ(codec.describe(reinterpret_cast<const void*>(bits)), text);
+  }
+}
+
+TEST(Handles, HandleOfAnEarlierHostIsForeign) {
+  VOR_CompItem* old = nullptr;
+  {
+    StandIn earlier;
+    old = earlier.makeComp();
+  }
+  StandIn now;
+  now.makeComp();
+  VOR_Item* item = nullptr;
+  EXPECT_EQ(kCompSuite9.GetItemFromComp(old, &item), HOST_ERR_BAD_HANDLE);
+  EXPECT_THAT(now.leave().refusals,
+              ElementsAre("GetItemFromComp: the composition is no handle of this host"));
+}
+
+}  // namespace
+}  // namespace refhost

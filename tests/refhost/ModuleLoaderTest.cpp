@@ -1,0 +1,63 @@
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include "refhost/Host.h"
+
+namespace refhost {
+namespace {
+
+using ::testing::HasSubstr;
+using ::testing::StartsWith;
+
+HostOptions optionsFor(const char* module) {
+  HostOptions options;
+  options.module = module;
+  options.pluginId = 23;
+  return options;
+}
+
+TEST(ModuleLoader, EntryOfTheModuleIsCalledWithThePluginId) {
+  Host host(optionsFor(TINY_MODULE));
+  CallbackResult result;
+  std::string failure;
+  ASSERT_TRUE(host.load(&result, &failure)) << failure;
+  EXPECT_EQ(result.code, 23);
+}
+
+TEST(ModuleLoader, ModuleThatIsMissingIsToldInWords) {
+  Host host(optionsFor("/nowhere/at/all.so"));
+  CallbackResult result;
+  std::string failure;
+  EXPECT_FALSE(host.load(&result, &failure));
+  EXPECT_THAT(failure, StartsWith("the module cannot be loaded: "));
+  EXPECT_THAT(failure, HasSubstr("/nowhere/at/all.so"));
+}
+
+TEST(ModuleLoader, ModuleWithoutEntryIsToldInWords) {
+  Host host(optionsFor(MODULE_WITHOUT_ENTRY));
+  CallbackResult result;
+  std::string failure;
+  EXPECT_FALSE(host.load(&result, &failure));
+  EXPECT_THAT(failure, StartsWith("the module has no entry: "));
+}
+
+TEST(ModuleLoader, SecondLoadIsRefused) {
+  Host host(optionsFor(TINY_MODULE));
+  CallbackResult result;
+  std::string failure;
+  ASSERT_TRUE(host.load(&result, &failure)) << failure;
+  EXPECT_FALSE(host.load(&result, &failure));
+  EXPECT_EQ(failure, "the module is loaded already");
+}
+
+TEST(ModuleLoader, UnloadedModuleCanBeLoadedAgain) {
+  Host host(optionsFor(TINY_MODULE));
+  CallbackResult result;
+  std::string failure;
+  ASSERT_TRUE(host.load(&result, &failure));
+  host.unload();
+  EXPECT_TRUE(host.load(&result, &failure)) << failure;
+}
+
+}  // namespace
+}  // namespace refhost

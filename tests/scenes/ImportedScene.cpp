@@ -1,0 +1,59 @@
+#include "tests/scenes/ImportedScene.h"
+
+#include <algorithm>
+
+namespace scenes {
+
+std::filesystem::path sharedFolder(const char* folder) {
+  return std::filesystem::path(MAYASCENE_SOURCE_DIR) / ".." / "shared" / folder;
+}
+
+ImportedScene::ImportedScene(const std::filesystem::path& path, bool linearUnits) {
+  refhost::HostOptions options;
+  options.module = MAYASCENE_MODULE;
+  options.linearUnits = linearUnits ? 1 : 0;
+  host_ = std::make_unique<refhost::Host>(options);
+  std::string failure;
+  loaded_ = host_->load(&loadResult_, &failure) && loadResult_.code == 0;
+  if (loaded_) result_ = host_->importScene(path);
+}
+
+const refhost::Layer* ImportedScene::layer(const std::string& name) const {
+  const refhost::Layer* found = nullptr;
+  for (const refhost::Layer& layer : project().layers()) {
+    if (layer.name != name) continue;
+    if (found != nullptr) return nullptr;
+    found = &layer;
+  }
+  return found;
+}
+
+std::size_t ImportedScene::layers(refhost::LayerKind kind) const {
+  const auto& all = project().layers();
+  return static_cast<std::size_t>(
+      std::count_if(all.begin(), all.end(), [&](const refhost::Layer& layer) { return layer.kind == kind; }));
+}
+
+std::size_t ImportedScene::aimedCameras() const {
+  const auto& all = project().layers();
+  return static_cast<std::size_t>(
+      std::count_if(all.begin(), all.end(), [](const refhost::Layer& layer) { return layer.aimed; }));
+}
+
+std::size_t ImportedScene::keys() const {
+  std::size_t count = 0;
+  for (const refhost::Layer& layer : project().layers()) {
+    for (const refhost::Stream& stream : layer.streams) count += stream.keyCount();
+  }
+  return count;
+}
+
+std::multiset<std::string> ImportedScene::names(refhost::LayerKind kind) const {
+  std::multiset<std::string> names;
+  for (const refhost::Layer& layer : project().layers()) {
+    if (layer.kind == kind) names.insert(layer.name);
+  }
+  return names;
+}
+
+}  // namespace scenes

@@ -1,0 +1,43 @@
+// One scene, imported by the module into an embedded host of its own, and what came of it in numbers.
+#pragma once
+
+#include <filesystem>
+#include <memory>
+#include <set>
+#include <string>
+
+#include "refhost/Host.h"
+
+namespace scenes {
+
+// ../shared/FOLDER beside the source folder.
+std::filesystem::path sharedFolder(const char* folder);
+
+class ImportedScene {
+ public:
+  explicit ImportedScene(const std::filesystem::path& path, bool linearUnits = false);
+
+  // False when the module could not be loaded; then nothing else may be asked.
+  bool loaded() const { return loaded_; }
+  const refhost::CallbackResult& result() const { return result_; }
+  const refhost::CallbackResult& loadResult() const { return loadResult_; }
+  refhost::CallbackResult unload() { return host_->unload(); }
+
+  // The only layer of that name; null when there is none, or more than one.
+  const refhost::Layer* layer(const std::string& name) const;
+
+  std::size_t compositions() const { return host_->project().compositions().size(); }
+  std::size_t layers(refhost::LayerKind kind) const;
+  std::size_t aimedCameras() const;
+  std::size_t keys() const;  // of all streams of all layers
+  std::multiset<std::string> names(refhost::LayerKind kind) const;
+  const refhost::Project& project() const { return host_->project(); }
+
+ private:
+  std::unique_ptr<refhost::Host> host_;
+  bool loaded_ = false;
+  refhost::CallbackResult loadResult_;
+  refhost::CallbackResult result_;
+};
+
+}  // namespace scenes

@@ -1,0 +1,48 @@
+// A run that a signal ends.
+#include <gtest/gtest.h>
+#include <signal.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <chrono>
+#include <string>
+#include <thread>
+
+#include "tests/tools/ToolRun.h"
+
+namespace mayascene_test {
+namespace {
+
+using namespace std::chrono_literals;
+
+class Interruption : public ToolTest {
+ protected:
+  // Starts an import that takes a while and interrupts it once its output has been begun.
+  ToolResult interrupted(int signal) {
+    write("out.json", "before");
+    std::string many = sceneText("");
+    for (int i = 0; i < 30'000; ++i) many += "createNode camera -n \"cam" + std::to_string(i) + "\";\n";
+    write("many.ma", many);
+    const int process = start({"import", "--quiet", "--json", "out.json", "many.ma"});
+    for (int tries = 0; files().size() < 3 && tries < 10'000; ++tries) std::this_thread::sleep_for(1ms);
+    ::kill(process, signal);
+    return end(process);
+  }
+};
+
+TEST_F(Interruption, AnInterruptedRunEndsWith130AndLeavesNoPartialOutput) {
+  const ToolResult result = interrupted(SIGINT);
+  EXPECT_EQ(result.status, 130);
+  EXPECT_EQ(read("out.json"), "before");
+  EXPECT_EQ(files(), (std::vector<std::string>{"many.ma", "out.json"}));
+}
+
+TEST_F(Interruption, ATerminatedRunLeavesNoPartialOutputEither) {
+  const ToolResult result = interrupted(SIGTERM);
+  EXPECT_EQ(result.status, 143);
+  EXPECT_EQ(read("out.json"), "before");
+  EXPECT_EQ(files(), (std::vector<std::string>{"many.ma", "out.json"}));
+}
+
+}  // namespace
+}  // namespace mayascene_test

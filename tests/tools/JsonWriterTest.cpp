@@ -1,0 +1,90 @@
+#include "tools/mayascene/JsonWriter.h"
+
+#include <gtest/gtest.h>
+
+#include <cmath>
+#include <cstdint>
+#include <cstring>
+#include <limits>
+#include <nlohmann/json.hpp>
+#include <sstream>
+#include <string>
+#include <vector>
+
+namespace mayascene {
+namespace {
+
+std::string numberAsJson(double value) {
+  std::ostringstream out;
+  JsonWriter(out).number(value);
+  return out.str();
+}
+
+std::string textAsJson(std::string_view text) {
+  std::ostringstream out;
+  JsonWriter(out).text(text);
+  return out.str();
+}
+
+std::uint64_t bitsOf(double value) {
+  std::uint64_t bits = 0;
+  std::memcpy(&bits, &value, sizeof bits);
+  return bits;
+}
+
+TEST(JsonWriter, ObjectsAreSpreadOverLinesAndRowsAreNot) {
+  std::ostringstream out;
+  JsonWriter json(out);
+  json.beginObject();
+  json.key("a");
+  json.integer(1);
+  json.key("rows");
+  json.beginArray();
+  for (int i = 0; i < 2; ++i) {
+    json.beginRow();
+    json.integer(i);
+    json.beginArray();
+    json.boolean(true);
+    json.null();
+    json.endArray();
+    json.endArray();
+  }
+  json.endArray();
+  json.key("none");
+  json.beginArray();
+  json.endArray();
+  json.endObject();
+  EXPECT_EQ(
+      out.str(),
+      "{\n \"a\": 1,\n \"rows\": [\n  [0, [true, null]],\n  [1, [true, null]]\n ],\n \"none\": []\n}\n");
+}
+
+TEST(JsonWriter, DoublesAreShortAndGiveTheSameBitsBack) {
+  const std::vector<double> values = {0.1,      1.0 / 3.0, 1e22,  5e-324, 1.7976931348623157e308,
+                                      636.3812, -2.5e7,    100.0, -0.0,   0.0};
+  for (const double value : values) {
+    EXPECT_EQ(bitsOf(nlohmann::json::parse(numberAsJson(value)).get<double>()), bitsOf(value)) << value;
+  }
+  EXPECT_EQ(numberAsJson(0.1), "0.1");
+  EXPECT_EQ(numberAsJson(100.0), "100");
+  EXPECT_EQ(numberAsJson(-0.0), "-0.0");
+}
+
+TEST(JsonWriter, WhatJsonHasNoNumberForIsAText) {
+  EXPECT_EQ(numberAsJson(std::numeric_limits<double>::infinity()), "\"inf\"");
+  EXPECT_EQ(numberAsJson(-std::numeric_limits<double>::infinity()), "\"-inf\"");
+  EXPECT_EQ(numberAsJson(std::nan("")), "\"nan\"");
+}
+
+TEST(JsonWriter, TextIsAsciiAndReadsBackAsUtf8) {
+  EXPECT_EQ(textAsJson("a\"b\\c\n\x1b\x7f\xc2\x9b<b>"), "\"a\\\"b\\\\c\\n\\u001b\\u007f\\u009b<b>\"");
+  EXPECT_EQ(nlohmann::json::parse(textAsJson("caf\xc3\xa9 \xf0\x9f\x8e\xa5")).get<std::string>(),
+            "caf\xc3\xa9 \xf0\x9f\x8e\xa5");
+}
+
+TEST(JsonWriter, EachByteThatIsNoUtf8IsReplaced) {
+  EXPECT_EQ(textAsJson("a\xff\xfe"), "\"a\\ufffd\\ufffd\"");
+}
+
+}  // namespace
+}  // namespace mayascene

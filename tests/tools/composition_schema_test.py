@@ -1,0 +1,136 @@
+#!/usr/bin/env python3
+"""Runs the tool and validates what it writes against the JSON Schema; then checks that the schema refuses documents
+that are broken in one place each."""
+
+import argparse
+import copy
+import json
+import os
+import pathlib
+import subprocess
+import sys
+import tempfile
+
+import jsonschema
+
+HEADER = "//Maya ASCII 2023 scene\n"
+CAMERA = HEADER + """currentUnit -l centimeter -a degree -t film;
+createNode transform -n "boom";
+createNode transform -n "shotcam" -p "boom";
+createNode camera -n "shotcamShape\x1b\x07" -p "shotcam";
+createNode animCurveTA -n "boom_rotateX";
+\tsetAttr -s 3 ".ktv[0:2]" 1 0 2 7.5 3 15;
+connectAttr "boom_rotateX.o" "boom.rx";
+"""
+
+BROKEN = {
+    "another format": lambda d: d.update(format="mayascene"),
+    "another version": lambda d: d.update(version=2),
+    "no scenes": lambda d: d.update(scenes=[]),
+    "no death hook": lambda d: d.pop("deathHook"),
+    "an unknown outcome": lambda d: scene(d).update(outcome="done"),
+    "an import with an error": lambda d: scene(d).update(error={"code": 5, "name": "", "meaning": ""}),
+    "an error of code 0": lambda d: d["entry"].update(error={"code": 0, "name": "", "meaning": ""}),
+    "an import without compositions": lambda d: scene(d).update(compositions=[]),
+    "a message that is no text": lambda d: scene(d).update(messages=[7]),
+    "a duration in seconds": lambda d: composition(d).update(duration=5.0),
+    "a rate of three numbers": lambda d: composition(d).update(frameRate=[24, 1, 1]),
+    "a negative denominator": lambda d: composition(d).update(pixelAspect=[1, -1]),
+    "a layer of number 0": lambda d: layer(d).update(number=0),
+    "an unknown kind": lambda d: layer(d).update(kind="light"),
+    "a camera of six streams": lambda d: layer(d)["streams"].pop(),
+    "streams in another order": lambda d: layer(d)["streams"].reverse(),
+    "a null with a film size": lambda d: null(d).update(filmSize={"direction": "vertical", "points": 1}),
+    "a null that is aimed": lambda d: null(d).update(aimed=True),
+    "a position of two numbers": lambda d: layer(d)["streams"][1].update(value=[1, 2]),
+    "a value that is a word": lambda d: layer(d)["streams"][1].update(value=[1, 2, "three"]),
+    "another unit": lambda d: layer(d)["streams"][2].update(unit="factor"),
+    "keys without values": lambda d: null(d)["streams"][4]["keys"].pop("values"),
+    "no keys as an empty list": lambda d: layer(d)["streams"][1].update(keys=[]),
+}
+
+
+def scene(document):
+    return document["scenes"][0]
+
+
+def composition(document):
+    return scene(document)["compositions"][0]
+
+
+def layer(document):
+    return composition(document)["layers"][0]
+
+
+def null(document):
+    return composition(document)["layers"][1]
+
+
+def main():
+    parser = argparse.ArgumentParser()
+    parser.add_argument("--tool", required=True)
+    parser.add_argument("--schema", required=True)
+    parser.add_argument("--scenes", required=True)
+    arguments = parser.parse_args()
+
+    with open(arguments.schema, encoding="utf-8") as file:
+        schema = json.load(file)
+    jsonschema.Draft7Validator.check_schema(schema)
+    validator = jsonschema.Draft7Validator(schema)
+    failures = []
+
+    with tempfile.TemporaryDirectory() as folder:
+        environment = dict(os.environ, XDG_CONFIG_HOME=folder)
+
+        def document_of(*words):
+            run = subprocess.run(
+                [arguments.tool, "import", "--json", "-", *words],
+                stdout=subprocess.PIPE, stderr=subprocess.PIPE, cwd=folder, env=environment, check=False)
+            return json.loads(run.stdout)
+
+        def write(name, text):
+            pathlib.Path(folder, name).write_text(text, encoding="utf-8")
+
+        write("camera.ma", CAMERA)
+        write("wide.ma", CAMERA + "select -ne :defaultResolution;\n\tsetAttr \".pa\" 2;\n")
+        write("aperture.ma", CAMERA + "createNode camera -n \"c\";\n\tsetAttr \".cap\" 0 0;\n")
+        write("rig.ma", HEADER + "createNode transform -n \"rig\";\n")
+        write("notes.txt", "just some notes\n")
+        write("broken.ma", HEADER + "createNode transform -n \"open;\n")
+        examples = sorted(str(path) for path in pathlib.Path(arguments.scenes).glob("*.ma"))
+        if not examples:
+            failures.append(f"no scenes in {arguments.scenes}")
+        good = document_of("camera.ma")
+        documents = {
+            "a camera": good,
+            "every outcome": document_of("camera.ma", "wide.ma", "rig.ma", "notes.txt", "broken.ma", "missing.ma"),
+            "infinities": document_of("--permissive", "aperture.ma"),
+            "leftovers": document_of("--fail", "SetStreamValue:0=9", "camera.ma"),
+            "the examples": document_of(*examples),
+        }
+
+    for name, document in documents.items():
+        for error in validator.iter_errors(document):
+            failures.append(f"{name}: {error.message} at {list(error.absolute_path)}")
+    outcomes = {one["outcome"] for one in documents["every outcome"]["scenes"]}
+    if outcomes != {"imported", "nothing", "refused", "failed", "unreadable"}:
+        failures.append(f"not every outcome occurred: {outcomes}")
+    if '"inf"' not in json.dumps(documents["infinities"]):
+        failures.append("no infinity occurred")
+
+    for name, damage in BROKEN.items():
+        broken = copy.deepcopy(good)
+        damage(broken)
+        if broken == good:
+            failures.append(f"{name}: nothing was broken")
+        if validator.is_valid(broken):
+            failures.append(f"{name}: the schema takes a broken document")
+
+    for failure in failures:
+        print(failure)
+    print(f"{len(documents)} documents, {len(BROKEN)} broken ones, {len(failures)} failures")
+    return 1 if failures else 0
+
+
+if __name__ == "__main__":
+    sys.exit(main())
