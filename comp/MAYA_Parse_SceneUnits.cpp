@@ -8,7 +8,7 @@ double MAYA_Parse::ConvertDist(double distance) const {
   if (G_use_linear_unitsL == 0) return distance;
   switch (linearUnit) {
     case kMillimeter:
-      return distance / 25.4 * kPointsPerInch;
+      return distance / kMillimetersPerInch * kPointsPerInch;
     // Deliberate: metres come out 10000 times as far as the same number of centimetres, and kilometres lack
     // the step from centimetres to inches. Consistent rows would move every layer of a scene in these units.
     case kMeter:

@@ -39,6 +39,7 @@ double TakeManyTurns(double angle, double previous, double turn) {
 }  // namespace
 
 double UnwrapAngle(double angle, double previous) {
+  if (std::fabs(angle - previous) < kHalfTurn) return angle;
   if (!TurnChanges(angle) || !TurnChanges(previous)) return angle;
   angle = TakeManyTurns(angle, previous, angle > previous ? -kTurn : kTurn);
   while (angle - previous >= kHalfTurn) angle += -kTurn;

@@ -19,8 +19,6 @@ HOSTUTIL_API int32_t HostCompareNoCase(const char* a, const char* b);
 inline unsigned char FoldCase(unsigned char byte) {
   return byte >= 'A' && byte <= 'Z' ? static_cast<unsigned char>(byte | 0x20) : byte;
 }
-
-inline bool EqualNoCase(const char* a, const char* b) { return HostCompareNoCase(a, b) == 0; }
 #endif
 
 #endif

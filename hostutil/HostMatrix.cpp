@@ -75,7 +75,7 @@ HostError MatrixRotateAxis(TransformMatrix* matrix, double ax, double ay, double
   if (matrix == nullptr) return HOST_ERR_UTILITY_NULL;
   if (ax == 0.0 && ay == 0.0 && az == 0.0) return HOST_ERR_NONE;
   double axis[kAxes] = {ax, ay, az};
-  Normalise(axis);
+  if (ax * ax + ay * ay + az * az != 1.0) Normalise(axis);
   double rotation[kAxes][kAxes];
   MakeRotation(axis, angle, rotation);
   for (int column = 0; column < kSize; ++column) {

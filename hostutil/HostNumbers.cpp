@@ -5,6 +5,7 @@
 #include "hostutil/HostNumbers.h"
 
 #include <algorithm>
+#include <array>
 #include <bit>
 #include <charconv>
 #include <cstdlib>
@@ -185,13 +186,23 @@ const char* PlainDigits(const char* at, const char* end, uint64_t* mantissa) {
   return at;
 }
 
-bool EndsWord(char c) { return c == ' ' || c == '\n' || c == ';' || c == '\t' || c == '\r'; }
+// The bytes that pairs of numbers are set apart by, and what may stand behind the last one.
+enum Separator : uint8_t { kNoSeparator = 0, kBlank = 1, kEndOfCommand = 2 };
+
+constexpr auto kSeparators = [] {
+  std::array<uint8_t, 256> separators{};
+  for (const char c : {' ', '\t', '\r', '\n'}) separators[static_cast<unsigned char>(c)] = kBlank;
+  separators[';'] = kEndOfCommand;
+  return separators;
+}();
+
+uint8_t SeparatorOf(char c) { return kSeparators[static_cast<unsigned char>(c)]; }
 
 // Passes over white space and reads one number of plain form. False, with nothing to rely on, when there is
 // none.
 bool ScanPlain(const char** text, const char* end, double* value, int32_t* lines) {
   const char* at = *text;
-  for (; *at == ' ' || *at == '\n' || *at == '\t' || *at == '\r'; ++at) *lines += *at == '\n' ? 1 : 0;
+  for (; SeparatorOf(*at) == kBlank; ++at) *lines += *at == '\n' ? 1 : 0;
   const bool negative = *at == '-';
   Cursor cursor{at + (negative ? 1 : 0), end};
   Decimal decimal{};
@@ -207,14 +218,14 @@ bool ScanPlain(const char** text, const char* end, double* value, int32_t* lines
     decimal.digits += decimal.fraction;
   }
   if (decimal.digits == 0) return false;
-  if (!EndsWord(*cursor.at)) {
+  if (SeparatorOf(*cursor.at) == kNoSeparator) {
     ReadExponent(&cursor, &decimal);
-    if (!EndsWord(*cursor.at)) return false;
+    if (SeparatorOf(*cursor.at) == kNoSeparator) return false;
   }
   if (cursor.at - at > kLongestPlainNumber) return false;
   decimal.end = cursor.at;
   double magnitude = 0.0;
-  if (Convert(decimal, &magnitude) != HOST_ERR_NONE) return false;
+  if (!ConvertExactly(decimal, &magnitude) && Convert(decimal, &magnitude) != HOST_ERR_NONE) return false;
   *value = negative ? -magnitude : magnitude;
   *text = cursor.at;
   return true;

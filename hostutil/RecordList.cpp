@@ -10,6 +10,7 @@
 #include <unordered_map>
 
 #include "hostapi/ErrorCodes.h"
+#include "hostutil/HostSetup.h"
 #include "hostutil/RegistryInternal.h"
 #include "hostutil/RehearsalInternal.h"
 
@@ -64,6 +65,7 @@ bool SetCapacity(RecordList* list, int64_t capacity) {
   if (records == nullptr) return false;
   list->records = static_cast<unsigned char*>(records);
   list->capacity = capacity;
+  HostAdviseLargePages(records, capacity * list->recordSize);
   return true;
 }
 

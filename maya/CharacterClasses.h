@@ -10,6 +10,7 @@ enum CharacterClass : std::uint8_t {
   kNulClass = 4,
   kLetterClass = 8,
   kNumberStartClass = 16,  // digits, "-" and "."
+  kQuoteClass = 32,
 };
 
 inline constexpr auto kCharacterClasses = [] {
@@ -21,6 +22,7 @@ inline constexpr auto kCharacterClasses = [] {
   for (const char c : {' ', '\t', '\r', '\n'}) add(c, kWhiteSpaceClass | kTerminatorClass);
   add(';', kTerminatorClass);
   add('\0', kNulClass);
+  add('"', kQuoteClass);
   for (char c = 'a'; c <= 'z'; ++c) add(c, kLetterClass);
   for (char c = 'A'; c <= 'Z'; ++c) add(c, kLetterClass);
   for (char c = '0'; c <= '9'; ++c) add(c, kNumberStartClass);

@@ -9,7 +9,7 @@
 
 namespace {
 
-// ---- SSE2: ranges of bytes, sixteen at a time -------------------------------------------------------------
+// ---- SSE2: ranges of bytes, sixteen at a time ----
 
 // 0xff for every byte from `first` on, `count` of them.
 __m128i InRange(__m128i bytes, char first, char count) {
@@ -46,8 +46,7 @@ BlockMasks ClassifySse2(const char* block) {
   return masks;
 }
 
-// ---- AVX2: a table look-up by nibbles, 32 bytes at a time
-// --------------------------------------------------
+// ---- AVX2: a table look-up by nibbles, 32 bytes at a time ----
 
 // A byte belongs to a class where the entries of both its nibbles have the bit.
 enum NibbleClass : unsigned {

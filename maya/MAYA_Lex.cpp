@@ -128,7 +128,7 @@ MayaToken MAYA_Lex::ParseQuote() {
   const char* at = position;
   do {
     ++at;
-    while (*at != '"' && *at != '\0') ++at;
+    while (!IsAny(*at, kQuoteClass | kNulClass)) ++at;
   } while (*at == '"' && at[-1] == '\\');
   position = at;
   if (*at == '\0') FailAtEnd();

@@ -15,12 +15,13 @@
 #include "maya/MAYA_Lex.h"
 #include "maya/NameIndex.h"
 #include "maya/SceneRecords.h"
+#include "maya/SceneUnits.h"
 
 struct NodeChannels;
 
 class MAYA_Parse : public MAYA_Lex {
  public:
-  // ---- maya/MAYA_Parse.cpp: lifetime and the main loop --------------------------------------------------
+  // ---- maya/MAYA_Parse.cpp: lifetime and the main loop ----
 
   // The text as for MAYA_Lex. The settings have their defaults, the lists are null.
   MAYA_Parse(const WNBasicSuite* basicSuite, const char* buffer, const char* end = nullptr);
@@ -48,7 +49,7 @@ class MAYA_Parse : public MAYA_Lex {
   static void BuildQuote(const char* first, const char* last, std::int32_t* length,
                          char (&text)[kNameCapacity]);
 
-  // ---- maya/MAYA_Parse_Nodes.cpp: "createNode" ----------------------------------------------------------
+  // ---- maya/MAYA_Parse_Nodes.cpp: "createNode" ----
 
   void ParseCreateNode();
   void ParseCreateTransformNode();
@@ -57,25 +58,25 @@ class MAYA_Parse : public MAYA_Lex {
   void ParseCreateAnimNode();
   void ParseCreateLocatorNode();
 
-  // ---- maya/MAYA_Parse_Attributes.cpp: "setAttr" on transforms and cameras -------------------------------
+  // ---- maya/MAYA_Parse_Attributes.cpp: "setAttr" on transforms and cameras ----
 
   void ParseTransformSetAttr();
   void ParseCameraSetAttr();
 
-  // ---- maya/MAYA_Parse_Keys.cpp: "setAttr" on animation curves -------------------------------------------
+  // ---- maya/MAYA_Parse_Keys.cpp: "setAttr" on animation curves ----
 
   void ParseAnimSetAttr();
 
-  // ---- maya/MAYA_Parse_Render.cpp: "select", and "setAttr" on the render settings ------------------------
+  // ---- maya/MAYA_Parse_Render.cpp: "select", and "setAttr" on the render settings ----
 
   void ParseSelect();
   void ParseRenderSetAttr();
 
-  // ---- maya/MAYA_Parse_Units.cpp: "currentUnit" ----------------------------------------------------------
+  // ---- maya/MAYA_Parse_Units.cpp: "currentUnit" ----
 
   void ParseCurrentUnit();
 
-  // ---- maya/MAYA_Parse_Connections.cpp: "connectAttr" ----------------------------------------------------
+  // ---- maya/MAYA_Parse_Connections.cpp: "connectAttr" ----
 
   void ParseConnectAttr();
 
@@ -84,14 +85,13 @@ class MAYA_Parse : public MAYA_Lex {
   void MakeConnection(std::string_view source, std::size_t sourceDot, std::string_view destination,
                       std::size_t destinationDot);
 
-  // ---- comp/MAYA_Parse_Assembly.cpp: the compositions -----------------------------------------------------
+  // ---- comp/MAYA_Parse_Assembly.cpp: the compositions ----
 
   // Builds the composition in the folder, under the name (NUL-terminated). A scene without a camera list
   // makes nothing. What was made before a failure stays.
   void MakeComp(VOR_Item* folder, const UTF16String* name);
 
-  // ---- comp/MAYA_Parse_Layers.cpp: cameras, locators, and the nulls above them
-  // -----------------------------
+  // ---- comp/MAYA_Parse_Layers.cpp: cameras, locators, and the nulls above them ----
 
   void CreateCameraLayerAndKeyframes(VOR_CompItem* comp, const MAYA_Camera* camera);
   void CreateLocatorLayerAndKeyframes(VOR_CompItem* comp, const MAYA_Locator* locator);
@@ -99,15 +99,15 @@ class MAYA_Parse : public MAYA_Lex {
   // Makes the locator's null layer with its transform applied, and hands it out.
   void CreateLocator(const MAYA_Locator* locator, VOR_CompItem* comp, VOR_Layer** layer);
 
-  // ---- comp/MAYA_Parse_CameraAnimation.cpp: zoom keys, then the camera's transform ------------------------
+  // ---- comp/MAYA_Parse_CameraAnimation.cpp: zoom keys, then the camera's transform ----
 
   void ApplyCameraAnimation(VOR_Layer* layer, const MAYA_Camera* camera);
 
-  // ---- comp/MAYA_Parse_TransformAnimation.cpp: keys of position, rotation and scale -----------------------
+  // ---- comp/MAYA_Parse_TransformAnimation.cpp: keys of position, rotation and scale ----
 
   void ApplyTransformAnimation(VOR_Layer* layer, const MAYA_Transform* node);
 
-  // ---- comp/MAYA_Parse_LookAt.cpp: aiming a camera --------------------------------------------------------
+  // ---- comp/MAYA_Parse_LookAt.cpp: aiming a camera ----
 
   // Aims the camera at the constraint's target. False, and nothing done, when the constraint turns another
   // transform than the camera's.
@@ -119,7 +119,7 @@ class MAYA_Parse : public MAYA_Lex {
   // Switches aiming on and sets the anchor point to the node's translate.
   void SetAnchorPoint(VOR_Layer* layer, const MAYA_Transform* node);
 
-  // ---- comp/MAYA_Parse_Camera.cpp: the lens ---------------------------------------------------------------
+  // ---- comp/MAYA_Parse_Camera.cpp: the lens ----
 
   void SetCamera(VOR_Layer* layer, const MAYA_Camera* camera);
 
@@ -129,12 +129,12 @@ class MAYA_Parse : public MAYA_Lex {
   // The zoom in pixels for a film size in points and a focal length in millimetres; null takes the camera's.
   double CalculateZoom(const MAYA_Camera* camera, double filmSize, const double* focalLength) const;
 
-  // ---- comp/MAYA_Parse_Transform.cpp: a transform in the host's space -------------------------------------
+  // ---- comp/MAYA_Parse_Transform.cpp: a transform in the host's space ----
 
   // Sets anchor point, scale, rotations and position of the layer.
   void SetTransform(VOR_Layer* layer, const MAYA_Transform* node);
 
-  // ---- comp/MAYA_Parse_Sampling.cpp: the keys of a node, by index -----------------------------------------
+  // ---- comp/MAYA_Parse_Sampling.cpp: the keys of a node, by index ----
 
   // The key count that the node's channels share, 0 when none is animated. Throws 1289987 after its message
   // when two animated channels differ.
@@ -147,7 +147,7 @@ class MAYA_Parse : public MAYA_Lex {
   void ExtractAnimInfo(const MAYA_Transform* node, std::int32_t group, std::int32_t n,
                        double (&values)[kAxisCount]);
 
-  // ---- comp/MAYA_Parse_Streams.cpp: values and keyframe batches -------------------------------------------
+  // ---- comp/MAYA_Parse_Streams.cpp: values and keyframe batches ----
 
   // Each acquires the stream, uses it and releases it, also after a failure. A standard exception in between
   // is translated.
@@ -163,8 +163,7 @@ class MAYA_Parse : public MAYA_Lex {
   // Commits the batch. A code of the host's is ignored.
   void EndAddingKeyframes(VOR_AddKeyframesInfo* batch);
 
-  // ---- comp/MAYA_Parse_Timing.cpp: times, rates, aspects
-  // ---------------------------------------------------
+  // ---- comp/MAYA_Parse_Timing.cpp: times, rates, aspects ----
 
   // Sets the process-wide time offset to 0.
   static void ResetOffset();
@@ -181,14 +180,12 @@ class MAYA_Parse : public MAYA_Lex {
   // The horizontal scale factor: the pixel aspect.
   double CalculateHSF() const;
 
-  // ---- comp/MAYA_Parse_SceneUnits.cpp: distances and angles
-  // -----------------------------------------------------
+  // ---- comp/MAYA_Parse_SceneUnits.cpp: distances and angles ----
 
   double ConvertDist(double distance) const;
   double ConvertRot(double angle) const;
 
-  // ---- The scene
-  // -------------------------------------------------------------------------------------------
+  // ---- The scene ----
 
   // The node that the last "createNode" or "select" made current, as a copy of its record.
   std::int32_t currentKind = kNoNode;
@@ -199,10 +196,10 @@ class MAYA_Parse : public MAYA_Lex {
     MAYA_Locator locator;
   } current;
 
-  std::int32_t timeUnit = 3;    // 1 to 12, see ParseCurrentUnit
-  double frameRate = 29.97;     // frames per second, with timeUnit 12
-  std::int32_t angleUnit = 1;   // 1 degrees, 2 radians
-  std::int32_t linearUnit = 2;  // 1 to 8, millimetres to miles
+  std::int32_t timeUnit = kSecond;
+  double frameRate = 29.97;  // frames per second, with kCustomRate
+  std::int32_t angleUnit = kDegree;
+  std::int32_t linearUnit = kCentimeter;
 
   std::int32_t resolutionWidth = 720;  // pixels
   std::int32_t resolutionHeight = 486;

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <charconv>
 #include <cstddef>
+#include <cstring>
 
 #include "maya/ListAccess.h"
 #include "maya/MAYA_Parse.h"
@@ -17,9 +18,12 @@ bool NamesKeys(std::string_view text) {
   return text.find(".ktv") != std::string_view::npos || text.find(".keyTimeValue") != std::string_view::npos;
 }
 
-// How many keys to make room for: what the command says, but never more than the rest of the text could hold.
-std::int64_t KeyCountHint(std::string_view text, std::int64_t bytesLeft) {
+// How many keys to make room for: what the command says, but never more than its own text could hold.
+std::int64_t KeyCountHint(std::string_view text, const char* keys, const char* end) {
   constexpr std::int64_t kShortestKey = 4;  // two digits and two blanks
+  const auto* commandEnd =
+      static_cast<const char*>(std::memchr(keys, ';', static_cast<std::size_t>(end - keys)));
+  const std::int64_t bytesLeft = (commandEnd != nullptr ? commandEnd : end) - keys;
   std::int64_t count = 0;
   std::from_chars(text.data(), text.data() + text.size(), count);
   return std::clamp(count, std::int64_t{0}, bytesLeft / kShortestKey);
@@ -29,7 +33,7 @@ std::int64_t KeyCountHint(std::string_view text, std::int64_t bytesLeft) {
 
 void MAYA_Parse::ParseAnimSetAttr() {
   std::string_view keyCount;
-  if (FindKeyAttribute(&keyCount)) ReadKeys(KeyCountHint(keyCount, end() - position));
+  if (FindKeyAttribute(&keyCount)) ReadKeys(KeyCountHint(keyCount, position, end()));
   WriteBackCurve();
 }
 

@@ -1,6 +1,5 @@
 #include "refhost/Call.h"
 
-#include <cmath>
 #include <new>
 #include <stdexcept>
 
@@ -69,14 +68,8 @@ bool Call::isStore(HostPrefsStore* handle) {
   return known;
 }
 
-bool Call::areFinite(const double* values, std::int32_t count, const char* what) {
-  if (host_.options.permissive) return true;
-  for (std::int32_t i = 0; i < count; ++i) {
-    if (std::isfinite(values[i])) continue;
-    refuse(HOST_ERR_BAD_VALUE, std::string(what) + " is not finite");
-    return false;
-  }
-  return true;
+void Call::refuseNotFinite(const char* what) {
+  refuse(HOST_ERR_BAD_VALUE, std::string(what) + " is not finite");
 }
 
 void Call::judge() {

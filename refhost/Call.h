@@ -5,6 +5,7 @@
 // throws when the rehearsal asked for an exception, so nothing that has to happen may come after it.
 #pragma once
 
+#include <cmath>
 #include <cstdint>
 #include <optional>
 #include <string>
@@ -38,7 +39,7 @@ class Call {
   bool didItsWork() const { return !rehearsed_ && error_ == 0; }
   bool failed() const { return thrown_.has_value() || error_ != 0; }
 
-  void refuse(HostError code, const std::string& sentence);
+  [[gnu::cold]] void refuse(HostError code, const std::string& sentence);
 
   // A refusal with a code of its own that is nobody's broken promise.
   void fail(HostError code) { error_ = code; }
@@ -77,7 +78,13 @@ class Call {
     if (pluginId != host_.options.pluginId) refusePluginId(pluginId);
     return pluginId == host_.options.pluginId;
   }
-  bool areFinite(const double* values, std::int32_t count, const char* what);
+  bool areFinite(const double* values, std::int32_t count, const char* what) {
+    bool finite = true;
+    for (std::int32_t i = 0; i < count; ++i) finite = finite && std::isfinite(values[i]);
+    if (finite || host_.options.permissive) return true;
+    refuseNotFinite(what);
+    return false;
+  }
 
   // The line to describe the arguments in, null when there is no trace.
   TraceLine* traced() { return host_.trace.on() ? &startLine() : nullptr; }
@@ -92,11 +99,12 @@ class Call {
 
  private:
   void judge();
-  TraceLine& startLine();
-  void refuseHandle(const void* handle, HandleKind wanted, const char* what);
-  void refuseNull(const char* what);
-  void refusePluginId(std::int32_t pluginId);
-  void conclude();
+  [[gnu::cold]] TraceLine& startLine();
+  [[gnu::cold]] void refuseHandle(const void* handle, HandleKind wanted, const char* what);
+  [[gnu::cold]] void refuseNull(const char* what);
+  [[gnu::cold]] void refusePluginId(std::int32_t pluginId);
+  [[gnu::cold]] void refuseNotFinite(const char* what);
+  [[gnu::cold]] void conclude();
 
   HostState& host_;
   Operation operation_;

@@ -5,6 +5,7 @@
 #include <string>
 #include <utility>
 
+#include "hostutil/HostSetup.h"
 #include "refhost/Call.h"
 #include "refhost/SuiteShelf.h"
 
@@ -19,7 +20,9 @@ constexpr std::int32_t kNoFlags = 0;
 void* allocate(std::int64_t size) {
   const std::uint64_t bytes = static_cast<std::uint64_t>(size);
   if (bytes > kLargestBlock || bytes > SIZE_MAX) return nullptr;
-  return ::operator new(static_cast<std::size_t>(bytes), std::nothrow);
+  void* memory = ::operator new(static_cast<std::size_t>(bytes), std::nothrow);
+  HostAdviseLargePages(memory, size);
+  return memory;
 }
 
 void newMemHandle(Call& call, const char* name, std::int64_t size, std::int32_t flags,

@@ -27,8 +27,8 @@ TEST(HostCompareTest, EveryPairOfBytesComparesAsItsFoldedForms) {
 TEST(HostCompareTest, CaseIsIgnoredThroughTheWholeText) {
   EXPECT_EQ(HostCompareNoCase("//Maya", "//MAYA"), 0);
   EXPECT_EQ(HostCompareNoCase("createNode", "CREATENODE"), 0);
-  EXPECT_TRUE(EqualNoCase("AnimCurve", "animcurve"));
-  EXPECT_FALSE(EqualNoCase("animCurve", "animCurveTL"));
+  EXPECT_EQ(HostCompareNoCase("AnimCurve", "animcurve"), 0);
+  EXPECT_NE(HostCompareNoCase("animCurve", "animCurveTL"), 0);
 }
 
 TEST(HostCompareTest, AShorterTextComesBeforeALongerOneThatBeginsWithIt) {

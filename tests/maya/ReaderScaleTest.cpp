@@ -1,4 +1,10 @@
 // Large scenes cost a number of list calls that grows with the scene and no faster.
+#include <string>
+
+#if defined(__GLIBC__)
+#include <malloc.h>
+#endif
+
 #include "hostutil/HostSetup.h"
 #include "tests/support/ReaderFixture.h"
 
@@ -46,6 +52,24 @@ TEST_F(ScaleTest, ManyUnnamedNodes) {
   ExpectLinear(Nodes([](int) { return std::string(); }), kNodes);
   EXPECT_EQ(TransformCount(), kNodes);
 }
+
+#if defined(__GLIBC__) && !defined(__SANITIZE_ADDRESS__)
+TEST_F(ScaleTest, AKeyCountThatLiesReservesNoMoreThanItsCommandCouldHold) {
+  constexpr int kCurves = 20000;
+  constexpr std::size_t kBytesPerCurve = 4096;  // two records of half a kilobyte, a list, and its few keys
+  std::string text;
+  for (int number = 0; number < kCurves; ++number) {
+    text += "createNode animCurveTL -n \"c" + std::to_string(number) +
+            "\";\nsetAttr -s 999999999 \".ktv[0:1]\" 1 0 2 5;\n";
+  }
+  const struct mallinfo2 before = mallinfo2();
+  ASSERT_EQ(Read(text), 0);
+  const struct mallinfo2 after = mallinfo2();
+  const std::size_t held = after.uordblks + after.hblkhd - before.uordblks - before.hblkhd;
+  EXPECT_LT(held, kCurves * kBytesPerCurve);
+  EXPECT_GT(held, kCurves * sizeof(MAYA_AnimCurve));
+}
+#endif
 
 TEST_F(ScaleTest, ManyConnections) {
   std::string text;
