@@ -21,14 +21,14 @@ struct Keyword {
 constexpr Keyword kKeywords[] = {
     {"file", File},
     {"requires", Requires},
-    {"createnode", CreateNode},
-    {"setattr", SetAttr},
-    {"addattr", AddAttr},
+    {"createNode", CreateNode},
+    {"setAttr", SetAttr},
+    {"addAttr", AddAttr},
     {"parent", Parent},
-    {"connectattr", ConnectAttr},
-    {"disconnectattr", DisconnectAttr},
+    {"connectAttr", ConnectAttr},
+    {"disconnectAttr", DisconnectAttr},
     {"select", Select},
-    {"currentunit", CurrentUnit},
+    {"currentUnit", CurrentUnit},
 };
 
 MayaToken KeywordOrIdentifier(std::string_view word) {

@@ -25,8 +25,8 @@ inline std::string_view QuotedText(const char* first, const char* last) {
   return {first + 1, length - 2};
 }
 
-// Fills a name field; what lies behind the text is zeroed.
+// Fills a name field, which holds zeros behind its text before and afterwards.
 inline void StoreName(char (&name)[kNameCapacity], std::string_view text) {
+  if (name[0] != '\0') std::memset(name, 0, sizeof name);
   std::memcpy(name, text.data(), text.size());
-  std::memset(name + text.size(), 0, kNameCapacity - text.size());
 }

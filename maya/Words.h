@@ -8,6 +8,7 @@
 
 inline bool SameWord(std::string_view a, std::string_view b) {
   if (a.size() != b.size()) return false;
+  if (a == b) return true;  // as a rule the case agrees too
   for (std::size_t i = 0; i < a.size(); ++i) {
     if (FoldCase(static_cast<unsigned char>(a[i])) != FoldCase(static_cast<unsigned char>(b[i])))
       return false;
