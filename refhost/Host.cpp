@@ -69,6 +69,7 @@ bool Host::load(CallbackResult* result, std::string* failure) {
 bool Host::load(HostPluginEntry entry, CallbackResult* result) {
   if (entry == nullptr || state_->loaded) return false;
   state_->loaded = true;
+  state_->linearUnits = 0;
   state_->begin(Callback::Entry, {});
   const HostError code = callPlugin(*state_, [&] {
     return entry(&kBasicSuite, kHostMajor, kHostMinor, state_->options.pluginId, nullptr);
@@ -127,6 +128,8 @@ const std::vector<std::string>& Host::importerExtensions() const {
 }
 
 const Project& Host::project() const { return state_->editor.project(); }
+
+std::int32_t Host::linearUnits() const { return state_->linearUnits; }
 
 std::int64_t Host::callCount(std::string_view operation) const {
   return state_->rehearsal.callCount(operation);

@@ -103,6 +103,10 @@ class Host {
 
   const Project& project() const;
 
+  // The preference "Use Linear Units" as the plug-in was handed it last since its entry was called. 0 when it
+  // never was: it did not ask, or the call failed.
+  std::int32_t linearUnits() const;
+
   // How often a suite call or a utility service was called in the last callback that the rehearsal is for.
   std::int64_t callCount(std::string_view operation) const;
 

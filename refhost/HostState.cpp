@@ -82,7 +82,7 @@ VOR_Item* HostState::begin(Callback which, const std::string& path) {
     if (takesFile(which)) line.text("path", path);
     if (which == Callback::Import) line.handle("folder", folderHandle);
     line.end();
-    trace.write(line);
+    trace.writeBracket(line);
   }
   rehearsal.begin(which);
   return folderHandle;
@@ -96,7 +96,7 @@ CallbackResult HostState::end(HostError code, bool canImport) {
     if (callback == Callback::Verify) line.truth("canImport", canImport);
     line.integer("error", code);
     line.end();
-    trace.write(line);
+    trace.writeBracket(line);
   }
   if (messages.isSilent() && !silenceEndFailed) {
     refuse(std::string(callbackName(callback)) + ": silent errors had begun and were never ended");

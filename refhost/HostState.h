@@ -95,6 +95,7 @@ class HostState {
   // The number of the stream that was handed out last when version 8 of the stream suite could not be
   // acquired: the value of no stream up to it could be set from then on.
   std::uint32_t streamsWithoutValueSuite = 0;
+  std::int32_t linearUnits = 0;   // the preference "Use Linear Units" as handed out last; 0: never
   bool silenceEndFailed = false;  // a rehearsal made an EndSilentErrors of this callback fail
 
  private:

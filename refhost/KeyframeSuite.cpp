@@ -12,7 +12,6 @@
 namespace refhost {
 namespace {
 
-constexpr std::size_t kRecordValues = 4;
 constexpr std::size_t kMostKeys = INT32_MAX;
 
 HostError GetStreamKeyframeCount(VOR_Stream* stream, std::int32_t* count) {
@@ -109,7 +108,7 @@ HostError SetBatchKeyframeValue(VOR_AddKeyframesInfo* batch, std::int32_t index,
   if (TraceLine* line = call.traced()) {
     line->handle("batch", batch).integer("index", index);
     line->handle("stream", value == nullptr ? nullptr : value->stream);
-    line->numbers("value", value == nullptr ? nullptr : value->value, kRecordValues);
+    line->recordValues("value", value);
   }
   return call.finish();
 }

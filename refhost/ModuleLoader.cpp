@@ -22,7 +22,15 @@ HostPluginEntry ModuleLoader::load(const std::filesystem::path& file, std::strin
   // With a bare name the loader would search the system's folders and not look where the user stands.
   std::error_code error;
   const std::filesystem::path absolute = std::filesystem::absolute(file, error);
-  library_ = dlopen(error ? file.c_str() : absolute.c_str(), RTLD_NOW | RTLD_LOCAL);
+  const std::filesystem::path& place = error ? file : absolute;
+  // The loader would wait for somebody to write into a FIFO. What is missing it tells in its own words.
+  std::error_code unknown;
+  const std::filesystem::file_status status = std::filesystem::status(place, unknown);
+  if (std::filesystem::exists(status) && !std::filesystem::is_regular_file(status)) {
+    *failure = "the module cannot be loaded: " + shownText(place.native()) + ": it is no regular file";
+    return nullptr;
+  }
+  library_ = dlopen(place.c_str(), RTLD_NOW | RTLD_LOCAL);
   if (library_ == nullptr) {
     *failure = "the module cannot be loaded: " + loaderComplaint();
     return nullptr;

@@ -12,6 +12,10 @@ constexpr std::size_t kStoreNumber = 1;
 constexpr std::string_view kLinearUnitsSection = "Maya Camera";
 constexpr std::string_view kLinearUnitsKey = "Use Linear Units";
 
+bool isLinearUnits(std::string_view section, std::string_view key) {
+  return section == kLinearUnitsSection && key == kLinearUnitsKey;
+}
+
 HostError GetAppPrefsBlob(HostPrefsStore** store) {
   Call call(Operation::GetAppPrefsBlob);
   if (call.goesOn(store) && call.given(store, "the place for the store")) {
@@ -30,7 +34,7 @@ void getPrefLong(Call& call, HostPrefsStore* store, const char* section, const c
   Preferences& preferences = call.host().preferences;
   if (!preferences.find(section, key)) preferences.set(section, key, defaultValue);
   const auto& linearUnits = call.host().options.linearUnits;
-  if (linearUnits && section == kLinearUnitsSection && key == kLinearUnitsKey) {
+  if (linearUnits && isLinearUnits(section, key)) {
     *value = *linearUnits;
   } else {
     *value = *preferences.find(section, key);
@@ -41,6 +45,8 @@ HostError GetPrefLong(HostPrefsStore* store, const char* section, const char* ke
                       std::int32_t* value) {
   Call call(Operation::GetPrefLong);
   if (call.goesOn(value)) getPrefLong(call, store, section, key, defaultValue, value);
+  const bool handedOut = !call.failed() && value != nullptr && section != nullptr && key != nullptr;
+  if (handedOut && isLinearUnits(section, key)) call.host().linearUnits = *value;
   if (TraceLine* line = call.traced()) {
     line->handle("store", store).text("section", section).text("key", key);
     line->integer("default", defaultValue).handedInteger("value", value);

@@ -19,6 +19,20 @@ namespace refhost {
 struct Composition;
 struct Layer;
 
+// The numbers of the streams.
+inline constexpr int32_t kAnchorStream = 0;  // a camera's point of interest
+inline constexpr int32_t kPositionStream = 1;
+inline constexpr int32_t kScaleStream = 2;
+inline constexpr int32_t kZRotationStream = 3;
+inline constexpr int32_t kXRotationStream = 8;
+inline constexpr int32_t kYRotationStream = 9;
+inline constexpr int32_t kZoomStream = 11;  // cameras only
+
+// The sides of the film that a film size can measure.
+inline constexpr int32_t kFilmNeverSet = 0;
+inline constexpr int32_t kFilmHorizontal = 1;
+inline constexpr int32_t kFilmVertical = 2;
+
 // The keys of one stream, sorted by time, no two at one time. values holds `dimension` numbers per key.
 struct KeyColumns {
   std::vector<T_Time> times;
@@ -27,9 +41,8 @@ struct KeyColumns {
 
 // One animatable property of a layer.
 struct Stream {
-  int32_t id = 0;         // 0 anchor point or point of interest, 1 position, 2 scale, 3 Z rotation,
-                          // 8 X rotation, 9 Y rotation, 11 zoom
-  int32_t dimension = 0;  // 1 or 3
+  int32_t id = kAnchorStream;
+  int32_t dimension = 0;              // 1 or 3
   double value[3] = {0.0, 0.0, 0.0};  // the static value; stays when keys are added
   std::unique_ptr<KeyColumns> keys;   // null when the stream has none
 
@@ -43,14 +56,14 @@ struct Layer {
   LayerKind kind = LayerKind::Null;
   std::string name;  // bytes as the importer gave them; may be empty or no UTF-8
   Composition* composition = nullptr;
-  Layer* parent = nullptr;        // null: none
-  Composition* source = nullptr;  // what a nested composition layer shows; else null
-  bool threeDimensional = false;  // layer flag 0x800
-  bool aimed = false;             // layer flag 8192: a camera that looks at its point of interest
-  int32_t childCount = 0;         // layers whose parent this one is
-  int32_t filmDirection = 0;      // camera: 1 horizontal, 2 vertical, 0 never set
-  double filmSize = 0.0;          // camera: points; 0 when never set
-  std::vector<Stream> streams;    // camera: 0, 1, 2, 3, 8, 9, 11; others: 0, 1, 2, 3, 8, 9
+  Layer* parent = nullptr;                // null: none
+  Composition* source = nullptr;          // what a nested composition layer shows; else null
+  bool threeDimensional = false;          // layer flag 0x800
+  bool aimed = false;                     // layer flag 8192: a camera that looks at its point of interest
+  int32_t childCount = 0;                 // layers whose parent this one is
+  int32_t filmDirection = kFilmNeverSet;  // camera: the measured side
+  double filmSize = 0.0;                  // camera: points; 0 when never set
+  std::vector<Stream> streams;            // camera: 0, 1, 2, 3, 8, 9, 11; others: 0, 1, 2, 3, 8, 9
 
   const Stream* findStream(int32_t id) const;  // null when the layer has none of that id
 };

@@ -55,14 +55,20 @@ bool setKind(Failure* failure, std::string_view kind, std::string* complaint) {
   return true;
 }
 
-using SetEffect = bool (*)(Failure*, std::string_view, std::string*);
+// What stands behind the equals sign.
+struct Effect {
+  const char* word;  // as the forms name it
+  bool (*set)(Failure*, std::string_view, std::string*);
+};
+constexpr Effect kCodeEffect = {"CODE", setCode};
+constexpr Effect kKindEffect = {"KIND", setKind};
 
-// "OPERATION:NTH=EFFECT".
-std::optional<Failure> parseNamed(std::string_view text, SetEffect setEffect, std::string* complaint) {
+// "OPERATION:NTH=CODE" or "OPERATION:NTH=KIND".
+std::optional<Failure> parseNamed(std::string_view text, const Effect& effect, std::string* complaint) {
   const auto halves = cutAt(text, text.find('='));
   const auto call = halves ? cutAt(halves->before, halves->before.find(':')) : std::nullopt;
   if (!call) {
-    complain(complaint, text, "the form is OPERATION:NTH=EFFECT");
+    complain(complaint, text, std::string("the form is OPERATION:NTH=") + effect.word);
     return std::nullopt;
   }
   if (!findOperation(call->before) && !findUtilityService(call->before)) {
@@ -77,15 +83,15 @@ std::optional<Failure> parseNamed(std::string_view text, SetEffect setEffect, st
   Failure failure;
   failure.operation = call->before;
   failure.nth = *nth;
-  if (!setEffect(&failure, halves->after, complaint)) return std::nullopt;
+  if (!effect.set(&failure, halves->after, complaint)) return std::nullopt;
   return failure;
 }
 
-// "K=EFFECT" and "K+=EFFECT".
-std::optional<Failure> parseNumbered(std::string_view text, SetEffect setEffect, std::string* complaint) {
+// "K=CODE" and "K+=CODE", or "K=KIND" and "K+=KIND".
+std::optional<Failure> parseNumbered(std::string_view text, const Effect& effect, std::string* complaint) {
   auto halves = cutAt(text, text.find('='));
   if (!halves) {
-    complain(complaint, text, "the form is K=EFFECT or K+=EFFECT");
+    complain(complaint, text, std::string("the form is K=") + effect.word + " or K+=" + effect.word);
     return std::nullopt;
   }
   Failure failure;
@@ -99,26 +105,26 @@ std::optional<Failure> parseNumbered(std::string_view text, SetEffect setEffect,
     return std::nullopt;
   }
   failure.nth = *nth;
-  if (!setEffect(&failure, halves->after, complaint)) return std::nullopt;
+  if (!effect.set(&failure, halves->after, complaint)) return std::nullopt;
   return failure;
 }
 
 }  // namespace
 
 std::optional<Failure> parseFail(std::string_view text, std::string* complaint) {
-  return parseNamed(text, setCode, complaint);
+  return parseNamed(text, kCodeEffect, complaint);
 }
 
 std::optional<Failure> parseThrow(std::string_view text, std::string* complaint) {
-  return parseNamed(text, setKind, complaint);
+  return parseNamed(text, kKindEffect, complaint);
 }
 
 std::optional<Failure> parseFailAt(std::string_view text, std::string* complaint) {
-  return parseNumbered(text, setCode, complaint);
+  return parseNumbered(text, kCodeEffect, complaint);
 }
 
 std::optional<Failure> parseThrowAt(std::string_view text, std::string* complaint) {
-  return parseNumbered(text, setKind, complaint);
+  return parseNumbered(text, kKindEffect, complaint);
 }
 
 std::optional<RefusedSuite> parseRefuse(std::string_view text, std::string* complaint) {

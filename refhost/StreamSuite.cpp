@@ -7,8 +7,6 @@
 namespace refhost {
 namespace {
 
-constexpr std::size_t kRecordValues = 4;
-
 void acquireLayerStream(Call& call, VOR_Layer* layer, std::int32_t streamId, VOR_Stream** stream) {
   Layer* found = call.layer(layer);
   if (found == nullptr || !call.given(stream, "the place for the stream")) return;
@@ -73,7 +71,7 @@ HostError SetStreamValue(std::int32_t pluginId, VOR_Stream* stream, const Stream
   if (HeldStream* held = call.host().streams.find(stream)) held->valueFailed = call.failed();
   if (TraceLine* line = call.traced()) {
     line->integer("pluginId", pluginId).handle("stream", stream);
-    line->numbers("value", value == nullptr ? nullptr : value->value, kRecordValues);
+    line->recordValues("value", value);
   }
   return call.finish();
 }

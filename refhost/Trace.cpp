@@ -4,6 +4,7 @@
 #include <cmath>
 #include <cstring>
 #include <ostream>
+#include <type_traits>
 
 #include "refhost/ShownText.h"
 
@@ -114,6 +115,11 @@ TraceLine& TraceLine::numbers(const char* name, const double* values, std::size_
   return *this;
 }
 
+TraceLine& TraceLine::recordValues(const char* name, const StreamValueRecord* record) {
+  constexpr std::size_t count = std::extent_v<decltype(StreamValueRecord::value)>;
+  return numbers(name, record == nullptr ? nullptr : record->value, count);
+}
+
 TraceLine& TraceLine::time(const char* name, const T_Time* time) {
   key(name);
   if (time == nullptr) {
@@ -203,6 +209,11 @@ TraceLine& TraceLine::handedImporter(const char* name, const HostImporterId* out
 
 void Trace::write(const TraceLine& line) {
   out_->write(line.line().data(), static_cast<std::streamsize>(line.line().size()));
+}
+
+void Trace::writeBracket(const TraceLine& line) {
+  write(line);
+  out_->flush();
 }
 
 }  // namespace refhost

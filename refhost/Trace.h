@@ -9,6 +9,7 @@
 
 #include "hostapi/FileImportManagerSuite.h"
 #include "hostapi/HostTypes.h"
+#include "hostapi/StreamSuite.h"
 #include "refhost/Handles.h"
 
 namespace refhost {
@@ -29,6 +30,7 @@ class TraceLine {
   TraceLine& truth(const char* key, bool value);
   TraceLine& number(const char* key, const double* value);
   TraceLine& numbers(const char* key, const double* values, std::size_t count);
+  TraceLine& recordValues(const char* key, const StreamValueRecord* record);  // all, used or not
   TraceLine& time(const char* key, const T_Time* time);
   TraceLine& ratio(const char* key, const HostRatio* ratio);
   TraceLine& handle(const char* key, const void* handle);
@@ -64,6 +66,8 @@ class Trace {
 
   bool on() const { return out_ != nullptr; }
   void write(const TraceLine& line);
+  // A line at which the plug-in begins or ends: all lines so far are sent on, whatever the plug-in does next.
+  void writeBracket(const TraceLine& line);
 
  private:
   std::ostream* out_;

@@ -265,6 +265,42 @@ TEST_F(HostCalls, LinearUnitsOfThisRunAreNotStored) {
   EXPECT_EQ(folder.read("store"), "[Maya Camera]\nUse Linear Units=0\n");
 }
 
+TEST_F(HostCalls, LinearUnitsAreThoseThatThePluginWasHandedLast) {
+  HostOptions given = options();
+  given.linearUnits = 6;
+  Failure failure;
+  failure.operation = "GetPrefLong";
+  failure.nth = 2;
+  failure.code = 5;
+  given.failures = {failure};
+  given.during = Callback::Entry;
+  Host host(given);
+  EXPECT_EQ(host.linearUnits(), 0);
+  host.load(entry, &loaded);
+  EXPECT_EQ(host.linearUnits(), 6);
+  host.beginCallback(Callback::Entry, {});
+  HostPrefsStore* store = nullptr;
+  std::int32_t value = 0;
+  ASSERT_EQ(kPersistentDataSuite3.GetAppPrefsBlob(&store), 0);
+  ASSERT_EQ(kPersistentDataSuite3.GetPrefLong(store, "Maya Camera", "Another", 9, &value), 0);
+  EXPECT_EQ(kPersistentDataSuite3.GetPrefLong(store, "Maya Camera", "Use Linear Units", 8, &value), 5);
+  host.endCallback(0);
+  EXPECT_EQ(host.linearUnits(), 6);
+}
+
+TEST_F(HostCalls, LinearUnitsAreZeroWhereTheCallFailed) {
+  HostOptions given = options();
+  given.linearUnits = 6;
+  Failure failure;
+  failure.operation = "GetPrefLong";
+  failure.code = 5;
+  given.failures = {failure};
+  given.during = Callback::Entry;
+  Host host(given);
+  host.load(entry, &loaded);
+  EXPECT_EQ(host.linearUnits(), 0);
+}
+
 TEST_F(HostCalls, PreferenceFileThatCannotBeWrittenChangesNothing) {
   const TemporaryFolder folder;
   folder.write("file", "");

@@ -1,7 +1,12 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
+#include <sys/stat.h>
+
+#include <filesystem>
+#include <string>
 
 #include "refhost/Host.h"
+#include "tests/refhost/TemporaryFolder.h"
 
 namespace refhost {
 namespace {
@@ -31,6 +36,19 @@ TEST(ModuleLoader, ModuleThatIsMissingIsToldInWords) {
   EXPECT_FALSE(host.load(&result, &failure));
   EXPECT_THAT(failure, StartsWith("the module cannot be loaded: "));
   EXPECT_THAT(failure, HasSubstr("/nowhere/at/all.so"));
+}
+
+TEST(ModuleLoader, FifoAndFolderAreNoModulesAndAreNotWaitedFor) {
+  const TemporaryFolder folder;
+  const std::filesystem::path fifo = folder.path() / "fifo";
+  ASSERT_EQ(mkfifo(fifo.c_str(), 0600), 0);
+  for (const std::filesystem::path& place : {fifo, folder.path()}) {
+    Host host(optionsFor(place.c_str()));
+    CallbackResult result;
+    std::string failure;
+    EXPECT_FALSE(host.load(&result, &failure));
+    EXPECT_EQ(failure, "the module cannot be loaded: " + place.string() + ": it is no regular file");
+  }
 }
 
 TEST(ModuleLoader, ModuleWithoutEntryIsToldInWords) {

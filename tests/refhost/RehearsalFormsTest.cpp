@@ -53,8 +53,10 @@ struct BadForm {
 };
 
 TEST(RehearsalForms, EveryBadFormIsToldInWords) {
-  const char* namedForm = ": the form is OPERATION:NTH=EFFECT";
-  const char* numberedForm = ": the form is K=EFFECT or K+=EFFECT";
+  const char* namedForm = ": the form is OPERATION:NTH=CODE";
+  const char* namedThrowForm = ": the form is OPERATION:NTH=KIND";
+  const char* numberedForm = ": the form is K=CODE or K+=CODE";
+  const char* numberedThrowForm = ": the form is K=KIND or K+=KIND";
   const BadForm forms[] = {
       {parseFail, "", namedForm},
       {parseFail, "CreateComp", namedForm},
@@ -70,6 +72,7 @@ TEST(RehearsalForms, EveryBadFormIsToldInWords) {
       {parseFail, "CreateComp:1=2147483648", "a code is a 32-bit integer"},
       {parseFail, "CreateComp:1=bad_alloc", "a code is a 32-bit integer"},
       {parseFail, "CreateComp:1=2 ", "a code is a 32-bit integer"},
+      {parseThrow, "CreateComp:1", namedThrowForm},
       {parseThrow, "CreateComp:1=5", "\"5\": an exception is bad_alloc or runtime_error"},
       {parseThrow, "CreateComp:1=Bad_Alloc", "an exception is"},
       {parseFailAt, "5", numberedForm},
@@ -78,7 +81,7 @@ TEST(RehearsalForms, EveryBadFormIsToldInWords) {
       {parseFailAt, "+=5", "calls are numbered from 1"},
       {parseFailAt, "5++=5", "calls are numbered from 1"},
       {parseFailAt, "5=x", "a code is a 32-bit integer"},
-      {parseThrowAt, "bad_alloc", numberedForm},
+      {parseThrowAt, "bad_alloc", numberedThrowForm},
       {parseThrowAt, "1=", "an exception is"},
       {parseThrowAt, "-1=bad_alloc", "calls are numbered from 1"},
   };

@@ -90,6 +90,14 @@ TEST_F(ExitStatusTest, AModuleThatCannotBeLoadedIsFour) {
   EXPECT_EQ(run({"verify", "good.ma", "--module", "good.ma"}).status, 4);
 }
 
+TEST_F(ExitStatusTest, AModuleThatIsAFifoIsFourAndNotWaitedFor) {
+  ASSERT_EQ(::mkfifo(path("fifo").c_str(), 0600), 0);
+  const ToolResult result = run({"import", "good.ma", "--module", "fifo"});
+  EXPECT_EQ(result.status, 4);
+  EXPECT_EQ(result.err,
+            "mayascene: the module cannot be loaded: " + path("fifo").string() + ": it is no regular file\n");
+}
+
 TEST_F(ExitStatusTest, ALibraryWithoutTheEntryIsFour) {
   const std::string library = std::filesystem::path(MAYASCENE_MODULE).parent_path() / "libhostutil.so";
   const ToolResult result = run({"import", "good.ma", "--module", library});

@@ -220,5 +220,36 @@ TEST_F(HostOptions, AnExceptionOutOfASuiteReleaseEndsTheProcessWithASentence) {
   EXPECT_TRUE(contains(result.err, "mayascene: an exception escaped where none may")) << result.err;
 }
 
+TEST_F(HostOptions, TheTraceOfARunThatAnExceptionEndsEndsWithTheCallThatThrew) {
+  const std::vector<std::string> ended = {
+      "import", "still.ma", "--json", "out.json", "--throw", "ReleaseSuiteByName:1=bad_alloc", "--trace"};
+  std::vector<std::string> toFile = ended, toOutput = ended;
+  toFile.push_back("calls.jsonl");
+  toOutput.push_back("-");
+  EXPECT_EQ(run(toFile).signal, 6);
+  const ToolResult result = run(toOutput);
+  EXPECT_EQ(result.signal, 6);
+  EXPECT_EQ(read("calls.jsonl"), result.out);
+  ASSERT_TRUE(result.out.ends_with('\n'));
+  const std::size_t lastLine = result.out.rfind('\n', result.out.size() - 2) + 1;
+  const json last = json::parse(result.out.substr(lastLine));
+  EXPECT_EQ(last["call"], "ReleaseSuiteByName");
+  EXPECT_EQ(last["error"], "bad_alloc");
+  EXPECT_EQ(files(), (std::vector<std::string>{"calls.jsonl", "crane.ma", "notes.txt", "still.ma"}));
+}
+
+TEST_F(HostOptions, TheJsonNamesThePreferenceThatTheImporterWasHanded) {
+  ASSERT_EQ(run({"prefs", "set", "linear-units", "1", "--preferences", "store"}).status, 0);
+  const auto handed = [&](const std::vector<std::string>& further) {
+    std::vector<std::string> words = {"still.ma", "--preferences", "store", "--json", "-"};
+    words.insert(words.end(), further.begin(), further.end());
+    return json::parse(import(words).out)["linearUnits"].get<int>();
+  };
+  EXPECT_EQ(handed({}), 1);
+  EXPECT_EQ(handed({"--linear-units", "3"}), 3);
+  EXPECT_EQ(handed({"--during", "entry", "--fail", "GetPrefLong:1=5"}), 0);
+  EXPECT_EQ(handed({"--during", "entry", "--fail", "GetPrefLong:1=0"}), 0);
+}
+
 }  // namespace
 }  // namespace mayascene_test

@@ -65,6 +65,48 @@ TEST_F(OutputFileTest, ASymbolicLinkStaysALink) {
   EXPECT_EQ(read("real.json"), "after");
 }
 
+TEST_F(OutputFileTest, ASymbolicLinkToAFileThatIsNotThereYetStaysALink) {
+  std::filesystem::create_directory(path("far"));
+  std::filesystem::create_symlink("far/second.json", target);
+  std::filesystem::create_symlink("real.json", path("far/second.json"));
+  const auto output = OutputFile::open(target, &failure);
+  ASSERT_NE(output, nullptr) << failure;
+  output->stream() << "made";
+  ASSERT_TRUE(output->commit(&failure)) << failure;
+  EXPECT_TRUE(std::filesystem::is_symlink(target));
+  EXPECT_TRUE(std::filesystem::is_symlink(path("far/second.json")));
+  EXPECT_EQ(read("far/real.json"), "made");
+}
+
+TEST_F(OutputFileTest, ASymbolicLinkThatLeadsInACircleStaysALinkAndIsTold) {
+  std::filesystem::create_symlink("out.json", target);
+  EXPECT_EQ(OutputFile::open(target, &failure), nullptr);
+  EXPECT_EQ(failure, target + " cannot be written: Too many levels of symbolic links");
+  EXPECT_TRUE(std::filesystem::is_symlink(target));
+}
+
+TEST_F(OutputFileTest, ALogStandsUnderItsNameFromTheStartAndStaysWithoutACommit) {
+  write("calls.jsonl", "of an earlier and longer run");
+  {
+    const auto log = OutputFile::openLog(path("calls.jsonl").string(), &failure);
+    ASSERT_NE(log, nullptr) << failure;
+    log->stream() << "first line\n" << std::flush;
+    EXPECT_EQ(read("calls.jsonl"), "first line\n");
+  }
+  EXPECT_EQ(read("calls.jsonl"), "first line\n");
+  EXPECT_EQ(files(), Names{"calls.jsonl"});
+}
+
+TEST_F(OutputFileTest, ALogThatCannotBeWrittenIsToldAtOnceOrWithTheCommit) {
+  EXPECT_EQ(OutputFile::openLog(path("no/such/log").string(), &failure), nullptr);
+  EXPECT_EQ(failure, path("no/such/log").string() + " cannot be written: No such file or directory");
+  const auto log = OutputFile::openLog("/dev/full", &failure);
+  ASSERT_NE(log, nullptr) << failure;
+  log->stream() << "too much";
+  EXPECT_FALSE(log->commit(&failure));
+  EXPECT_EQ(failure, "/dev/full cannot be written: No space left on device");
+}
+
 TEST_F(OutputFileTest, ADeviceIsWrittenAndNotReplaced) {
   const auto output = OutputFile::open("/dev/null", &failure);
   ASSERT_NE(output, nullptr) << failure;

@@ -73,6 +73,26 @@ TEST_F(Outputs, WithoutAModuleWhatLayThereStays) {
   EXPECT_EQ(files(), (Names{"notes.txt", "out.json", "still.ma"}));
 }
 
+TEST_F(Outputs, AClosedStandardOutputCannotBeWrittenAndItsTextGoesIntoNoOtherOutput) {
+  const std::string whole = run({"import", "still.ma", "--json", "-"}).out;
+  closedDescriptors = {1};
+  const ToolResult result = run({"import", "still.ma", "--json", "out.json", "--trace", "calls.jsonl"});
+  EXPECT_EQ(result.status, 5);
+  EXPECT_TRUE(result.err.ends_with("mayascene: standard output cannot be written: Bad file descriptor\n"))
+      << result.err;
+  EXPECT_EQ(read("out.json"), whole);
+  EXPECT_EQ(read("calls.jsonl").find("{\"call\":\"enter\""), 0u);
+}
+
+TEST_F(Outputs, WhatGoesToAClosedStandardErrorGoesIntoNoOutput) {
+  const std::string whole = run({"import", "notes.txt", "--json", "-"}).out;
+  for (const std::vector<int>& closed : {std::vector{2}, {0, 2}, {0, 1, 2}}) {
+    closedDescriptors = closed;
+    EXPECT_EQ(run({"import", "--quiet", "notes.txt", "--json", "out.json"}).status, 1);
+    EXPECT_EQ(read("out.json"), whole);
+  }
+}
+
 TEST_F(Outputs, AnOutlineThatCannotBeWrittenIsToldToo) {
   const ToolResult result = run({"import", "still.ma", "--quiet", "--trace", "/dev/full"});
   EXPECT_EQ(result.status, 5);

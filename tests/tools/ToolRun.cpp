@@ -73,6 +73,7 @@ int ToolTest::spawn(const std::vector<std::string>& arguments, const std::string
   posix_spawn_file_actions_addopen(&actions, STDIN_FILENO, "/dev/null", O_RDONLY, 0);
   posix_spawn_file_actions_addopen(&actions, STDOUT_FILENO, out.c_str(), O_WRONLY | O_CREAT | O_TRUNC, 0600);
   posix_spawn_file_actions_addopen(&actions, STDERR_FILENO, err.c_str(), O_WRONLY | O_CREAT | O_TRUNC, 0600);
+  for (const int closed : closedDescriptors) posix_spawn_file_actions_addclose(&actions, closed);
   pid_t process = -1;
   const int failure = ::posix_spawn(&process, MAYASCENE_TOOL, &actions, nullptr, pointers(words).data(),
                                     pointers(variables).data());

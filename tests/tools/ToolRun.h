@@ -41,8 +41,9 @@ class ToolTest : public ::testing::Test {
   std::vector<std::string> files() const;  // names in the folder, sorted
 
   std::map<std::string, std::string>
-      environment;            // what the runs find; PATH, HOME, XDG_CONFIG_HOME and TERM have defaults
-  std::string workingFolder;  // where the runs start; empty: the test's own folder
+      environment;  // what the runs find; PATH, HOME, XDG_CONFIG_HOME and TERM have defaults
+  std::vector<int> closedDescriptors;  // of 0, 1 and 2, what the runs find closed
+  std::string workingFolder;           // where the runs start; empty: the test's own folder
 
  private:
   int spawn(const std::vector<std::string>& arguments, const std::string& out, const std::string& err) const;

@@ -5,6 +5,7 @@
 #include <vector>
 
 #include "tools/mayascene/JsonWriter.h"
+#include "tools/mayascene/StreamWords.h"
 
 namespace mayascene {
 namespace {
@@ -17,22 +18,6 @@ using refhost::Stream;
 
 constexpr std::string_view kFormat = "mayascene-composition";
 constexpr std::int64_t kVersionOfForm = 1;
-
-struct StreamWords {
-  int32_t id;
-  std::string_view name;
-  std::string_view cameraName;
-  std::string_view unit;
-};
-constexpr StreamWords kStreams[] = {
-    {0, "anchorPoint", "pointOfInterest", "points"},
-    {1, "position", "position", "points"},
-    {2, "scale", "scale", "percent"},
-    {3, "zRotation", "zRotation", "degrees"},
-    {8, "xRotation", "xRotation", "degrees"},
-    {9, "yRotation", "yRotation", "degrees"},
-    {11, "zoom", "zoom", "pixels"},
-};
 
 std::string_view outcomeWord(Outcome outcome) {
   switch (outcome) {
@@ -135,7 +120,7 @@ void writeStream(JsonWriter& json, const Stream& stream, LayerKind kind) {
   json.beginObject();
   json.key("id");
   json.integer(stream.id);
-  for (const StreamWords& words : kStreams) {
+  for (const StreamWords& words : kStreamWords) {
     if (words.id != stream.id) continue;
     json.key("name");
     json.text(kind == LayerKind::Camera ? words.cameraName : words.name);
@@ -150,10 +135,10 @@ void writeStream(JsonWriter& json, const Stream& stream, LayerKind kind) {
 
 void writeFilmSize(JsonWriter& json, const Layer& layer) {
   json.key("filmSize");
-  if (layer.filmDirection == 0) return json.null();
+  if (layer.filmDirection == refhost::kFilmNeverSet) return json.null();
   json.beginObject();
   json.key("direction");
-  json.text(layer.filmDirection == 2 ? "vertical" : "horizontal");
+  json.text(layer.filmDirection == refhost::kFilmVertical ? "vertical" : "horizontal");
   json.key("points");
   json.number(layer.filmSize);
   json.endObject();

@@ -67,10 +67,4 @@ ExitStatus HostSession::finish() {
   return diagnostics_.judge("the module's death hook", deathHook_);
 }
 
-std::int32_t HostSession::linearUnits() const {
-  if (arguments_.linearUnits) return *arguments_.linearUnits;
-  const refhost::Preferences store(preferenceFile(arguments_.preferences));
-  return store.find(kPreferenceSection, kLinearUnitsKey).value_or(0);
-}
-
 }  // namespace mayascene

@@ -1,7 +1,6 @@
 // The embedded host of one run: set up from the command line, loaded with the importer, and ended.
 #pragma once
 
-#include <cstdint>
 #include <filesystem>
 #include <memory>
 #include <ostream>
@@ -30,9 +29,6 @@ class HostSession {
   refhost::Host& host() { return *host_; }  // after start()
   const refhost::CallbackResult& entry() const { return entry_; }
   const refhost::CallbackResult& deathHook() const { return deathHook_; }
-
-  // The preference "Use Linear Units" that the run works with.
-  std::int32_t linearUnits() const;
 
  private:
   const HostArguments& arguments_;

@@ -23,12 +23,14 @@ struct Outputs {
   bool open(const ImportArguments& arguments, std::string* failure) {
     const bool outputTaken = arguments.json == kStandardOutput || arguments.host.trace == kStandardOutput;
     return openOne(arguments.quiet || outputTaken ? "" : kStandardOutput, &outline, failure) &&
-           openOne(arguments.json, &json, failure) && openOne(arguments.host.trace, &trace, failure);
+           openOne(arguments.json, &json, failure) &&
+           openOne(arguments.host.trace, &trace, failure, OutputFile::openLog);
   }
 
-  static bool openOne(const std::string& target, std::unique_ptr<OutputFile>* output, std::string* failure) {
+  static bool openOne(const std::string& target, std::unique_ptr<OutputFile>* output, std::string* failure,
+                      decltype(&OutputFile::open) open = OutputFile::open) {
     if (target.empty()) return true;
-    *output = OutputFile::open(target, failure);
+    *output = open(target, failure);
     return *output != nullptr;
   }
 
@@ -111,7 +113,7 @@ ExitStatus runImport(const ImportArguments& arguments, Diagnostics& diagnostics)
   ExitStatus status = session.start();
   const bool loaded = status <= ExitStatus::Refused;
   if (loaded) {
-    run.linearUnits = session.linearUnits();
+    run.linearUnits = session.host().linearUnits();
     run.entry = session.entry();
     status = worse(status, importAll(arguments, session, outputs, &run, diagnostics));
     status = worse(status, session.finish());

@@ -7,6 +7,7 @@
 #include <atomic>
 #include <cstdlib>
 #include <exception>
+#include <streambuf>
 #include <string_view>
 
 namespace mayascene {
@@ -17,6 +18,8 @@ constexpr int kSignalBase = 128;
 // As many as there can be outputs at a time, and to spare.
 std::array<std::atomic<const char*>, 8> unfinished{};
 static_assert(std::atomic<const char*>::is_always_lock_free, "a signal handler reads them");
+
+std::streambuf* terminationLog = nullptr;
 
 void removeUnfinished() noexcept {
   for (std::atomic<const char*>& slot : unfinished) {
@@ -35,6 +38,8 @@ extern "C" void endInterrupted(int signal) {
   constexpr std::string_view farewell =
       "mayascene: an exception escaped where none may, in the importer or the tool; the run ends here\n";
   removeUnfinished();
+  // The log's last line is the call that ends the run.
+  if (terminationLog != nullptr) terminationLog->pubsync();
   if (::write(STDERR_FILENO, farewell.data(), farewell.size()) < 0) std::abort();
   std::abort();
 }
@@ -67,5 +72,7 @@ void forgetUnfinished(const char* name) {
     if (slot.compare_exchange_strong(held, nullptr)) return;
   }
 }
+
+void flushWhenTerminated(std::streambuf* log) { terminationLog = log; }
 
 }  // namespace mayascene

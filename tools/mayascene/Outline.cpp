@@ -8,6 +8,7 @@
 #include <vector>
 
 #include "tools/mayascene/Quantities.h"
+#include "tools/mayascene/StreamWords.h"
 
 namespace mayascene {
 namespace {
@@ -24,23 +25,6 @@ constexpr std::size_t kLabelWidth = 19;
 constexpr double kPointsPerInch = 72.0;
 constexpr double kMillimetresPerInch = 25.4;
 
-// The streams in the order in which a person asks for them.
-struct Property {
-  int32_t streamId;
-  std::string_view label;
-  std::string_view cameraLabel;
-  std::string_view unit;
-};
-constexpr Property kProperties[] = {
-    {11, "zoom", "zoom", " px"},
-    {1, "position", "position", " pt"},
-    {8, "X rotation", "X rotation", " deg"},
-    {9, "Y rotation", "Y rotation", " deg"},
-    {3, "Z rotation", "Z rotation", " deg"},
-    {2, "scale", "scale", " %"},
-    {0, "anchor point", "point of interest", " pt"},
-};
-
 struct Row {
   std::string_view label;
   std::string value;  // the static value; in parentheses where keys stand over it
@@ -56,23 +40,23 @@ std::string padded(std::string_view text, std::size_t width) {
 std::string filmText(const Layer& camera) {
   const double millimetres = camera.filmSize / kPointsPerInch * kMillimetresPerInch;
   return numberText(camera.filmSize) + " pt (" + numberText(millimetres) + " mm) " +
-         (camera.filmDirection == 2 ? "vertically" : "horizontally");
+         (camera.filmDirection == refhost::kFilmVertical ? "vertically" : "horizontally");
 }
 
 std::vector<Row> rowsOf(const Layer& layer) {
   std::vector<Row> rows;
-  for (const Property& property : kProperties) {
-    const Stream* stream = layer.findStream(property.streamId);
+  for (const StreamWords& words : kStreamWords) {
+    const Stream* stream = layer.findStream(words.id);
     if (stream == nullptr) continue;
     Row row;
-    row.label = layer.kind == LayerKind::Camera ? property.cameraLabel : property.label;
-    row.value = valueText(*stream) + std::string(property.unit);
+    row.label = layer.kind == LayerKind::Camera ? words.cameraLabel : words.label;
+    row.value = valueText(*stream) + std::string(words.unitSign);
     if (stream->keyCount() > 0) {
       row.value = '(' + row.value + ')';
       row.keys = keysText(*stream, layer.composition->frameRate);
     }
     rows.push_back(std::move(row));
-    if (property.streamId == 11 && layer.filmDirection != 0)
+    if (words.id == refhost::kZoomStream && layer.filmDirection != refhost::kFilmNeverSet)
       rows.push_back({"film size", filmText(layer), ""});
   }
   return rows;

@@ -20,6 +20,7 @@ namespace {
 
 constexpr mode_t kNewFileMode = 0666;  // less what the user's mask takes away
 constexpr mode_t kPermissionBits = 07777;
+constexpr int kMostLinks = 40;  // that one name leads through; the system follows no more either
 
 std::string cannotWrite(const std::string& target, int number) {
   const std::string name = target == kStandardOutput ? "standard output" : target;
@@ -33,11 +34,17 @@ std::string nameBeside(const std::filesystem::path& place) {
   return (place.parent_path() / name).string();
 }
 
-// Where a file belongs: a symbolic link is followed, so that the link stays one.
+// Where a file belongs: symbolic links are followed, so that they stay links; what the last one names need
+// not exist. Empty where they lead in a circle.
 std::filesystem::path placeOf(const std::string& target) {
-  std::error_code failed;
-  std::filesystem::path place = std::filesystem::canonical(target, failed);
-  return failed ? std::filesystem::path(target) : place;
+  std::filesystem::path place = target;
+  for (int links = 0; links < kMostLinks; ++links) {
+    std::error_code isNoLink;
+    const std::filesystem::path next = std::filesystem::read_symlink(place, isNoLink);
+    if (isNoLink) return place;
+    place = place.parent_path() / next;
+  }
+  return {};
 }
 
 }  // namespace
@@ -49,6 +56,7 @@ struct OutputFile::State {
       ::unlink(beside.c_str());
       forgetUnfinished(beside.c_str());
     }
+    if (log) flushWhenTerminated(nullptr);
     closeDescriptor();
   }
   State(const State&) = delete;
@@ -68,6 +76,10 @@ struct OutputFile::State {
   // Opens a new file beside the place of a regular file.
   bool openBeside(const struct stat* existing) {
     place = placeOf(target).string();
+    if (place.empty()) {
+      errno = ELOOP;
+      return false;
+    }
     beside = nameBeside(place);
     rememberUnfinished(beside.c_str());
     const int opened = ::open(beside.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, kNewFileMode);
@@ -80,6 +92,7 @@ struct OutputFile::State {
   std::string place;   // where the file belongs
   std::string beside;  // where it is written until it is whole; empty: written as it is, or whole already
   int descriptor = -1;
+  bool log = false;
   std::optional<DescriptorBuffer> buffer;
   std::ostream stream{nullptr};
 };
@@ -109,6 +122,21 @@ std::unique_ptr<OutputFile> OutputFile::open(const std::string& target, std::str
     *failure = cannotWrite(target, errno);
     return nullptr;
   }
+  return std::unique_ptr<OutputFile>(new OutputFile(std::move(state)));
+}
+
+std::unique_ptr<OutputFile> OutputFile::openLog(const std::string& target, std::string* failure) {
+  auto state = std::make_unique<State>(target);
+  const int descriptor = target == kStandardOutput
+                             ? STDOUT_FILENO
+                             : ::open(target.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, kNewFileMode);
+  if (descriptor < 0) {
+    *failure = cannotWrite(target, errno);
+    return nullptr;
+  }
+  state->attach(descriptor);
+  state->log = true;
+  flushWhenTerminated(&*state->buffer);
   return std::unique_ptr<OutputFile>(new OutputFile(std::move(state)));
 }
 

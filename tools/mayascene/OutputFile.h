@@ -1,5 +1,5 @@
-// Where one output of the tool goes: a file that appears under its name whole or not at all, or standard
-// output.
+// Where one output of the tool goes: a file that appears under its name whole or not at all, a log, or
+// standard output.
 #pragma once
 
 #include <memory>
@@ -18,7 +18,13 @@ class OutputFile {
   // when it cannot be written.
   static std::unique_ptr<OutputFile> open(const std::string& target, std::string* failure);
 
-  // What was not committed is taken away again.
+  // Opens an output that tells how a run went and is wanted most where the run is cut short: it is written
+  // under its own name from the start, over what lay there, and may end anywhere. What is written last goes
+  // out when the process is terminated, too. One at a time. Null with a sentence in *failure when it cannot
+  // be written.
+  static std::unique_ptr<OutputFile> openLog(const std::string& target, std::string* failure);
+
+  // What was not committed is taken away again; of a log, what went out stays.
   ~OutputFile();
   OutputFile(const OutputFile&) = delete;
   OutputFile& operator=(const OutputFile&) = delete;

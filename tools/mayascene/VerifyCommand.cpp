@@ -34,7 +34,7 @@ ExitStatus runVerify(const VerifyArguments& arguments, Diagnostics& diagnostics)
   std::unique_ptr<OutputFile> answers, trace;
   std::string failure;
   const std::string& traceName = arguments.host.trace;
-  if (!traceName.empty()) trace = OutputFile::open(traceName, &failure);
+  if (!traceName.empty()) trace = OutputFile::openLog(traceName, &failure);
   if (!arguments.quiet && traceName != kStandardOutput) answers = OutputFile::open(kStandardOutput, &failure);
   if (!failure.empty()) {
     diagnostics.complain("", failure);

@@ -1,6 +1,8 @@
 // The command-line tool: reads arguments, runs one command, ends with its status.
+#include <fcntl.h>
 #include <unistd.h>
 
+#include <cerrno>
 #include <exception>
 #include <iostream>
 #include <new>
@@ -29,9 +31,21 @@ ExitStatus run(int argc, const char* const* argv) {
   return arguments.over;
 }
 
+// A standard stream that is closed leaves its number to the first file that the run opens, and that file
+// would then take the stream's text in. Its place is held read-only, so that writing to the stream still
+// fails.
+void holdStandardDescriptors() {
+  for (const int descriptor : {STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO}) {
+    const bool closed = ::fcntl(descriptor, F_GETFD) < 0 && errno == EBADF;
+    // The lowest free number is this one: those below it are held already.
+    if (closed && ::open("/dev/null", O_RDONLY) < 0) return;
+  }
+}
+
 }  // namespace
 
 int main(int argc, char** argv) {
+  holdStandardDescriptors();
   mayascene::handleInterruptions();
   ExitStatus status = ExitStatus::CannotWrite;
   try {
