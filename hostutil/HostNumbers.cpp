@@ -198,6 +198,19 @@ constexpr auto kSeparators = [] {
 
 uint8_t SeparatorOf(char c) { return kSeparators[static_cast<unsigned char>(c)]; }
 
+// Reads the rest of a plain number, whose digits up to a point were read. False when it has another form.
+bool ScanRest(Cursor* cursor, Decimal* decimal) {
+  if (*cursor->at == '.') {
+    const char* const fraction = ++cursor->at;
+    cursor->at = PlainDigits(fraction, cursor->end, &decimal->mantissa);
+    decimal->fraction = cursor->at - fraction;
+    decimal->digits += decimal->fraction;
+  }
+  if (SeparatorOf(*cursor->at) != kNoSeparator) return decimal->digits != 0;
+  if (decimal->digits != 0) ReadExponent(cursor, decimal);
+  return decimal->digits != 0 && SeparatorOf(*cursor->at) != kNoSeparator;
+}
+
 // Passes over white space and reads one number of plain form. False, with nothing to rely on, when there is
 // none.
 bool ScanPlain(const char** text, const char* end, double* value, int32_t* lines) {
@@ -211,18 +224,7 @@ bool ScanPlain(const char** text, const char* end, double* value, int32_t* lines
     decimal.mantissa = decimal.mantissa * 10 + static_cast<uint64_t>(*cursor.at - '0');
   }
   decimal.digits = cursor.at - decimal.begin;
-  if (*cursor.at == '.') {
-    const char* const fraction = ++cursor.at;
-    cursor.at = PlainDigits(fraction, end, &decimal.mantissa);
-    decimal.fraction = cursor.at - fraction;
-    decimal.digits += decimal.fraction;
-  }
-  if (decimal.digits == 0) return false;
-  if (SeparatorOf(*cursor.at) == kNoSeparator) {
-    ReadExponent(&cursor, &decimal);
-    if (SeparatorOf(*cursor.at) == kNoSeparator) return false;
-  }
-  if (cursor.at - at > kLongestPlainNumber) return false;
+  if (!ScanRest(&cursor, &decimal) || cursor.at - at > kLongestPlainNumber) return false;
   decimal.end = cursor.at;
   double magnitude = 0.0;
   if (!ConvertExactly(decimal, &magnitude) && Convert(decimal, &magnitude) != HOST_ERR_NONE) return false;

@@ -92,13 +92,10 @@ class HandlePool {
   HandlePool(const HandleCodec& codec, HandleKind kind) : codec_(codec), kind_(kind) {}
 
   Object* find(const void* handle) {
-    if (!codec_.isOf(kind_, handle)) return nullptr;
+    // The slot holds the whole handle, so that one comparison tells kind, host, number and life.
     const std::size_t slot = HandleCodec::heldSlot(handle);
-    if (slot >= slots_.size()) return nullptr;
-    Slot& found = slots_[slot];
-    const bool live =
-        found.number != 0 && (found.number & HandleCodec::kNumberMask) == HandleCodec::heldNumber(handle);
-    return live ? &found.object : nullptr;
+    if (slot >= slots_.size() || slots_[slot].handle != handle || handle == nullptr) return nullptr;
+    return &slots_[slot].object;
   }
 
   // Whether the handle was handed out and given back since.
@@ -121,7 +118,8 @@ class HandlePool {
     }
     slots_[slot].object = std::move(object);
     slots_[slot].number = ++handedOut_;
-    return reinterpret_cast<void*>(codec_.held(kind_, slot, handedOut_));
+    slots_[slot].handle = reinterpret_cast<void*>(codec_.held(kind_, slot, handedOut_));
+    return slots_[slot].handle;
   }
 
   // The handle is live.
@@ -152,6 +150,7 @@ class HandlePool {
 
  private:
   struct Slot {
+    void* handle = nullptr;      // null: free
     std::uint32_t number = 0;    // 0: free
     std::uint32_t nextFree = 0;  // of a free slot: the next one, or kNoSlot
     Object object{};
@@ -160,6 +159,7 @@ class HandlePool {
 
   void release(std::size_t slot) {
     slots_[slot].object = Object{};
+    slots_[slot].handle = nullptr;
     slots_[slot].number = 0;
     slots_[slot].nextFree = firstFree_;
     firstFree_ = static_cast<std::uint32_t>(slot);
