@@ -1,11 +1,11 @@
 #include "tests/docs/SceneImport.h"
 
 #include <gtest/gtest.h>
-#include <unistd.h>
 
 #include <filesystem>
-#include <fstream>
 #include <utility>
+
+#include "tests/support/TemporaryFolder.h"
 
 namespace docs_test {
 namespace {
@@ -15,31 +15,8 @@ refhost::HostOptions WithModule(refhost::HostOptions options) {
   return options;
 }
 
-// A folder of this process, gone when it ends. A process that it forks and that is killed leaves nothing.
-class TemporaryFolder {
- public:
-  TemporaryFolder()
-      : path_(std::filesystem::path(testing::TempDir()) / ("docs_test_" + std::to_string(getpid()))) {
-    std::filesystem::create_directories(path_);
-  }
-  TemporaryFolder(const TemporaryFolder&) = delete;
-  TemporaryFolder& operator=(const TemporaryFolder&) = delete;
-  ~TemporaryFolder() {
-    std::error_code ignored;
-    std::filesystem::remove_all(path_, ignored);
-  }
-
-  std::filesystem::path Write(const std::string& text) const {
-    const std::filesystem::path file = path_ / "shot.ma";
-    std::ofstream(file, std::ios::binary) << text;
-    return file;
-  }
-
- private:
-  std::filesystem::path path_;
-};
-
-const TemporaryFolder kFolder;
+// Of the process: one that it forks and that is killed leaves nothing.
+const testsupport::TemporaryFolder kFolder;
 
 }  // namespace
 
@@ -52,7 +29,7 @@ SceneImport::SceneImport(const std::string& text, refhost::HostOptions options)
     return;
   }
   EXPECT_EQ(entry.code, 0);
-  result_ = host_.importScene(kFolder.Write(text));
+  result_ = host_.importScene(kFolder.write("shot.ma", text));
 }
 
 const refhost::Layer* SceneImport::Layer(const std::string& name) const {

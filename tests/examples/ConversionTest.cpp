@@ -1,7 +1,6 @@
 // The conversion from first principles: what a scene's own camera sees, and what the camera of the
 // composition that an import makes of it sees, are the same picture.
 #include <gtest/gtest.h>
-#include <unistd.h>
 
 #include <algorithm>
 #include <cmath>
@@ -14,6 +13,7 @@
 #include "refhost/Host.h"
 #include "tests/examples/CompositionView.h"
 #include "tests/examples/ConversionScene.h"
+#include "tests/support/TemporaryFolder.h"
 
 namespace {
 
@@ -29,12 +29,6 @@ constexpr double kPointsPerCentimetre = 72.0 / 2.54;
 
 class Conversion : public testing::Test {
  protected:
-  Conversion() {
-    std::string pattern = (std::filesystem::temp_directory_path() / "mayascene-conversion-XXXXXX").string();
-    if (mkdtemp(pattern.data()) != nullptr) folder_ = pattern;
-  }
-  ~Conversion() override { std::filesystem::remove_all(folder_); }
-
   void expectTheSamePicture(const SceneTraits& traits, bool linearUnits = false) {
     refhost::HostOptions options;
     options.module = MAYASCENE_MODULE;
@@ -53,7 +47,7 @@ class Conversion : public testing::Test {
  private:
   // The composition that receives the layers; null when the import failed.
   const refhost::Composition* import(refhost::Host& host, const ConversionScene& scene) {
-    const std::filesystem::path path = folder_ / "scene.ma";
+    const std::filesystem::path path = folder_.path() / "scene.ma";
     std::ofstream(path, std::ios::binary) << scene.text();
     const refhost::CallbackResult result = host.importScene(path);
     EXPECT_EQ(result.code, 0);
@@ -93,7 +87,7 @@ class Conversion : public testing::Test {
     }
   }
 
-  std::filesystem::path folder_;
+  testsupport::TemporaryFolder folder_;
 };
 
 TEST_F(Conversion, ShowsTheSamePictureWithoutPivotsAndScale) { expectTheSamePicture({}); }

@@ -1,7 +1,6 @@
 // Each example scene shows what its comment says.
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
-#include <unistd.h>
 
 #include <algorithm>
 #include <cmath>
@@ -13,6 +12,7 @@
 #include <vector>
 
 #include "tests/scenes/ImportedScene.h"
+#include "tests/support/TemporaryFolder.h"
 
 namespace {
 
@@ -103,12 +103,8 @@ TEST(AimedCamera, WhoseWeightIsConnectedLastIsAimedAtTheConstraintItself) {
   text.erase(start, length);
   text.insert(text.find("// End of"), weight);
 
-  std::string pattern = (std::filesystem::temp_directory_path() / "mayascene-aim-XXXXXX").string();
-  ASSERT_NE(mkdtemp(pattern.data()), nullptr);
-  const std::filesystem::path path = std::filesystem::path(pattern) / "weight_last.ma";
-  std::ofstream(path, std::ios::binary) << text;
-  const ImportedScene scene(path);
-  std::filesystem::remove_all(pattern);
+  const testsupport::TemporaryFolder folder;
+  const ImportedScene scene(folder.write("weight_last.ma", text));
 
   ASSERT_TRUE(scene.loaded());
   const Layer* camera = scene.layer("chase_camShape");

@@ -1,7 +1,6 @@
 // Every example scene, imported by the tool, makes exactly the calls of its golden trace.
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
-#include <unistd.h>
 
 #include <algorithm>
 #include <cmath>
@@ -14,6 +13,8 @@
 #include <string>
 #include <utility>
 #include <vector>
+
+#include "tests/support/TemporaryFolder.h"
 
 namespace {
 
@@ -50,26 +51,10 @@ std::string openingComment(const std::string& scene) {
   return comment;
 }
 
-// A folder that is gone when the test is.
-class ScratchFolder {
- public:
-  ScratchFolder() {
-    std::string pattern = (fs::temp_directory_path() / "mayascene-golden-XXXXXX").string();
-    if (mkdtemp(pattern.data()) != nullptr) path_ = pattern;
-  }
-  ~ScratchFolder() { fs::remove_all(path_); }
-  ScratchFolder(const ScratchFolder&) = delete;
-  ScratchFolder& operator=(const ScratchFolder&) = delete;
-  const fs::path& path() const { return path_; }
-
- private:
-  fs::path path_;
-};
-
 std::string quoted(const fs::path& path) { return "'" + path.string() + "'"; }
 
 std::string traceOfImport(const std::string& stem) {
-  const ScratchFolder scratch;
+  const testsupport::TemporaryFolder scratch;
   const fs::path trace = scratch.path() / "trace";
   const std::string comment = openingComment(contentsOf(examplesDir() / (stem + ".ma")));
   std::string command = "cd " + quoted(sourceDir()) + " && " + quoted(MAYASCENE_TOOL) +

@@ -1,4 +1,4 @@
-// A folder of a test's own, gone with the test.
+// A test's own folder with the kinds of file that the file services meet.
 #pragma once
 
 #include <fcntl.h>
@@ -7,31 +7,18 @@
 #include <unistd.h>
 
 #include <cstdint>
-#include <filesystem>
-#include <fstream>
 #include <string>
+
+#include "tests/support/TemporaryFolder.h"
 
 namespace hostutil_tests {
 
-class TemporaryFolder {
+class TemporaryFolder : public testsupport::TemporaryFolder {
  public:
-  TemporaryFolder() {
-    std::string pattern = (std::filesystem::temp_directory_path() / "hostutil.XXXXXX").string();
-    EXPECT_NE(mkdtemp(pattern.data()), nullptr);
-    path_ = pattern;
-  }
-  ~TemporaryFolder() {
-    std::error_code ignored;
-    std::filesystem::remove_all(path_, ignored);
-  }
-  TemporaryFolder(const TemporaryFolder&) = delete;
-  TemporaryFolder& operator=(const TemporaryFolder&) = delete;
-
-  std::string Path(const std::string& name) const { return path_ + "/" + name; }
+  std::string Path(const std::string& name) const { return (path() / name).string(); }
 
   std::string Write(const std::string& name, const std::string& bytes) const {
-    std::ofstream(Path(name), std::ios::binary) << bytes;
-    return Path(name);
+    return write(name, bytes).string();
   }
 
   // A file of that size without contents; it takes no room on the disk.
@@ -45,9 +32,6 @@ class TemporaryFolder {
     EXPECT_EQ(mkfifo(Path(name).c_str(), S_IRUSR | S_IWUSR), 0);
     return Path(name);
   }
-
- private:
-  std::string path_;
 };
 
 }  // namespace hostutil_tests

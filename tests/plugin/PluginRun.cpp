@@ -1,9 +1,5 @@
 #include "tests/plugin/PluginRun.h"
 
-#include <stdlib.h>
-
-#include <fstream>
-
 #include "plugin/Entry.h"
 #include "plugin/Globals.h"
 
@@ -23,16 +19,9 @@ std::string ValueOf(const std::string& line, const std::string& key) {
 
 }  // namespace
 
-PluginTest::PluginTest() {
-  std::string pattern = (std::filesystem::temp_directory_path() / "plugin-XXXXXX").string();
-  folder_ = mkdtemp(pattern.data());
-  G_use_linear_unitsL = 0;
-}
+PluginTest::PluginTest() { G_use_linear_unitsL = 0; }
 
-PluginTest::~PluginTest() {
-  EndHost();
-  std::filesystem::remove_all(folder_);
-}
+PluginTest::~PluginTest() { EndHost(); }
 
 refhost::CallbackResult PluginTest::Load(refhost::HostOptions options) {
   EndHost();
@@ -69,8 +58,7 @@ void PluginTest::EndHost() {
 }
 
 std::filesystem::path PluginTest::Write(const std::string& name, std::string_view bytes) const {
-  std::ofstream(folder_ / name, std::ios::binary) << bytes;
-  return folder_ / name;
+  return folder_.write(name, bytes);
 }
 
 std::vector<std::string> PluginTest::Lines() const {

@@ -13,6 +13,7 @@
 
 #include "hostapi/ErrorCodes.h"
 #include "refhost/Host.h"
+#include "tests/support/TemporaryFolder.h"
 
 namespace testsupport {
 
@@ -73,14 +74,14 @@ class PluginTest : public ::testing::Test {
   // Whatever was made to fail: no exception left the plug-in, and nothing was left behind.
   void ExpectSound(const refhost::CallbackResult& result) const;
 
-  const std::filesystem::path& folder() const { return folder_; }
+  const std::filesystem::path& folder() const { return folder_.path(); }
 
   std::unique_ptr<refhost::Host> host_;
 
  private:
   std::vector<std::string> Lines() const;
 
-  std::filesystem::path folder_;
+  TemporaryFolder folder_;
   std::ostringstream trace_;
 };
 

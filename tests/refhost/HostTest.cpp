@@ -3,10 +3,12 @@
 
 #include "hostutil/HostStrings.h"
 #include "tests/refhost/StandIn.h"
-#include "tests/refhost/TemporaryFolder.h"
+#include "tests/support/TemporaryFolder.h"
 
 namespace refhost {
 namespace {
+
+using testsupport::TemporaryFolder;
 
 using ::testing::ElementsAre;
 using ::testing::IsEmpty;

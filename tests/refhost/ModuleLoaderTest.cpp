@@ -6,10 +6,12 @@
 #include <string>
 
 #include "refhost/Host.h"
-#include "tests/refhost/TemporaryFolder.h"
+#include "tests/support/TemporaryFolder.h"
 
 namespace refhost {
 namespace {
+
+using testsupport::TemporaryFolder;
 
 using ::testing::HasSubstr;
 using ::testing::StartsWith;

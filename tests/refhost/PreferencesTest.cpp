@@ -7,10 +7,12 @@
 #include <fstream>
 #include <sstream>
 
-#include "tests/refhost/TemporaryFolder.h"
+#include "tests/support/TemporaryFolder.h"
 
 namespace refhost {
 namespace {
+
+using testsupport::TemporaryFolder;
 
 namespace fs = std::filesystem;
 

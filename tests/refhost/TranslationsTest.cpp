@@ -3,10 +3,12 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include "tests/refhost/TemporaryFolder.h"
+#include "tests/support/TemporaryFolder.h"
 
 namespace refhost {
 namespace {
+
+using testsupport::TemporaryFolder;
 
 using ::testing::ElementsAre;
 using ::testing::EndsWith;

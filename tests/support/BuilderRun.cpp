@@ -3,7 +3,6 @@
 #include <stdlib.h>
 
 #include <cstddef>
-#include <fstream>
 #include <stdexcept>
 #include <utility>
 
@@ -54,18 +53,8 @@ std::size_t EndOfValue(std::string_view line, std::size_t at) {
 
 }  // namespace
 
-TemporaryFile::TemporaryFile(std::string_view text, std::string_view name) {
-  std::string pattern = (std::filesystem::temp_directory_path() / "mayascene-XXXXXX").native();
-  if (mkdtemp(pattern.data()) == nullptr) throw std::runtime_error("no temporary folder");
-  folder_ = pattern;
-  path_ = folder_ / name;
-  std::ofstream(path_, std::ios::binary) << text;
-}
-
-TemporaryFile::~TemporaryFile() {
-  std::error_code ignored;
-  std::filesystem::remove_all(folder_, ignored);
-}
+TemporaryFile::TemporaryFile(std::string_view text, std::string_view name)
+    : path_(folder_.write(name, text)) {}
 
 ImportRun ImportFile(const TemporaryFile& file, refhost::HostOptions options) {
   return Import(file, std::move(options), true);

@@ -9,6 +9,7 @@
 #include <vector>
 
 #include "refhost/Host.h"
+#include "tests/support/TemporaryFolder.h"
 
 namespace testsupport {
 
@@ -16,14 +17,11 @@ namespace testsupport {
 class TemporaryFile {
  public:
   explicit TemporaryFile(std::string_view text, std::string_view name = "shot01.ma");
-  ~TemporaryFile();
-  TemporaryFile(const TemporaryFile&) = delete;
-  TemporaryFile& operator=(const TemporaryFile&) = delete;
 
   const std::filesystem::path& path() const { return path_; }
 
  private:
-  std::filesystem::path folder_;
+  TemporaryFolder folder_;
   std::filesystem::path path_;
 };
 

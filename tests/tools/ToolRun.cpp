@@ -4,31 +4,14 @@
 #include <poll.h>
 #include <signal.h>
 #include <spawn.h>
-#include <stdlib.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
 #include <algorithm>
 #include <array>
-#include <fstream>
-#include <sstream>
-#include <stdexcept>
 
 namespace mayascene_test {
 namespace {
-
-std::filesystem::path temporaryFolder() {
-  std::string pattern = (std::filesystem::temp_directory_path() / "mayascene-test-XXXXXX").string();
-  if (::mkdtemp(pattern.data()) == nullptr) throw std::runtime_error("no temporary folder");
-  return pattern;
-}
-
-std::string contents(const std::filesystem::path& file) {
-  std::ifstream stream(file, std::ios::binary);
-  std::ostringstream text;
-  text << stream.rdbuf();
-  return text.str();
-}
 
 std::vector<char*> pointers(std::vector<std::string>& words) {
   std::vector<char*> list;
@@ -46,30 +29,22 @@ ToolResult resultOf(int status) {
 
 }  // namespace
 
-ToolTest::ToolTest() : folder_(temporaryFolder()), captured_(temporaryFolder()) {}
-
-ToolTest::~ToolTest() {
-  std::error_code ignored;
-  std::filesystem::remove_all(folder_, ignored);
-  std::filesystem::remove_all(captured_, ignored);
-}
-
 int ToolTest::spawn(const std::vector<std::string>& arguments, const std::string& out,
                     const std::string& err) const {
   std::vector<std::string> words = {MAYASCENE_TOOL};
   words.insert(words.end(), arguments.begin(), arguments.end());
   std::map<std::string, std::string> found = environment;
   found.insert({{"PATH", "/usr/bin:/bin"},
-                {"HOME", captured_.string()},
-                {"XDG_CONFIG_HOME", (captured_ / "config").string()},
+                {"HOME", captured_.path().string()},
+                {"XDG_CONFIG_HOME", (captured_.path() / "config").string()},
                 {"TERM", "xterm"}});
   std::vector<std::string> variables;
   for (const auto& [name, value] : found) variables.push_back(name + '=' + value);
 
   posix_spawn_file_actions_t actions;
   posix_spawn_file_actions_init(&actions);
-  posix_spawn_file_actions_addchdir_np(&actions,
-                                       workingFolder.empty() ? folder_.c_str() : workingFolder.c_str());
+  posix_spawn_file_actions_addchdir_np(
+      &actions, workingFolder.empty() ? folder_.path().c_str() : workingFolder.c_str());
   posix_spawn_file_actions_addopen(&actions, STDIN_FILENO, "/dev/null", O_RDONLY, 0);
   posix_spawn_file_actions_addopen(&actions, STDOUT_FILENO, out.c_str(), O_WRONLY | O_CREAT | O_TRUNC, 0600);
   posix_spawn_file_actions_addopen(&actions, STDERR_FILENO, err.c_str(), O_WRONLY | O_CREAT | O_TRUNC, 0600);
@@ -83,15 +58,15 @@ int ToolTest::spawn(const std::vector<std::string>& arguments, const std::string
 }
 
 int ToolTest::start(const std::vector<std::string>& arguments) const {
-  return spawn(arguments, captured_ / "out", captured_ / "err");
+  return spawn(arguments, captured_.path() / "out", captured_.path() / "err");
 }
 
 ToolResult ToolTest::end(int process) const {
   int status = 0;
   if (::waitpid(process, &status, 0) != process) throw std::runtime_error("the tool cannot be waited for");
   ToolResult result = resultOf(status);
-  result.out = contents(captured_ / "out");
-  result.err = contents(captured_ / "err");
+  result.out = captured_.read("out");
+  result.err = captured_.read("err");
   return result;
 }
 
@@ -121,15 +96,13 @@ ToolResult ToolTest::runOnTerminal(const std::vector<std::string>& arguments) co
   return result;
 }
 
-void ToolTest::write(std::string_view name, std::string_view text) const {
-  std::ofstream(path(name), std::ios::binary) << text;
-}
+void ToolTest::write(std::string_view name, std::string_view text) const { folder_.write(name, text); }
 
-std::string ToolTest::read(std::string_view name) const { return contents(path(name)); }
+std::string ToolTest::read(std::string_view name) const { return folder_.read(name); }
 
 std::vector<std::string> ToolTest::files() const {
   std::vector<std::string> names;
-  for (const auto& entry : std::filesystem::directory_iterator(folder_))
+  for (const auto& entry : std::filesystem::directory_iterator(folder_.path()))
     names.push_back(entry.path().filename());
   std::sort(names.begin(), names.end());
   return names;

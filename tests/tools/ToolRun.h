@@ -9,6 +9,8 @@
 #include <string_view>
 #include <vector>
 
+#include "tests/support/TemporaryFolder.h"
+
 namespace mayascene_test {
 
 struct ToolResult {
@@ -22,9 +24,6 @@ struct ToolResult {
 // no run reads or writes that of the person who tests.
 class ToolTest : public ::testing::Test {
  protected:
-  ToolTest();
-  ~ToolTest() override;
-
   // Runs the tool with these arguments and waits for its end.
   ToolResult run(const std::vector<std::string>& arguments) const;
 
@@ -35,7 +34,7 @@ class ToolTest : public ::testing::Test {
   int start(const std::vector<std::string>& arguments) const;
   ToolResult end(int process) const;
 
-  std::filesystem::path path(std::string_view name) const { return folder_ / name; }
+  std::filesystem::path path(std::string_view name) const { return folder_.path() / name; }
   void write(std::string_view name, std::string_view text) const;
   std::string read(std::string_view name) const;
   std::vector<std::string> files() const;  // names in the folder, sorted
@@ -48,8 +47,8 @@ class ToolTest : public ::testing::Test {
  private:
   int spawn(const std::vector<std::string>& arguments, const std::string& out, const std::string& err) const;
 
-  std::filesystem::path folder_;
-  std::filesystem::path captured_;
+  testsupport::TemporaryFolder folder_;
+  testsupport::TemporaryFolder captured_;
 };
 
 // A scene of the given commands, in frames of film, 640 by 360 square pixels.
