@@ -17,7 +17,7 @@ void MAYA_Parse::SetCamera(VOR_Layer* layer, const MAYA_Camera* camera) {
   ThrowOnError(CameraSuite2().SetCameraFilmSize(layer, direction, &filmSize));
   SetUnguarded(layer, kZoomStream, CalculateZoom(camera, filmSize, nullptr));
 
-  const std::int32_t parent = transformNames_.Find(transforms, camera->parent);
+  const std::int32_t parent = transformNames_.Find(camera->parent);
   if (parent == kNoIndex) return;
   const auto transform = FetchRecord<MAYA_Transform>(transforms, parent);
   SetTransform(layer, &transform);

@@ -9,7 +9,7 @@
 
 void MAYA_Parse::ApplyCameraAnimation(VOR_Layer* layer, const MAYA_Camera* camera) {
   ApplyZoomAnimation(layer, camera);
-  const std::int32_t parent = transformNames_.Find(transforms, camera->parent);
+  const std::int32_t parent = transformNames_.Find(camera->parent);
   if (parent == kNoIndex) return;
   const auto transform = FetchRecord<MAYA_Transform>(transforms, parent);
   ApplyTransformAnimation(layer, &transform);

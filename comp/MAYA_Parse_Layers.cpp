@@ -24,7 +24,7 @@ void MAYA_Parse::CreateCameraLayerAndKeyframes(VOR_CompItem* comp, const MAYA_Ca
                                            HOST_CAMERA_CENTER_ANYWHERE, &layer));
   SetCamera(layer, camera);
   ApplyCameraAnimation(layer, camera);
-  const std::int32_t transform = transformNames_.Find(transforms, camera->parent);
+  const std::int32_t transform = transformNames_.Find(camera->parent);
   CreateParentNulls(comp, layer, transform);
   LookAtPass(layer, camera, transform);
 }
@@ -33,12 +33,12 @@ void MAYA_Parse::CreateLocatorLayerAndKeyframes(VOR_CompItem* comp, const MAYA_L
   if (!IsMarked(locator->name)) return;
   VOR_Layer* layer = nullptr;
   CreateLocator(locator, comp, &layer);
-  CreateParentNulls(comp, layer, transformNames_.Find(transforms, locator->parent));
+  CreateParentNulls(comp, layer, transformNames_.Find(locator->parent));
 }
 
 void MAYA_Parse::CreateLocator(const MAYA_Locator* locator, VOR_CompItem* comp, VOR_Layer** layer) {
   *layer = NewNull(comp, locator->name);
-  const std::int32_t transform = transformNames_.Find(transforms, locator->parent);
+  const std::int32_t transform = transformNames_.Find(locator->parent);
   if (transform == kNoIndex) return;
   const auto record = FetchRecord<MAYA_Transform>(transforms, transform);
   SetTransform(*layer, &record);
@@ -55,7 +55,7 @@ void MAYA_Parse::CreateParentNulls(VOR_CompItem* comp, VOR_Layer* child, std::in
     chainOfTransform_.at(static_cast<std::size_t>(transform)) = chain_;
     const auto below = FetchRecord<MAYA_Transform>(transforms, transform);
     if (below.parent[0] == '\0') return;
-    transform = transformNames_.Find(transforms, below.parent);
+    transform = transformNames_.Find(below.parent);
     const bool found = transform != kNoIndex;
     if (found && chainOfTransform_.at(static_cast<std::size_t>(transform)) == chain_) return;
 

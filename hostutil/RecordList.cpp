@@ -3,14 +3,13 @@
 
 #include <algorithm>
 #include <cstddef>
-#include <cstdlib>
 #include <cstring>
 #include <new>
 #include <string>
 #include <unordered_map>
 
 #include "hostapi/ErrorCodes.h"
-#include "hostutil/HostSetup.h"
+#include "hostutil/BlocksInternal.h"
 #include "hostutil/RegistryInternal.h"
 #include "hostutil/RehearsalInternal.h"
 
@@ -24,7 +23,7 @@ constexpr uint64_t kListMark = 0x5265634C69737431;
 struct RecordList final : hostutil::LiveObject {
   RecordList(int64_t recordBytes, int64_t growthStep)
       : LiveObject(Kind::List), recordSize(recordBytes), growth(growthStep) {}
-  ~RecordList() override { std::free(records); }
+  ~RecordList() override { hostutil::FreeBlock(records, capacity * recordSize); }
 
   std::string Describe() const override {
     return "list of " + std::to_string(count) + " records of " + std::to_string(recordSize) + " bytes";
@@ -61,11 +60,11 @@ std::size_t ByteCount(int64_t records, int64_t recordSize) {
 }
 
 bool SetCapacity(RecordList* list, int64_t capacity) {
-  void* records = std::realloc(list->records, ByteCount(capacity, list->recordSize));
+  void* records =
+      hostutil::GrowBlock(list->records, list->capacity * list->recordSize, capacity * list->recordSize);
   if (records == nullptr) return false;
   list->records = static_cast<unsigned char*>(records);
   list->capacity = capacity;
-  HostAdviseLargePages(records, capacity * list->recordSize);
   return true;
 }
 
@@ -93,13 +92,12 @@ HostError RecordListCreate(int64_t recordSize, int64_t growth, int64_t initial, 
   auto* made = new (std::nothrow) RecordList(recordSize, growth);
   if (made == nullptr) return HOST_ERR_LIST_MEMORY;
   if (initial > 0) {
-    made->records = static_cast<unsigned char*>(
-        std::calloc(static_cast<std::size_t>(initial), static_cast<std::size_t>(recordSize)));
-    if (made->records == nullptr) {
+    if (!SetCapacity(made, initial)) {
       delete made;
       return HOST_ERR_LIST_MEMORY;
     }
-    made->count = made->capacity = initial;
+    std::memset(made->records, 0, ByteCount(initial, recordSize));
+    made->count = initial;
   }
   *list = made;
   return HOST_ERR_NONE;

@@ -12,6 +12,7 @@
 
 #include "hostapi/HostTypes.h"
 #include "hostutil/HostUtilities.h"
+#include "maya/ConnectionScout.h"
 #include "maya/MAYA_Lex.h"
 #include "maya/NameIndex.h"
 #include "maya/SceneRecords.h"
@@ -288,6 +289,7 @@ class MAYA_Parse : public MAYA_Lex {
   NameIndex transformNames_;
   NameIndex cameraNames_;
   NameIndex curveNames_;
+  ConnectionScout scout_;
 
   // Used while the composition is built; by transform index.
   std::vector<std::uint32_t> chainOfTransform_;  // the last parent chain that used it

@@ -41,6 +41,7 @@ void MAYA_Parse::ParseConnectAttr() {
   const char* last = nullptr;
   std::string_view source;
   std::string_view destination;
+  scout_.LookAhead(position, end(), curveNames_, transformNames_);
   for (MayaToken kind = Unknown; kind != Semicolon;) {
     kind = NextInCommand(&first, &last);
     if (kind != String) continue;
@@ -58,20 +59,20 @@ void MAYA_Parse::MakeConnection(std::string_view source, std::size_t sourceDot, 
                                 std::size_t destinationDot) {
   const std::string_view sourceAttribute = source.substr(sourceDot + 1);
   const std::string_view attribute = destination.substr(destinationDot + 1);
-  const std::int32_t curve = curveNames_.Find(curves, source.substr(0, sourceDot));
+  const std::int32_t curve = curveNames_.Find(source.substr(0, sourceDot));
   const bool fromCurve = curve != kNoIndex;
   if (fromCurve && !IsOneOf(sourceAttribute, kOutputs)) return;
 
   const std::string_view destinationNode = destination.substr(0, destinationDot);
-  const std::int32_t transform = transformNames_.Find(transforms, destinationNode);
+  const std::int32_t transform = transformNames_.Find(destinationNode);
   if (transform != kNoIndex) {
     if (fromCurve) return ConnectCurve(curve, transform, attribute);
-    const std::int32_t sourceTransform = transformNames_.Find(transforms, source.substr(0, sourceDot));
+    const std::int32_t sourceTransform = transformNames_.Find(source.substr(0, sourceDot));
     if (sourceTransform == kNoIndex) return;
     return ConnectTransforms(sourceTransform, sourceAttribute, transform, attribute);
   }
   if (!fromCurve || !IsOneOf(attribute, kFocalLengthInputs)) return;
-  const std::int32_t camera = cameraNames_.Find(cameras, destinationNode);
+  const std::int32_t camera = cameraNames_.Find(destinationNode);
   if (camera == kNoIndex) return;
   ChangeRecord<MAYA_Camera>(cameras, camera, [&](MAYA_Camera& record) { record.focalLengthCurve = curve; });
 }

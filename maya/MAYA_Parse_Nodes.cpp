@@ -93,7 +93,7 @@ void MAYA_Parse::CreateNodeRecord(Record record, NodeKind kind, RecordList** lis
   currentKind = kind;
   currentRecord_ = kNoIndex;
   std::memcpy(static_cast<void*>(&current), &record, sizeof record);
-  if (names != nullptr) currentRecord_ = names->Append(*list, index, record.name);
+  if (names != nullptr) currentRecord_ = names->Append(index, record.name);
 }
 
 // Takes the next token as a name if it is a string, else drops it. True when it was the command's ";".

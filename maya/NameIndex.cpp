@@ -5,11 +5,11 @@
 #include <cstring>
 
 #include "maya/SceneRecords.h"
-#include "maya/Words.h"
 
 namespace {
 
 constexpr std::size_t kFirstCapacity = 64;
+constexpr std::size_t kWordSize = sizeof(std::uint64_t);
 
 // Lower case for the ASCII letters among eight bytes at once.
 std::uint64_t FoldEight(std::uint64_t bytes) {
@@ -36,71 +36,81 @@ std::uint64_t Mix(std::uint64_t state, std::uint64_t bytes) {
   return state ^ (state >> 32);
 }
 
-std::uint32_t HashName(std::string_view name) {
-  const std::uint64_t seed = Seed();
-  std::uint64_t state = seed + name.size();
-  std::size_t at = 0;
-  for (; at < name.size(); at += sizeof(std::uint64_t)) {
-    std::uint64_t bytes = 0;
-    std::memcpy(&bytes, name.data() + at, std::min(sizeof bytes, name.size() - at));
-    state = Mix(state + seed, FoldEight(bytes));
-  }
-  return static_cast<std::uint32_t>(Mix(state, seed) >> 16);
-}
-
-std::uint64_t LoadEight(const char* at) {
-  std::uint64_t bytes = 0;
-  std::memcpy(&bytes, at, sizeof bytes);
-  return bytes;
-}
-
-// Whether the record that begins with `field`, a name filled up with NULs, is one of that name.
-bool IsNamed(const char* field, std::string_view name) {
-  constexpr std::size_t kEight = sizeof(std::uint64_t);
-  if (name.size() >= kNameCapacity || field[name.size()] != '\0') return false;
-  std::size_t at = 0;
-  for (; at + kEight <= name.size(); at += kEight) {
-    if (FoldEight(LoadEight(field + at)) != FoldEight(LoadEight(name.data() + at))) return false;
-  }
-  return SameWord({field + at, name.size() - at}, name.substr(at));
-}
-
-bool IsNamed(const RecordList* list, std::int32_t index, std::string_view name) {
-  const auto* field = static_cast<const char*>(RecordListPeek(list, index));
-  return field != nullptr && IsNamed(field, name);
-}
-
 }  // namespace
 
-std::int32_t NameIndex::Append(const RecordList* list, std::int32_t index, std::string_view name) {
+// A name as the index keeps it, with its hash.
+class NameIndex::FoldedName {
+ public:
+  explicit FoldedName(std::string_view name) : length_(static_cast<std::uint32_t>(name.size())) {
+    const std::uint64_t seed = Seed();
+    std::uint64_t state = seed + name.size();
+    for (std::size_t at = 0; at < name.size(); at += kWordSize) {
+      std::uint64_t bytes = 0;
+      std::memcpy(&bytes, name.data() + at, std::min(kWordSize, name.size() - at));
+      const std::uint64_t folded = FoldEight(bytes);
+      words_[at / kWordSize] = folded;
+      state = Mix(state + seed, folded);
+    }
+    hash_ = static_cast<std::uint32_t>(Mix(state, seed) >> 16);
+  }
+
+  std::uint32_t hash() const { return hash_; }
+  std::uint32_t length() const { return length_; }
+  const std::uint64_t* begin() const { return words_; }
+  const std::uint64_t* end() const { return words_ + (length_ + kWordSize - 1) / kWordSize; }
+
+ private:
+  std::uint32_t hash_ = 0;
+  std::uint32_t length_;
+  std::uint64_t words_[kNameCapacity / kWordSize];
+};
+
+std::int32_t NameIndex::Append(std::int32_t index, std::string_view name) {
   if (entries_.size() < 2 * (used_ + 1)) Grow();
-  const std::uint32_t hash = HashName(name);
-  Entry& entry = entries_[Locate(list, name, hash)];
+  const FoldedName folded(name);
+  Entry& entry = entries_[Locate(folded)];
   if (entry.index == kNoIndex) {
-    entry = {hash, index};
+    const auto firstWord = static_cast<std::uint32_t>(words_.size());
+    words_.insert(words_.end(), folded.begin(), folded.end());
+    entry = {folded.hash(), index, firstWord, folded.length()};
     ++used_;
   }
   return entry.index;
 }
 
-std::int32_t NameIndex::Find(const RecordList* list, std::string_view name) const {
-  if (entries_.empty()) return kNoIndex;
-  return entries_[Locate(list, name, HashName(name))].index;
+std::int32_t NameIndex::Find(std::string_view name) const {
+  if (entries_.empty() || name.size() >= kNameCapacity) return kNoIndex;
+  return entries_[Locate(FoldedName(name))].index;
+}
+
+std::uint32_t NameIndex::Hash(std::string_view name) { return FoldedName(name).hash(); }
+
+void NameIndex::PrefetchEntry(std::uint32_t hash) const {
+  if (!entries_.empty()) __builtin_prefetch(&entries_[hash & (entries_.size() - 1)]);
+}
+
+void NameIndex::PrefetchName(std::uint32_t hash) const {
+  if (entries_.empty()) return;
+  const Entry& entry = entries_[hash & (entries_.size() - 1)];
+  if (entry.hash == hash && entry.index != kNoIndex) __builtin_prefetch(words_.data() + entry.firstWord);
 }
 
 // The entry of the name, or the free one where it belongs.
-std::size_t NameIndex::Locate(const RecordList* list, std::string_view name, std::uint32_t hash) const {
+std::size_t NameIndex::Locate(const FoldedName& name) const {
   const std::size_t mask = entries_.size() - 1;
-  std::size_t at = hash & mask;
-  while (entries_[at].index != kNoIndex) {
-    if (entries_[at].hash == hash && IsNamed(list, entries_[at].index, name)) break;
-    at = (at + 1) & mask;
+  std::size_t at = name.hash() & mask;
+  for (; entries_[at].index != kNoIndex; at = (at + 1) & mask) {
+    const Entry& entry = entries_[at];
+    if (entry.hash == name.hash() && entry.length == name.length() &&
+        std::equal(name.begin(), name.end(), words_.data() + entry.firstWord)) {
+      break;
+    }
   }
   return at;
 }
 
 void NameIndex::Grow() {
-  std::vector<Entry> old(std::max(kFirstCapacity, entries_.size() * 2), Entry{0, kNoIndex});
+  std::vector<Entry> old(std::max(kFirstCapacity, entries_.size() * 2), Entry{0, kNoIndex, 0, 0});
   old.swap(entries_);
   const std::size_t mask = entries_.size() - 1;
   for (const Entry& entry : old) {

@@ -2,8 +2,6 @@
 
 #include <gtest/gtest.h>
 
-#include <cstring>
-#include <memory>
 #include <string>
 
 #include "maya/SceneRecords.h"
@@ -13,28 +11,19 @@ namespace {
 
 class NameIndexTest : public ::testing::Test {
  protected:
-  NameIndexTest() { EXPECT_EQ(RecordListCreate(sizeof(MAYA_Locator), 10, 0, &list_), 0); }
-  ~NameIndexTest() override { RecordListDispose(list_); }
+  // Takes in the next record of the list, of that name.
+  std::int32_t Add(const std::string& name) { return index_.Append(count_++, name); }
 
-  // Appends a record of that name to the list and takes it in.
-  std::int32_t Add(const std::string& name) {
-    MAYA_Locator record{};
-    name.copy(record.name, kNameCapacity - 1);
-    EXPECT_EQ(RecordListAppend(list_, &record), 0);
-    return index_.Append(list_, count_++, name);
-  }
+  std::int32_t Find(const std::string& name) const { return index_.Find(name); }
 
-  std::int32_t Find(const std::string& name) const { return index_.Find(list_, name); }
-
-  RecordList* list_ = nullptr;
+ private:
   NameIndex index_;
   std::int32_t count_ = 0;
 };
 
 TEST_F(NameIndexTest, AnEmptyIndexFindsNothing) {
-  EXPECT_EQ(index_.Find(nullptr, "a"), kNoIndex);
-  EXPECT_EQ(index_.Find(nullptr, ""), kNoIndex);
   EXPECT_EQ(Find("a"), kNoIndex);
+  EXPECT_EQ(Find(""), kNoIndex);
 }
 
 TEST_F(NameIndexTest, AppendGivesTheFirstRecordOfTheName) {
@@ -95,14 +84,18 @@ TEST_F(NameIndexTest, ManyNamesAreAllFound) {
   EXPECT_EQ(Find("node_" + std::to_string(kNames)), kNoIndex);
 }
 
-TEST_F(NameIndexTest, ARecordMayChangeTheCaseOfItsName) {
-  Add("rig");
-  void* record = nullptr;
-  ASSERT_EQ(RecordListLock(list_, 0, &record), 0);
-  std::strcpy(static_cast<MAYA_Locator*>(record)->name, "RIG");
-  ASSERT_EQ(RecordListUnlock(list_, 0), 0);
-  EXPECT_EQ(Find("Rig"), 0);
-  EXPECT_EQ(Add("rIG"), 0);
+TEST_F(NameIndexTest, ANameLongerThanARecordHoldsIsNeverFound) {
+  Add(std::string(255, 'n'));
+  EXPECT_EQ(Find(std::string(255, 'N')), 0);
+  EXPECT_EQ(Find(std::string(256, 'n')), kNoIndex);
+  EXPECT_EQ(Find(std::string(5000, 'n')), kNoIndex);
+}
+
+TEST_F(NameIndexTest, AnEmbeddedNulIsPartOfAName) {
+  EXPECT_EQ(Add("rig"), 0);
+  EXPECT_EQ(Find(std::string("rig\0", 4)), kNoIndex);
+  EXPECT_EQ(Add(std::string("rig\0", 4)), 1);
+  EXPECT_EQ(Find("RIG"), 0);
 }
 
 }  // namespace

@@ -12,6 +12,7 @@
 #include "tools/mayascene/ImportCommand.h"
 #include "tools/mayascene/Interruption.h"
 #include "tools/mayascene/PrefsCommand.h"
+#include "tools/mayascene/ProcessMemory.h"
 #include "tools/mayascene/VerifyCommand.h"
 
 namespace {
@@ -46,6 +47,7 @@ void holdStandardDescriptors() {
 
 int main(int argc, char** argv) {
   holdStandardDescriptors();
+  mayascene::useLargePages();
   mayascene::handleInterruptions();
   ExitStatus status = ExitStatus::CannotWrite;
   try {
