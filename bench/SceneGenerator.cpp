@@ -1,5 +1,6 @@
 #include "bench/SceneGenerator.h"
 
+#include <algorithm>
 #include <array>
 
 #include "bench/SceneText.h"
@@ -106,10 +107,17 @@ void mesh(SceneText& scene, const std::string& name, std::int64_t vertices) {
   meshRows(scene, ".vt", vertices, 166, threeReals);
   meshRows(scene, ".ed", vertices * 2, 166, edge);
   meshRows(scene, ".n", vertices * 2, 166, threeReals);
-  for (std::int64_t first = 0; first < vertices; first += 500) {
-    scene.text("\tsetAttr -s 500 \".fc[").integer(first).text(":").integer(first + 499);
+  constexpr std::int64_t kFacesPerCommand = 500;
+  for (std::int64_t first = 0; first < vertices; first += kFacesPerCommand) {
+    const std::int64_t count = std::min(kFacesPerCommand, vertices - first);
+    scene.text("\tsetAttr -s ")
+        .integer(count)
+        .text(" \".fc[")
+        .integer(first)
+        .text(":")
+        .integer(first + count - 1);
     scene.text("]\" -type \"polyFaces\" ");
-    for (std::int64_t i = first; i < first + 500; ++i) {
+    for (std::int64_t i = first; i < first + count; ++i) {
       scene.text("\n\t\t");
       face(scene, i);
     }
@@ -120,7 +128,7 @@ void mesh(SceneText& scene, const std::string& name, std::int64_t vertices) {
 void writeMesh(std::ostream& out, double scale, std::uint64_t seed) {
   SceneText scene(out, seed);
   scene.header("film");
-  const std::int64_t vertices = scaled(scale, 10000);
+  const std::int64_t vertices = scaled(scale, 10500);
   for (int i = 0; i < 90; ++i) mesh(scene, numbered("mesh", i), vertices);
   for (int i = 0; i < 4; ++i) {
     const std::string name = numbered("camera", i);
@@ -155,9 +163,11 @@ void writeNodes(std::ostream& out, double scale, std::uint64_t seed) {
     transform(scene, numbered("crowd_group_", i),
               i % 8 == 0 ? std::string() : numbered("crowd_group_", i - 1));
     scene.text("\tsetAttr \".r\" -type \"double3\" 0 ").real(scene.number(180), 4).text(" 0 ;\n");
+    scene.text("\tsetAttr \".rp\" -type \"double3\" 0 ").real(scene.number(2), 4).text(" 0 ;\n");
     if (i < locators) {
       scene.text("createNode locator -n \"").text(numbered("crowd_locatorShape_", i)).text("\" -p \"");
       scene.text(numbered("crowd_group_", i)).text("\";\n\tsetAttr -k off \".v\";\n");
+      scene.text("\tsetAttr \".los\" -type \"double3\" 0.5 0.5 0.5 ;\n");
     }
   }
   for (std::int64_t i = 0; i < curves; ++i) {
@@ -186,7 +196,7 @@ void writeComposition(std::ostream& out, double scale, std::uint64_t seed) {
     transform(scene, name, "");
     scene.text("createNode locator -n \"").text(name).text("_nullShape\" -p \"").text(name).text("\";\n");
     animate(scene, name, 1200, 8, 0, 1);
-    animate(scene, name, 1200, 8, 4, 1);
+    animate(scene, name, 1200, 9, 4, 1);
   }
   scene.footer();
 }
