@@ -14,6 +14,7 @@ set(CMAKE_VISIBILITY_INLINES_HIDDEN ON)
 
 option(MAYASCENE_SANITIZE "Build with the address, leak and undefined behaviour sanitizers" OFF)
 option(MAYASCENE_COVERAGE "Build for line and branch coverage" OFF)
+option(MAYASCENE_FUZZ "Build the fuzz targets as fuzzers, with the integer sanitizers too; needs clang" OFF)
 
 # bin/ holds the tool, lib/ the utility library and the module; they find each other from where they lie.
 set(CMAKE_RUNTIME_OUTPUT_DIRECTORY ${CMAKE_BINARY_DIR}/bin)
@@ -42,6 +43,23 @@ endif()
 if(MAYASCENE_COVERAGE)
   target_compile_options(mayascene_options INTERFACE --coverage -fprofile-update=atomic)
   target_link_options(mayascene_options INTERFACE --coverage)
+endif()
+if(MAYASCENE_FUZZ)
+  # "function" tells a call through a pointer by the address of a type's description, of which every shared library has
+  # its own: it would take each call across the border for a wrong one. Comparisons are not traced: the dictionary and
+  # the mutator know the words, and tracing takes half of the runs.
+  target_compile_options(
+    mayascene_options
+    INTERFACE -fsanitize=fuzzer-no-link,address,undefined,float-cast-overflow,integer
+              -fno-sanitize=function
+              -fno-sanitize-recover=all
+              -fno-sanitize-coverage=trace-cmp
+              -fsanitize-ignorelist=${PROJECT_SOURCE_DIR}/fuzz/sanitizer_ignorelist.txt
+              -fsanitize-coverage-ignorelist=${PROJECT_SOURCE_DIR}/fuzz/coverage_ignorelist.txt
+              -fno-omit-frame-pointer
+              -gline-tables-only)
+  target_link_options(mayascene_options INTERFACE
+                      -fsanitize=fuzzer-no-link,address,undefined,float-cast-overflow,integer)
 endif()
 
 # add_room(NAME KIND SOURCES ... [LINKS ...]): one library of the house. KIND is STATIC, SHARED or MODULE.

@@ -1,0 +1,48 @@
+// An input taken apart into values, first to last. What is asked for beyond its end is zero or empty, so that
+// every input means something.
+#pragma once
+
+#include <algorithm>
+#include <cstddef>
+#include <cstdint>
+#include <cstring>
+#include <string>
+#include <string_view>
+
+namespace fuzz {
+
+inline std::string_view TextOf(const std::uint8_t* data, std::size_t size) {
+  return {reinterpret_cast<const char*>(data), size};
+}
+
+class Bytes {
+ public:
+  Bytes(const std::uint8_t* data, std::size_t size) : left_(TextOf(data, size)) {}
+
+  bool empty() const { return left_.empty(); }
+
+  std::string_view TakeRun(std::size_t size) {
+    const std::string_view run = left_.substr(0, size);
+    left_.remove_prefix(run.size());
+    return run;
+  }
+
+  // The bytes as they lie: for integers and doubles.
+  template <typename Value>
+  Value Take() {
+    const std::string_view run = TakeRun(sizeof(Value));
+    Value value{};
+    std::memcpy(&value, run.data(), run.size());
+    return value;
+  }
+
+  std::size_t TakeBelow(std::size_t bound) { return Take<std::uint8_t>() % bound; }
+
+  // A length, then so many bytes.
+  std::string TakeText() { return std::string(TakeRun(Take<std::uint8_t>())); }
+
+ private:
+  std::string_view left_;
+};
+
+}  // namespace fuzz

@@ -1,0 +1,8 @@
+// What every fuzz target offers, under the names that the fuzzer's library calls.
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+
+// Runs one input. Returns 0; ends the process where a promise was broken.
+extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size);
