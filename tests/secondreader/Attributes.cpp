@@ -1,0 +1,162 @@
+// The four kinds of setAttr.
+#include <algorithm>
+#include <cmath>
+
+#include "hostutil/HostNumbers.h"
+#include "tests/secondreader/SceneReader.h"
+
+namespace secondreader {
+namespace {
+
+bool nearlyEqual(double a, double b) {
+  constexpr double kRelative = 1e-12;
+  constexpr double kLeast = 1.000088900582341e-12;
+  const double larger = std::fabs(a) > std::fabs(b) ? std::fabs(a) : std::fabs(b);
+  return std::fabs(a - b) < std::max(kRelative * larger, kLeast);
+}
+
+}  // namespace
+
+void SceneReader::setAttr() {
+  switch (kind_) {
+    case Current::Transform:
+      return setTransformAttr();
+    case Current::Camera:
+      return setCameraAttr();
+    case Current::Curve:
+      return setCurveAttr();
+    case Current::Render:
+      return setRenderAttr();
+    case Current::None:
+    case Current::Locator:
+      return;
+  }
+}
+
+double SceneReader::number(const Token& token) { return host_.scanNumber(copied(token.text)); }
+
+template <typename Record>
+void SceneReader::writeBack(std::vector<Record>& list, const Record& current) {
+  const int index = findNamed(list, current.name);
+  if (index >= 0) list[static_cast<std::size_t>(index)] = current;
+}
+
+void SceneReader::readTriple(Triple& triple, Triple standard) {
+  std::size_t count = 0;
+  for (Token token = inCommand(); token.kind != Kind::Semicolon; token = inCommand()) {
+    if (token.kind == Kind::Number && count < standard.size()) standard[count++] = number(token);
+  }
+  triple = standard;
+}
+
+void SceneReader::setTransformAttr() {
+  constexpr Triple kNone{0.0, 0.0, 0.0};
+  constexpr Triple kUnscaled{1.0, 1.0, 1.0};
+  const Token token = lexer_.next();
+  if (token.kind != Kind::String) return;
+  const std::string attribute = unquoted(token.text);
+  if (isOneOf(attribute, {".t", ".translate"})) {
+    readTriple(transform_.translate, kNone);
+  } else if (isOneOf(attribute, {".r", ".rotate"})) {
+    readTriple(transform_.rotate, kNone);
+  } else if (isOneOf(attribute, {".s", ".scale"})) {
+    readTriple(transform_.scale, kUnscaled);
+  } else if (isOneOf(attribute, {".rp", ".rotatePivot"})) {
+    readTriple(transform_.rotatePivot, kNone);
+  } else if (isOneOf(attribute, {".sp", ".scalePivot"})) {
+    readTriple(transform_.scalePivot, kNone);
+  } else {
+    return;
+  }
+  writeBack(scene_.transforms, transform_);
+}
+
+void SceneReader::setCameraAttr() {
+  Token token = lexer_.next();
+  if (token.kind == Kind::Option) {
+    lexer_.next();
+    token = lexer_.next();
+  }
+  if (token.kind != Kind::String) return;
+  const std::string attribute = unquoted(token.text);
+  const bool orthographic = isOneOf(attribute, {".o", ".orthographic"});
+  const bool interest = isOneOf(attribute, {".wci", ".worldCenterOfInterest"});
+  const bool fit = isOneOf(attribute, {".ff", ".filmFit"});
+  const bool focal = isOneOf(attribute, {".fl", ".focalLength"});
+  const bool aperture = isOneOf(attribute, {".cap", ".cameraAperture"});
+  if (!orthographic && !interest && !fit && !focal && !aperture) return;
+  Triple values{};
+  std::size_t count = 0;
+  for (token = inCommand(); token.kind != Kind::Semicolon; token = inCommand()) {
+    if (orthographic && token.kind == Kind::Identifier && same(copied(token.text), "yes")) {
+      camera_.orthographic = true;
+    }
+    if (token.kind != Kind::Number) continue;
+    if (fit) {
+      const double value = number(token);
+      camera_.verticalFit = !nearlyEqual(value, 1.0) && nearlyEqual(value, 2.0);
+    } else if (focal) {
+      camera_.focalLength = number(token);
+    } else if ((interest && count < 3) || (aperture && count < 2)) {
+      values[count++] = number(token);
+    }
+  }
+  if (aperture && count > 0) {
+    camera_.horizontalAperture = values[0];
+    camera_.verticalAperture = values[1];
+  }
+  writeBack(scene_.cameras, camera_);
+}
+
+void SceneReader::setCurveAttr() {
+  if (findKeys()) readKeys();
+  writeBack(scene_.curves, curve_);
+}
+
+// True before the keys; false when the command ended without any.
+bool SceneReader::findKeys() {
+  for (;;) {
+    const Token token = inCommand();
+    if (token.kind == Kind::Semicolon) return false;
+    if (token.kind == Kind::Option && !same(copied(token.text), "-s")) lexer_.next();
+    if (token.kind != Kind::String) continue;
+    const std::string attribute = unquoted(token.text);
+    if (attribute.find(".ktv") != std::string::npos) return true;
+    if (attribute.find(".keyTimeValue") != std::string::npos) return true;
+  }
+}
+
+void SceneReader::readKeys() {
+  for (Token token = inCommand(); token.kind != Kind::Semicolon; token = inCommand()) {
+    if (token.kind != Kind::Number) continue;
+    Key key;
+    key.time = number(token);
+    const Token value = inCommand();
+    if (value.kind == Kind::Number) key.value = number(value);
+    if (curve_.keys == nullptr) curve_.keys = std::make_shared<std::vector<Key>>();
+    curve_.keys->push_back(key);
+    if (value.kind == Kind::Semicolon) return;
+  }
+}
+
+void SceneReader::setRenderAttr() {
+  for (Token token = inCommand(); token.kind != Kind::Semicolon; token = inCommand()) {
+    if (token.kind != Kind::String) continue;
+    const std::string attribute = unquoted(token.text);
+    const bool width = isOneOf(attribute, {".w", ".width"});
+    const bool height = isOneOf(attribute, {".h", ".height"});
+    const bool device = isOneOf(attribute, {".dar", ".deviceAspectRatio"});
+    const bool pixel = isOneOf(attribute, {".pa", ".pixelAspect"});
+    if (!width && !height && !device && !pixel) continue;
+    token = inCommand();
+    if (token.kind == Kind::Semicolon) return;
+    if (token.kind != Kind::Number) continue;
+    const double value = number(token);
+    if (width) scene_.width = TruncateToInt32(value);
+    if (height) scene_.height = TruncateToInt32(value);
+    if (device) scene_.deviceAspectRatio = value;
+    if (pixel) scene_.pixelAspect = value;
+  }
+}
+
+}  // namespace secondreader

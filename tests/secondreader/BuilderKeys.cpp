@@ -1,0 +1,136 @@
+// Keys: counted, sampled one by one, and written.
+#include "tests/secondreader/Builder.h"
+#include "tests/secondreader/BuilderTemplates.h"
+
+namespace secondreader {
+namespace {
+
+constexpr double kPi = 3.141592653589793;
+constexpr double kTurn = 6.283185307179586;
+constexpr double kDegreesPerRadian = 57.29577951308232;
+constexpr double kPercent = 100.0;
+
+double unwrapped(double angle, double previous) {
+  while (angle - previous >= kPi) angle -= kTurn;
+  while (angle - previous <= -kPi) angle += kTurn;
+  return angle;
+}
+
+}  // namespace
+
+// How many keys the node's channels share; 0 when it stands still.
+int Builder::keyCount(const Transform& node) {
+  std::size_t count = 0;
+  for (std::size_t channel = 0; channel < kChannels; ++channel) {
+    if (node.curve[channel] < 0) continue;
+    const auto& keys = scene_.curves[static_cast<std::size_t>(node.curve[channel])].keys;
+    if (keys == nullptr || keys->size() < 2) continue;
+    if (count == 0) count = keys->size();
+    if (keys->size() != count) {
+      show_(kKeyCountsMessage);
+      throw int{HOST_ERR_MAYA_KEY_COUNTS};
+    }
+  }
+  return static_cast<int>(count);
+}
+
+T_Time Builder::keyTime(const Transform& node, std::size_t key) {
+  for (std::size_t channel = 0; channel < kChannels; ++channel) {
+    if (node.curve[channel] < 0) continue;
+    const auto& keys = scene_.curves[static_cast<std::size_t>(node.curve[channel])].keys;
+    if (keys != nullptr && keys->size() > key) return convert_.time((*keys)[key].time, key == 0);
+  }
+  return {0, 1};
+}
+
+void Builder::sample(const Transform& node, std::size_t group, std::size_t key, Triple& values) const {
+  for (std::size_t axis = 0; axis < values.size(); ++axis) {
+    const int index = node.curve[3 * group + axis];
+    if (index < 0) continue;
+    const auto& keys = scene_.curves[static_cast<std::size_t>(index)].keys;
+    if (keys == nullptr || keys->empty()) continue;
+    values[axis] = (*keys)[keys->size() == 1 ? 0 : key].value;
+  }
+}
+
+void Builder::animate(Handle layer, const Transform& node) {
+  const int count = keyCount(node);
+  if (count < 1) return;
+  withBatches(layer, {{2}, {8}, {9}, {3}, {1}}, [&](const std::vector<Batch>& batches) {
+    Triple previous{};
+    for (std::size_t key = 0; key < static_cast<std::size_t>(count); ++key) {
+      const T_Time time = keyTime(node, key);
+      Triple scale = node.scale;
+      Triple rotate = node.rotate;
+      Triple translate = node.translate;
+      sample(node, 2, key, scale);
+      sample(node, 1, key, rotate);
+      sample(node, 0, key, translate);
+      for (double& value : rotate) value = convert_.angle(value);
+      for (double& value : translate) value = convert_.distance(value);
+      const MatrixComponents parts = decomposed(node, translate, rotate, scale);
+      Triple angles{parts.rotation[0], parts.rotation[1], parts.rotation[2]};
+      for (std::size_t axis = 0; key > 0 && axis < angles.size(); ++axis) {
+        angles[axis] = unwrapped(angles[axis], previous[axis]);
+      }
+      insertKey(layer, batches[0], time,
+                {parts.scale[0] * kPercent, parts.scale[1] * kPercent, parts.scale[2] * kPercent});
+      insertKey(layer, batches[1], time, {angles[0] * kDegreesPerRadian});
+      insertKey(layer, batches[2], time, {angles[1] * kDegreesPerRadian});
+      insertKey(layer, batches[3], time, {angles[2] * kDegreesPerRadian});
+      insertKey(layer, batches[4], time, {parts.translation[0], parts.translation[1], parts.translation[2]});
+      previous = angles;
+    }
+  });
+}
+
+void Builder::animateAnchor(Handle layer, const Transform& node) {
+  const int count = keyCount(node);
+  if (count < 1) return;
+  withBatches(layer, {{0}}, [&](const std::vector<Batch>& batches) {
+    for (std::size_t key = 0; key < static_cast<std::size_t>(count); ++key) {
+      const T_Time time = keyTime(node, key);
+      Triple point = node.translate;
+      sample(node, 0, key, point);
+      for (double& value : point) value = convert_.distance(value);
+      insertKey(layer, batches[0], time, {point[0], -point[1], -point[2]});
+    }
+  });
+}
+
+void Builder::zoomKeys(Handle stream, Batch& batch, const Camera& camera, const std::vector<Key>& keys) {
+  check(suites_.beginKeyframeBatch(stream, &batch.number));
+  for (std::size_t key = 0; key < keys.size(); ++key) {
+    const T_Time time = convert_.time(keys[key].time, key == 0);
+    std::int32_t index = 0;
+    check(suites_.addBatchKeyframe(batch.number, time, &index));
+    check(
+        suites_.setBatchKeyframeValue(batch.number, index, stream, {convert_.zoom(camera, keys[key].value)}));
+  }
+}
+
+void Builder::animateCamera(Handle layer, const Camera& camera) {
+  constexpr std::int32_t kZoom = 11;
+  const int curve = camera.focalLengthCurve;
+  const auto keys = curve < 0 ? nullptr : scene_.curves[static_cast<std::size_t>(curve)].keys;
+  if (keys != nullptr && !keys->empty()) {
+    Handle stream = 0;
+    Batch batch{kZoom};
+    bool held = false;
+    HostError kept = suites_.host().guarded([&] {
+      check(suites_.acquireLayerStream(layer, kZoom, &stream));
+      std::int32_t count = 0;
+      check(suites_.getStreamKeyframeCount(stream, &count));
+      held = count > 0;
+      if (!held) zoomKeys(stream, batch, camera, *keys);
+    });
+    const HostError closing = suites_.host().guarded([&] { closeBatches({batch}); });
+    if (kept == HOST_ERR_NONE) kept = closing;
+    if (stream != 0 && !held) suites_.releaseStream(stream);
+    check(kept);
+  }
+  const int transform = findNamed(scene_.transforms, camera.parent);
+  if (transform >= 0) animate(layer, scene_.transforms[static_cast<std::size_t>(transform)]);
+}
+
+}  // namespace secondreader

@@ -1,0 +1,46 @@
+// Which calls of a callback a rehearsal makes fail, counted as the embedded host counts them.
+#pragma once
+
+#include <cstdint>
+#include <map>
+#include <optional>
+#include <string>
+#include <string_view>
+
+#include "refhost/Host.h"
+
+namespace secondreader {
+
+class FailurePlan {
+ public:
+  // The options outlive the plan.
+  explicit FailurePlan(const refhost::HostOptions& options) : options_(options) {}
+
+  // The counts begin anew; failures are planned only within the callback that the options name.
+  void begin(refhost::Callback callback);
+  void end() { active_ = false; }
+
+  // Counts a suite call or a call of a utility service; what is planned for it, if anything.
+  std::optional<refhost::Failure> suiteCall(const std::string& operation);
+  std::optional<refhost::Failure> service(const std::string& name);
+
+  bool refuses(std::string_view suite, std::int32_t version) const;
+
+  // In the callback that runs or ran last.
+  std::int64_t suiteCalls() const { return calls_; }
+  std::int64_t count(const std::string& name) const {
+    const auto found = counts_.find(name);
+    return found == counts_.end() ? 0 : found->second;
+  }
+
+ private:
+  const refhost::HostOptions& options_;
+  bool active_ = false;
+  std::int64_t calls_ = 0;
+  std::map<std::string, std::int64_t> counts_;
+};
+
+// Throws the standard exception of a planned failure; nothing when it is a code.
+void throwPlanned(const refhost::Failure& failure, const std::string& what);
+
+}  // namespace secondreader

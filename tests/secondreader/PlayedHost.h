@@ -1,0 +1,99 @@
+// A host that is only played: it keeps count of what it would hand out, refuses what the embedded host
+// refuses, and writes the line that the embedded host would write for each call.
+#pragma once
+
+#include <array>
+#include <cstdint>
+#include <exception>
+#include <string>
+#include <utility>
+#include <vector>
+
+#include "hostapi/ErrorCodes.h"
+#include "hostapi/HostTypes.h"
+#include "tests/secondreader/FailurePlan.h"
+
+namespace secondreader {
+
+// What a played handle is: the number in its name. 0 is the null handle.
+using Handle = std::int64_t;
+
+// Thrown where the process would end.
+struct ProcessEnds {};
+
+struct OpenBatch {
+  Handle number = 0;
+  Handle layer = 0;
+  std::int32_t stream = 0;
+  std::int32_t keys = 0;
+};
+
+struct HeldStream {
+  Handle number = 0;
+  Handle layer = 0;
+  std::int32_t stream = 0;
+};
+
+struct PlayedLayer {
+  bool camera = false;
+};
+
+class PlayedHost {
+ public:
+  explicit PlayedHost(refhost::HostOptions given) : options(std::move(given)), plan(options) {}
+  PlayedHost(const PlayedHost&) = delete;
+  PlayedHost& operator=(const PlayedHost&) = delete;
+
+  // Shows what becomes of a standard exception; the code for it.
+  HostError translateAndReport(const std::exception& exception);
+
+  // Runs the work; the code that it ended with, of an integer or of a standard exception.
+  template <typename Work>
+  HostError guarded(Work work) {
+    try {
+      work();
+      return HOST_ERR_NONE;
+    } catch (int code) {
+      return code;
+    } catch (const std::exception& exception) {
+      return translateAndReport(exception);
+    }
+  }
+
+  // Counts a call of a utility service. True when it is to do nothing and return *code; throws when it is to
+  // throw.
+  bool serviceFails(const char* name, HostError* code);
+
+  // The text of the localised string of that number, "" without the table.
+  std::string localized(int id) const;
+
+  // Reads a number as the number scanner does; throws the code of a failure.
+  double scanNumber(const std::string& text);
+
+  const refhost::HostOptions options;
+  FailurePlan plan;
+  std::vector<std::string> lines;
+  std::vector<std::string> messages;
+  bool silent = false;
+
+  bool stringTable = false;  // the table of localised strings is registered
+  std::int32_t linearUnits = 0;
+  bool importerUsable = false;
+  bool deathHook = false;
+
+  Handle items = 0;
+  Handle comps = 0;
+  std::vector<PlayedLayer> layers;  // by number - 1
+  Handle memories = 0;
+  Handle streams = 0;
+  Handle batches = 0;
+  std::vector<HeldStream> heldStreams;
+  std::vector<OpenBatch> openBatches;
+};
+
+// Throws a code that is not 0.
+inline void check(HostError code) {
+  if (code != HOST_ERR_NONE) throw int{code};
+}
+
+}  // namespace secondreader

@@ -1,0 +1,128 @@
+#include "tests/secondreader/SceneRun.h"
+
+#include <sstream>
+#include <vector>
+
+#include "plugin/Entry.h"
+#include "plugin/Globals.h"
+#include "tests/secondreader/SceneGenerator.h"
+#include "tests/secondreader/TraceComparison.h"
+
+namespace secondreader {
+namespace {
+
+constexpr std::uint64_t kFailureSeeds = 0x5eed0000000000u;
+
+// What the callbacks gave.
+struct Results {
+  refhost::CallbackResult entry;
+  refhost::CallbackResult verify;
+  std::vector<refhost::CallbackResult> imports;
+  refhost::CallbackResult death;
+};
+
+Results runHost(refhost::HostOptions options, const std::string& path, int imports, std::string* trace) {
+  std::ostringstream out;
+  options.trace = &out;
+  G_use_linear_unitsL = 0;
+  Results results;
+  {
+    refhost::Host host(std::move(options));
+    host.load(&MayaImportEntry, &results.entry);
+    results.verify = host.verifyScene(path);
+    for (int i = 0; i < imports; ++i) results.imports.push_back(host.importScene(path));
+    results.death = host.unload();
+  }
+  // What a death hook that could not be registered left.
+  DeathHook(0);
+  *trace = out.str();
+  return results;
+}
+
+void compare(std::ostringstream& words, const char* callback, const PredictedCallback& predicted,
+             const refhost::CallbackResult& result) {
+  if (predicted.code != result.code) {
+    words << callback << ": code predicted " << predicted.code << ", returned " << result.code << '\n';
+  }
+  if (predicted.canImport != result.canImport) words << callback << ": the answers differ\n";
+  if (predicted.messages != result.messages) {
+    words << callback << ": messages differ\n";
+    for (const std::string& message : predicted.messages) words << "  predicted: " << message << '\n';
+    for (const std::string& message : result.messages) words << "  shown:     " << message << '\n';
+  }
+  for (const std::string& refusal : result.refusals) {
+    if (refusal == "an exception left the plug-in") words << callback << ": " << refusal << '\n';
+  }
+  for (const refhost::Leftover& leftover : result.leftovers) {
+    if (!leftover.keptByDesign) words << callback << ": left behind: " << leftover.description << '\n';
+  }
+}
+
+std::string describe(const refhost::HostOptions& options) {
+  std::ostringstream words;
+  for (const refhost::RefusedSuite& refused : options.refusedSuites) {
+    words << " refused: " << refused.name << ' ' << refused.version << ';';
+  }
+  for (const refhost::Failure& failure : options.failures) {
+    words << ' ' << (failure.operation.empty() ? "call" : failure.operation) << ':' << failure.nth
+          << (failure.onwards ? "+" : "") << '=';
+    if (failure.kind == refhost::Failure::Kind::Code) {
+      words << failure.code;
+    } else {
+      words << (failure.kind == refhost::Failure::Kind::BadAlloc ? "bad_alloc" : "runtime_error");
+    }
+    words << ';';
+  }
+  return words.str();
+}
+
+}  // namespace
+
+RunReport SceneRunner::run(const refhost::HostOptions& options, const std::string& fileName,
+                           std::string_view scene, int imports) {
+  RunReport report;
+  const std::string path = (folder_.path() / fileName).string();
+  report.prediction = predict(options, path, scene, imports);
+  report.skipped = report.prediction.processEnds;
+  if (report.skipped) return report;
+  folder_.write(fileName, scene);
+  std::string trace;
+  const Results results = runHost(options, path, imports, &trace);
+  std::ostringstream words;
+  if (const auto difference = firstDifference(report.prediction.trace, linesOf(trace))) {
+    words << "line " << difference->line << " of the trace:\n  predicted: " << difference->predicted
+          << "\n  traced:    " << difference->traced << '\n';
+  }
+  compare(words, "entry", report.prediction.entry, results.entry);
+  compare(words, "verify", report.prediction.verify, results.verify);
+  for (std::size_t i = 0; i < results.imports.size(); ++i) {
+    compare(words, "import", report.prediction.imports[i], results.imports[i]);
+  }
+  compare(words, "death", report.prediction.death, results.death);
+  if (!words.str().empty()) report.disagreement = words.str();
+  return report;
+}
+
+SeedReport runSeed(SceneRunner& runner, std::uint64_t seed, bool failures) {
+  SeedReport report;
+  GeneratedScene scene = SceneGenerator(seed).make();
+  const auto runOnce = [&] {
+    const RunReport run = runner.run(scene.options, scene.fileName, scene.bytes, scene.imports);
+    report.runs += 1;
+    report.skipped += run.skipped ? 1 : 0;
+    report.imported += !run.skipped && run.prediction.imports.front().code == 0 ? 1 : 0;
+    report.lines += run.prediction.trace.size();
+    if (run.disagreement) {
+      report.disagreement = "scene " + std::to_string(seed) + ", rehearsing:" + describe(scene.options) +
+                            "\n" + *run.disagreement;
+    }
+    return run.prediction.imports.front();
+  };
+  const PredictedCallback plain = runOnce();
+  if (!failures || report.disagreement) return report;
+  planFailures(seed ^ kFailureSeeds, {plain.suiteCalls, plain.numberScans}, &scene.options);
+  runOnce();
+  return report;
+}
+
+}  // namespace secondreader

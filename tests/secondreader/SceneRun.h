@@ -1,0 +1,40 @@
+// Runs a scene through the importer under the embedded host, and holds what came of it to the prediction.
+#pragma once
+
+#include <cstdint>
+#include <optional>
+#include <string>
+#include <string_view>
+
+#include "refhost/Host.h"
+#include "tests/secondreader/SecondReader.h"
+#include "tests/support/TemporaryFolder.h"
+
+namespace secondreader {
+
+struct RunReport {
+  Prediction prediction;
+  bool skipped = false;                     // the process would have ended
+  std::optional<std::string> disagreement;  // in words
+};
+
+class SceneRunner {
+ public:
+  RunReport run(const refhost::HostOptions& options, const std::string& fileName, std::string_view scene,
+                int imports = 1);
+
+ private:
+  testsupport::TemporaryFolder folder_;
+};
+
+// The generated scene of a seed, run without failures and, if they are asked for, once more with failures.
+struct SeedReport {
+  int runs = 0;
+  int skipped = 0;
+  int imported = 0;                         // runs whose first import returned 0
+  std::uint64_t lines = 0;                  // of all predicted traces
+  std::optional<std::string> disagreement;  // names the seed
+};
+SeedReport runSeed(SceneRunner& runner, std::uint64_t seed, bool failures);
+
+}  // namespace secondreader

@@ -1,0 +1,37 @@
+// A second reader of scenes: slow and plain, it predicts what the plug-in makes of one under the embedded
+// host.
+#pragma once
+
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "refhost/Host.h"
+
+namespace secondreader {
+
+// What a callback comes to.
+struct PredictedCallback {
+  HostError code = 0;
+  bool canImport = false;
+  std::vector<std::string> messages;
+  int suiteCalls = 0;
+  int numberScans = 0;  // counted only in the callback that the rehearsal is for
+};
+
+// The callbacks in their order: the entry, the header test, the imports, the death hook.
+struct Prediction {
+  std::vector<std::string> trace;  // without line ends
+  PredictedCallback entry;
+  PredictedCallback verify;
+  std::vector<PredictedCallback> imports;
+  PredictedCallback death;
+  bool processEnds = false;  // in one of them; then nothing else is predicted
+};
+
+// The options are those that the host is made with; `scene` is what the file of that path holds, and it is
+// imported so many times. The path is UTF-8.
+Prediction predict(const refhost::HostOptions& options, const std::string& path, std::string_view scene,
+                   int imports = 1);
+
+}  // namespace secondreader

@@ -1,0 +1,68 @@
+// Generated scenes: what the importer does with each is what the second reader says, also when the host
+// fails.
+#include <gtest/gtest.h>
+
+#include <map>
+#include <set>
+#include <string>
+
+#include "hostapi/ErrorCodes.h"
+#include "refhost/Operations.h"
+#include "tests/secondreader/SceneGenerator.h"
+#include "tests/secondreader/SceneRun.h"
+
+namespace secondreader {
+namespace {
+
+constexpr std::uint64_t kShares = 4;  // of which several can run at once
+constexpr std::uint64_t kScenesPerShare = 500;
+
+class SeededScenesTest : public ::testing::TestWithParam<std::uint64_t> {};
+
+TEST_P(SeededScenesTest, EachSceneGivesThePredictedTracesWithoutAndWithFailures) {
+  SceneRunner runner;
+  int runs = 0;
+  int imported = 0;
+  for (std::uint64_t seed = GetParam() * kScenesPerShare; seed < (GetParam() + 1) * kScenesPerShare; ++seed) {
+    const SeedReport report = runSeed(runner, seed, true);
+    runs += report.runs - report.skipped;
+    imported += report.imported;
+    ASSERT_EQ(report.disagreement, std::nullopt);
+  }
+  // Few end the process, and a good share is imported whole.
+  EXPECT_GT(runs, static_cast<int>(2 * kScenesPerShare * 9 / 10));
+  EXPECT_GT(imported, static_cast<int>(2 * kScenesPerShare / 3));
+}
+
+INSTANTIATE_TEST_SUITE_P(Shares, SeededScenesTest, ::testing::Range(std::uint64_t{0}, kShares));
+
+TEST(SceneGeneratorTest, ASeedAlwaysGivesTheSameScene) {
+  EXPECT_EQ(SceneGenerator(17).make().bytes, SceneGenerator(17).make().bytes);
+  EXPECT_NE(SceneGenerator(17).make().bytes, SceneGenerator(18).make().bytes);
+}
+
+TEST(SceneGeneratorTest, TheScenesReachEveryCallOfAnImportAndEveryKindOfFailure) {
+  std::set<std::string> calls;
+  std::map<HostError, int> codes;
+  for (std::uint64_t seed = 0; seed < kShares * kScenesPerShare; ++seed) {
+    const GeneratedScene scene = SceneGenerator(seed).make();
+    const Prediction prediction = predict(scene.options, "/" + scene.fileName, scene.bytes, scene.imports);
+    ++codes[prediction.imports.front().code];
+    for (const std::string& line : prediction.trace) {
+      const std::string lead = "{\"call\":\"";
+      calls.insert(line.substr(lead.size(), line.find('"', lead.size()) - lead.size()));
+    }
+  }
+  for (std::size_t operation = 0; operation < refhost::kOperationCount; ++operation) {
+    EXPECT_EQ(calls.count(refhost::factsOf(static_cast<refhost::Operation>(operation)).name), 1u);
+  }
+  for (const HostError code :
+       {HOST_ERR_NONE, HOST_ERR_MAYA_SYNTAX, HOST_ERR_MAYA_UNEXPECTED_END, HOST_ERR_MAYA_KEY_COUNTS,
+        HOST_ERR_NUMBER_SYNTAX, HOST_ERR_NUMBER_RANGE, HOST_ERR_MATRIX_NOT_FINITE, HOST_ERR_BAD_SIZE,
+        HOST_ERR_BAD_RATIO, HOST_ERR_BAD_VALUE, HOST_ERR_BAD_FILM_SIZE}) {
+    EXPECT_GT(codes[code], 0) << code;
+  }
+}
+
+}  // namespace
+}  // namespace secondreader
