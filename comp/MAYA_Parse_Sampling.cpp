@@ -29,6 +29,19 @@ void NodeChannels::Extract(std::int32_t group, std::int32_t n, double (&values)[
   }
 }
 
+void NodeChannels::ListSampled() {
+  for (const int group : {kScaleGroup, kRotateGroup, kTranslateGroup}) {
+    for (int slot = kAxisCount * group; slot < kAxisCount * (group + 1); ++slot) {
+      const auto place = static_cast<std::uint8_t>(slot);
+      if (channels[place].count != 0) sampled[sampledCount++] = place;
+    }
+  }
+}
+
+void NodeChannels::Sample(std::int32_t n, double (&values)[kChannelCount]) const {
+  for (std::size_t i = 0; i < sampledCount; ++i) ReadKey(channels[sampled[i]], n, &values[sampled[i]]);
+}
+
 std::int32_t MAYA_Parse::VerifyAnimInfo(const MAYA_Transform* node) {
   return VerifyChannels(*node).sharedCount;
 }
@@ -62,6 +75,7 @@ NodeChannels MAYA_Parse::VerifyChannels(const MAYA_Transform& node) {
     ReportError(LocalizedText(kInconsistentKeysMessage));
     throw int{kInconsistentKeys};
   }
+  fetched.ListSampled();
   fetched.sharedCount = static_cast<std::int32_t>(shared);
   return fetched;
 }

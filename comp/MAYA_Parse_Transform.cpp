@@ -2,15 +2,12 @@
 // sign, and the pivots are folded into the position. Reads the units; sets streams through
 // MAYA_Parse_Streams.cpp.
 #include "comp/Conversions.h"
+#include "comp/HostPoint.h"
 #include "comp/LayerStreams.h"
 #include "maya/MAYA_Parse.h"
 #include "plugin/ErrorCodes.h"
 
 namespace {
-
-struct HostPoint {
-  double x, y, z;
-};
 
 void Translate(TransformMatrix* matrix, const HostPoint& by) {
   ThrowOnError(MatrixTranslate(matrix, by.x, by.y, by.z));
@@ -22,27 +19,40 @@ void TranslateBack(TransformMatrix* matrix, const HostPoint& by) {
 
 }  // namespace
 
-MatrixComponents MAYA_Parse::DecomposeTransform(const MAYA_Transform& node, const double (&scale)[kAxisCount],
-                                                const double (&rotate)[kAxisCount],
-                                                const double (&translate)[kAxisCount]) const {
-  const auto hostPoint = [this](const double(&point)[kAxisCount]) {
-    return HostPoint{ConvertDist(point[0]), -ConvertDist(point[1]), -ConvertDist(point[2])};
-  };
-  const HostPoint scalePivot = hostPoint(node.scalePivot);
-  const HostPoint rotatePivot = hostPoint(node.rotatePivot);
+HostPoint MAYA_Parse::ConvertPoint(const double* point) const {
+  return {ConvertDist(point[0]), -ConvertDist(point[1]), -ConvertDist(point[2])};
+}
+
+NodePivots MAYA_Parse::ConvertPivots(const MAYA_Transform& node) const {
+  return {ConvertPoint(node.scalePivot), ConvertPoint(node.rotatePivot)};
+}
+
+void MAYA_Parse::CopyChannels(const MAYA_Transform& node, double (&values)[kChannelCount]) {
+  for (int axis = 0; axis < kAxisCount; ++axis) {
+    values[kAxisCount * kTranslateGroup + axis] = node.translate[axis];
+    values[kAxisCount * kRotateGroup + axis] = node.rotate[axis];
+    values[kAxisCount * kScaleGroup + axis] = node.scale[axis];
+  }
+}
+
+MatrixComponents MAYA_Parse::DecomposeTransform(const NodePivots& pivots,
+                                                const double (&values)[kChannelCount]) const {
+  const double* const translate = values + kAxisCount * kTranslateGroup;
+  const double* const rotate = values + kAxisCount * kRotateGroup;
+  const double* const scale = values + kAxisCount * kScaleGroup;
 
   // Deliberate: always about X, then Y, then Z; the node's own rotate order is not looked at.
   TransformMatrix matrix{};
   ThrowOnError(MatrixSetIdentity(&matrix));
-  TranslateBack(&matrix, scalePivot);
+  TranslateBack(&matrix, pivots.scale);
   ThrowOnError(MatrixScale(&matrix, scale[0], scale[1], scale[2]));
-  Translate(&matrix, scalePivot);
-  TranslateBack(&matrix, rotatePivot);
+  Translate(&matrix, pivots.scale);
+  TranslateBack(&matrix, pivots.rotate);
   ThrowOnError(MatrixRotateAxis(&matrix, 1.0, 0.0, 0.0, ConvertRot(rotate[0]) * kDegreesToRadians));
   ThrowOnError(MatrixRotateAxis(&matrix, 0.0, 1.0, 0.0, ConvertRot(rotate[1]) * -kDegreesToRadians));
   ThrowOnError(MatrixRotateAxis(&matrix, 0.0, 0.0, 1.0, ConvertRot(rotate[2]) * -kDegreesToRadians));
-  Translate(&matrix, rotatePivot);
-  Translate(&matrix, hostPoint(translate));
+  Translate(&matrix, pivots.rotate);
+  Translate(&matrix, ConvertPoint(translate));
 
   MatrixComponents components{};
   ThrowOnError(MatrixDecompose(&matrix, &components, nullptr));
@@ -50,7 +60,9 @@ MatrixComponents MAYA_Parse::DecomposeTransform(const MAYA_Transform& node, cons
 }
 
 void MAYA_Parse::SetTransform(VOR_Layer* layer, const MAYA_Transform* node) {
-  const MatrixComponents at = DecomposeTransform(*node, node->scale, node->rotate, node->translate);
+  double values[kChannelCount];
+  CopyChannels(*node, values);
+  const MatrixComponents at = DecomposeTransform(ConvertPivots(*node), values);
   SetThreeDStream(layer, kAnchorPointStream, 0.0, 0.0, 0.0);
   SetThreeDStream(layer, kScaleStream, at.scale[0] * kPercent, at.scale[1] * kPercent,
                   at.scale[2] * kPercent);

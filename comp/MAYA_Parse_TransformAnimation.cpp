@@ -1,9 +1,7 @@
 // Keys of a node's position, rotation and scale: for every sampled key the node's matrix is rebuilt, taken
 // apart and written to five streams. Reads `curves` and the units; keys go through MAYA_Parse_Streams.cpp.
-#include <algorithm>
-#include <iterator>
-
 #include "comp/Conversions.h"
+#include "comp/HostPoint.h"
 #include "comp/LayerStreams.h"
 #include "comp/NodeChannels.h"
 #include "comp/UnwrapAngle.h"
@@ -36,20 +34,16 @@ void MAYA_Parse::ApplyTransformAnimation(VOR_Layer* layer, const MAYA_Transform*
 
 void MAYA_Parse::InsertTransformKeys(VOR_Layer* layer, const MAYA_Transform& node,
                                      const NodeChannels& channels, VOR_AddKeyframesInfo* const* batches) {
+  const NodePivots pivots = ConvertPivots(node);
+  double still[kChannelCount];
+  CopyChannels(node, still);
+  double values[kChannelCount];
   double previous[kAxisCount] = {};
   for (std::int32_t n = 0; n < channels.sharedCount; ++n) {
     const T_Time time = KeyTime(channels, n);
-    double scale[kAxisCount];
-    double rotate[kAxisCount];
-    double translate[kAxisCount];
-    std::copy(std::begin(node.scale), std::end(node.scale), scale);
-    std::copy(std::begin(node.rotate), std::end(node.rotate), rotate);
-    std::copy(std::begin(node.translate), std::end(node.translate), translate);
-    channels.Extract(kScaleGroup, n, scale);
-    channels.Extract(kRotateGroup, n, rotate);
-    channels.Extract(kTranslateGroup, n, translate);
-
-    const MatrixComponents at = DecomposeTransform(node, scale, rotate, translate);
+    for (int channel = 0; channel < kChannelCount; ++channel) values[channel] = still[channel];
+    channels.Sample(n, values);
+    const MatrixComponents at = DecomposeTransform(pivots, values);
     double angles[kAxisCount];
     for (int axis = 0; axis < kAxisCount; ++axis) {
       angles[axis] = n > 0 ? UnwrapAngle(at.rotation[axis], previous[axis]) : at.rotation[axis];

@@ -15,6 +15,17 @@ struct NodeChannels {
   std::array<Channel, kChannelCount> channels;  // by curve slot
   std::int32_t sharedCount = 0;                 // of the channels that have two keys or more; 0 when none has
 
+  // The slots of the channels that have keys, in the order in which a sample reads them: scale, rotate,
+  // translate.
+  std::array<std::uint8_t, kChannelCount> sampled{};
+  std::size_t sampledCount = 0;
+
+  // Fills in `sampled`, from `channels`.
+  void ListSampled();
+
+  // Overwrites the animated channels of `values`, by curve slot, with key n, as Extract does.
+  void Sample(std::int32_t n, double (&values)[kChannelCount]) const;
+
   // Overwrites the animated axes of `values` with key n of the group; a channel of one key gives that one.
   // Throws the list's code when a channel has no key n.
   void Extract(std::int32_t group, std::int32_t n, double (&values)[kAxisCount]) const;

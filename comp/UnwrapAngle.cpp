@@ -16,7 +16,7 @@ bool TurnChanges(double angle) {
 // The angle moved by turns (of either sign) until few are left to the previous one. Between two powers of two
 // every turn changes a double by the same amount, so that as many as fit there are taken at once, and the
 // result has the bits of one turn at a time.
-double TakeManyTurns(double angle, double previous, double turn) {
+[[gnu::noinline]] double TakeManyTurns(double angle, double previous, double turn) {
   while ((previous - angle) / turn > kFewTurns) {
     const double first = angle + turn;
     const double second = first + turn;

@@ -12,8 +12,49 @@ namespace {
 constexpr int kAxes = 3;
 constexpr int kSize = 4;
 
-// The rotation about a unit axis. Written so that about a coordinate axis every entry is 0, 1, the cosine or
-// the sine, without a rounding.
+// A row of a matrix as two pairs of numbers, so that the compiler can take a pair at a time.
+using Pair = double __attribute__((vector_size(2 * sizeof(double))));
+struct Row {
+  Pair left, right;
+};
+
+Row Load(const double (&row)[kSize]) { return {Pair{row[0], row[1]}, Pair{row[2], row[3]}}; }
+
+void Store(const Row& from, double (&row)[kSize]) {
+  row[0] = from.left[0];
+  row[1] = from.left[1];
+  row[2] = from.right[0];
+  row[3] = from.right[1];
+}
+
+Row Sum(const Row& a, const Row& b) { return {a.left + b.left, a.right + b.right}; }
+
+Row Product(double factor, const Row& row) { return {factor * row.left, factor * row.right}; }
+
+constexpr int kNoAxis = -1;
+
+// The number of the coordinate axis that these are, or none.
+int CoordinateAxis(double ax, double ay, double az) {
+  if (ax == 1.0 && ay == 0.0 && az == 0.0) return 0;
+  if (ax == 0.0 && ay == 1.0 && az == 0.0) return 1;
+  return ax == 0.0 && ay == 0.0 && az == 1.0 ? 2 : kNoAxis;
+}
+
+// Mixes the rows of the two other axes by the cosine and the sine, without another rounding. Nothing is 0
+// times a number here, so that an angle of 0 leaves the matrix as it is.
+void TurnAboutCoordinateAxis(TransformMatrix* matrix, int axis, double angle) {
+  if (angle == 0.0) return;
+  const double c = std::cos(angle);
+  const double s = std::sin(angle);
+  auto& first = matrix->m[(axis + 1) % kAxes];
+  auto& second = matrix->m[(axis + 2) % kAxes];
+  const Row j = Load(first);
+  const Row k = Load(second);
+  Store(Sum(Product(c, j), Product(-s, k)), first);
+  Store(Sum(Product(s, j), Product(c, k)), second);
+}
+
+// The rotation about a unit axis.
 void MakeRotation(const double axis[kAxes], double angle, double rotation[kAxes][kAxes]) {
   const double c = std::cos(angle);
   const double s = std::sin(angle);
@@ -52,10 +93,9 @@ HostError MatrixTranslate(TransformMatrix* matrix, double tx, double ty, double 
   if (HostError code; hostutil::Rehearsed(HOST_UTILITY_MatrixTranslate, &code)) return code;
   if (matrix == nullptr) return HOST_ERR_UTILITY_NULL;
   const double offset[kAxes] = {tx, ty, tz};
+  const Row last = Load(matrix->m[kAxes]);
   for (int row = 0; row < kAxes; ++row) {
-    for (int column = 0; column < kSize; ++column) {
-      matrix->m[row][column] += offset[row] * matrix->m[kAxes][column];
-    }
+    Store(Sum(Load(matrix->m[row]), Product(offset[row], last)), matrix->m[row]);
   }
   return HOST_ERR_NONE;
 }
@@ -65,7 +105,7 @@ HostError MatrixScale(TransformMatrix* matrix, double sx, double sy, double sz) 
   if (matrix == nullptr) return HOST_ERR_UTILITY_NULL;
   const double factor[kAxes] = {sx, sy, sz};
   for (int row = 0; row < kAxes; ++row) {
-    for (int column = 0; column < kSize; ++column) matrix->m[row][column] *= factor[row];
+    Store(Product(factor[row], Load(matrix->m[row])), matrix->m[row]);
   }
   return HOST_ERR_NONE;
 }
@@ -74,17 +114,20 @@ HostError MatrixRotateAxis(TransformMatrix* matrix, double ax, double ay, double
   if (HostError code; hostutil::Rehearsed(HOST_UTILITY_MatrixRotateAxis, &code)) return code;
   if (matrix == nullptr) return HOST_ERR_UTILITY_NULL;
   if (ax == 0.0 && ay == 0.0 && az == 0.0) return HOST_ERR_NONE;
+  if (const int axisNumber = CoordinateAxis(ax, ay, az); axisNumber != kNoAxis) {
+    TurnAboutCoordinateAxis(matrix, axisNumber, angle);
+    return HOST_ERR_NONE;
+  }
   double axis[kAxes] = {ax, ay, az};
   if (ax * ax + ay * ay + az * az != 1.0) Normalise(axis);
   double rotation[kAxes][kAxes];
   MakeRotation(axis, angle, rotation);
-  for (int column = 0; column < kSize; ++column) {
-    const double x = matrix->m[0][column];
-    const double y = matrix->m[1][column];
-    const double z = matrix->m[2][column];
-    for (int row = 0; row < kAxes; ++row) {
-      matrix->m[row][column] = rotation[row][0] * x + rotation[row][1] * y + rotation[row][2] * z;
-    }
+  const Row x = Load(matrix->m[0]);
+  const Row y = Load(matrix->m[1]);
+  const Row z = Load(matrix->m[2]);
+  for (int row = 0; row < kAxes; ++row) {
+    const double* by = rotation[row];
+    Store(Sum(Sum(Product(by[0], x), Product(by[1], y)), Product(by[2], z)), matrix->m[row]);
   }
   return HOST_ERR_NONE;
 }

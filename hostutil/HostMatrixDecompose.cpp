@@ -35,7 +35,7 @@ double Dot(const Vector& a, const Vector& b) { return a[0] * b[0] + a[1] * b[1] 
 
 // Makes the vector one of length 1 and returns the length that it had. A length beyond the largest double is
 // held there. A zero vector stays.
-double Normalise(Vector* v) {
+[[gnu::noinline]] double NormaliseExtreme(Vector* v) {
   const double largest = std::max({std::abs((*v)[0]), std::abs((*v)[1]), std::abs((*v)[2])});
   if (largest == 0.0) return 0.0;
   for (double& component : *v) component /= largest;
@@ -44,16 +44,26 @@ double Normalise(Vector* v) {
   return std::min(largest * length, std::numeric_limits<double>::max());
 }
 
+// The same for vectors whose squares neither overflow nor are lost, which nearly all are.
+inline double Normalise(Vector* v) {
+  constexpr double kSmallSquare = 1e-200;
+  constexpr double kLargeSquare = 1e200;
+  const double square = Dot(*v, *v);
+  if (!(square > kSmallSquare && square < kLargeSquare)) return NormaliseExtreme(v);
+  const double length = std::sqrt(square);
+  for (double& component : *v) component /= length;
+  return length;
+}
+
 // An angle or coordinate of -0 becomes 0, so that it cannot choose between half a turn and minus half a turn.
 double WithoutNegativeZero(double value) { return value + 0.0; }
 
 bool IsFinite(const TransformMatrix& matrix) {
+  double zero = 0.0;  // 0 times what is not finite is not a number
   for (const auto& row : matrix.m) {
-    for (const double value : row) {
-      if (!std::isfinite(value)) return false;
-    }
+    for (const double value : row) zero += 0.0 * value;
   }
-  return true;
+  return zero == 0.0;
 }
 
 // A direction at right angles to the only axis that is there, chosen so that the angles which that axis
@@ -95,10 +105,10 @@ bool CompleteThird(std::size_t missing, Basis* basis) {
 
 // Gives every axis a direction.
 void Complete(Basis* basis) {
+  if (!IsZero((*basis)[0]) && !IsZero((*basis)[1]) && !IsZero((*basis)[2])) return;
   std::array<bool, kAxes> has{};
   for (std::size_t i = 0; i < kAxes; ++i) has[i] = !IsZero((*basis)[i]);
   const auto known = std::count(has.begin(), has.end(), true);
-  if (known == kAxes) return;
   if (known == 0) {
     *basis = {Vector{1.0, 0.0, 0.0}, Vector{0.0, 1.0, 0.0}, Vector{0.0, 0.0, 1.0}};
     return;
@@ -114,11 +124,11 @@ void Complete(Basis* basis) {
 // taken back: near the pole that keeps the sum of the two right, where each alone is uncertain.
 void AnglesOf(const Basis& basis, double rotation[kAxes]) {
   const auto& [x, y, z] = basis;
-  const double cosineY = std::hypot(x[0], x[1]);
-  const double angleZ =
-      cosineY < kPoleCosine ? 0.0 : std::atan2(WithoutNegativeZero(x[1]), WithoutNegativeZero(x[0]));
-  const double c = std::cos(angleZ);
-  const double s = std::sin(angleZ);
+  const double cosineY = std::sqrt(x[0] * x[0] + x[1] * x[1]);
+  const bool atPole = cosineY < kPoleCosine;
+  const double angleZ = atPole ? 0.0 : std::atan2(WithoutNegativeZero(x[1]), WithoutNegativeZero(x[0]));
+  const double c = atPole ? 1.0 : x[0] / cosineY;
+  const double s = atPole ? 0.0 : x[1] / cosineY;
   rotation[0] =
       std::atan2(WithoutNegativeZero(s * z[0] - c * z[1]), WithoutNegativeZero(c * y[1] - s * y[0]));
   rotation[1] = std::atan2(WithoutNegativeZero(-x[2]), cosineY);

@@ -160,27 +160,39 @@ HostError Convert(const Decimal& decimal, double* value) {
 
 constexpr uint64_t kEachByte = 0x0101010101010101;
 
-// The value of eight digits, the first in the lowest byte; false when they are not all digits.
-bool EightDigits(const char* at, uint64_t* value) {
+constexpr int64_t kWordSize = sizeof(uint64_t);
+constexpr uint64_t kWordPowers[kWordSize + 1] = {1,      10,      100,      1000,     10000,
+                                                 100000, 1000000, 10000000, 100000000};
+
+// How many digits, at most eight, stand at the beginning of eight bytes, and their value.
+[[gnu::always_inline]] inline int64_t LeadingDigits(const char* at, uint64_t* value) {
   uint64_t bytes = 0;
   std::memcpy(&bytes, at, sizeof bytes);
-  if constexpr (std::endian::native == std::endian::big) return false;
   const uint64_t digits = bytes - '0' * kEachByte;
-  if (((bytes + 0x46 * kEachByte) | digits) & (0x80 * kEachByte)) return false;
-  const uint64_t pairs = digits * 10 + (digits >> 8);
+  // The lowest of the marked bytes is no digit; those above it may be marked by a carry.
+  const uint64_t others = ((bytes + 0x46 * kEachByte) | digits) & (0x80 * kEachByte);
+  const int64_t count = others == 0 ? kWordSize : std::countr_zero(others) / 8;
+  *value = 0;
+  if (count == 0) return 0;
+  const uint64_t filled = digits << (8 * (kWordSize - count));  // zeros stand in front
+  const uint64_t pairs = filled * 10 + (filled >> 8);
   constexpr uint64_t kEvery4 = 0x000000ff000000ff;
   *value = ((pairs & kEvery4) * (100 + (uint64_t{1000000} << 32)) +
             ((pairs >> 16) & kEvery4) * (1 + (uint64_t{10000} << 32))) >>
            32;
-  return true;
+  return count;
 }
 
 // Reads digits on to the mantissa, which may overflow.
-const char* PlainDigits(const char* at, const char* end, uint64_t* mantissa) {
-  uint64_t eight = 0;
-  while (end - at >= 8 && EightDigits(at, &eight)) {
-    *mantissa = *mantissa * 100000000 + eight;
-    at += 8;
+[[gnu::always_inline]] inline const char* PlainDigits(const char* at, const char* end, uint64_t* mantissa) {
+  if constexpr (std::endian::native == std::endian::little) {
+    while (end - at >= kWordSize) {
+      uint64_t value = 0;
+      const int64_t count = LeadingDigits(at, &value);
+      *mantissa = *mantissa * kWordPowers[count] + value;
+      at += count;
+      if (count < kWordSize || !IsDigit(*at)) return at;
+    }
   }
   for (; IsDigit(*at); ++at) *mantissa = *mantissa * 10 + static_cast<uint64_t>(*at - '0');
   return at;
@@ -211,26 +223,43 @@ bool ScanRest(Cursor* cursor, Decimal* decimal) {
   return decimal->digits != 0 && SeparatorOf(*cursor->at) != kNoSeparator;
 }
 
-// Passes over white space and reads one number of plain form. False, with nothing to rely on, when there is
-// none.
-bool ScanPlain(const char** text, const char* end, double* value, int32_t* lines) {
-  const char* at = *text;
-  for (; SeparatorOf(*at) == kBlank; ++at) *lines += *at == '\n' ? 1 : 0;
-  const bool negative = *at == '-';
-  Cursor cursor{at + (negative ? 1 : 0), end};
+// Reads one number of plain form that is no short decimal. Null when there is none.
+[[gnu::noinline]] const char* ScanLongPlain(const char* at, const char* end, bool negative, double* value) {
+  Cursor cursor{at, end};
   Decimal decimal{};
-  decimal.begin = cursor.at;
-  for (; IsDigit(*cursor.at); ++cursor.at) {
-    decimal.mantissa = decimal.mantissa * 10 + static_cast<uint64_t>(*cursor.at - '0');
-  }
-  decimal.digits = cursor.at - decimal.begin;
-  if (!ScanRest(&cursor, &decimal) || cursor.at - at > kLongestPlainNumber) return false;
+  decimal.begin = at;
+  ReadDigits(&cursor, &decimal);
+  if (!ScanRest(&cursor, &decimal) || cursor.at - at > kLongestPlainNumber) return nullptr;
   decimal.end = cursor.at;
   double magnitude = 0.0;
-  if (!ConvertExactly(decimal, &magnitude) && Convert(decimal, &magnitude) != HOST_ERR_NONE) return false;
+  if (Convert(decimal, &magnitude) != HOST_ERR_NONE) return nullptr;
   *value = negative ? -magnitude : magnitude;
-  *text = cursor.at;
-  return true;
+  return cursor.at;
+}
+
+// Passes over white space and reads one number of plain form; returns what stands behind it. Null, with
+// nothing to rely on, when there is none. Short decimals, which most numbers of a scene are, are read right
+// here.
+[[gnu::always_inline]] inline const char* ScanPlain(const char* at, const char* end, double* value,
+                                                    int32_t* lines) {
+  for (; SeparatorOf(*at) == kBlank; ++at) *lines += *at == '\n' ? 1 : 0;
+  const bool negative = *at == '-';
+  const char* const first = at + (negative ? 1 : 0);
+  uint64_t mantissa = 0;
+  for (at = first; IsDigit(*at); ++at) mantissa = mantissa * 10 + static_cast<uint64_t>(*at - '0');
+  int64_t digits = at - first;
+  int64_t fraction = 0;
+  if (*at == '.') {
+    const char* const point = at++;
+    at = PlainDigits(at, end, &mantissa);
+    fraction = at - point - 1;
+    digits += fraction;
+  }
+  const bool isShort = digits - 1 < kMantissaDigits && digits != 0 && mantissa <= kExactMantissa;
+  if (!isShort || SeparatorOf(*at) == kNoSeparator) return ScanLongPlain(first, end, negative, value);
+  const double magnitude = static_cast<double>(static_cast<int64_t>(mantissa)) / kExactPowers[fraction];
+  *value = negative ? -magnitude : magnitude;
+  return at;
 }
 
 bool OnlyLettersLeft(const Cursor& cursor) {
@@ -265,9 +294,9 @@ int64_t HostNumberScanPairs(const char* text, const char* end, double (*pairs)[2
   int64_t count = 0;
   int32_t lines = 0;
   for (; count < capacity; ++count) {
-    const char* at = *behind;
-    if (!ScanPlain(&at, end, &pairs[count][0], &lines) || !ScanPlain(&at, end, &pairs[count][1], &lines))
-      break;
+    const char* at = ScanPlain(*behind, end, &pairs[count][0], &lines);
+    if (at != nullptr) at = ScanPlain(at, end, &pairs[count][1], &lines);
+    if (at == nullptr) break;
     *behind = at;
     *lineFeeds += lines;
     lines = 0;

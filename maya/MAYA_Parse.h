@@ -18,7 +18,9 @@
 #include "maya/SceneRecords.h"
 #include "maya/SceneUnits.h"
 
+struct HostPoint;
 struct NodeChannels;
+struct NodePivots;
 
 class MAYA_Parse : public MAYA_Lex {
  public:
@@ -269,9 +271,10 @@ class MAYA_Parse : public MAYA_Lex {
   void SetUnguarded(VOR_Layer* layer, std::int32_t streamId, double x);
 
   // comp/MAYA_Parse_Transform.cpp
-  MatrixComponents DecomposeTransform(const MAYA_Transform& node, const double (&scale)[kAxisCount],
-                                      const double (&rotate)[kAxisCount],
-                                      const double (&translate)[kAxisCount]) const;
+  HostPoint ConvertPoint(const double* point) const;
+  NodePivots ConvertPivots(const MAYA_Transform& node) const;
+  static void CopyChannels(const MAYA_Transform& node, double (&values)[kChannelCount]);
+  MatrixComponents DecomposeTransform(const NodePivots& pivots, const double (&values)[kChannelCount]) const;
 
   // comp/MAYA_Parse_Sampling.cpp
   NodeChannels VerifyChannels(const MAYA_Transform& node);

@@ -9,8 +9,8 @@ namespace {
 
 void dropKeysWithoutValue(Batch& batch) {
   const std::size_t dimension = static_cast<std::size_t>(batch.stream->dimension);
-  if (batch.valued.empty()) {
-    batch.times.resize(batch.values.size() / dimension);
+  if (batch.nextValued != Batch::kOutOfOrder) {
+    batch.times.resize(batch.nextValued);
     return;
   }
   std::size_t kept = 0;
@@ -27,8 +27,10 @@ void dropKeysWithoutValue(Batch& batch) {
 }
 
 bool isAscending(const std::vector<T_Time>& times) {
-  return std::adjacent_find(times.begin(), times.end(),
-                            [](const T_Time& a, const T_Time& b) { return !timeLess(a, b); }) == times.end();
+  return std::adjacent_find(times.begin(), times.end(), [](const T_Time& a, const T_Time& b) {
+           const bool sameScale = a.scale == b.scale && a.scale != 0;
+           return sameScale ? a.value >= b.value : !timeLess(a, b);
+         }) == times.end();
 }
 
 KeyColumns sorted(const KeyColumns& keys, std::size_t dimension) {
@@ -52,15 +54,31 @@ KeyColumns sorted(const KeyColumns& keys, std::size_t dimension) {
 
 }  // namespace
 
-void Batch::setValueOutOfOrder(std::size_t index, const double* value) {
+void Batch::clear() {
+  layer = nullptr;
+  stream = nullptr;
+  times.clear();
+  values.clear();
+  valued.clear();
+  nextValued = 0;
+  endFailed = false;
+}
+
+void Batch::setValue(std::size_t index, const double* value) {
   const std::size_t dimension = static_cast<std::size_t>(stream->dimension);
-  if (valued.empty()) valued.assign(values.size() / dimension, 1);
+  if (index == nextValued) {
+    for (std::size_t i = 0; i < dimension; ++i) values.add(value[i]);
+    ++nextValued;
+    return;
+  }
+  if (nextValued != kOutOfOrder) valued.assign(nextValued, 1);
+  nextValued = kOutOfOrder;
   if (index >= valued.size()) {
     valued.resize(index + 1, 0);
-    values.resize(valued.size() * dimension, 0.0);
+    values.resize(valued.size() * dimension);
   }
   valued[index] = 1;
-  std::copy(value, value + dimension, values.begin() + static_cast<std::ptrdiff_t>(index * dimension));
+  for (std::size_t i = 0; i < dimension; ++i) values[index * dimension + i] = value[i];
 }
 
 bool timeLess(const T_Time& a, const T_Time& b) {
@@ -75,7 +93,8 @@ void commitKeys(Batch& batch, std::unique_ptr<KeyColumns>& keys) {
   dropKeysWithoutValue(batch);
   if (batch.times.empty()) return;
   if (keys == nullptr) {
-    keys = std::make_unique<KeyColumns>(KeyColumns{std::move(batch.times), std::move(batch.values)});
+    keys = std::make_unique<KeyColumns>(
+        KeyColumns{{batch.times.begin(), batch.times.end()}, {batch.values.begin(), batch.values.end()}});
   } else {
     keys->times.insert(keys->times.end(), batch.times.begin(), batch.times.end());
     keys->values.insert(keys->values.end(), batch.values.begin(), batch.values.end());

@@ -5,6 +5,7 @@
 #include <cstdint>
 #include <vector>
 
+#include "refhost/Column.h"
 #include "refhost/Project.h"
 
 namespace refhost {
@@ -16,29 +17,48 @@ bool timeLess(const T_Time& a, const T_Time& b);
 struct Batch {
   Layer* layer = nullptr;
   Stream* stream = nullptr;
-  std::vector<T_Time> times;
-  std::vector<double> values;  // dimension numbers per key, as far as keys got values
+  Column<T_Time> times;
+  Column<double> values;  // dimension numbers per key, as far as keys got values
   // Which keys have a value, 1 or 0. Empty as long as they got theirs in their order: those that `values`
   // holds.
   std::vector<std::uint8_t> valued;
-  bool endFailed = false;  // a rehearsal made its EndKeyframeBatch fail
+  std::size_t nextValued = 0;  // the key whose turn it is to get its value; none when they came out of order
+  bool endFailed = false;      // a rehearsal made its EndKeyframeBatch fail
 
-  void addKey(const T_Time& time) { times.push_back(time); }
+  static constexpr std::size_t kOutOfOrder = SIZE_MAX;
+  static constexpr std::size_t kMostDimensions = 3;
 
-  // There is a key of that index.
-  void setValue(std::size_t index, const double* value) {
-    const std::size_t dimension = static_cast<std::size_t>(stream->dimension);
-    if (index * dimension == values.size() && valued.empty()) {
-      for (std::size_t i = 0; i < dimension; ++i) values.push_back(value[i]);
-    } else {
-      setValueOutOfOrder(index, value);
-    }
+  void addKey(const T_Time& time) { times.add(time); }
+
+  // The same where there is room.
+  bool hasRoomForKey() const { return times.hasRoom(1); }
+  void addKeyInRoom(const T_Time& time) {
+    *times.next() = time;
+    times.advance(1);
   }
 
-  void setValueOutOfOrder(std::size_t index, const double* value);
+  // Whether it is the turn of that key to get its value, and there is room. All three numbers have to be
+  // finite, also those that the stream does not have.
+  bool canAddValueOf(std::int32_t index, const double* value) const {
+    const double zero = 0.0 * value[0] + 0.0 * value[1] + 0.0 * value[2];
+    const auto key = static_cast<std::size_t>(index);
+    return zero == 0.0 && key == nextValued && key < times.size() && values.hasRoom(kMostDimensions);
+  }
+  void addValueInRoom(const double* value) {
+    double* const next = values.next();
+    for (std::size_t i = 0; i < kMostDimensions; ++i) next[i] = value[i];
+    values.advance(static_cast<std::size_t>(stream->dimension));
+    ++nextValued;
+  }
+
+  // There is a key of that index.
+  void setValue(std::size_t index, const double* value);
+
+  // Makes the batch blank. The columns keep their memory for the next batch.
+  void clear();
 };
 
-// Moves the keys of the batch into the columns (null: there are none yet): sorted by time, stably, of equal
+// Takes the keys of the batch into the columns (null: there are none yet): sorted by time, stably, of equal
 // times the later stays (those of the batch are later than those that are there), keys without a value
 // dropped. The batch is spent afterwards.
 void commitKeys(Batch& batch, std::unique_ptr<KeyColumns>& keys);

@@ -76,7 +76,8 @@ void Call::judge() {
   const Verdict verdict = host_.rehearsal.judge(operation_);
   rehearsed_ = verdict.rehearsed;
   error_ = verdict.code;
-  if (verdict.throws()) thrown_ = verdict.kind;
+  throws_ = verdict.throws();
+  outOfMemory_ = verdict.kind == Failure::Kind::BadAlloc;
 }
 
 TraceLine& Call::startLine() {
@@ -92,18 +93,17 @@ TraceLine* Call::traced(const char* suite, std::int32_t version) {
 }
 
 void Call::conclude() {
-  const bool outOfMemory = thrown_ == Failure::Kind::BadAlloc;
   if (line_ != nullptr) {
-    if (thrown_.has_value()) {
-      line_->text("error", outOfMemory ? "bad_alloc" : "runtime_error");
+    if (throws_) {
+      line_->text("error", outOfMemory_ ? "bad_alloc" : "runtime_error");
     } else {
       line_->integer("error", error_);
     }
     line_->end();
     host_.trace.write(*line_);
   }
-  if (!thrown_.has_value()) return;
-  if (outOfMemory) throw std::bad_alloc();
+  if (!throws_) return;
+  if (outOfMemory_) throw std::bad_alloc();
   throw std::runtime_error(std::string("rehearsed failure of ") + factsOf(operation_).name);
 }
 

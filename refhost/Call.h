@@ -5,9 +5,7 @@
 // throws when the rehearsal asked for an exception, so nothing that has to happen may come after it.
 #pragma once
 
-#include <cmath>
 #include <cstdint>
-#include <optional>
 #include <string>
 
 #include "hostapi/ErrorCodes.h"
@@ -31,13 +29,13 @@ class Call {
   template <typename... Outs>
   bool goesOn(Outs*... outs) {
     if (!rehearsed_) return true;
-    if (!thrown_.has_value() && error_ == 0) ((outs != nullptr ? void(*outs = Outs{}) : void()), ...);
+    if (!throws_ && error_ == 0) ((outs != nullptr ? void(*outs = Outs{}) : void()), ...);
     return false;
   }
 
   // Whether the call did what it was asked for.
   bool didItsWork() const { return !rehearsed_ && error_ == 0; }
-  bool failed() const { return thrown_.has_value() || error_ != 0; }
+  bool failed() const { return throws_ || error_ != 0; }
 
   [[gnu::cold]] void refuse(HostError code, const std::string& sentence);
 
@@ -49,21 +47,24 @@ class Call {
   Composition* composition(VOR_CompItem* handle, const char* what = "the composition");
   Item* item(VOR_Item* handle, const char* what);
   Layer* layer(VOR_Layer* handle, const char* what = "the layer") {
-    if (host_.codec.isOf(HandleKind::Layer, handle)) {
+    if (host_.codec.isOf(HandleKind::Layer, handle)) [[likely]] {
       Layer* found = host_.editor.layer(HandleCodec::lastingNumber(handle));
-      if (found != nullptr) return found;
+      if (found != nullptr) [[likely]]
+        return found;
     }
     refuseHandle(handle, HandleKind::Layer, what);
     return nullptr;
   }
   HeldStream* stream(VOR_Stream* handle, const char* what = "the stream") {
     HeldStream* found = host_.streams.find(handle);
-    if (found == nullptr) refuseHandle(handle, HandleKind::Stream, what);
+    if (found == nullptr) [[unlikely]]
+      refuseHandle(handle, HandleKind::Stream, what);
     return found;
   }
   Batch* batch(VOR_AddKeyframesInfo* handle) {
     Batch* found = host_.batches.find(handle);
-    if (found == nullptr) refuseHandle(handle, HandleKind::Batch, "the batch");
+    if (found == nullptr) [[unlikely]]
+      refuseHandle(handle, HandleKind::Batch, "the batch");
     return found;
   }
   MemoryBlock* memory(HostMemHandle* handle);
@@ -71,17 +72,20 @@ class Call {
 
   // False after a refusal.
   bool given(const void* pointer, const char* what) {
-    if (pointer == nullptr) refuseNull(what);
+    if (pointer == nullptr) [[unlikely]]
+      refuseNull(what);
     return pointer != nullptr;
   }
   bool isPluginId(std::int32_t pluginId) {
-    if (pluginId != host_.options.pluginId) refusePluginId(pluginId);
+    if (pluginId != host_.options.pluginId) [[unlikely]]
+      refusePluginId(pluginId);
     return pluginId == host_.options.pluginId;
   }
   bool areFinite(const double* values, std::int32_t count, const char* what) {
-    bool finite = true;
-    for (std::int32_t i = 0; i < count; ++i) finite = finite && std::isfinite(values[i]);
-    if (finite || host_.options.permissive) return true;
+    double zero = 0.0;  // 0 times what is not finite is not a number
+    for (std::int32_t i = 0; i < count; ++i) zero += 0.0 * values[i];
+    if (zero == 0.0 || host_.options.permissive) [[likely]]
+      return true;
     refuseNotFinite(what);
     return false;
   }
@@ -107,11 +111,12 @@ class Call {
   [[gnu::cold]] void conclude();
 
   HostState& host_;
-  Operation operation_;
+  TraceLine* line_ = nullptr;  // the host's, while this call writes it
   HostError error_ = 0;
+  Operation operation_;
   bool rehearsed_ = false;
-  std::optional<Failure::Kind> thrown_;  // the exception to throw at the end
-  TraceLine* line_ = nullptr;            // the host's, while this call writes it
+  bool throws_ = false;       // at the end
+  bool outOfMemory_ = false;  // what it throws then: std::bad_alloc, or a runtime_error
 };
 
 }  // namespace refhost

@@ -94,7 +94,8 @@ class HandlePool {
   Object* find(const void* handle) {
     // The slot holds the whole handle, so that one comparison tells kind, host, number and life.
     const std::size_t slot = HandleCodec::heldSlot(handle);
-    if (slot >= slots_.size() || slots_[slot].handle != handle || handle == nullptr) return nullptr;
+    if (slot >= slotCount_ || slots_[slot].handle != handle || handle == nullptr) [[unlikely]]
+      return nullptr;
     return &slots_[slot].object;
   }
 
@@ -105,21 +106,22 @@ class HandlePool {
            (HandleCodec::heldNumber(handle) <= handedOut_ || !HandleCodec::kWide);
   }
 
-  // Null when there are no more numbers or slots.
-  void* add(Object object) {
-    if (handedOut_ == UINT32_MAX) return nullptr;
-    std::size_t slot = firstFree_;
-    if (slot == kNoSlot) {
-      slot = slots_.size();
-      if (slot > HandleCodec::kSlotMask) return nullptr;
-      slots_.emplace_back();
-    } else {
-      firstFree_ = slots_[slot].nextFree;
-    }
-    slots_[slot].object = std::move(object);
-    slots_[slot].number = ++handedOut_;
-    slots_[slot].handle = reinterpret_cast<void*>(codec_.held(kind_, slot, handedOut_));
-    return slots_[slot].handle;
+  // Hands out a new handle and the object behind it, which is blank. Null when there are no more numbers or
+  // slots.
+  Object* add(void** handle) {
+    if (handedOut_ == UINT32_MAX || (firstFree_ == kNoSlot && !makeSlot())) return nullptr;
+    return addToFreeSlot(handle);
+  }
+
+  // The same in two steps: whether there is a slot that was given back, and handing that out.
+  bool hasFreeSlot() const { return firstFree_ != kNoSlot && handedOut_ != UINT32_MAX; }
+  Object* addToFreeSlot(void** handle) {
+    const std::size_t index = firstFree_;
+    Slot& slot = slots_[index];
+    firstFree_ = slot.nextFree;
+    slot.number = ++handedOut_;
+    *handle = slot.handle = reinterpret_cast<void*>(codec_.held(kind_, index, handedOut_));
+    return &slot.object;
   }
 
   // The handle is live.
@@ -157,18 +159,38 @@ class HandlePool {
   };
   static constexpr std::uint32_t kNoSlot = UINT32_MAX;
 
-  void release(std::size_t slot) {
-    slots_[slot].object = Object{};
-    slots_[slot].handle = nullptr;
-    slots_[slot].number = 0;
-    slots_[slot].nextFree = firstFree_;
-    firstFree_ = static_cast<std::uint32_t>(slot);
+  bool makeSlot() {
+    const std::size_t index = slots_.size();
+    if (index > HandleCodec::kSlotMask) return false;
+    slots_.emplace_back().nextFree = kNoSlot;
+    ++slotCount_;
+    firstFree_ = static_cast<std::uint32_t>(index);
+    return true;
+  }
+
+  void release(std::size_t index) {
+    Slot& slot = slots_[index];
+    clear(slot.object);
+    slot.handle = nullptr;
+    slot.number = 0;
+    slot.nextFree = firstFree_;
+    firstFree_ = static_cast<std::uint32_t>(index);
+  }
+
+  // Makes an object blank. One that has a way of its own may keep memory for the next in its slot.
+  static void clear(Object& object) {
+    if constexpr (requires { object.clear(); }) {
+      object.clear();
+    } else {
+      object = Object{};
+    }
   }
 
   const HandleCodec& codec_;
   HandleKind kind_;
   std::uint32_t handedOut_ = 0;
   std::vector<Slot> slots_;
+  std::uint32_t slotCount_ = 0;
   std::uint32_t firstFree_ = kNoSlot;
 };
 

@@ -66,6 +66,9 @@ class HostState {
   // canImport is written to the trace for verify only.
   CallbackResult end(HostError code, bool canImport);
 
+  // Whether a call may be rehearsed or has to be told.
+  bool watched() const { return rehearsal.watches() || trace.on(); }
+
   void refuse(std::string sentence) { result.refusals.push_back(std::move(sentence)); }
 
   // An importer with callbacks, the first registered; null when there is none.

@@ -37,14 +37,14 @@ void beginKeyframeBatch(Call& call, VOR_Stream* stream, VOR_AddKeyframesInfo** b
                                          " already has an open batch");
     return;
   }
-  Batch opened;
-  opened.layer = held->layer;
-  opened.stream = held->stream;
-  void* handle = host.batches.add(std::move(opened));
-  if (handle == nullptr) {
+  void* handle = nullptr;
+  Batch* opened = host.batches.add(&handle);
+  if (opened == nullptr) {
     call.refuse(HOST_ERR_MEMORY, "too many batches are open");
     return;
   }
+  opened->layer = held->layer;
+  opened->stream = held->stream;
   *batch = static_cast<VOR_AddKeyframesInfo*>(handle);
 }
 
@@ -55,25 +55,46 @@ HostError BeginKeyframeBatch(VOR_Stream* stream, VOR_AddKeyframesInfo** batch) {
   return call.finish();
 }
 
+// The sentences of the operations that are called for every key are put together apart from them.
+[[gnu::cold, gnu::noinline]] void refuseTimeMode(Call& call, std::int32_t timeMode) {
+  call.refuse(HOST_ERR_BAD_TIME_MODE, "the time mode " + std::to_string(timeMode) + " is not 0");
+}
+
+[[gnu::cold, gnu::noinline]] void refuseTime(Call& call, const T_Time& time) {
+  call.refuse(HOST_ERR_BAD_TIME, "a key time of " + std::to_string(time.value) + "/0 has scale 0");
+}
+
+[[gnu::cold, gnu::noinline]] void refuseMoreKeys(Call& call) {
+  call.refuse(HOST_ERR_MEMORY, "the batch is full");
+}
+
+[[gnu::cold, gnu::noinline]] void refuseOtherStream(Call& call, VOR_AddKeyframesInfo* batch,
+                                                    VOR_Stream* stream) {
+  const HandleCodec& codec = call.host().codec;
+  call.refuse(HOST_ERR_BATCH_KEY, codec.describe(stream) + " is not of the stream that " +
+                                      codec.describe(batch) + " was opened on");
+}
+
+[[gnu::cold, gnu::noinline]] void refuseIndex(Call& call, VOR_AddKeyframesInfo* batch, std::int32_t index) {
+  call.refuse(HOST_ERR_BATCH_KEY,
+              call.host().codec.describe(batch) + " holds no key of the index " + std::to_string(index));
+}
+
 void addBatchKeyframe(Call& call, VOR_AddKeyframesInfo* batch, std::int32_t timeMode, const T_Time* time,
                       std::int32_t* index) {
   Batch* open = call.batch(batch);
   if (open == nullptr || !call.given(time, "the time") || !call.given(index, "the place for the index"))
     return;
-  if (timeMode != HOST_TIME_MODE_COMP) {
-    call.refuse(HOST_ERR_BAD_TIME_MODE, "the time mode " + std::to_string(timeMode) + " is not 0");
-  } else if (time->scale == 0 && !call.host().options.permissive) {
-    call.refuse(HOST_ERR_BAD_TIME, "a key time of " + std::to_string(time->value) + "/0 has scale 0");
-  } else if (open->times.size() >= kMostKeys) {
-    call.refuse(HOST_ERR_MEMORY, "the batch is full");
-  } else {
-    *index = static_cast<std::int32_t>(open->times.size());
-    open->addKey(*time);
-  }
+  if (timeMode != HOST_TIME_MODE_COMP) return refuseTimeMode(call, timeMode);
+  if (time->scale == 0 && !call.host().options.permissive) return refuseTime(call, *time);
+  const std::size_t count = open->times.size();
+  if (count >= kMostKeys) return refuseMoreKeys(call);
+  *index = static_cast<std::int32_t>(count);
+  open->addKey(*time);
 }
 
-HostError AddBatchKeyframe(VOR_AddKeyframesInfo* batch, std::int32_t timeMode, const T_Time* time,
-                           std::int32_t* index) {
+[[gnu::noinline]] HostError addBatchKeyframeWatched(VOR_AddKeyframesInfo* batch, std::int32_t timeMode,
+                                                    const T_Time* time, std::int32_t* index) {
   Call call(Operation::AddBatchKeyframe);
   if (call.goesOn(index)) addBatchKeyframe(call, batch, timeMode, time, index);
   if (TraceLine* line = call.traced()) {
@@ -83,26 +104,38 @@ HostError AddBatchKeyframe(VOR_AddKeyframesInfo* batch, std::int32_t timeMode, c
   return call.finish();
 }
 
+// The ordinary call, kept short because an import makes it for every key of every stream: nobody watches, and
+// there is nothing to refuse. Every other call goes the long way.
+HostError AddBatchKeyframe(VOR_AddKeyframesInfo* batch, std::int32_t timeMode, const T_Time* time,
+                           std::int32_t* index) {
+  HostState& host = HostState::live();
+  Batch* const open = host.batches.find(batch);
+  if (!host.watched() && open != nullptr && timeMode == HOST_TIME_MODE_COMP && time != nullptr &&
+      time->scale != 0 && index != nullptr && open->times.size() < kMostKeys && open->hasRoomForKey())
+      [[likely]] {
+    host.rehearsal.count(Operation::AddBatchKeyframe);
+    *index = static_cast<std::int32_t>(open->times.size());
+    open->addKeyInRoom(*time);
+    return 0;
+  }
+  return addBatchKeyframeWatched(batch, timeMode, time, index);
+}
+
 void setBatchKeyframeValue(Call& call, VOR_AddKeyframesInfo* batch, std::int32_t index,
                            const StreamValueRecord* value) {
   Batch* open = call.batch(batch);
   if (open == nullptr || !call.given(value, "the value record")) return;
   const HeldStream* recorded = call.stream(value->stream, "the record's stream");
   if (recorded == nullptr) return;
-  const HandleCodec& codec = call.host().codec;
-  if (recorded->stream != open->stream) {
-    call.refuse(HOST_ERR_BATCH_KEY, codec.describe(value->stream) + " is not of the stream that " +
-                                        codec.describe(batch) + " was opened on");
-  } else if (index < 0 || static_cast<std::size_t>(index) >= open->times.size()) {
-    call.refuse(HOST_ERR_BATCH_KEY,
-                codec.describe(batch) + " holds no key of the index " + std::to_string(index));
-  } else if (call.areFinite(value->value, open->stream->dimension, "the value")) {
-    open->setValue(static_cast<std::size_t>(index), value->value);
-  }
+  if (recorded->stream != open->stream) return refuseOtherStream(call, batch, value->stream);
+  if (index < 0 || static_cast<std::size_t>(index) >= open->times.size())
+    return refuseIndex(call, batch, index);
+  if (!call.areFinite(value->value, open->stream->dimension, "the value")) return;
+  open->setValue(static_cast<std::size_t>(index), value->value);
 }
 
-HostError SetBatchKeyframeValue(VOR_AddKeyframesInfo* batch, std::int32_t index,
-                                const StreamValueRecord* value) {
+[[gnu::noinline]] HostError setBatchKeyframeValueWatched(VOR_AddKeyframesInfo* batch, std::int32_t index,
+                                                         const StreamValueRecord* value) {
   Call call(Operation::SetBatchKeyframeValue);
   if (call.goesOn()) setBatchKeyframeValue(call, batch, index, value);
   if (TraceLine* line = call.traced()) {
@@ -111,6 +144,23 @@ HostError SetBatchKeyframeValue(VOR_AddKeyframesInfo* batch, std::int32_t index,
     line->recordValues("value", value);
   }
   return call.finish();
+}
+
+// As short as AddBatchKeyframe.
+HostError SetBatchKeyframeValue(VOR_AddKeyframesInfo* batch, std::int32_t index,
+                                const StreamValueRecord* value) {
+  HostState& host = HostState::live();
+  Batch* const open = host.batches.find(batch);
+  if (!host.watched() && open != nullptr && value != nullptr) [[likely]] {
+    const HeldStream* const recorded = host.streams.find(value->stream);
+    if (recorded != nullptr && recorded->stream == open->stream && open->canAddValueOf(index, value->value))
+        [[likely]] {
+      host.rehearsal.count(Operation::SetBatchKeyframeValue);
+      open->addValueInRoom(value->value);
+      return 0;
+    }
+  }
+  return setBatchKeyframeValueWatched(batch, index, value);
 }
 
 HostError EndKeyframeBatch(std::int32_t commit, VOR_AddKeyframesInfo* batch) {

@@ -37,12 +37,14 @@ void newMemHandle(Call& call, const char* name, std::int64_t size, std::int32_t 
   block.name = name;
   block.size = size;
   block.memory.reset(allocate(size));
-  void* added = block.memory == nullptr ? nullptr : call.host().memory.add(std::move(block));
-  if (added == nullptr) {
+  void* made = nullptr;
+  MemoryBlock* held = block.memory == nullptr ? nullptr : call.host().memory.add(&made);
+  if (held == nullptr) {
     call.refuse(HOST_ERR_MEMORY, "there is no memory for " + std::to_string(size) + " bytes");
     return;
   }
-  *handle = static_cast<HostMemHandle*>(added);
+  *held = std::move(block);
+  *handle = static_cast<HostMemHandle*>(made);
 }
 
 HostError NewMemHandle(std::int32_t pluginId, const char* name, std::int64_t size, std::int32_t flags,

@@ -4,7 +4,6 @@
 #include <utility>
 
 #include "hostapi/LayerSuite.h"
-#include "refhost/StreamTable.h"
 
 namespace refhost {
 
@@ -43,6 +42,7 @@ void ProjectEditor::makeItem(Composition& composition) {
 
 Layer& ProjectEditor::addLayer(Composition& composition, LayerKind kind, std::string name) {
   Layer& layer = project_.layers_.emplace_back();
+  layers_.push_back(&layer);
   layer.number = static_cast<int32_t>(project_.layers_.size());
   layer.kind = kind;
   layer.name = std::move(name);
@@ -98,13 +98,6 @@ void ProjectEditor::setFilm(Layer& camera, int32_t direction, double size) {
 }
 
 void ProjectEditor::commit(Batch& batch) { commitKeys(batch, batch.stream->keys); }
-
-Stream* ProjectEditor::findStream(Layer& layer, int32_t id) {
-  for (Stream& stream : layer.streams) {
-    if (stream.id == id) return &stream;
-  }
-  return nullptr;
-}
 
 void ProjectEditor::setValue(Stream& stream, const double* value) {
   for (int32_t i = 0; i < stream.dimension; ++i) stream.value[i] = value[i];

@@ -7,6 +7,7 @@
 
 #include "refhost/Batches.h"
 #include "refhost/Project.h"
+#include "refhost/StreamTable.h"
 
 namespace refhost {
 
@@ -34,9 +35,7 @@ class ProjectEditor {
   Composition* composition(std::size_t number) {
     return number - 1 < project_.compositions_.size() ? &project_.compositions_[number - 1] : nullptr;
   }
-  Layer* layer(std::size_t number) {
-    return number - 1 < project_.layers_.size() ? &project_.layers_[number - 1] : nullptr;
-  }
+  Layer* layer(std::size_t number) { return number - 1 < layers_.size() ? layers_[number - 1] : nullptr; }
 
   Folder& addFolder();
   Composition& addComposition(Folder& folder, CompositionSettings settings);
@@ -54,7 +53,11 @@ class ProjectEditor {
   static void setValue(Stream& stream, const double* value);
   static void commit(Batch& batch);
 
-  static Stream* findStream(Layer& layer, int32_t id);  // null when the layer has none of that id
+  // Null when the layer has none of that id.
+  static Stream* findStream(Layer& layer, int32_t id) {
+    const std::size_t place = streamPlace(id);
+    return place < layer.streams.size() ? &layer.streams[place] : nullptr;
+  }
 
   // Whether the layer is the other one or stands above it.
   static bool isSameOrAbove(const Layer& layer, const Layer& other);
@@ -67,6 +70,7 @@ class ProjectEditor {
 
   Project project_;
   std::vector<Item> items_;
+  std::vector<Layer*> layers_;  // by number - 1
 };
 
 }  // namespace refhost

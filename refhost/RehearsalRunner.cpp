@@ -1,5 +1,6 @@
 #include "refhost/RehearsalRunner.h"
 
+#include <numeric>
 #include <stdexcept>
 
 #include "hostutil/HostSetup.h"
@@ -50,19 +51,22 @@ void RehearsalRunner::planUtilityFailure(std::int32_t service, const Failure& fa
 }
 
 void RehearsalRunner::begin(Callback callback) {
-  calls_ = 0;
   active_ = callback == during_;
   watching_ = active_ && !planned_.empty();
   tally_ = active_ ? &counts_ : &others_;
-  if (!active_) return;
-  counts_.fill(0);
-  HostBeginRehearsal();
+  tally_->fill(0);
+  if (active_) HostBeginRehearsal();
 }
 
 void RehearsalRunner::end() {
+  calls_ = callsSoFar();
   if (active_) HostEndRehearsal();
   active_ = watching_ = false;
   tally_ = &others_;
+}
+
+std::int64_t RehearsalRunner::callsSoFar() const {
+  return std::accumulate(tally_->begin(), tally_->end(), std::int64_t{0});
 }
 
 Verdict RehearsalRunner::judge(Operation operation) const {
@@ -71,7 +75,7 @@ Verdict RehearsalRunner::judge(Operation operation) const {
     const Failure& failure = planned.failure;
     bool hit = false;
     if (!planned.operation) {
-      hit = failure.onwards ? calls_ >= failure.nth : calls_ == failure.nth;
+      hit = failure.onwards ? callsSoFar() >= failure.nth : callsSoFar() == failure.nth;
     } else if (*planned.operation == operation) {
       hit = failure.nth == 0 || ofOperation == failure.nth;
     }

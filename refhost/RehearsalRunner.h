@@ -35,17 +35,18 @@ class RehearsalRunner {
 
   // Counts a call. True when its verdict is to be asked for; a call without one goes on.
   bool count(Operation operation) {
-    ++calls_;
     ++(*tally_)[static_cast<std::size_t>(operation)];
     return watching_;
   }
+
+  bool watches() const { return watching_; }
 
   // The verdict on the call that was counted last.
   Verdict judge(Operation operation) const;
 
   bool refuses(std::string_view suite, std::int32_t version) const;
 
-  std::int64_t calls() const { return calls_; }  // suite calls since begin()
+  std::int64_t calls() const { return calls_; }  // suite calls between begin() and end()
   std::int64_t callCount(std::string_view operation) const;
 
  private:
@@ -54,6 +55,7 @@ class RehearsalRunner {
     Failure failure;
   };
 
+  std::int64_t callsSoFar() const;
   void planUtilityFailure(std::int32_t service, const Failure& failure);
 
   Callback during_;
@@ -63,7 +65,7 @@ class RehearsalRunner {
   std::int64_t calls_ = 0;
   using Tally = std::array<std::int64_t, kOperationCount>;
   Tally counts_{};           // of the callback that the rehearsal is for
-  Tally others_{};           // of the other callbacks; nobody asks for them
+  Tally others_{};           // of the other callbacks
   Tally* tally_ = &others_;  // where the calls of the callback that runs are counted
   bool watching_ = false;    // whether any call of the callback that runs may be rehearsed
 };

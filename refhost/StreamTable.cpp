@@ -26,6 +26,14 @@ constexpr StreamFacts kStreams[] = {
 };
 constexpr std::size_t kStreamCount = sizeof(kStreams) / sizeof(kStreams[0]);
 
+constexpr bool standAtTheirPlaces() {
+  for (std::size_t place = 0; place < kStreamCount; ++place) {
+    if (streamPlace(kStreams[place].id) != place) return false;
+  }
+  return true;
+}
+static_assert(standAtTheirPlaces());
+
 }  // namespace
 
 std::vector<Stream> makeStreams(LayerKind kind) {

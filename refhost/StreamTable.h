@@ -1,6 +1,7 @@
 // The streams that a layer has from its creation: names, dimensions and defaults.
 #pragma once
 
+#include <cstddef>
 #include <cstdint>
 #include <vector>
 
@@ -11,6 +12,14 @@ namespace refhost {
 // The streams of a layer of that kind, in the order of their numbers, with the defaults that do not depend on
 // the composition.
 std::vector<Stream> makeStreams(LayerKind kind);
+
+// Where the stream of that number stands among a layer's; beyond all of them for a number that no layer has.
+inline constexpr std::uint8_t kNoStreamPlace = 7;
+inline constexpr std::uint8_t kStreamPlaces[] = {
+    0, 1, 2, 3, kNoStreamPlace, kNoStreamPlace, kNoStreamPlace, kNoStreamPlace, 4, 5, kNoStreamPlace, 6};
+constexpr std::size_t streamPlace(int32_t id) {
+  return static_cast<std::uint32_t>(id) < sizeof kStreamPlaces ? kStreamPlaces[id] : kNoStreamPlace;
+}
 
 // "position"; a camera's anchor point is its "point of interest".
 const char* streamName(int32_t id, LayerKind kind);

@@ -11,10 +11,18 @@ struct Thing {
   int worth = 0;
 };
 
+void* handOut(HandlePool<Thing>& pool, int worth) {
+  void* handle = nullptr;
+  Thing* thing = pool.add(&handle);
+  EXPECT_EQ(thing->worth, 0) << "what is handed out is blank";
+  thing->worth = worth;
+  return handle;
+}
+
 TEST(Handles, HandleFindsItsObjectUntilItIsGivenBack) {
   const HandleCodec codec(1);
   HandlePool<Thing> pool(codec, HandleKind::Stream);
-  void* handle = pool.add({41});
+  void* handle = handOut(pool, 41);
   ASSERT_NE(pool.find(handle), nullptr);
   EXPECT_EQ(pool.find(handle)->worth, 41);
   EXPECT_FALSE(pool.wasGivenBack(handle));
@@ -26,9 +34,9 @@ TEST(Handles, HandleFindsItsObjectUntilItIsGivenBack) {
 TEST(Handles, RecycledSlotDoesNotReviveAStaleHandle) {
   const HandleCodec codec(1);
   HandlePool<Thing> pool(codec, HandleKind::Stream);
-  void* first = pool.add({1});
+  void* first = handOut(pool, 1);
   pool.remove(first);
-  void* second = pool.add({2});
+  void* second = handOut(pool, 2);
   EXPECT_EQ(HandleCodec::heldSlot(first), HandleCodec::heldSlot(second));
   EXPECT_NE(first, second);
   EXPECT_EQ(pool.find(first), nullptr);
@@ -39,21 +47,21 @@ TEST(Handles, RecycledSlotDoesNotReviveAStaleHandle) {
 TEST(Handles, EachAcquisitionHasANumberOfItsOwn) {
   const HandleCodec codec(3);
   HandlePool<Thing> pool(codec, HandleKind::Batch);
-  EXPECT_EQ(codec.describe(pool.add({1})), "batch:1");
-  void* second = pool.add({2});
+  EXPECT_EQ(codec.describe(handOut(pool, 1)), "batch:1");
+  void* second = handOut(pool, 2);
   EXPECT_EQ(codec.describe(second), "batch:2");
   pool.remove(second);
-  EXPECT_EQ(codec.describe(pool.add({3})), "batch:3");
+  EXPECT_EQ(codec.describe(handOut(pool, 3)), "batch:3");
   EXPECT_EQ(codec.describe(second), "batch:2");
 }
 
 TEST(Handles, HeldObjectsComeInTheOrderInWhichTheyWereHandedOut) {
   const HandleCodec codec(0);
   HandlePool<Thing> pool(codec, HandleKind::Memory);
-  void* first = pool.add({10});
-  pool.add({20});
+  void* first = handOut(pool, 10);
+  handOut(pool, 20);
   pool.remove(first);
-  pool.add({30});  // in the first slot again
+  handOut(pool, 30);  // in the first slot again
   std::vector<int> worths;
   for (const auto& [number, thing] : pool.held()) worths.push_back(thing->worth);
   EXPECT_THAT(worths, ElementsAre(20, 30));
@@ -62,7 +70,7 @@ TEST(Handles, HeldObjectsComeInTheOrderInWhichTheyWereHandedOut) {
 TEST(Handles, PointerToAnObjectOfTheProcessIsForeign) {
   const HandleCodec codec(0);
   HandlePool<Thing> pool(codec, HandleKind::Stream);
-  pool.add({1});
+  handOut(pool, 1);
   int local = 0;
   EXPECT_EQ(codec.kindOf(&local), HandleKind::None);
   EXPECT_EQ(pool.find(&local), nullptr);
@@ -73,7 +81,7 @@ TEST(Handles, PointerToAnObjectOfTheProcessIsForeign) {
 TEST(Handles, NumberThatWasNeverHandedOutIsNoStaleHandle) {
   const HandleCodec codec(0);
   HandlePool<Thing> pool(codec, HandleKind::Stream);
-  pool.add({1});
+  handOut(pool, 1);
   const void* invented = reinterpret_cast<const void*>(codec.held(HandleKind::Stream, 0, 9));
   EXPECT_EQ(pool.find(invented), nullptr);
   EXPECT_FALSE(pool.wasGivenBack(invented));

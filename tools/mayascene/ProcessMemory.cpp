@@ -5,9 +5,8 @@
 
 #if defined(__GLIBC__)
 #include <malloc.h>
+#include <sys/mman.h>
 #include <unistd.h>
-
-#include "hostutil/HostSetup.h"
 #endif
 
 namespace mayascene {
@@ -31,7 +30,10 @@ void useLargePages() {
   std::free(extended);
   mallopt(M_TOP_PAD, kUsualReserve);
   auto* const after = static_cast<char*>(sbrk(0));
-  if (after > before) HostAdviseLargePages(before, after - before);
+  if (after <= before) return;
+  const auto page = static_cast<std::uintptr_t>(sysconf(_SC_PAGESIZE));
+  auto* const first = before + (page - reinterpret_cast<std::uintptr_t>(before) % page) % page;
+  madvise(first, static_cast<std::size_t>(after - first), MADV_HUGEPAGE);
 }
 #else
 void useLargePages() {}

@@ -1,0 +1,52 @@
+// A row of plain values that grows at its end and keeps its memory when it is cleared.
+#pragma once
+
+#include <algorithm>
+#include <cstddef>
+#include <vector>
+
+namespace refhost {
+
+template <typename Value>
+class Column {
+ public:
+  std::size_t size() const { return size_; }
+  bool empty() const { return size_ == 0; }
+  const Value* begin() const { return room_.data(); }
+  const Value* end() const { return room_.data() + size_; }
+  Value& operator[](std::size_t at) { return room_[at]; }
+  const Value& operator[](std::size_t at) const { return room_[at]; }
+
+  // Whether so many more values need no more memory.
+  bool hasRoom(std::size_t count) const { return room_.size() - size_ >= count; }
+
+  void add(Value value) {
+    if (!hasRoom(1)) [[unlikely]]
+      grow(size_ + 1);
+    room_[size_++] = value;
+  }
+
+  // Where the next values go, as far as there is room, and so many of them added there.
+  Value* next() { return room_.data() + size_; }
+  void advance(std::size_t count) { size_ += count; }
+
+  // Values that come to it are zero.
+  void resize(std::size_t size) {
+    if (size > room_.size()) grow(size);
+    if (size > size_) std::fill(room_.data() + size_, room_.data() + size, Value{});
+    size_ = size;
+  }
+
+  void clear() { size_ = 0; }
+
+ private:
+  [[gnu::noinline]] void grow(std::size_t least) {
+    constexpr std::size_t kFirstRoom = 64;
+    room_.resize(std::max({least, 2 * room_.size(), kFirstRoom}));
+  }
+
+  std::vector<Value> room_;  // the values, and zeros or old values behind them
+  std::size_t size_ = 0;
+};
+
+}  // namespace refhost
