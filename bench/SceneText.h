@@ -59,7 +59,7 @@ class SceneText {
     text("\tsetAttr \".dar\" 1.7777777910232544;\n\tsetAttr \".pa\" 1;\n// End of measured.ma\n");
   }
 
-  // A curve of baked keys from frame 1 on.
+  // A curve of baked keys from frame 1 on: a motion that changes its speed a little from frame to frame.
   void curve(std::string_view type, const std::string& name, int keys, int decimals, double range) {
     text("createNode ")
         .text(type)
@@ -67,8 +67,14 @@ class SceneText {
         .text(name)
         .text("\";\n\tsetAttr \".tan\" 18;\n\tsetAttr -s ");
     integer(keys).text(" \".ktv[0:").integer(keys - 1).text("]\" ");
+    constexpr double kDrag = 0.9;
+    constexpr double kPush = 0.01;
+    double value = number(range);
+    double speed = 0.0;
     for (int k = 0; k < keys; ++k) {
-      text(k % 8 == 7 ? "\n\t\t" : " ").integer(k + 1).text(" ").real(number(range), decimals);
+      text(k % 8 == 7 ? "\n\t\t" : " ").integer(k + 1).text(" ").real(value, decimals);
+      speed = speed * kDrag + number(range * kPush);
+      value += speed;
     }
     text(";\n");
   }

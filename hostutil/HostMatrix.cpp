@@ -84,8 +84,11 @@ HostError MatrixSetIdentity(TransformMatrix* matrix) {
     return code;
   }
   if (matrix == nullptr) return HOST_ERR_UTILITY_NULL;
-  *matrix = TransformMatrix{};
-  for (int i = 0; i < kSize; ++i) matrix->m[i][i] = 1.0;
+  // By pairs, as the operations that follow load them: a pair that was stored in parts is waited for.
+  Store({Pair{1.0, 0.0}, Pair{0.0, 0.0}}, matrix->m[0]);
+  Store({Pair{0.0, 1.0}, Pair{0.0, 0.0}}, matrix->m[1]);
+  Store({Pair{0.0, 0.0}, Pair{1.0, 0.0}}, matrix->m[2]);
+  Store({Pair{0.0, 0.0}, Pair{0.0, 1.0}}, matrix->m[3]);
   return HOST_ERR_NONE;
 }
 

@@ -8,6 +8,7 @@
 #include <array>
 #include <bit>
 #include <charconv>
+#include <cstddef>
 #include <cstdlib>
 #include <cstring>
 #include <limits>
@@ -104,11 +105,55 @@ bool ReadDecimal(Cursor* cursor, Decimal* decimal) {
   return true;
 }
 
+#if defined(__SIZEOF_INT128__)
+constexpr auto kIntegerPowers = [] {
+  std::array<uint64_t, kMantissaDigits + 1> powers{1};
+  for (std::size_t i = 1; i < powers.size(); ++i) powers[i] = powers[i - 1] * 10;
+  return powers;
+}();
+
+// The mantissa, which is not 0, divided by a power of ten that fits 64 bits: the quotient in at least 63
+// bits, with its lowest bit set where something is left over, is rounded correctly when it becomes a double.
+double Divide(uint64_t mantissa, int64_t power) {
+  using Wide = unsigned __int128;
+  constexpr int kFractionBits = 63;
+  const uint64_t divisor = kIntegerPowers[static_cast<std::size_t>(power)];
+  const int mantissaShift = std::countl_zero(mantissa);
+  const int divisorShift = std::countl_zero(divisor);
+  const Wide dividend = Wide{mantissa << mantissaShift} << kFractionBits;
+  const uint64_t aligned = divisor << divisorShift;
+  const auto quotient = static_cast<uint64_t>(dividend / aligned);
+  const uint64_t rest = static_cast<uint64_t>(dividend) - quotient * aligned;
+  const auto rounded = static_cast<double>(quotient | (rest != 0 ? 1 : 0));
+  constexpr int kBias = 1023;
+  constexpr int kMantissaBits = 52;
+  const int scale = kBias + divisorShift - mantissaShift - kFractionBits;
+  return rounded * std::bit_cast<double>(static_cast<uint64_t>(scale) << kMantissaBits);
+}
+
+#endif
+
+// The mantissa divided by 10^power, at most 10^19, rounded correctly. False where that has to be done another
+// way.
+inline bool DivideByPower(uint64_t mantissa, int64_t power, double* value) {
+  if (mantissa <= kExactMantissa) [[likely]] {
+    *value = static_cast<double>(static_cast<int64_t>(mantissa)) / kExactPowers[power];
+    return true;
+  }
+#if defined(__SIZEOF_INT128__)
+  *value = Divide(mantissa, power);
+  return true;
+#else
+  return false;
+#endif
+}
+
 // One exact operation on two exact numbers is rounded correctly.
 bool ConvertExactly(const Decimal& decimal, double* value) {
+  if (decimal.digits > kMantissaDigits) return false;
   const int64_t power = decimal.exponent - decimal.fraction;
-  if (decimal.digits > kMantissaDigits || decimal.mantissa > kExactMantissa) return false;
-  if (power < -kMostExactPower || power > kMostExactPower) return false;
+  if (power <= 0 && power >= -kMantissaDigits) return DivideByPower(decimal.mantissa, -power, value);
+  if (decimal.mantissa > kExactMantissa || power < -kMostExactPower || power > kMostExactPower) return false;
   const auto mantissa = static_cast<double>(decimal.mantissa);
   *value = power < 0 ? mantissa / kExactPowers[-power] : mantissa * kExactPowers[power];
   return true;
@@ -255,9 +300,11 @@ bool ScanRest(Cursor* cursor, Decimal* decimal) {
     fraction = at - point - 1;
     digits += fraction;
   }
-  const bool isShort = digits - 1 < kMantissaDigits && digits != 0 && mantissa <= kExactMantissa;
-  if (!isShort || SeparatorOf(*at) == kNoSeparator) return ScanLongPlain(first, end, negative, value);
-  const double magnitude = static_cast<double>(static_cast<int64_t>(mantissa)) / kExactPowers[fraction];
+  const bool isShort = digits != 0 && digits <= kMantissaDigits && SeparatorOf(*at) != kNoSeparator;
+  double magnitude = 0.0;
+  if (!isShort || !DivideByPower(mantissa, fraction, &magnitude)) {
+    return ScanLongPlain(first, end, negative, value);
+  }
   *value = negative ? -magnitude : magnitude;
   return at;
 }
