@@ -146,7 +146,7 @@ void writeKeys(std::ostream& out, double scale, std::uint64_t seed) {
   for (std::int64_t i = 0; i < count; ++i) {
     const std::string name = numbered("joint", i);
     transform(scene, name, i % 10 == 0 ? std::string() : numbered("joint", i - 1));
-    animate(scene, name, 240, 11, 0, 9);
+    animate(scene, name, 240, 10, 0, 9);
   }
   scene.footer();
 }
@@ -196,7 +196,7 @@ void writeComposition(std::ostream& out, double scale, std::uint64_t seed) {
     transform(scene, name, "");
     scene.text("createNode locator -n \"").text(name).text("_nullShape\" -p \"").text(name).text("\";\n");
     animate(scene, name, 1200, 8, 0, 1);
-    animate(scene, name, 1200, 9, 4, 1);
+    animate(scene, name, 1200, 8, 4, 1);
   }
   scene.footer();
 }

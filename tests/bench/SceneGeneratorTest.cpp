@@ -52,7 +52,7 @@ double Megabytes(std::string_view workload) {
 }
 
 TEST(SceneGeneratorTest, MeshIsOf200Megabytes) { EXPECT_NEAR(Megabytes("mesh"), 200.0, 4.0); }
-TEST(SceneGeneratorTest, KeysIsOf127Megabytes) { EXPECT_NEAR(Megabytes("keys"), 127.0, 2.5); }
+TEST(SceneGeneratorTest, KeysIsOf125Megabytes) { EXPECT_NEAR(Megabytes("keys"), 125.0, 2.5); }
 TEST(SceneGeneratorTest, NodesIsOf50Megabytes) { EXPECT_NEAR(Megabytes("nodes"), 50.0, 1.5); }
 TEST(SceneGeneratorTest, CompositionIsOf42Megabytes) { EXPECT_NEAR(Megabytes("composition"), 42.0, 0.8); }
 
