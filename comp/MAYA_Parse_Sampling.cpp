@@ -25,7 +25,8 @@ void ReadKey(const NodeChannels::Channel& channel, std::int32_t n, double* value
 
 void NodeChannels::Extract(std::int32_t group, std::int32_t n, double (&values)[kAxisCount]) const {
   for (std::int32_t axis = 0; axis < kAxisCount; ++axis) {
-    ReadKey(channels[static_cast<std::size_t>(kAxisCount * group + axis)], n, &values[axis]);
+    const std::int32_t slot = kAxisCount * group + axis;
+    ReadKey(channels[static_cast<std::size_t>(slot)], n, &values[axis]);
   }
 }
 

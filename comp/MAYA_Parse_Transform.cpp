@@ -1,6 +1,8 @@
 // A transform in the host's space: scene points (x, y, z) become (x, -y, -z), angles about Y and Z change
 // sign, and the pivots are folded into the position. Reads the units; sets streams through
 // MAYA_Parse_Streams.cpp.
+#include <cstddef>
+
 #include "comp/Conversions.h"
 #include "comp/HostPoint.h"
 #include "comp/LayerStreams.h"
@@ -37,9 +39,10 @@ void MAYA_Parse::CopyChannels(const MAYA_Transform& node, double (&values)[kChan
 
 MatrixComponents MAYA_Parse::DecomposeTransform(const NodePivots& pivots,
                                                 const double (&values)[kChannelCount]) const {
-  const double* const translate = values + kAxisCount * kTranslateGroup;
-  const double* const rotate = values + kAxisCount * kRotateGroup;
-  const double* const scale = values + kAxisCount * kScaleGroup;
+  constexpr std::ptrdiff_t axes = kAxisCount;
+  const double* const translate = values + axes * kTranslateGroup;
+  const double* const rotate = values + axes * kRotateGroup;
+  const double* const scale = values + axes * kScaleGroup;
 
   // Deliberate: always about X, then Y, then Z; the node's own rotate order is not looked at.
   TransformMatrix matrix{};

@@ -108,7 +108,7 @@ bool ReadDecimal(Cursor* cursor, Decimal* decimal) {
 #if defined(__SIZEOF_INT128__)
 constexpr auto kIntegerPowers = [] {
   std::array<uint64_t, kMantissaDigits + 1> powers{1};
-  for (std::size_t i = 1; i < powers.size(); ++i) powers[i] = powers[i - 1] * 10;
+  for (std::size_t i = 1; i != powers.size(); ++i) powers[i] = powers[i - 1] * 10;
   return powers;
 }();
 

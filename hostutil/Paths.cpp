@@ -127,7 +127,8 @@ std::string ShownLine(const HostUTF16Unit* units) {
     units += character.length;
     if (BreaksLine(character.codePoint)) {
       char escaped[sizeof "\\u0000"];
-      std::snprintf(escaped, sizeof escaped, "\\u%04x", static_cast<unsigned>(character.codePoint & 0xFFFF));
+      (void)std::snprintf(escaped, sizeof escaped, "\\u%04x",
+                          static_cast<unsigned>(character.codePoint & 0xFFFF));
       line += escaped;
       continue;
     }

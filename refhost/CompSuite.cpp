@@ -102,8 +102,8 @@ VOR_Layer* handleOf(Call& call, const Layer& layer) {
 HostError NewCameraLayer(const char* name, VOR_CompItem* comp, double centerX, double centerY,
                          VOR_Layer** layer) {
   Call call(Operation::NewCameraLayer);
-  double center[2] = {centerX, centerY};
   if (call.goesOn(layer)) {
+    double center[2] = {centerX, centerY};
     Composition* found = call.composition(comp);
     if (found != nullptr && call.given(name, "the name") && call.given(layer, "the place for the layer") &&
         call.areFinite(center, 2, "the centre")) {

@@ -84,6 +84,20 @@ TEST(JsonWriter, TextIsAsciiAndReadsBackAsUtf8) {
 
 TEST(JsonWriter, EachByteThatIsNoUtf8IsReplaced) {
   EXPECT_EQ(textAsJson("a\xff\xfe"), "\"a\\ufffd\\ufffd\"");
+  EXPECT_EQ(textAsJson("\xc0\xafz"), "\"\\ufffd\\ufffdz\"");            // a longer form than needed
+  EXPECT_EQ(textAsJson("\xed\xa0\xbd"), "\"\\ufffd\\ufffd\\ufffd\"");   // a surrogate
+  EXPECT_EQ(textAsJson("\xe6\x98\"\\"), "\"\\ufffd\\ufffd\\\"\\\\\"");  // cut short before a quote
+}
+
+TEST(JsonWriter, NoPairOfBytesLeavesItsQuotes) {
+  for (int pair = 0; pair < 0x10000; ++pair) {
+    const std::string bytes = {static_cast<char>(pair >> 8), static_cast<char>(pair & 0xff)};
+    const std::string written = textAsJson(bytes);
+    // Another text of one or two characters, and nothing after it.
+    ASSERT_TRUE(nlohmann::json::accept(written)) << pair;
+    ASSERT_TRUE(nlohmann::json::parse(written).is_string()) << pair;
+    for (const char letter : written) ASSERT_TRUE(letter >= ' ' && letter < '\x7f') << pair;
+  }
 }
 
 }  // namespace

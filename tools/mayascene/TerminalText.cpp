@@ -40,7 +40,8 @@ std::string escaped(char32_t point) {
   if (point == '\r') return "\\r";
   if (point == '\t') return "\\t";
   std::array<char, 12> text{};
-  std::snprintf(text.data(), text.size(), point < 0x80 ? "\\x%02x" : "\\u%04x", static_cast<unsigned>(point));
+  (void)std::snprintf(text.data(), text.size(), point < 0x80 ? "\\x%02x" : "\\u%04x",
+                      static_cast<unsigned>(point));
   return text.data();
 }
 
