@@ -4,29 +4,21 @@
 #include <cstddef>
 
 #include "comp/Conversions.h"
-#include "comp/HostPoint.h"
 #include "comp/LayerStreams.h"
 #include "maya/MAYA_Parse.h"
 #include "plugin/ErrorCodes.h"
 
-namespace {
-
-void Translate(TransformMatrix* matrix, const HostPoint& by) {
-  ThrowOnError(MatrixTranslate(matrix, by.x, by.y, by.z));
+void MAYA_Parse::ConvertPoint(const double* point, double (&host)[kAxisCount]) const {
+  host[0] = ConvertDist(point[0]);
+  host[1] = -ConvertDist(point[1]);
+  host[2] = -ConvertDist(point[2]);
 }
 
-void TranslateBack(TransformMatrix* matrix, const HostPoint& by) {
-  ThrowOnError(MatrixTranslate(matrix, -by.x, -by.y, -by.z));
-}
-
-}  // namespace
-
-HostPoint MAYA_Parse::ConvertPoint(const double* point) const {
-  return {ConvertDist(point[0]), -ConvertDist(point[1]), -ConvertDist(point[2])};
-}
-
-NodePivots MAYA_Parse::ConvertPivots(const MAYA_Transform& node) const {
-  return {ConvertPoint(node.scalePivot), ConvertPoint(node.rotatePivot)};
+PivotedTransform MAYA_Parse::ConvertPivots(const MAYA_Transform& node) const {
+  PivotedTransform pivots{};
+  ConvertPoint(node.scalePivot, pivots.scalePivot);
+  ConvertPoint(node.rotatePivot, pivots.rotatePivot);
+  return pivots;
 }
 
 void MAYA_Parse::CopyChannels(const MAYA_Transform& node, double (&values)[kChannelCount]) {
@@ -37,35 +29,28 @@ void MAYA_Parse::CopyChannels(const MAYA_Transform& node, double (&values)[kChan
   }
 }
 
-MatrixComponents MAYA_Parse::DecomposeTransform(const NodePivots& pivots,
+// Fills in the channels beside the pivots, and takes the whole apart.
+MatrixComponents MAYA_Parse::DecomposeTransform(PivotedTransform* transform,
                                                 const double (&values)[kChannelCount]) const {
   constexpr std::ptrdiff_t axes = kAxisCount;
-  const double* const translate = values + axes * kTranslateGroup;
   const double* const rotate = values + axes * kRotateGroup;
   const double* const scale = values + axes * kScaleGroup;
-
+  for (int axis = 0; axis < kAxisCount; ++axis) transform->scale[axis] = scale[axis];
   // Deliberate: always about X, then Y, then Z; the node's own rotate order is not looked at.
-  TransformMatrix matrix{};
-  ThrowOnError(MatrixSetIdentity(&matrix));
-  TranslateBack(&matrix, pivots.scale);
-  ThrowOnError(MatrixScale(&matrix, scale[0], scale[1], scale[2]));
-  Translate(&matrix, pivots.scale);
-  TranslateBack(&matrix, pivots.rotate);
-  ThrowOnError(MatrixRotateAxis(&matrix, 1.0, 0.0, 0.0, ConvertRot(rotate[0]) * kDegreesToRadians));
-  ThrowOnError(MatrixRotateAxis(&matrix, 0.0, 1.0, 0.0, ConvertRot(rotate[1]) * -kDegreesToRadians));
-  ThrowOnError(MatrixRotateAxis(&matrix, 0.0, 0.0, 1.0, ConvertRot(rotate[2]) * -kDegreesToRadians));
-  Translate(&matrix, pivots.rotate);
-  Translate(&matrix, ConvertPoint(translate));
-
-  MatrixComponents components{};
-  ThrowOnError(MatrixDecompose(&matrix, &components, nullptr));
+  transform->rotation[0] = ConvertRot(rotate[0]) * kDegreesToRadians;
+  transform->rotation[1] = ConvertRot(rotate[1]) * -kDegreesToRadians;
+  transform->rotation[2] = ConvertRot(rotate[2]) * -kDegreesToRadians;
+  ConvertPoint(values + axes * kTranslateGroup, transform->translation);
+  MatrixComponents components;
+  ThrowOnError(MatrixDecomposePivoted(transform, &components));
   return components;
 }
 
 void MAYA_Parse::SetTransform(VOR_Layer* layer, const MAYA_Transform* node) {
   double values[kChannelCount];
   CopyChannels(*node, values);
-  const MatrixComponents at = DecomposeTransform(ConvertPivots(*node), values);
+  PivotedTransform transform = ConvertPivots(*node);
+  const MatrixComponents at = DecomposeTransform(&transform, values);
   SetThreeDStream(layer, kAnchorPointStream, 0.0, 0.0, 0.0);
   SetThreeDStream(layer, kScaleStream, at.scale[0] * kPercent, at.scale[1] * kPercent,
                   at.scale[2] * kPercent);

@@ -1,7 +1,6 @@
 // Keys of a node's position, rotation and scale: for every sampled key the node's matrix is rebuilt, taken
 // apart and written to five streams. Reads `curves` and the units; keys go through MAYA_Parse_Streams.cpp.
 #include "comp/Conversions.h"
-#include "comp/HostPoint.h"
 #include "comp/LayerStreams.h"
 #include "comp/NodeChannels.h"
 #include "comp/UnwrapAngle.h"
@@ -34,7 +33,7 @@ void MAYA_Parse::ApplyTransformAnimation(VOR_Layer* layer, const MAYA_Transform*
 
 void MAYA_Parse::InsertTransformKeys(VOR_Layer* layer, const MAYA_Transform& node,
                                      const NodeChannels& channels, VOR_AddKeyframesInfo* const* batches) {
-  const NodePivots pivots = ConvertPivots(node);
+  PivotedTransform transform = ConvertPivots(node);
   double still[kChannelCount];
   CopyChannels(node, still);
   double values[kChannelCount];
@@ -43,7 +42,7 @@ void MAYA_Parse::InsertTransformKeys(VOR_Layer* layer, const MAYA_Transform& nod
     const T_Time time = KeyTime(channels, n);
     for (int channel = 0; channel < kChannelCount; ++channel) values[channel] = still[channel];
     channels.Sample(n, values);
-    const MatrixComponents at = DecomposeTransform(pivots, values);
+    const MatrixComponents at = DecomposeTransform(&transform, values);
     double angles[kAxisCount];
     for (int axis = 0; axis < kAxisCount; ++axis) {
       angles[axis] = n > 0 ? UnwrapAngle(at.rotation[axis], previous[axis]) : at.rotation[axis];

@@ -5,31 +5,12 @@
 #include <cmath>
 
 #include "hostapi/ErrorCodes.h"
+#include "hostutil/HostMatrixInternal.h"
 #include "hostutil/RehearsalInternal.h"
 
+using namespace hostutil::matrix;
+
 namespace {
-
-constexpr int kAxes = 3;
-constexpr int kSize = 4;
-
-// A row of a matrix as two pairs of numbers, so that the compiler can take a pair at a time.
-using Pair = double __attribute__((vector_size(2 * sizeof(double))));
-struct Row {
-  Pair left, right;
-};
-
-Row Load(const double (&row)[kSize]) { return {Pair{row[0], row[1]}, Pair{row[2], row[3]}}; }
-
-void Store(const Row& from, double (&row)[kSize]) {
-  row[0] = from.left[0];
-  row[1] = from.left[1];
-  row[2] = from.right[0];
-  row[3] = from.right[1];
-}
-
-Row Sum(const Row& a, const Row& b) { return {a.left + b.left, a.right + b.right}; }
-
-Row Product(double factor, const Row& row) { return {factor * row.left, factor * row.right}; }
 
 constexpr int kNoAxis = -1;
 
@@ -38,20 +19,6 @@ int CoordinateAxis(double ax, double ay, double az) {
   if (ax == 1.0 && ay == 0.0 && az == 0.0) return 0;
   if (ax == 0.0 && ay == 1.0 && az == 0.0) return 1;
   return ax == 0.0 && ay == 0.0 && az == 1.0 ? 2 : kNoAxis;
-}
-
-// Mixes the rows of the two other axes by the cosine and the sine, without another rounding. Nothing is 0
-// times a number here, so that an angle of 0 leaves the matrix as it is.
-void TurnAboutCoordinateAxis(TransformMatrix* matrix, int axis, double angle) {
-  if (angle == 0.0) return;
-  const double c = std::cos(angle);
-  const double s = std::sin(angle);
-  auto& first = matrix->m[(axis + 1) % kAxes];
-  auto& second = matrix->m[(axis + 2) % kAxes];
-  const Row j = Load(first);
-  const Row k = Load(second);
-  Store(Sum(Product(c, j), Product(-s, k)), first);
-  Store(Sum(Product(s, j), Product(c, k)), second);
 }
 
 // The rotation about a unit axis.
@@ -84,32 +51,21 @@ HostError MatrixSetIdentity(TransformMatrix* matrix) {
     return code;
   }
   if (matrix == nullptr) return HOST_ERR_UTILITY_NULL;
-  // By pairs, as the operations that follow load them: a pair that was stored in parts is waited for.
-  Store({Pair{1.0, 0.0}, Pair{0.0, 0.0}}, matrix->m[0]);
-  Store({Pair{0.0, 1.0}, Pair{0.0, 0.0}}, matrix->m[1]);
-  Store({Pair{0.0, 0.0}, Pair{1.0, 0.0}}, matrix->m[2]);
-  Store({Pair{0.0, 0.0}, Pair{0.0, 1.0}}, matrix->m[3]);
+  SetIdentity(matrix);
   return HOST_ERR_NONE;
 }
 
 HostError MatrixTranslate(TransformMatrix* matrix, double tx, double ty, double tz) {
   if (HostError code; hostutil::Rehearsed(HOST_UTILITY_MatrixTranslate, &code)) return code;
   if (matrix == nullptr) return HOST_ERR_UTILITY_NULL;
-  const double offset[kAxes] = {tx, ty, tz};
-  const Row last = Load(matrix->m[kAxes]);
-  for (int row = 0; row < kAxes; ++row) {
-    Store(Sum(Load(matrix->m[row]), Product(offset[row], last)), matrix->m[row]);
-  }
+  Translate(matrix, {tx, ty, tz});
   return HOST_ERR_NONE;
 }
 
 HostError MatrixScale(TransformMatrix* matrix, double sx, double sy, double sz) {
   if (HostError code; hostutil::Rehearsed(HOST_UTILITY_MatrixScale, &code)) return code;
   if (matrix == nullptr) return HOST_ERR_UTILITY_NULL;
-  const double factor[kAxes] = {sx, sy, sz};
-  for (int row = 0; row < kAxes; ++row) {
-    Store(Product(factor[row], Load(matrix->m[row])), matrix->m[row]);
-  }
+  Scale(matrix, {sx, sy, sz});
   return HOST_ERR_NONE;
 }
 

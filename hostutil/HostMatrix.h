@@ -47,6 +47,21 @@ HOSTUTIL_API HostError MatrixRotateAxis(TransformMatrix* matrix, double ax, doub
 HOSTUTIL_API HostError MatrixDecompose(const TransformMatrix* matrix, MatrixComponents* components,
                                        void* options);
 
+/* A transform as scenes hold it: scaled about one pivot, turned about another, then moved. */
+typedef struct PivotedTransform {
+  double scalePivot[3];
+  double scale[3];
+  double rotatePivot[3];
+  double rotation[3]; /* about X, then Y, then Z, in radians */
+  double translation[3];
+} PivotedTransform;
+
+/* Composes the transform and takes it apart. Does what these services do one after the other, to the last
+ * bit, and counts as their calls: MatrixSetIdentity; MatrixTranslate by -scalePivot; MatrixScale;
+ * MatrixTranslate by scalePivot and by -rotatePivot; MatrixRotateAxis about X, Y and Z; MatrixTranslate by
+ * rotatePivot and by translation; MatrixDecompose. Ends with the code of the first that fails. */
+HOSTUTIL_API HostError MatrixDecomposePivoted(const PivotedTransform* from, MatrixComponents* components);
+
 #ifdef __cplusplus
 }
 #endif

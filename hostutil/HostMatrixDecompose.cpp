@@ -6,6 +6,7 @@
 
 #include "hostapi/ErrorCodes.h"
 #include "hostutil/HostMatrix.h"
+#include "hostutil/HostMatrixInternal.h"
 #include "hostutil/RehearsalInternal.h"
 
 namespace {
@@ -51,19 +52,21 @@ inline double Normalise(Vector* v) {
   const double square = Dot(*v, *v);
   if (!(square > kSmallSquare && square < kLargeSquare)) return NormaliseExtreme(v);
   const double length = std::sqrt(square);
-  for (double& component : *v) component /= length;
+  const double inverse = 1.0 / length;
+  for (double& component : *v) component *= inverse;
   return length;
 }
 
 // An angle or coordinate of -0 becomes 0, so that it cannot choose between half a turn and minus half a turn.
 double WithoutNegativeZero(double value) { return value + 0.0; }
 
+// 0 times what is not finite is not a number, and so is every sum with it.
 bool IsFinite(const TransformMatrix& matrix) {
-  double zero = 0.0;  // 0 times what is not finite is not a number
+  hostutil::matrix::Row zero{};
   for (const auto& row : matrix.m) {
-    for (const double value : row) zero += 0.0 * value;
+    zero = hostutil::matrix::Sum(zero, hostutil::matrix::Product(0.0, hostutil::matrix::Load(row)));
   }
-  return zero == 0.0;
+  return zero.left[0] + zero.left[1] + zero.right[0] + zero.right[1] == 0.0;
 }
 
 // A direction at right angles to the only axis that is there, chosen so that the angles which that axis
@@ -127,8 +130,9 @@ void AnglesOf(const Basis& basis, double rotation[kAxes]) {
   const double cosineY = std::sqrt(x[0] * x[0] + x[1] * x[1]);
   const bool atPole = cosineY < kPoleCosine;
   const double angleZ = atPole ? 0.0 : std::atan2(WithoutNegativeZero(x[1]), WithoutNegativeZero(x[0]));
-  const double c = atPole ? 1.0 : x[0] / cosineY;
-  const double s = atPole ? 0.0 : x[1] / cosineY;
+  const double inverse = 1.0 / cosineY;
+  const double c = atPole ? 1.0 : x[0] * inverse;
+  const double s = atPole ? 0.0 : x[1] * inverse;
   rotation[0] =
       std::atan2(WithoutNegativeZero(s * z[0] - c * z[1]), WithoutNegativeZero(c * y[1] - s * y[0]));
   rotation[1] = std::atan2(WithoutNegativeZero(-x[2]), cosineY);
@@ -137,20 +141,17 @@ void AnglesOf(const Basis& basis, double rotation[kAxes]) {
 
 }  // namespace
 
-HostError MatrixDecompose(const TransformMatrix* matrix, MatrixComponents* components, void* /*options*/) {
-  if (HostError code; hostutil::Rehearsed(HOST_UTILITY_MatrixDecompose, &code)) {
-    hostutil::HandOutNothing(components);
-    return code;
+HostError hostutil::matrix::Decompose(const TransformMatrix& matrix, MatrixComponents* components) {
+  if (!IsFinite(matrix)) {
+    *components = MatrixComponents{};
+    return HOST_ERR_MATRIX_NOT_FINITE;
   }
-  if (components == nullptr) return HOST_ERR_UTILITY_NULL;
-  *components = MatrixComponents{};
-  if (matrix == nullptr) return HOST_ERR_UTILITY_NULL;
-  if (!IsFinite(*matrix)) return HOST_ERR_MATRIX_NOT_FINITE;
   Basis basis;
   for (std::size_t axis = 0; axis < kAxes; ++axis) {
-    for (std::size_t row = 0; row < kAxes; ++row) basis[axis][row] = matrix->m[row][axis];
+    for (std::size_t row = 0; row < kAxes; ++row) basis[axis][row] = matrix.m[row][axis];
     components->scale[axis] = Normalise(&basis[axis]);
-    components->translation[axis] = matrix->m[axis][kAxes];
+    components->translation[axis] = matrix.m[axis][kAxes];
+    components->shear[axis] = 0.0;
   }
   if (Dot(basis[0], Cross(basis[1], basis[2])) < 0.0) {
     components->scale[0] = -components->scale[0];
@@ -159,4 +160,17 @@ HostError MatrixDecompose(const TransformMatrix* matrix, MatrixComponents* compo
   Complete(&basis);
   AnglesOf(basis, components->rotation);
   return HOST_ERR_NONE;
+}
+
+HostError MatrixDecompose(const TransformMatrix* matrix, MatrixComponents* components, void* /*options*/) {
+  if (HostError code; hostutil::Rehearsed(HOST_UTILITY_MatrixDecompose, &code)) {
+    hostutil::HandOutNothing(components);
+    return code;
+  }
+  if (components == nullptr) return HOST_ERR_UTILITY_NULL;
+  if (matrix == nullptr) {
+    *components = MatrixComponents{};
+    return HOST_ERR_UTILITY_NULL;
+  }
+  return hostutil::matrix::Decompose(*matrix, components);
 }

@@ -126,8 +126,9 @@ void RecordListReserve(RecordList* list, int64_t count) {
   if (count <= MostRecords(list->recordSize) - list->count) SetCapacity(list, list->count + count);
 }
 
-HostError RecordListGet(const RecordList* list, int64_t index, void* record) {
-  if (HostError code; hostutil::Rehearsed(HOST_UTILITY_ListGet, &code)) return code;
+namespace {
+
+HostError CopyRecord(const RecordList* list, int64_t index, void* record) {
   if (!IsList(list) || record == nullptr) return HOST_ERR_UTILITY_NULL;
   if (!list->Holds(index)) return HOST_ERR_LIST_INDEX;
   if (list->recordSize == kKeySize) [[likely]] {
@@ -136,6 +137,19 @@ HostError RecordListGet(const RecordList* list, int64_t index, void* record) {
     std::memcpy(record, list->At(index), static_cast<std::size_t>(list->recordSize));
   }
   return HOST_ERR_NONE;
+}
+
+[[gnu::noinline]] HostError GetInRehearsal(const RecordList* list, int64_t index, void* record) {
+  HostError code = HOST_ERR_NONE;
+  return hostutil::IsPlannedToFail(HOST_UTILITY_ListGet, &code) ? code : CopyRecord(list, index, record);
+}
+
+}  // namespace
+
+HostError RecordListGet(const RecordList* list, int64_t index, void* record) {
+  if (hostutil::MayBePlanned(HOST_UTILITY_ListGet)) [[unlikely]]
+    return GetInRehearsal(list, index, record);
+  return CopyRecord(list, index, record);
 }
 
 HostError RecordListLock(RecordList* list, int64_t index, void** record) {

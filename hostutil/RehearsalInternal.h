@@ -24,6 +24,14 @@ inline bool Rehearsed(int32_t service, HostError* code) {
   return failuresPlanned && IsPlannedToFail(service, code);
 }
 
+// The same in two steps, for the services that are called most: whether the call, which is counted, is to be
+// asked for with IsPlannedToFail. They do that apart from their work, which then needs no stack.
+inline bool MayBePlanned(int32_t service) {
+  if (!rehearsalRunning) return false;
+  ++callCounts[static_cast<std::size_t>(service)];
+  return failuresPlanned;
+}
+
 // For a service that does the work of many calls at once: it may not where a failure is planned, so that the
 // calls are then made one by one; else it counts them all.
 inline bool MayWorkInBulk() { return !rehearsalRunning || !failuresPlanned; }

@@ -18,9 +18,7 @@
 #include "maya/SceneRecords.h"
 #include "maya/SceneUnits.h"
 
-struct HostPoint;
 struct NodeChannels;
-struct NodePivots;
 
 class MAYA_Parse : public MAYA_Lex {
  public:
@@ -271,10 +269,11 @@ class MAYA_Parse : public MAYA_Lex {
   void SetUnguarded(VOR_Layer* layer, std::int32_t streamId, double x);
 
   // comp/MAYA_Parse_Transform.cpp
-  HostPoint ConvertPoint(const double* point) const;
-  NodePivots ConvertPivots(const MAYA_Transform& node) const;
+  void ConvertPoint(const double* point, double (&host)[kAxisCount]) const;
+  PivotedTransform ConvertPivots(const MAYA_Transform& node) const;
   static void CopyChannels(const MAYA_Transform& node, double (&values)[kChannelCount]);
-  MatrixComponents DecomposeTransform(const NodePivots& pivots, const double (&values)[kChannelCount]) const;
+  MatrixComponents DecomposeTransform(PivotedTransform* transform,
+                                      const double (&values)[kChannelCount]) const;
 
   // comp/MAYA_Parse_Sampling.cpp
   NodeChannels VerifyChannels(const MAYA_Transform& node);

@@ -46,7 +46,9 @@ struct Batch {
   }
   void addValueInRoom(const double* value) {
     double* const next = values.next();
-    for (std::size_t i = 0; i < kMostDimensions; ++i) next[i] = value[i];
+    next[0] = value[0];
+    next[1] = value[1];
+    next[2] = value[2];
     values.advance(static_cast<std::size_t>(stream->dimension));
     ++nextValued;
   }
