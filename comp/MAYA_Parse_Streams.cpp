@@ -63,16 +63,6 @@ void MAYA_Parse::InsertKeyframe(VOR_AddKeyframesInfo* batch, VOR_Layer* layer, s
   });
 }
 
-void MAYA_Parse::InsertOneDKeyframe(VOR_AddKeyframesInfo* batch, VOR_Layer* layer, std::int32_t streamId,
-                                    const T_Time* time, double value) {
-  InsertKeyframe(batch, layer, streamId, time, value, 0.0, 0.0);
-}
-
-void MAYA_Parse::InsertThreeDKeyframe(VOR_AddKeyframesInfo* batch, VOR_Layer* layer, std::int32_t streamId,
-                                      const T_Time* time, double x, double y, double z) {
-  InsertKeyframe(batch, layer, streamId, time, x, y, z);
-}
-
 void MAYA_Parse::EndAddingKeyframes(VOR_AddKeyframesInfo* batch) {
   constexpr std::int32_t kCommit = 1;
   KeyframeSuite3().EndKeyframeBatch(kCommit, batch);

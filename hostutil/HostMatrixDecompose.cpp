@@ -150,7 +150,7 @@ HostError hostutil::matrix::Decompose(const TransformMatrix& matrix, MatrixCompo
   for (std::size_t axis = 0; axis < kAxes; ++axis) {
     for (std::size_t row = 0; row < kAxes; ++row) basis[axis][row] = matrix.m[row][axis];
     components->scale[axis] = Normalise(&basis[axis]);
-    components->translation[axis] = matrix.m[axis][kAxes];
+    components->translation[axis] = WithoutNegativeZero(matrix.m[axis][kAxes]);
     components->shear[axis] = 0.0;
   }
   if (Dot(basis[0], Cross(basis[1], basis[2])) < 0.0) {

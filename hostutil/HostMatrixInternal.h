@@ -42,6 +42,7 @@ inline void SetIdentity(TransformMatrix* matrix) {
 }
 
 inline void Translate(TransformMatrix* matrix, const Triple& by) {
+  if (by.x == 0.0 && by.y == 0.0 && by.z == 0.0) return;  // as nearly every pivot is
   const Row last = Load(matrix->m[kAxes]);
   Store(Sum(Load(matrix->m[0]), Product(by.x, last)), matrix->m[0]);
   Store(Sum(Load(matrix->m[1]), Product(by.y, last)), matrix->m[1]);

@@ -157,9 +157,13 @@ class MAYA_Parse : public MAYA_Lex {
   void SetThreeDStream(VOR_Layer* layer, std::int32_t streamId, double x, double y, double z);
   void StartAddingKeyframes(VOR_Layer* layer, std::int32_t streamId, VOR_AddKeyframesInfo** batch);
   void InsertOneDKeyframe(VOR_AddKeyframesInfo* batch, VOR_Layer* layer, std::int32_t streamId,
-                          const T_Time* time, double value);
+                          const T_Time* time, double value) {
+    InsertKeyframe(batch, layer, streamId, time, value, 0.0, 0.0);
+  }
   void InsertThreeDKeyframe(VOR_AddKeyframesInfo* batch, VOR_Layer* layer, std::int32_t streamId,
-                            const T_Time* time, double x, double y, double z);
+                            const T_Time* time, double x, double y, double z) {
+    InsertKeyframe(batch, layer, streamId, time, x, y, z);
+  }
 
   // Commits the batch. A code of the host's is ignored.
   void EndAddingKeyframes(VOR_AddKeyframesInfo* batch);

@@ -85,11 +85,13 @@ VOR_Item* HostState::begin(Callback which, const std::string& path) {
     trace.writeBracket(line);
   }
   rehearsal.begin(which);
+  watched_ = rehearsal.watches() || trace.on();
   return folderHandle;
 }
 
 CallbackResult HostState::end(HostError code, bool canImport) {
   rehearsal.end();
+  watched_ = trace.on();
   if (trace.on()) {
     TraceLine line(codec, "leave", true);
     line.text("callback", callbackName(callback));

@@ -66,8 +66,8 @@ class HostState {
   // canImport is written to the trace for verify only.
   CallbackResult end(HostError code, bool canImport);
 
-  // Whether a call may be rehearsed or has to be told.
-  bool watched() const { return rehearsal.watches() || trace.on(); }
+  // Whether a call may be rehearsed or has to be told. Settled where a callback begins and ends.
+  bool watched() const { return watched_; }
 
   void refuse(std::string sentence) { result.refusals.push_back(std::move(sentence)); }
 
@@ -102,6 +102,8 @@ class HostState {
   bool silenceEndFailed = false;  // a rehearsal made an EndSilentErrors of this callback fail
 
  private:
+  bool watched_ = trace.on();
+
   static HostState* live_;
 };
 
