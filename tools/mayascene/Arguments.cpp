@@ -100,6 +100,24 @@ void addHostOptions(CLI::App* verb, HostArguments* host, Words* words) {
       ->group(group);
 }
 
+// The defaults that the texts name are those of refhost::HostOptions.
+void addCeilings(CLI::App* verb, HostArguments* host) {
+  constexpr const char* group = "Ceilings";
+  verb->add_option("--most-layers", host->mostLayers, "layers that the project takes (2000000)")
+      ->option_text("N")
+      ->check(CLI::NonNegativeNumber)
+      ->group(group);
+  verb->add_option("--most-keys", host->mostKeys, "keys that the project takes (100000000)")
+      ->option_text("N")
+      ->check(CLI::NonNegativeNumber)
+      ->group(group);
+  verb->add_option("--most-memory", host->mostMemory,
+                   "bytes that the importer is given at one time (4294967296)")
+      ->option_text("N")
+      ->check(CLI::NonNegativeNumber)
+      ->group(group);
+}
+
 void translateWords(const Words& words, HostArguments* host) {
   parseEach<refhost::Failure>("--fail", words.fail, refhost::parseFail, &host->failures);
   parseEach<refhost::Failure>("--fail-at", words.failAt, refhost::parseFailAt, &host->failures);
@@ -194,6 +212,7 @@ struct CommandLine {
         ->option_text("FILE");
     importVerb->add_flag("-q,--quiet", import.quiet, "print nothing but errors");
     addHostOptions(importVerb, &import.host, &importWords);
+    addCeilings(importVerb, &import.host);
   }
 
   void addVerify() {
