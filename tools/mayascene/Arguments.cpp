@@ -18,6 +18,7 @@ namespace mayascene {
 namespace {
 
 constexpr std::int32_t kMostZoomKeys = 1'000'000;
+constexpr std::int64_t kMostMemory = INT64_MAX - 1;  // a number that is too large is read as the largest one
 constexpr std::size_t kNameColumn = 36;
 
 constexpr const char* kFooter =
@@ -114,7 +115,7 @@ void addCeilings(CLI::App* verb, HostArguments* host) {
   verb->add_option("--most-memory", host->mostMemory,
                    "bytes that the importer is given at one time (4294967296)")
       ->option_text("N")
-      ->check(CLI::NonNegativeNumber)
+      ->check(CLI::Range(std::int64_t{0}, kMostMemory))
       ->group(group);
 }
 
