@@ -1,4 +1,6 @@
 // "QZGP Comp Suite" 21 and 9: compositions and the layers made in them.
+#include <algorithm>
+#include <cstdint>
 #include <string>
 
 #include "refhost/Call.h"
@@ -99,25 +101,32 @@ VOR_Layer* handleOf(Call& call, const Layer& layer) {
       call.host().codec.lasting(HandleKind::Layer, static_cast<std::size_t>(layer.number)));
 }
 
+void newCameraLayer(Call& call, const char* name, VOR_CompItem* comp, const double (&center)[2],
+                    VOR_Layer** layer) {
+  HostState& host = call.host();
+  const std::int32_t zoomKeys = std::max(host.options.zoomKeys, 0);
+  Composition* found = call.composition(comp);
+  if (found == nullptr || !call.given(name, "the name") || !call.given(layer, "the place for the layer") ||
+      !call.areFinite(center, 2, "the centre") || !takesLayer(call, zoomKeys)) {
+    return;
+  }
+  double interest[2] = {center[0], center[1]};
+  if (center[0] == HOST_CAMERA_CENTER_ANYWHERE && center[1] == HOST_CAMERA_CENTER_ANYWHERE) {
+    interest[0] = found->width / 2.0;
+    interest[1] = found->height / 2.0;
+  }
+  *layer = handleOf(call, host.editor.addCameraLayer(*found, name, interest, zoomKeys));
+  --host.allowance.layers;
+  host.allowance.keys -= zoomKeys;
+}
+
 HostError NewCameraLayer(const char* name, VOR_CompItem* comp, double centerX, double centerY,
                          VOR_Layer** layer) {
   Call call(Operation::NewCameraLayer);
-  if (call.goesOn(layer)) {
-    double center[2] = {centerX, centerY};
-    Composition* found = call.composition(comp);
-    if (found != nullptr && call.given(name, "the name") && call.given(layer, "the place for the layer") &&
-        call.areFinite(center, 2, "the centre")) {
-      if (centerX == HOST_CAMERA_CENTER_ANYWHERE && centerY == HOST_CAMERA_CENTER_ANYWHERE) {
-        center[0] = found->width / 2.0;
-        center[1] = found->height / 2.0;
-      }
-      *layer = handleOf(
-          call, call.host().editor.addCameraLayer(*found, name, center, call.host().options.zoomKeys));
-    }
-  }
+  const double center[2] = {centerX, centerY};
+  if (call.goesOn(layer)) newCameraLayer(call, name, comp, center, layer);
   if (TraceLine* line = call.traced()) {
-    const double given[2] = {centerX, centerY};
-    line->text("name", name).handle("comp", comp).numbers("center", given, 2).handed("layer", layer);
+    line->text("name", name).handle("comp", comp).numbers("center", center, 2).handed("layer", layer);
   }
   return call.finish();
 }
@@ -138,7 +147,9 @@ void newNullLayer(Call& call, const char* name, VOR_CompItem* comp, const T_Time
     call.refuse(HOST_ERR_BAD_TIME, "a time of " + shown(*time) + " is no length");
     return;
   }
+  if (!takesLayer(call, 0)) return;
   *layer = handleOf(call, call.host().editor.addNullLayer(*found, name));
+  --call.host().allowance.layers;
 }
 
 HostError NewNullLayer(const char* name, VOR_CompItem* comp, const T_Time* time, VOR_Layer** layer) {

@@ -49,6 +49,7 @@ HostState* HostState::live_ = nullptr;
 HostState::HostState(HostOptions given)
     : options(admit(std::move(given), live_)),
       codec(nextHostSerial()),
+      allowance(options),
       rehearsal(options),
       trace(options.trace),
       preferences(options.preferences) {

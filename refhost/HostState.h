@@ -11,6 +11,7 @@
 #include "hostapi/FileImportManagerSuite.h"
 #include "hostapi/HostTypes.h"
 #include "hostapi/RegisterSuite.h"
+#include "refhost/Ceilings.h"
 #include "refhost/Handles.h"
 #include "refhost/Host.h"
 #include "refhost/MessageBoard.h"
@@ -77,6 +78,7 @@ class HostState {
   const HostOptions options;
   const HandleCodec codec;
   ProjectEditor editor;
+  Allowance allowance;
   HandlePool<HeldStream> streams{codec, HandleKind::Stream};
   HandlePool<Batch> batches{codec, HandleKind::Batch};
   HandlePool<MemoryBlock> memory{codec, HandleKind::Memory};

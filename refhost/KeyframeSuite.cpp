@@ -64,10 +64,6 @@ HostError BeginKeyframeBatch(VOR_Stream* stream, VOR_AddKeyframesInfo** batch) {
   call.refuse(HOST_ERR_BAD_TIME, "a key time of " + std::to_string(time.value) + "/0 has scale 0");
 }
 
-[[gnu::cold, gnu::noinline]] void refuseMoreKeys(Call& call) {
-  call.refuse(HOST_ERR_MEMORY, "the batch is full");
-}
-
 [[gnu::cold, gnu::noinline]] void refuseOtherStream(Call& call, VOR_AddKeyframesInfo* batch,
                                                     VOR_Stream* stream) {
   const HandleCodec& codec = call.host().codec;
@@ -87,10 +83,10 @@ void addBatchKeyframe(Call& call, VOR_AddKeyframesInfo* batch, std::int32_t time
     return;
   if (timeMode != HOST_TIME_MODE_COMP) return refuseTimeMode(call, timeMode);
   if (time->scale == 0 && !call.host().options.permissive) return refuseTime(call, *time);
-  const std::size_t count = open->times.size();
-  if (count >= kMostKeys) return refuseMoreKeys(call);
-  *index = static_cast<std::int32_t>(count);
+  if (call.host().allowance.keys == 0) return refuseKey(call);
+  *index = static_cast<std::int32_t>(open->times.size());
   open->addKey(*time);
+  --call.host().allowance.keys;
 }
 
 [[gnu::noinline]] HostError addBatchKeyframeWatched(VOR_AddKeyframesInfo* batch, std::int32_t timeMode,
@@ -111,11 +107,11 @@ HostError AddBatchKeyframe(VOR_AddKeyframesInfo* batch, std::int32_t timeMode, c
   HostState& host = HostState::live();
   Batch* const open = host.batches.find(batch);
   if (!host.watched() && open != nullptr && timeMode == HOST_TIME_MODE_COMP && time != nullptr &&
-      time->scale != 0 && index != nullptr && open->times.size() < kMostKeys && open->hasRoomForKey())
-      [[likely]] {
+      time->scale != 0 && index != nullptr && host.allowance.keys != 0 && open->hasRoomForKey()) [[likely]] {
     host.rehearsal.count(Operation::AddBatchKeyframe);
     *index = static_cast<std::int32_t>(open->times.size());
     open->addKeyInRoom(*time);
+    --host.allowance.keys;
     return 0;
   }
   return addBatchKeyframeWatched(batch, timeMode, time, index);
@@ -163,11 +159,18 @@ HostError SetBatchKeyframeValue(VOR_AddKeyframesInfo* batch, std::int32_t index,
   return setBatchKeyframeValueWatched(batch, index, value);
 }
 
+// Keys that the stream does not keep are no longer the host's.
+void endBatch(HostState& host, Batch& batch, bool commit) {
+  const std::size_t held = batch.stream->keyCount() + batch.times.size();
+  if (commit) ProjectEditor::commit(batch);
+  host.allowance.keys += static_cast<std::int64_t>(held - batch.stream->keyCount());
+}
+
 HostError EndKeyframeBatch(std::int32_t commit, VOR_AddKeyframesInfo* batch) {
   Call call(Operation::EndKeyframeBatch);
   if (call.goesOn()) {
     if (Batch* open = call.batch(batch)) {
-      if (commit != 0) ProjectEditor::commit(*open);
+      endBatch(call.host(), *open, commit != 0);
       call.host().batches.remove(batch);
     }
   } else if (Batch* open = call.host().batches.find(batch)) {

@@ -83,6 +83,10 @@ std::vector<Leftover> drawLedger(HostState& host) {
 
 void releaseLeftovers(HostState& host) {
   host.suites.giveAllBack();
+  for (const auto& held : host.batches.held()) {
+    host.allowance.keys += static_cast<std::int64_t>(held.second->times.size());
+  }
+  for (const auto& held : host.memory.held()) host.allowance.memory += held.second->size;
   host.batches.removeAll();
   host.streams.removeAll();
   host.memory.removeAll();

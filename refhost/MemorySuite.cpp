@@ -12,14 +12,11 @@
 namespace refhost {
 namespace {
 
-// Twice what the largest file takes. What is larger is refused without asking the system, which may promise
-// memory that it does not have.
-constexpr std::uint64_t kLargestBlock = std::uint64_t{1} << 32;
 constexpr std::int32_t kNoFlags = 0;
 
 void* allocate(std::int64_t size) {
   const std::uint64_t bytes = static_cast<std::uint64_t>(size);
-  if (bytes > kLargestBlock || bytes > SIZE_MAX) return nullptr;
+  if (bytes > SIZE_MAX) return nullptr;
   void* memory = ::operator new(static_cast<std::size_t>(bytes), std::nothrow);
   HostAdviseLargePages(memory, size);
   return memory;
@@ -33,6 +30,7 @@ void newMemHandle(Call& call, const char* name, std::int64_t size, std::int32_t 
                 "a size of " + std::to_string(size) + " with flags " + std::to_string(flags));
     return;
   }
+  if (!takesMemory(call, size)) return;
   MemoryBlock block;
   block.name = name;
   block.size = size;
@@ -44,6 +42,7 @@ void newMemHandle(Call& call, const char* name, std::int64_t size, std::int32_t 
     return;
   }
   *held = std::move(block);
+  call.host().allowance.memory -= size;
   *handle = static_cast<HostMemHandle*>(made);
 }
 
@@ -61,7 +60,10 @@ HostError NewMemHandle(std::int32_t pluginId, const char* name, std::int64_t siz
 HostError FreeMemHandle(HostMemHandle* handle) {
   Call call(Operation::FreeMemHandle);
   if (call.goesOn()) {
-    if (call.memory(handle) != nullptr) call.host().memory.remove(handle);
+    if (const MemoryBlock* block = call.memory(handle)) {
+      call.host().allowance.memory += block->size;
+      call.host().memory.remove(handle);
+    }
   } else if (MemoryBlock* block = call.host().memory.find(handle)) {
     block->freeFailed = true;
   }

@@ -132,42 +132,53 @@ HeldByImport HeldAfter(const std::vector<std::string>& trace, std::size_t count,
   return held;
 }
 
-bool IsCodeIgnored(const std::vector<std::string>& trace, std::size_t index) {
-  const std::string call = CallName(trace[index]);
-  if (call == "ReleaseStream") {
-    return !HeldAfter(trace, index, false).IsUnguarded(Field(trace[index], "stream"));
-  }
+bool IsCodeIgnored(std::string_view line, const HeldByImport& before) {
+  const std::string call = CallName(line);
+  if (call == "ReleaseStream") return !before.IsUnguarded(Field(line, "stream"));
   return call == "ReleaseSuiteByName" || call == "ShowMessage" || call == "EndKeyframeBatch" ||
          call == "UnlockMemHandle" || call == "FreeMemHandle";
 }
 
-Made MadeBy(const std::vector<std::string>& trace, std::size_t idle) {
-  Made made;
-  std::multiset<std::string> held;
-  std::map<std::string, std::set<std::string>> batches;
-  const auto giveBack = [&held](const std::string& what) {
-    if (const auto found = held.find(what); found != held.end()) held.erase(found);
-  };
-  for (std::size_t i = 0; i < trace.size(); ++i) {
-    const std::string& line = trace[i];
-    if (i == idle || !Succeeded(line)) continue;
-    const std::string call = CallName(line);
-    const std::string batch(Field(line, "batch"));
-    if (call == "CreateComp") ++made.compositions;
-    if (call == "NewCameraLayer" || call == "NewNullLayer" || call == "AddLayerFromItem") ++made.layers;
-    if (call == "SetBatchKeyframeValue") batches[batch].emplace(Field(line, "index"));
-    if (call == "EndKeyframeBatch") made.keys += batches[batch].size();
-    if (call == "AcquireSuite") held.insert(SuiteKey(line));
-    if (call == "ReleaseSuiteByName") giveBack(SuiteKey(line));
-    if (call == "AcquireLayerStream") held.emplace(Field(line, "stream"));
-    if (call == "ReleaseStream") giveBack(std::string(Field(line, "stream")));
-    if (call == "BeginKeyframeBatch") held.insert(batch);
-    if (call == "EndKeyframeBatch") giveBack(batch);
-    if (call == "NewMemHandle") held.emplace(Field(line, "handle"));
-    if (call == "FreeMemHandle") giveBack(std::string(Field(line, "handle")));
+bool IsCodeIgnored(const std::vector<std::string>& trace, std::size_t index) {
+  return IsCodeIgnored(trace[index], HeldAfter(trace, index, false));
+}
+
+CallFacts::CallFacts(std::string_view line) : call(CallName(line)), batch(Field(line, "batch")) {
+  if (call == "AcquireSuite" || call == "ReleaseSuiteByName") held = SuiteKey(line);
+  if (call == "AcquireLayerStream" || call == "ReleaseStream") held = Field(line, "stream");
+  if (call == "BeginKeyframeBatch" || call == "EndKeyframeBatch") held = batch;
+  if (call == "NewMemHandle" || call == "FreeMemHandle") held = Field(line, "handle");
+  if (call == "SetBatchKeyframeValue") index = Field(line, "index");
+}
+
+void MadeCount::Take(const CallFacts& facts) {
+  const std::string& call = facts.call;
+  if (call == "CreateComp") ++made_.compositions;
+  if (call == "NewCameraLayer" || call == "NewNullLayer" || call == "AddLayerFromItem") ++made_.layers;
+  if (call == "SetBatchKeyframeValue") keyed_[facts.batch].insert(facts.index);
+  if (call == "EndKeyframeBatch") made_.keys += keyed_[facts.batch].size();
+  if (facts.held.empty()) return;
+  const bool takes = call == "AcquireSuite" || call == "AcquireLayerStream" || call == "BeginKeyframeBatch" ||
+                     call == "NewMemHandle";
+  if (takes) {
+    held_.insert(facts.held);
+  } else if (const auto found = held_.find(facts.held); found != held_.end()) {
+    held_.erase(found);
   }
-  made.leftovers = std::set<std::string>(held.begin(), held.end()).size();
+}
+
+Made MadeCount::made() const {
+  Made made = made_;
+  made.leftovers = std::set<std::string>(held_.begin(), held_.end()).size();
   return made;
+}
+
+Made MadeBy(const std::vector<std::string>& trace, std::size_t idle) {
+  MadeCount count;
+  for (std::size_t i = 0; i < trace.size(); ++i) {
+    if (i != idle && Succeeded(trace[i])) count.Take(CallFacts(trace[i]));
+  }
+  return count.made();
 }
 
 }  // namespace testsupport

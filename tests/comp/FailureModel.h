@@ -69,15 +69,41 @@ class HeldByImport {
 HeldByImport HeldAfter(const std::vector<std::string>& trace, std::size_t count, bool lastFailed);
 
 // Whether a code that the call gives back changes nothing.
+bool IsCodeIgnored(std::string_view line, const HeldByImport& before);
 bool IsCodeIgnored(const std::vector<std::string>& trace, std::size_t index);
 
-// What a trace says that the host has made, but for the call `idle` (from 0), which did nothing.
 struct Made {
   std::size_t compositions = 0;
   std::size_t layers = 0;
   std::size_t keys = 0;
   std::size_t leftovers = 0;  // on the ledger, but for the file object
+
+  bool operator==(const Made&) const = default;
 };
+
+// A line of a trace, as far as it tells what was made and what is held.
+struct CallFacts {
+  explicit CallFacts(std::string_view line);
+
+  std::string call;
+  std::string batch;
+  std::string held;   // the suite, stream, batch or memory that it takes or gives back
+  std::string index;  // of a key
+};
+
+// Counts what succeeding calls make and hold.
+class MadeCount {
+ public:
+  void Take(const CallFacts& call);
+  Made made() const;
+
+ private:
+  Made made_;
+  std::multiset<std::string> held_;
+  std::map<std::string, std::set<std::string>> keyed_;  // indices of the keys with a value, by batch
+};
+
+// What a trace says that the host has made, but for the call `idle` (from 0), which did nothing.
 inline constexpr std::size_t kNoCall = static_cast<std::size_t>(-1);
 Made MadeBy(const std::vector<std::string>& trace, std::size_t idle = kNoCall);
 

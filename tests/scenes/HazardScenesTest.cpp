@@ -131,6 +131,21 @@ TEST_F(HazardScenes, AThousandParentsAboveEachOfAThousandLocatorsAllBecomeNulls)
   EXPECT_EQ(tops, 1000u);
 }
 
+TEST_F(HazardScenes, ParentsWithoutEndAreRefusedAtTheCeilingAndTheNullsBeforeStay) {
+  constexpr std::int32_t kMost = 5000;
+  refhost::HostOptions options;
+  options.mostLayers = kMost;
+  ImportedScene scene(sharedFolder("hazards") / "q_chain_1000.ma", options);
+  ASSERT_TRUE(scene.loaded());
+  EXPECT_EQ(scene.result().code, HOST_ERR_TOO_MANY_LAYERS);
+  EXPECT_THAT(scene.result().refusals,
+              testing::ElementsAre("NewNullLayer: the host takes no more than 5000 layers"));
+  EXPECT_THAT(scene.result().messages, IsEmpty());
+  EXPECT_TRUE(scene.result().ledgerClean());
+  EXPECT_EQ(scene.project().layers().size(), std::size_t{kMost});
+  EXPECT_EQ(scene.layers(LayerKind::Camera), 1u);
+}
+
 TEST_F(HazardScenes, AreAllKnown) {
   std::set<std::string> known = {"q_chain_1000"}, there;
   for (const Hazard& hazard : hazards()) known.insert(hazard.name);

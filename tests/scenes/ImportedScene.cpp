@@ -1,6 +1,7 @@
 #include "tests/scenes/ImportedScene.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace scenes {
 
@@ -8,11 +9,14 @@ std::filesystem::path sharedFolder(const char* folder) {
   return std::filesystem::path(MAYASCENE_SOURCE_DIR) / ".." / "shared" / folder;
 }
 
-ImportedScene::ImportedScene(const std::filesystem::path& path, bool linearUnits) {
-  refhost::HostOptions options;
+ImportedScene::ImportedScene(const std::filesystem::path& path, bool linearUnits)
+    : ImportedScene(path, refhost::HostOptions(), linearUnits) {}
+
+ImportedScene::ImportedScene(const std::filesystem::path& path, refhost::HostOptions options,
+                             bool linearUnits) {
   options.module = MAYASCENE_MODULE;
   options.linearUnits = linearUnits ? 1 : 0;
-  host_ = std::make_unique<refhost::Host>(options);
+  host_ = std::make_unique<refhost::Host>(std::move(options));
   std::string failure;
   loaded_ = host_->load(&loadResult_, &failure) && loadResult_.code == 0;
   if (loaded_) result_ = host_->importScene(path);

@@ -16,6 +16,8 @@ std::filesystem::path sharedFolder(const char* folder);
 class ImportedScene {
  public:
   explicit ImportedScene(const std::filesystem::path& path, bool linearUnits = false);
+  // The options' module and units are the scene's own.
+  ImportedScene(const std::filesystem::path& path, refhost::HostOptions options, bool linearUnits = false);
 
   // False when the module could not be loaded; then nothing else may be asked.
   bool loaded() const { return loaded_; }

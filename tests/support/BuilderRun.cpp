@@ -11,7 +11,7 @@
 namespace testsupport {
 namespace {
 
-ImportRun Import(const TemporaryFile& file, refhost::HostOptions options, bool traced) {
+ImportRun Import(const std::filesystem::path& scene, refhost::HostOptions options, bool traced) {
   ImportRun run;
   run.written = std::make_unique<std::ostringstream>();
   if (traced) options.trace = run.written.get();
@@ -21,7 +21,7 @@ ImportRun Import(const TemporaryFile& file, refhost::HostOptions options, bool t
     throw std::runtime_error("the importer's entry failed");
   }
   run.written->str("");
-  run.result = run.host->importScene(file.path());
+  run.result = run.host->importScene(scene);
   if (!traced) return run;
   run.trace = LinesOf(run.written->str());
   if (run.trace.size() < 2) throw std::runtime_error("the trace has no bracket");
@@ -56,16 +56,20 @@ std::size_t EndOfValue(std::string_view line, std::size_t at) {
 TemporaryFile::TemporaryFile(std::string_view text, std::string_view name)
     : path_(folder_.write(name, text)) {}
 
+ImportRun ImportPath(const std::filesystem::path& scene, refhost::HostOptions options) {
+  return Import(scene, std::move(options), true);
+}
+
 ImportRun ImportFile(const TemporaryFile& file, refhost::HostOptions options) {
-  return Import(file, std::move(options), true);
+  return Import(file.path(), std::move(options), true);
 }
 
 ImportRun ImportText(std::string_view text, refhost::HostOptions options) {
-  return Import(TemporaryFile(text), std::move(options), true);
+  return Import(TemporaryFile(text).path(), std::move(options), true);
 }
 
 ImportRun ImportUntraced(const TemporaryFile& file, refhost::HostOptions options) {
-  return Import(file, std::move(options), false);
+  return Import(file.path(), std::move(options), false);
 }
 
 std::vector<std::string> LinesOf(const std::string& text) {

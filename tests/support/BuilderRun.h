@@ -33,6 +33,7 @@ struct ImportRun {
   std::vector<std::string> trace;  // the suite calls of the import, without the lines around them
 };
 
+ImportRun ImportPath(const std::filesystem::path& scene, refhost::HostOptions options = {});
 ImportRun ImportFile(const TemporaryFile& file, refhost::HostOptions options = {});
 ImportRun ImportText(std::string_view text, refhost::HostOptions options = {});
 

@@ -42,6 +42,7 @@ TEST(Arguments, ImportTakesAnyNumberOfScenesAndNothingElseByDefault) {
   EXPECT_EQ(import.scenes, (Words{"a.ma", "b.ma", "verify"}));
   EXPECT_EQ(import.json + import.host.trace + import.host.module + import.host.preferences, "");
   EXPECT_FALSE(import.quiet || import.host.permissive || import.host.linearUnits || import.host.during);
+  EXPECT_FALSE(import.host.mostLayers || import.host.mostKeys || import.host.mostMemory);
   EXPECT_EQ(import.host.pluginId, 1);
   EXPECT_EQ(import.host.zoomKeys, 0);
 }
@@ -66,6 +67,12 @@ TEST(Arguments, EveryOptionReachesItsPlace) {
                                 "--zoom-keys",
                                 "3",
                                 "--permissive",
+                                "--most-layers",
+                                "11",
+                                "--most-keys",
+                                "12",
+                                "--most-memory",
+                                "13000000000",
                                 "--during",
                                 "death",
                                 "--fail",
@@ -89,6 +96,9 @@ TEST(Arguments, EveryOptionReachesItsPlace) {
   EXPECT_EQ(host.linearUnits, 1);
   EXPECT_EQ(host.zoomKeys, 3);
   EXPECT_TRUE(host.permissive);
+  EXPECT_EQ(host.mostLayers, 11);
+  EXPECT_EQ(host.mostKeys, 12);
+  EXPECT_EQ(host.mostMemory, 13'000'000'000);
   EXPECT_EQ(host.during, refhost::Callback::Death);
   ASSERT_EQ(host.failures.size(), 4u);
   EXPECT_EQ(host.failures[0].operation, "ShowMessage");

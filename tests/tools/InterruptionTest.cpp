@@ -7,6 +7,7 @@
 #include <chrono>
 #include <string>
 #include <thread>
+#include <vector>
 
 #include "tests/tools/ToolRun.h"
 
@@ -17,15 +18,26 @@ using namespace std::chrono_literals;
 
 class Interruption : public ToolTest {
  protected:
-  // Starts an import that takes a while and interrupts it once its output has been begun.
-  ToolResult interrupted(int signal) {
-    write("out.json", "before");
+  Interruption() {
     std::string many = sceneText("");
     for (int i = 0; i < 30'000; ++i) many += "createNode camera -n \"cam" + std::to_string(i) + "\";\n";
     write("many.ma", many);
+  }
+
+  // Starts an import that takes a while and interrupts it once its output has been begun.
+  ToolResult interrupted(int signal) {
+    write("out.json", "before");
     const int process = start({"import", "--quiet", "--json", "out.json", "many.ma"});
     for (int tries = 0; files().size() < 3 && tries < 10'000; ++tries) std::this_thread::sleep_for(1ms);
     ::kill(process, signal);
+    return end(process);
+  }
+
+  // The same once there is something in a file.
+  ToolResult interruptedWhenThereIs(const std::string& name, std::vector<std::string> arguments) {
+    const int process = start(arguments);
+    for (int tries = 0; read(name).empty() && tries < 10'000; ++tries) std::this_thread::sleep_for(1ms);
+    ::kill(process, SIGINT);
     return end(process);
   }
 };
@@ -35,6 +47,31 @@ TEST_F(Interruption, AnInterruptedRunEndsWith130AndLeavesNoPartialOutput) {
   EXPECT_EQ(result.status, 130);
   EXPECT_EQ(read("out.json"), "before");
   EXPECT_EQ(files(), (std::vector<std::string>{"many.ma", "out.json"}));
+}
+
+TEST_F(Interruption, AHangUpLeavesNoPartialOutputEither) {
+  const ToolResult result = interrupted(SIGHUP);
+  EXPECT_EQ(result.status, 129);
+  EXPECT_EQ(read("out.json"), "before");
+  EXPECT_EQ(files(), (std::vector<std::string>{"many.ma", "out.json"}));
+}
+
+// The trace is a log: where it ends tells how far the run came. Nothing else is left, with both outputs at
+// work.
+TEST_F(Interruption, WhileTheTraceIsWrittenTheJsonIsNotThereAndTheTraceIsItsBeginning) {
+  const ToolResult result = interruptedWhenThereIs(
+      "calls.jsonl", {"import", "--quiet", "--json", "out.json", "--trace", "calls.jsonl", "many.ma"});
+  EXPECT_EQ(result.status, 130);
+  EXPECT_EQ(files(), (std::vector<std::string>{"calls.jsonl", "many.ma"}));
+  EXPECT_EQ(read("calls.jsonl").find("{\"call\":\"enter\""), 0u);
+}
+
+TEST_F(Interruption, ThePreferenceStoreIsWholeAndNothingLiesBesideIt) {
+  const ToolResult result =
+      interruptedWhenThereIs("store", {"import", "--quiet", "--preferences", "store", "many.ma"});
+  EXPECT_EQ(result.status, 130);
+  EXPECT_EQ(read("store"), "[Maya Camera]\nUse Linear Units=0\n");
+  EXPECT_EQ(files(), (std::vector<std::string>{"many.ma", "store"}));
 }
 
 TEST_F(Interruption, ATerminatedRunLeavesNoPartialOutputEither) {

@@ -18,6 +18,7 @@ namespace mayascene {
 namespace {
 
 constexpr std::int32_t kMostZoomKeys = 1'000'000;
+constexpr std::int64_t kMostMemory = INT64_MAX - 1;  // a number that is too large is read as the largest one
 constexpr std::size_t kNameColumn = 36;
 
 constexpr const char* kFooter =
@@ -97,6 +98,24 @@ void addHostOptions(CLI::App* verb, HostArguments* host, Words* words) {
                    "the callback that the rehearsal is for: entry, import,\nverify or death")
       ->option_text("CALLBACK")
       ->check(CLI::IsMember({"entry", "import", "verify", "death"}))
+      ->group(group);
+}
+
+// The defaults that the texts name are those of refhost::HostOptions.
+void addCeilings(CLI::App* verb, HostArguments* host) {
+  constexpr const char* group = "Ceilings";
+  verb->add_option("--most-layers", host->mostLayers, "layers that the project takes (2000000)")
+      ->option_text("N")
+      ->check(CLI::NonNegativeNumber)
+      ->group(group);
+  verb->add_option("--most-keys", host->mostKeys, "keys that the project takes (100000000)")
+      ->option_text("N")
+      ->check(CLI::NonNegativeNumber)
+      ->group(group);
+  verb->add_option("--most-memory", host->mostMemory,
+                   "bytes that the importer is given at one time (4294967296)")
+      ->option_text("N")
+      ->check(CLI::Range(std::int64_t{0}, kMostMemory))
       ->group(group);
 }
 
@@ -194,6 +213,7 @@ struct CommandLine {
         ->option_text("FILE");
     importVerb->add_flag("-q,--quiet", import.quiet, "print nothing but errors");
     addHostOptions(importVerb, &import.host, &importWords);
+    addCeilings(importVerb, &import.host);
   }
 
   void addVerify() {

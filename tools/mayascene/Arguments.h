@@ -22,6 +22,9 @@ struct HostArguments {
   std::optional<std::int32_t> linearUnits;  // none: what the preference store holds
   std::int32_t zoomKeys = 0;
   bool permissive = false;
+  std::optional<std::int32_t> mostLayers;  // none: what the host takes by itself; the same for the next two
+  std::optional<std::int32_t> mostKeys;
+  std::optional<std::int64_t> mostMemory;
   std::vector<refhost::Failure> failures;
   std::vector<refhost::RefusedSuite> refusedSuites;
   std::optional<refhost::Callback> during;  // none: the verb's own callback

@@ -41,6 +41,9 @@ ExitStatus HostSession::start() {
   options.during = arguments_.during.value_or(own_);
   options.zoomKeys = arguments_.zoomKeys;
   options.permissive = arguments_.permissive;
+  options.mostLayers = arguments_.mostLayers.value_or(options.mostLayers);
+  options.mostKeys = arguments_.mostKeys.value_or(options.mostKeys);
+  options.mostMemory = arguments_.mostMemory.value_or(options.mostMemory);
   std::string complaint;
   if (!arguments_.translations.empty()) {
     auto translations = refhost::readTranslations(arguments_.translations, &complaint);

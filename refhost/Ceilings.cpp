@@ -1,0 +1,40 @@
+#include "refhost/Ceilings.h"
+
+#include <algorithm>
+#include <string>
+
+#include "refhost/Call.h"
+
+namespace refhost {
+
+Allowance::Allowance(const HostOptions& options)
+    : layers(std::max<std::int64_t>(options.mostLayers, 0)),
+      keys(std::max<std::int64_t>(options.mostKeys, 0)),
+      memory(std::max<std::int64_t>(options.mostMemory, 0)) {}
+
+bool takesLayer(Call& call, std::int32_t keys) {
+  const HostState& host = call.host();
+  if (host.allowance.layers < 1) {
+    call.refuse(HOST_ERR_TOO_MANY_LAYERS,
+                "the host takes no more than " + std::to_string(host.options.mostLayers) + " layers");
+  } else if (host.allowance.keys < keys) {
+    refuseKey(call);
+  }
+  return !call.failed();
+}
+
+bool takesMemory(Call& call, std::int64_t bytes) {
+  const HostState& host = call.host();
+  if (bytes <= host.allowance.memory) return true;
+  call.refuse(HOST_ERR_TOO_MUCH_MEMORY, std::to_string(bytes) + " bytes are more than the " +
+                                            std::to_string(host.allowance.memory) + " that are left of " +
+                                            std::to_string(host.options.mostMemory));
+  return false;
+}
+
+void refuseKey(Call& call) {
+  call.refuse(HOST_ERR_TOO_MANY_KEYS,
+              "the host takes no more than " + std::to_string(call.host().options.mostKeys) + " keys");
+}
+
+}  // namespace refhost

@@ -1,0 +1,32 @@
+// What the host takes at most: layers, keys and bytes of memory.
+//
+// The importer makes a null layer for each parent of each camera and marked locator, so that a small text can
+// ask for far more than it holds. Beyond a ceiling the host refuses; what exists stays.
+#pragma once
+
+#include <cstdint>
+
+#include "refhost/Host.h"
+
+namespace refhost {
+
+class Call;
+
+// How much more the host takes. None goes below 0.
+struct Allowance {
+  // Ceilings below 0 count as 0.
+  explicit Allowance(const HostOptions& options);
+
+  std::int64_t layers;  // of the project
+  std::int64_t keys;    // of the project and of open batches; never more than an index can count
+  std::int64_t memory;  // bytes behind memory handles
+};
+
+// Whether the host takes a further layer with so many keys, or so many bytes. False after a refusal. Who
+// makes it takes it off the allowance.
+bool takesLayer(Call& call, std::int32_t keys);
+bool takesMemory(Call& call, std::int64_t bytes);
+
+void refuseKey(Call& call);
+
+}  // namespace refhost

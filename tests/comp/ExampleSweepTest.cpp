@@ -1,0 +1,211 @@
+// Every suite call of every example scene is made to fail, one after the other: once, and from there on for
+// ever.
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <cstdio>
+#include <string>
+#include <utility>
+#include <vector>
+
+#include "hostapi/ErrorCodes.h"
+#include "tests/comp/SweptImport.h"
+
+namespace testsupport {
+namespace {
+
+using refhost::Failure;
+
+constexpr HostError kRehearsed = -77;  // no code of the host's or the importer's own
+constexpr const char* kRehearsedText = "-77";
+constexpr std::size_t kFileObject = 1;
+
+class ExampleSweepTest : public ::testing::TestWithParam<std::string> {
+ protected:
+  ExampleSweepTest() : import_(ExampleScene(GetParam())), stride_(SweepStride(import_.good().size())) {}
+
+  ~ExampleSweepTest() override {
+    std::printf("%s: %d points walked of %zu calls\n", GetParam().c_str(), points_, import_.good().size());
+    RecordProperty("points", points_);
+  }
+
+  SweptRun Rehearse(std::size_t index, Failure::Kind kind, HostError code, bool onwards) {
+    ++points_;
+    refhost::HostOptions options;
+    options.failures.push_back({"", static_cast<std::int64_t>(index) + 1, onwards, kind, code});
+    return import_.Run(options);
+  }
+
+  // Calls work(cursor) for every call, or for the share of them that is walked.
+  template <typename Work>
+  void ForEachCall(Work work) {
+    for (SweepCursor cursor(import_); !cursor.isAtEnd() && !HasFailure(); cursor.Next()) {
+      if (cursor.index() % stride_ != 0) continue;
+      SCOPED_TRACE("call " + std::to_string(cursor.index() + 1) + ": " + cursor.line());
+      work(cursor);
+    }
+  }
+
+  // The calls before the failure are those of the good run; then come the call `thrown`, whose failure ends
+  // the import, and the calls that clean up.
+  void ExpectEndedAt(const SweptRun& run, const SweepCursor& cursor, std::size_t thrown,
+                     const std::string& error, bool onwards) {
+    const std::vector<std::string>& good = import_.good();
+    std::string expected(import_.FirstCalls(cursor.index()));
+    HeldByImport held = cursor.held();
+    for (std::size_t i = cursor.index(); i < thrown; ++i) {
+      held.Take(good[i], true);
+      expected += WithErrors({WithoutError(good[i])}, error);
+    }
+    held.Take(good[thrown], true);
+    const std::vector<std::string> cleanUp = held.CleanUp();
+    const std::string rest = WithErrors(cleanUp, onwards ? error : "0");
+    ASSERT_GE(run.calls.size(), expected.size() + rest.size());
+    EXPECT_EQ(run.calls.compare(0, expected.size(), expected), 0);
+    const std::string_view behind = std::string_view(run.calls).substr(expected.size());
+    const std::string_view failed = behind.substr(0, behind.find('\n'));
+    EXPECT_EQ(CallName(failed), CallName(good[thrown]));
+    EXPECT_EQ(Field(failed, "error"), error);
+    EXPECT_EQ(behind.substr(failed.size() + 1), rest);
+    ExpectHeld(run, onwards ? cursor.made() : cursor.madeAfter(cleanUp));
+  }
+
+  // One failing call changes nothing of the others.
+  void ExpectGoneOn(const SweptRun& run, std::size_t index, const std::string& error) {
+    std::string expected(import_.FirstCalls(index));
+    expected += WithErrors({WithoutError(import_.good()[index])}, error);
+    expected += import_.CallsFrom(index + 1);
+    EXPECT_TRUE(run.calls == expected);
+    ExpectHeld(run, import_.MadeWithout(index));
+  }
+
+  void ExpectHeld(const SweptRun& run, Made made) {
+    made.leftovers += kFileObject;
+    const bool reported =
+        run.result.code == HOST_ERR_EXCEPTION_MEMORY || run.result.code == HOST_ERR_EXCEPTION_OTHER;
+    ExpectMade(run, made, reported ? 1 : 0);
+  }
+
+  static HostError CodeWhereItIsThrown(const std::string& line) {
+    return CallName(line) == "AcquireSuite" ? HOST_ERR_MISSING_SUITE : kRehearsed;
+  }
+
+  const SweptImport import_;
+  const std::size_t stride_;
+  int points_ = 0;
+};
+
+TEST_P(ExampleSweepTest, ACallThatFailsGivesItsCodeOrIsIgnored) {
+  ForEachCall([this](const SweepCursor& cursor) {
+    const SweptRun run = Rehearse(cursor.index(), Failure::Kind::Code, kRehearsed, false);
+    if (IsCodeIgnored(cursor.line(), cursor.held())) {
+      EXPECT_EQ(run.result.code, 0);
+      ExpectGoneOn(run, cursor.index(), kRehearsedText);
+    } else {
+      EXPECT_EQ(run.result.code, CodeWhereItIsThrown(cursor.line()));
+      ExpectEndedAt(run, cursor, cursor.index(), kRehearsedText, false);
+    }
+  });
+}
+
+TEST_P(ExampleSweepTest, WhereEverythingFailsFromACallOnTheImportEndsAllTheSame) {
+  const std::vector<std::string>& good = import_.good();
+  ForEachCall([&](const SweepCursor& cursor) {
+    const SweptRun run = Rehearse(cursor.index(), Failure::Kind::Code, kRehearsed, true);
+    SweepCursor thrown = cursor;
+    while (!thrown.isAtEnd() && IsCodeIgnored(thrown.line(), thrown.held())) thrown.Next();
+    if (thrown.isAtEnd()) {
+      std::vector<std::string> failing;
+      for (std::size_t i = cursor.index(); i < good.size(); ++i) failing.push_back(WithoutError(good[i]));
+      EXPECT_EQ(run.result.code, 0);
+      EXPECT_TRUE(run.calls ==
+                  std::string(import_.FirstCalls(cursor.index())) + WithErrors(failing, kRehearsedText));
+      ExpectHeld(run, cursor.made());
+    } else {
+      EXPECT_EQ(run.result.code, CodeWhereItIsThrown(thrown.line()));
+      ExpectEndedAt(run, cursor, thrown.index(), kRehearsedText, true);
+    }
+  });
+}
+
+TEST_P(ExampleSweepTest, AStandardExceptionIsReportedOnceAndBecomesItsCode) {
+  const struct {
+    Failure::Kind kind;
+    HostError code;
+    const char* error;
+  } exceptions[] = {{Failure::Kind::BadAlloc, HOST_ERR_EXCEPTION_MEMORY, "\"bad_alloc\""},
+                    {Failure::Kind::RuntimeError, HOST_ERR_EXCEPTION_OTHER, "\"runtime_error\""}};
+  for (const auto& exception : exceptions) {
+    ForEachCall([&](const SweepCursor& cursor) {
+      const std::string call = CallName(cursor.line());
+      if (call == "ReleaseSuiteByName") return;  // ends the process: a test of its own
+      const SweptRun run = Rehearse(cursor.index(), exception.kind, 0, false);
+      EXPECT_EQ(run.result.code, exception.code);
+      if (call == "UnlockMemHandle" || call == "FreeMemHandle") {
+        ExpectGoneOn(run, cursor.index(), exception.error);
+      } else {
+        ExpectEndedAt(run, cursor, cursor.index(), exception.error, false);
+      }
+    });
+  }
+}
+
+TEST_P(ExampleSweepTest, ASuiteThatIsRefusedIsThirteen) {
+  for (SweepCursor cursor(import_); !cursor.isAtEnd(); cursor.Next()) {
+    if (CallName(cursor.line()) != "AcquireSuite") continue;
+    SCOPED_TRACE("refused " + cursor.line());
+    ++points_;
+    const std::string_view quoted = Field(cursor.line(), "suite");
+    refhost::HostOptions options;
+    options.refusedSuites.push_back({std::string(quoted.substr(1, quoted.size() - 2)),
+                                     std::stoi(std::string(Field(cursor.line(), "version")))});
+    const SweptRun run = import_.Run(options);
+    EXPECT_EQ(run.result.code, HOST_ERR_MISSING_SUITE);
+    ExpectEndedAt(run, cursor, cursor.index(), std::to_string(HOST_ERR_SUITE_REFUSED), false);
+  }
+}
+
+// A list that counts nothing, though it holds records, is an exception where it is indexed; so only codes
+// other than 0 are rehearsed here.
+TEST_P(ExampleSweepTest, AUtilityServiceThatFailsGivesItsCodeAndAnExceptionIsReportedOnce) {
+  std::vector<std::string> cleanUps;
+  std::vector<Made> made;
+  for (SweepCursor cursor(import_);; cursor.Next()) {
+    const std::vector<std::string> cleanUp = cursor.held().CleanUp();
+    cleanUps.push_back(WithErrors(cleanUp, "0"));
+    made.push_back(cursor.madeAfter(cleanUp));
+    if (cursor.isAtEnd()) break;
+  }
+  const std::pair<Failure::Kind, HostError> kinds[] = {
+      {Failure::Kind::Code, kRehearsed},
+      {Failure::Kind::BadAlloc, HOST_ERR_EXCEPTION_MEMORY},
+      {Failure::Kind::RuntimeError, HOST_ERR_EXCEPTION_OTHER}};
+  for (const char* const service : SweptServices()) {
+    const auto calls = import_.serviceCalls(service);
+    const auto stride = static_cast<std::int64_t>(SweepStride(static_cast<std::size_t>(calls), kSmallShare));
+    for (std::int64_t nth = 1; nth <= calls; nth += stride) {
+      for (const auto& [kind, code] : kinds) {
+        SCOPED_TRACE(std::string(service) + " " + std::to_string(nth));
+        ++points_;
+        refhost::HostOptions options;
+        options.failures.push_back({service, nth, false, kind, code});
+        const SweptRun run = import_.Run(options);
+        EXPECT_EQ(run.result.code, code);
+        // What every import ends with is clean-up also where the good run goes on with it.
+        std::size_t same = import_.LinesInCommon(run.calls);
+        while (same > 0 && EndsTheImport(import_.good()[same - 1])) --same;
+        EXPECT_EQ(run.calls, std::string(import_.FirstCalls(same)) + cleanUps[same]);
+        Made expected = made[same];
+        expected.leftovers += run.host->callCount("FileName") != 0 ? kFileObject : 0;
+        ExpectMade(run, expected, kind == Failure::Kind::Code ? 0 : 1);
+        if (HasFailure()) return;
+      }
+    }
+  }
+}
+
+INSTANTIATE_TEST_SUITE_P(Examples, ExampleSweepTest, ::testing::ValuesIn(ExampleNames()),
+                         [](const auto& example) { return example.param; });
+
+}  // namespace
+}  // namespace testsupport

@@ -1,0 +1,152 @@
+#include "tests/comp/SweptImport.h"
+
+#include <gmock/gmock.h>
+
+#include <algorithm>
+#include <cstdlib>
+#include <stdexcept>
+#include <utility>
+
+#include "hostutil/HostSetup.h"
+#include "plugin/Entry.h"
+
+namespace testsupport {
+namespace {
+
+// A sanitizer makes an import some ten times as long.
+#ifdef __SANITIZE_ADDRESS__
+constexpr std::size_t kShareDivisor = 10;
+#else
+constexpr std::size_t kShareDivisor = 1;
+#endif
+
+}  // namespace
+
+std::vector<std::string> ExampleNames() {
+  std::vector<std::string> names;
+  for (const auto& entry : std::filesystem::directory_iterator(MAYASCENE_SOURCE_DIR "/examples")) {
+    if (entry.path().extension() == ".ma") names.push_back(entry.path().stem().string());
+  }
+  std::sort(names.begin(), names.end());
+  return names;
+}
+
+std::filesystem::path ExampleScene(const std::string& name) {
+  return std::filesystem::path(MAYASCENE_SOURCE_DIR "/examples") / (name + ".ma");
+}
+
+const std::vector<const char*>& SweptServices() {
+  static const std::vector<const char*> services = {
+#define SERVICE_NAME(name) #name,
+      HOST_UTILITY_TABLE(SERVICE_NAME)
+#undef SERVICE_NAME
+  };
+  return services;
+}
+
+std::size_t SweepStride(std::size_t calls, std::size_t share) {
+  const char* const wanted = std::getenv("MAYASCENE_SWEEP");
+  if (wanted != nullptr && std::string_view(wanted) == "all") return 1;
+  share /= kShareDivisor;
+  return ((calls + share - 1) / share) | 1;
+}
+
+bool EndsTheImport(std::string_view line) {
+  const std::string call = CallName(line);
+  return call == "ReleaseSuiteByName" || call == "UnlockMemHandle" || call == "FreeMemHandle";
+}
+
+SweptImport::SweptImport(std::filesystem::path scene) : scene_(std::move(scene)) {
+  const SweptRun run = Run({});
+  if (run.result.code != 0) throw std::runtime_error(scene_.string() + " cannot be imported");
+  text_ = run.calls;
+  good_ = LinesOf(text_);
+  ends_.push_back(0);
+  for (const std::string& line : good_) {
+    facts_.emplace_back(line);
+    ends_.push_back(ends_.back() + line.size() + 1);
+  }
+  for (const char* const service : SweptServices())
+    serviceCalls_.emplace_back(service, run.host->callCount(service));
+}
+
+std::int64_t SweptImport::serviceCalls(std::string_view service) const {
+  for (const auto& [name, count] : serviceCalls_) {
+    if (name == service) return count;
+  }
+  return 0;
+}
+
+SweptRun SweptImport::Run(refhost::HostOptions options) const {
+  SweptRun run;
+  run.written = std::make_unique<std::ostringstream>();
+  options.trace = run.written.get();
+  run.host = std::make_unique<refhost::Host>(std::move(options));
+  refhost::CallbackResult entry;
+  if (!run.host->load(MayaImportEntry, &entry) || entry.code != 0) {
+    throw std::runtime_error("the importer's entry failed");
+  }
+  run.written->str("");
+  run.result = run.host->importScene(scene_);
+  run.calls = std::move(*run.written).str();
+  run.calls.erase(run.calls.rfind("{\"call\":\"leave\""));
+  run.calls.erase(0, run.calls.find('\n') + 1);
+  return run;
+}
+
+Made SweptImport::MadeWithout(std::size_t index) const {
+  MadeCount count;
+  for (std::size_t i = 0; i < facts_.size(); ++i) {
+    if (i != index) count.Take(facts_[i]);
+  }
+  return count.made();
+}
+
+std::size_t SweptImport::LinesInCommon(std::string_view calls) const {
+  const auto differs = std::mismatch(text_.begin(), text_.end(), calls.begin(), calls.end()).first;
+  const auto bytes = static_cast<std::size_t>(differs - text_.begin());
+  return static_cast<std::size_t>(std::upper_bound(ends_.begin(), ends_.end(), bytes) - ends_.begin()) - 1;
+}
+
+void SweepCursor::Next() {
+  held_.Take(line(), false);
+  made_.Take(import_.facts_[index_]);
+  ++index_;
+}
+
+Made SweepCursor::madeAfter(const std::vector<std::string>& cleanUp) const {
+  MadeCount count = made_;
+  for (const std::string& call : cleanUp) count.Take(CallFacts(call));
+  return count.made();
+}
+
+std::string WithErrors(const std::vector<std::string>& calls, std::string_view error) {
+  std::string text;
+  for (const std::string& call : calls) text.append(call).append(",\"error\":").append(error).append("}\n");
+  return text;
+}
+
+void ExpectMade(const SweptRun& run, const Made& made, std::size_t reports) {
+  const refhost::Project& project = run.host->project();
+  Made there;
+  there.compositions = project.compositions().size();
+  there.layers = project.layers().size();
+  for (const refhost::Layer& layer : project.layers()) {
+    for (const refhost::Stream& stream : layer.streams) there.keys += stream.keyCount();
+  }
+  there.leftovers = run.result.leftovers.size();
+  EXPECT_EQ(there.compositions, made.compositions);
+  EXPECT_EQ(there.layers, made.layers);
+  EXPECT_EQ(there.keys, made.keys);
+  EXPECT_EQ(there.leftovers, made.leftovers);
+  for (const refhost::Leftover& left : run.result.leftovers) {
+    EXPECT_TRUE(left.keptByDesign) << left.description;
+  }
+  EXPECT_EQ(run.result.messages.size(), reports);
+  for (const std::string& message : run.result.messages) {
+    EXPECT_TRUE(message.starts_with(refhost::errorSentence(run.result.code))) << message;
+  }
+  EXPECT_THAT(run.result.refusals, ::testing::Each(::testing::Not(::testing::HasSubstr("exception"))));
+}
+
+}  // namespace testsupport
