@@ -5,7 +5,7 @@ import unittest
 
 from project import ROOT, read
 
-DOCUMENTS = ["README.md", "CHANGELOG.md"] + sorted(
+DOCUMENTS = ["README.md", "CHANGELOG.md", "SECURITY.md"] + sorted(
     path.relative_to(ROOT).as_posix() for path in (ROOT / "docs").glob("**/*.md")
 )
 LINK = re.compile(r"\[[^\]]*\]\(([^)\s]+)\)")
