@@ -15,10 +15,14 @@ NodeChannels::Channel FetchChannel(const RecordList* curves, std::int32_t curve)
   return {record.keys, RecordCount(record.keys)};
 }
 
+MAYA_Key FetchKey(const NodeChannels::Channel& channel, std::int32_t n) {
+  return channel.run != nullptr ? channel.run[n] : FetchRecord<MAYA_Key>(channel.keys, n);
+}
+
 // Writes key n of a channel; a channel of one key gives that one, a channel without keys leaves the value.
 void ReadKey(const NodeChannels::Channel& channel, std::int32_t n, double* value) {
   if (channel.count == 0) return;
-  *value = FetchRecord<MAYA_Key>(channel.keys, channel.count == 1 ? 0 : n).value;
+  *value = FetchKey(channel, channel.count == 1 ? 0 : n).value;
 }
 
 }  // namespace
@@ -36,6 +40,16 @@ void NodeChannels::ListSampled() {
       const auto place = static_cast<std::uint8_t>(slot);
       if (channels[place].count != 0) sampled[sampledCount++] = place;
     }
+  }
+}
+
+void NodeChannels::FetchRuns() {
+  // Each sample reads each channel once, and one of them once more for its time.
+  std::int64_t gets = 2 * sharedCount;
+  for (std::size_t i = 0; i < sampledCount; ++i) {
+    Channel& channel = channels[sampled[i]];
+    channel.run = static_cast<const MAYA_Key*>(RecordListGetRun(channel.keys, 0, channel.count, gets));
+    gets = sharedCount;
   }
 }
 
@@ -86,7 +100,7 @@ NodeChannels MAYA_Parse::VerifyChannels(const MAYA_Transform& node) {
 T_Time MAYA_Parse::KeyTime(const NodeChannels& fetched, std::int32_t n) const {
   constexpr T_Time kNoTime{0, 1};
   for (const NodeChannels::Channel& channel : fetched.channels) {
-    if (channel.count > n) return ConvertTime(FetchRecord<MAYA_Key>(channel.keys, n).time, n == 0 ? 1 : 0);
+    if (channel.count > n) return ConvertTime(FetchKey(channel, n).time, n == 0 ? 1 : 0);
   }
   return kNoTime;
 }

@@ -17,8 +17,9 @@ constexpr LayerStreamId kBatchStreams[kBatchCount] = {kScaleStream, kRotationXSt
 }  // namespace
 
 void MAYA_Parse::ApplyTransformAnimation(VOR_Layer* layer, const MAYA_Transform* node) {
-  const NodeChannels channels = VerifyChannels(*node);
+  NodeChannels channels = VerifyChannels(*node);
   if (channels.sharedCount < 1) return;
+  channels.FetchRuns();
 
   VOR_AddKeyframesInfo* batches[kBatchCount] = {};
   HostError kept = Guarded([&] {

@@ -10,6 +10,7 @@ struct NodeChannels {
   struct Channel {
     const RecordList* keys = nullptr;  // null when the channel has no curve, or its curve no keys
     std::int64_t count = 0;
+    const MAYA_Key* run = nullptr;  // all keys in one place; null where they are fetched one by one
   };
 
   std::array<Channel, kChannelCount> channels;  // by curve slot
@@ -22,6 +23,9 @@ struct NodeChannels {
 
   // Fills in `sampled`, from `channels`.
   void ListSampled();
+
+  // Finds the keys' places, for one who is going to read every key time and every sample.
+  void FetchRuns();
 
   // Overwrites the animated channels of `values`, by curve slot, with key n, as Extract does.
   void Sample(std::int32_t n, double (&values)[kChannelCount]) const;

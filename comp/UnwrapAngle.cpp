@@ -5,7 +5,6 @@
 
 namespace {
 
-constexpr double kHalfTurn = 3.141592653589793;
 constexpr double kTurn = 6.283185307179586;
 constexpr double kFewTurns = 4.0;
 
@@ -38,8 +37,7 @@ bool TurnChanges(double angle) {
 
 }  // namespace
 
-double UnwrapAngle(double angle, double previous) {
-  if (std::fabs(angle - previous) < kHalfTurn) return angle;
+double UnwrapTurns(double angle, double previous) {
   if (!TurnChanges(angle) || !TurnChanges(previous)) return angle;
   angle = TakeManyTurns(angle, previous, angle > previous ? -kTurn : kTurn);
   while (angle - previous >= kHalfTurn) angle += -kTurn;

@@ -1,7 +1,17 @@
 // Keeps consecutive angles from turning through a whole revolution.
 #pragma once
 
+#include <cmath>
+
+inline constexpr double kHalfTurn = 3.141592653589793;
+
+// The same for angles that lie half a turn apart or more.
+double UnwrapTurns(double angle, double previous);
+
 // The angle shifted by whole turns until it lies less than half a turn from the previous one (both in
 // radians; a difference of exactly half a turn is shifted too). Takes the same time for any number of turns.
 // An angle that is not finite, or so large that a turn no longer changes it, stays as it is.
-double UnwrapAngle(double angle, double previous);
+inline double UnwrapAngle(double angle, double previous) {
+  // As it is for nearly every key.
+  return std::fabs(angle - previous) < kHalfTurn ? angle : UnwrapTurns(angle, previous);
+}

@@ -9,9 +9,11 @@
 #include "hostutil/HostMatrixInternal.h"
 #include "hostutil/RehearsalInternal.h"
 
+using namespace hostutil::matrix;
+
 namespace {
 
-constexpr int kAxes = 3;
+constexpr double kHalfTurn = 3.141592653589793;
 
 // Below this cosine of the Y angle the X and Z angles turn about one line.
 constexpr double kPoleCosine = 1e-9;
@@ -51,6 +53,7 @@ inline double Normalise(Vector* v) {
   constexpr double kLargeSquare = 1e200;
   const double square = Dot(*v, *v);
   if (!(square > kSmallSquare && square < kLargeSquare)) return NormaliseExtreme(v);
+  if (square == 1.0) return 1.0;
   const double length = std::sqrt(square);
   const double inverse = 1.0 / length;
   for (double& component : *v) component *= inverse;
@@ -62,9 +65,9 @@ double WithoutNegativeZero(double value) { return value + 0.0; }
 
 // 0 times what is not finite is not a number, and so is every sum with it.
 bool IsFinite(const TransformMatrix& matrix) {
-  hostutil::matrix::Row zero{};
+  Row zero{};
   for (const auto& row : matrix.m) {
-    zero = hostutil::matrix::Sum(zero, hostutil::matrix::Product(0.0, hostutil::matrix::Load(row)));
+    zero = Sum(zero, Product(0.0, Load(row)));
   }
   return zero.left[0] + zero.left[1] + zero.right[0] + zero.right[1] == 0.0;
 }
@@ -123,20 +126,31 @@ void Complete(Basis* basis) {
   CompleteThird(first == 2 ? 1 : 2, basis);
 }
 
+// The angle of a direction from x towards y. One without a y, as nodes that turn about one axis have two,
+// needs no arc tangent.
+double AngleOf(double y, double x) {
+  const double up = WithoutNegativeZero(y);
+  if (up == 0.0) return x < 0.0 ? kHalfTurn : 0.0;
+  return std::atan2(up, x);
+}
+
 // X, Y and Z so that Rz·Ry·Rx turns the coordinate axes into the basis. X is what is left when Y and Z are
 // taken back: near the pole that keeps the sum of the two right, where each alone is uncertain.
 void AnglesOf(const Basis& basis, double rotation[kAxes]) {
   const auto& [x, y, z] = basis;
-  const double cosineY = std::sqrt(x[0] * x[0] + x[1] * x[1]);
-  const bool atPole = cosineY < kPoleCosine;
-  const double angleZ = atPole ? 0.0 : std::atan2(WithoutNegativeZero(x[1]), WithoutNegativeZero(x[0]));
-  const double inverse = 1.0 / cosineY;
-  const double c = atPole ? 1.0 : x[0] * inverse;
-  const double s = atPole ? 0.0 : x[1] * inverse;
-  rotation[0] =
-      std::atan2(WithoutNegativeZero(s * z[0] - c * z[1]), WithoutNegativeZero(c * y[1] - s * y[0]));
-  rotation[1] = std::atan2(WithoutNegativeZero(-x[2]), cosineY);
-  rotation[2] = angleZ;
+  // An axis without a y needs no root: its length is that of the x.
+  const bool flat = x[1] == 0.0;
+  const double cosineY = flat ? std::abs(x[0]) : std::sqrt(x[0] * x[0] + x[1] * x[1]);
+  double c = 1.0;
+  double s = 0.0;
+  rotation[2] = 0.0;
+  if (cosineY >= kPoleCosine) {
+    rotation[2] = AngleOf(x[1], x[0]);
+    c = flat ? std::copysign(1.0, x[0]) : x[0] / cosineY;
+    s = flat ? 0.0 : x[1] / cosineY;
+  }
+  rotation[0] = AngleOf(s * z[0] - c * z[1], c * y[1] - s * y[0]);
+  rotation[1] = AngleOf(-x[2], cosineY);
 }
 
 }  // namespace
@@ -146,13 +160,19 @@ HostError hostutil::matrix::Decompose(const TransformMatrix& matrix, MatrixCompo
     *components = MatrixComponents{};
     return HOST_ERR_MATRIX_NOT_FINITE;
   }
+  // By rows, in the pairs that they were stored in: a load across two stores is waited for.
+  const Row rows[] = {Load(matrix.m[0]), Load(matrix.m[1]), Load(matrix.m[2])};
   Basis basis;
-  for (std::size_t axis = 0; axis < kAxes; ++axis) {
-    for (std::size_t row = 0; row < kAxes; ++row) basis[axis][row] = matrix.m[row][axis];
-    components->scale[axis] = Normalise(&basis[axis]);
-    components->translation[axis] = WithoutNegativeZero(matrix.m[axis][kAxes]);
-    components->shear[axis] = 0.0;
+  for (std::size_t row = 0; row < kAxes; ++row) {
+    basis[0][row] = rows[row].left[0];
+    basis[1][row] = rows[row].left[1];
+    basis[2][row] = rows[row].right[0];
+    components->translation[row] = WithoutNegativeZero(rows[row].right[1]);
+    components->shear[row] = 0.0;
   }
+  components->scale[0] = Normalise(&basis[0]);
+  components->scale[1] = Normalise(&basis[1]);
+  components->scale[2] = Normalise(&basis[2]);
   if (Dot(basis[0], Cross(basis[1], basis[2])) < 0.0) {
     components->scale[0] = -components->scale[0];
     basis[0] = Negated(basis[0]);

@@ -47,6 +47,9 @@ constexpr int64_t kExponentLimit = 100'000'000'000'000'000;
 constexpr int64_t kLongestPlainNumber = 64;
 
 bool IsDigit(char c) { return c >= '0' && c <= '9'; }
+unsigned DigitOf(char c) {
+  return static_cast<unsigned>(static_cast<unsigned char>(c)) - '0';
+}  // 10 and up: none
 bool IsLetter(char c) { return (c >= 'A' && c <= 'Z') || (c >= 'a' && c <= 'z'); }
 
 // A position in the text; at the end it reads as a NUL.
@@ -291,7 +294,8 @@ bool ScanRest(Cursor* cursor, Decimal* decimal) {
   const bool negative = *at == '-';
   const char* const first = at + (negative ? 1 : 0);
   uint64_t mantissa = 0;
-  for (at = first; IsDigit(*at); ++at) mantissa = mantissa * 10 + static_cast<uint64_t>(*at - '0');
+  at = first;
+  for (unsigned digit = DigitOf(*at); digit <= 9; digit = DigitOf(*++at)) mantissa = mantissa * 10 + digit;
   int64_t digits = at - first;
   int64_t fraction = 0;
   if (*at == '.') {

@@ -152,6 +152,13 @@ HostError RecordListGet(const RecordList* list, int64_t index, void* record) {
   return CopyRecord(list, index, record);
 }
 
+const void* RecordListGetRun(const RecordList* list, int64_t index, int64_t count, int64_t gets) {
+  if (!hostutil::MayWorkInBulk() || !IsList(list) || count < 1) return nullptr;
+  if (index < 0 || index > list->count - count) return nullptr;
+  hostutil::CountCalls(HOST_UTILITY_ListGet, gets);
+  return list->At(index);
+}
+
 HostError RecordListLock(RecordList* list, int64_t index, void** record) {
   if (HostError code; hostutil::Rehearsed(HOST_UTILITY_ListLock, &code)) {
     hostutil::HandOutNothing(record);

@@ -92,9 +92,10 @@ class HandlePool {
   HandlePool(const HandleCodec& codec, HandleKind kind) : codec_(codec), kind_(kind) {}
 
   Object* find(const void* handle) {
-    // The slot holds the whole handle, so that one comparison tells kind, host, number and life.
+    // The slot holds the whole handle, so that one comparison tells kind, host, number and life. That of a
+    // free slot would lead to another one.
     const std::size_t slot = HandleCodec::heldSlot(handle);
-    if (slot >= slotCount_ || slots_[slot].handle != handle || handle == nullptr) [[unlikely]]
+    if (slot >= slotCount_ || slots_[slot].handle != handle) [[unlikely]]
       return nullptr;
     return &slots_[slot].object;
   }
@@ -152,16 +153,19 @@ class HandlePool {
 
  private:
   struct Slot {
-    void* handle = nullptr;      // null: free
+    void* handle = freeHandle();
     std::uint32_t number = 0;    // 0: free
     std::uint32_t nextFree = 0;  // of a free slot: the next one, or kNoSlot
     Object object{};
   };
   static constexpr std::uint32_t kNoSlot = UINT32_MAX;
 
+  // Of the last slot, which no pool makes.
+  static void* freeHandle() { return reinterpret_cast<void*>(UINTPTR_MAX); }
+
   bool makeSlot() {
     const std::size_t index = slots_.size();
-    if (index > HandleCodec::kSlotMask) return false;
+    if (index >= HandleCodec::kSlotMask) return false;
     slots_.emplace_back().nextFree = kNoSlot;
     ++slotCount_;
     firstFree_ = static_cast<std::uint32_t>(index);
@@ -171,7 +175,7 @@ class HandlePool {
   void release(std::size_t index) {
     Slot& slot = slots_[index];
     clear(slot.object);
-    slot.handle = nullptr;
+    slot.handle = freeHandle();
     slot.number = 0;
     slot.nextFree = firstFree_;
     firstFree_ = static_cast<std::uint32_t>(index);
