@@ -195,8 +195,11 @@ void writeComposition(std::ostream& out, double scale, std::uint64_t seed) {
     const std::string name = numbered("marker", i);
     transform(scene, name, "");
     scene.text("createNode locator -n \"").text(name).text("_nullShape\" -p \"").text(name).text("\";\n");
-    animate(scene, name, 1200, 8, 0, 1);
-    animate(scene, name, 1200, 8, 4, 1);
+    const auto channel = static_cast<std::size_t>(i % 6);
+    const std::string curve = name + "_" + std::string(kChannels[channel].suffix);
+    scene.curve(kChannels[channel].curveType, curve, 1200, 14, 100.0);
+    scene.tangents(1200);
+    scene.connect(curve + ".o", name + "." + std::string(kChannels[channel].attribute));
   }
   scene.footer();
 }
@@ -207,7 +210,7 @@ const Workload kWorkloads[4] = {
     {"mesh", "90 meshes and four baked cameras", writeMesh},
     {"keys", "3000 transforms with nine curves of 240 keys each", writeKeys},
     {"nodes", "120,000 transforms, 80,000 locators, 10,000 curves, 200,000 connections", writeNodes},
-    {"composition", "1000 animated transforms with a null locator each", writeComposition},
+    {"composition", "1000 transforms with one curve of 1200 keys and a null locator each", writeComposition},
 };
 
 const Workload* findWorkload(std::string_view name) {

@@ -8,6 +8,7 @@
 #include <random>
 #include <string>
 #include <string_view>
+#include <utility>
 
 namespace bench {
 
@@ -77,6 +78,21 @@ class SceneText {
       value += speed;
     }
     text(";\n");
+  }
+
+  // What a curve that was edited after baking holds for each key beside its value, in commands of their own.
+  void tangents(int keys) {
+    for (const auto& [attribute, word] : {std::pair{".kit", " 18"}, {".kot", " 18"}, {".ktl", " no"}, {".kwl", " no"}}) {
+      text("\tsetAttr -s ")
+          .integer(keys)
+          .text(" \"")
+          .text(attribute)
+          .text("[0:")
+          .integer(keys - 1)
+          .text("]\" ");
+      for (int k = 0; k < keys; ++k) text(word);
+      text(";\n");
+    }
   }
 
   void connect(const std::string& source, const std::string& destination) {
