@@ -46,11 +46,13 @@ std::unique_ptr<refhost::KeyColumns> TakeKeys(Bytes& bytes, std::size_t count, s
   auto keys = std::make_unique<refhost::KeyColumns>();
   auto time = static_cast<std::int32_t>(bytes.Take<std::int16_t>());
   const auto scale = bytes.Take<std::uint32_t>();
+  std::vector<T_Time> times;
   for (; count > 0; --count) {
-    keys->times.push_back({time, scale});
+    times.push_back({time, scale});
     time += 1 + bytes.Take<std::uint8_t>();
     for (std::size_t i = 0; i < dimension; ++i) keys->values.push_back(bytes.Take<double>());
   }
+  keys->times = std::move(times);
   return keys;
 }
 

@@ -25,15 +25,17 @@ constexpr auto kByteClasses = [] {
 ByteClass ClassOf(char c) { return kByteClasses[static_cast<unsigned char>(c)]; }
 
 // A byte at a time. Ends a block before the end, as the others do, so that no word is scanned over it.
-const char* SkipHarmlessTextPlain(const char* position, const char* end, std::int32_t* lines) {
+template <SkipWhere kWhere>
+const char* SkipPlain(const char* position, const char* end, std::int32_t* lines) {
+  constexpr bool inCommand = kWhere == SkipWhere::InCommand;
   while (end - position >= kSkipBlock) {
     const ByteClass first = ClassOf(*position);
-    if (first != kInWord) {
+    if (first != kInWord && !(inCommand && *position == ';')) {
       *lines += first == kLineFeed ? 1 : 0;
       ++position;
       continue;
     }
-    if (!BeginsHarmlessWord(position)) return position;
+    if (!BeginsHarmlessWord(position) || (inCommand && *position == '-')) return position;
     const char* behind = position;
     while (behind != end && ClassOf(*behind) == kInWord) ++behind;
     if (behind == end) return position;
@@ -42,16 +44,21 @@ const char* SkipHarmlessTextPlain(const char* position, const char* end, std::in
   return position;
 }
 
+constexpr HarmlessTextSkipper kPlain = {"plain", SkipPlain<SkipWhere::BetweenCommands>,
+                                        SkipPlain<SkipWhere::InCommand>};
+
 }  // namespace
 
 std::span<const HarmlessTextSkipper> HarmlessTextSkippers() {
 #if defined(__x86_64__)
   static constexpr std::array<HarmlessTextSkipper, 3> kSkippers = {
-      {{"plain", SkipHarmlessTextPlain}, {"SSE2", SkipHarmlessTextSse2}, {"AVX2", SkipHarmlessTextAvx2}}};
+      {kPlain,
+       {"SSE2", SkipHarmlessTextSse2, SkipInCommandSse2},
+       {"AVX2", SkipHarmlessTextAvx2, SkipInCommandAvx2}}};
   static const std::size_t count = HasAvx2() ? 3 : 2;
   return std::span(kSkippers).first(count);
 #else
-  static constexpr std::array<HarmlessTextSkipper, 1> kSkippers = {{{"plain", SkipHarmlessTextPlain}}};
+  static constexpr std::array<HarmlessTextSkipper, 1> kSkippers = {kPlain};
   return kSkippers;
 #endif
 }

@@ -20,6 +20,9 @@ using SkipHarmlessText = const char* (*)(const char* position, const char* end, 
 struct HarmlessTextSkipper {
   const char* name;
   SkipHarmlessText skip;
+
+  // The same inside a command whose words do not matter: stops at ";" and at every "-" too.
+  SkipHarmlessText skipInCommand;
 };
 
 // Those that this processor can run, the fastest last. Never empty; the first one runs on every processor.

@@ -12,6 +12,7 @@ inline constexpr std::ptrdiff_t kSkipBlock = 64;
 // One bit per byte of a block, the first byte in the lowest bit.
 struct BlockMasks {
   std::uint64_t terminator;  // white space and ";"
+  std::uint64_t semicolon;
   std::uint64_t lineFeed;
   std::uint64_t harmless;  // may begin a word that is passed over
   std::uint64_t dash;      // "-"
@@ -20,7 +21,9 @@ struct BlockMasks {
 
 inline constexpr bool IsWordByte(char c) { return IsLetter(c) || IsNumberStart(c); }
 
-template <typename Classify>
+enum class SkipWhere { BetweenCommands, InCommand };
+
+template <SkipWhere kWhere, typename Classify>
 [[gnu::always_inline]] inline const char* SkipBlocks(const char* position, const char* end,
                                                      std::int32_t* lines, Classify classify) {
   std::uint64_t boundary = 1;  // whether a token may start at the block's first byte
@@ -29,7 +32,8 @@ template <typename Classify>
     const BlockMasks masks = classify(block);
     const std::uint64_t starts = ~masks.terminator & (masks.terminator << 1 | boundary);
     const std::uint64_t beforeWord = masks.wordByte >> 1 | std::uint64_t{IsWordByte(block[kSkipBlock])} << 63;
-    const std::uint64_t stops = starts & ~(masks.harmless | (masks.dash & beforeWord));
+    std::uint64_t stops = starts & ~(masks.harmless | (masks.dash & beforeWord));
+    if constexpr (kWhere == SkipWhere::InCommand) stops = (starts & ~masks.harmless) | masks.semicolon;
     if (stops != 0) {
       const int at = std::countr_zero(stops);
       *lines += std::popcount(masks.lineFeed & ((std::uint64_t{1} << at) - 1));

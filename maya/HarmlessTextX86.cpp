@@ -37,7 +37,9 @@ BlockMasks ClassifySse2(const char* block) {
     const __m128i keywordStart = Either(Equal(lower, 'c'), Equal(lower, 's'));
     const __m128i numeral = Either(InRange(bytes, '0', 10), Equal(bytes, '.'));
     const __m128i dash = Equal(bytes, '-');
-    masks.terminator |= MaskOf(Either(space, Equal(bytes, ';')), shift);
+    const __m128i semicolon = Equal(bytes, ';');
+    masks.terminator |= MaskOf(Either(space, semicolon), shift);
+    masks.semicolon |= MaskOf(semicolon, shift);
     masks.lineFeed |= MaskOf(lineFeed, shift);
     masks.harmless |= MaskOf(Either(_mm_andnot_si128(keywordStart, letter), numeral), shift);
     masks.dash |= MaskOf(dash, shift);
@@ -124,6 +126,7 @@ TARGET_AVX2 inline void ClassifyHalf(const char* at, int shift, BlockMasks* mask
                                            _mm256_shuffle_epi8(TableOf(kHighTable), highNibbles));
   const auto put = [shift](std::uint32_t bits) { return std::uint64_t{bits} << shift; };
   masks->terminator |= put(~WithoutAny(classes, kControl | kSemicolon) | MaskOfEqual(bytes, ' '));
+  masks->semicolon |= put(MaskOfEqual(bytes, ';'));
   masks->lineFeed |= put(MaskOfEqual(bytes, '\n'));
   masks->harmless |= put(~WithoutAny(classes, kHarmless));
   masks->dash |= put(MaskOfEqual(bytes, '-'));
@@ -140,7 +143,11 @@ TARGET_AVX2 inline BlockMasks ClassifyAvx2(const char* block) {
 }  // namespace
 
 const char* SkipHarmlessTextSse2(const char* position, const char* end, std::int32_t* lines) {
-  return SkipBlocks(position, end, lines, ClassifySse2);
+  return SkipBlocks<SkipWhere::BetweenCommands>(position, end, lines, ClassifySse2);
+}
+
+const char* SkipInCommandSse2(const char* position, const char* end, std::int32_t* lines) {
+  return SkipBlocks<SkipWhere::InCommand>(position, end, lines, ClassifySse2);
 }
 
 bool HasAvx2() {
@@ -148,7 +155,11 @@ bool HasAvx2() {
 }
 
 TARGET_AVX2 const char* SkipHarmlessTextAvx2(const char* position, const char* end, std::int32_t* lines) {
-  return SkipBlocks(position, end, lines, ClassifyAvx2);
+  return SkipBlocks<SkipWhere::BetweenCommands>(position, end, lines, ClassifyAvx2);
+}
+
+TARGET_AVX2 const char* SkipInCommandAvx2(const char* position, const char* end, std::int32_t* lines) {
+  return SkipBlocks<SkipWhere::InCommand>(position, end, lines, ClassifyAvx2);
 }
 
 #endif

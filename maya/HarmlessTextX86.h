@@ -5,8 +5,10 @@
 #include <cstdint>
 
 const char* SkipHarmlessTextSse2(const char* position, const char* end, std::int32_t* lines);
+const char* SkipInCommandSse2(const char* position, const char* end, std::int32_t* lines);
 
 // Only where HasAvx2.
 bool HasAvx2();
 const char* SkipHarmlessTextAvx2(const char* position, const char* end, std::int32_t* lines);
+const char* SkipInCommandAvx2(const char* position, const char* end, std::int32_t* lines);
 #endif

@@ -113,6 +113,11 @@ void MAYA_Lex::SkipHarmless() {
   tokenStart = position = skip(position, end_, &line);
 }
 
+void MAYA_Lex::SkipHarmlessInCommand() {
+  static const SkipHarmlessText skip = HarmlessTextSkippers().back().skipInCommand;
+  tokenStart = position = skip(position, end_, &line);
+}
+
 std::int32_t MAYA_Lex::SkipCharacters(const char* set) {
   while (*position != '\0' && std::strchr(set, *position) != nullptr) {
     if (*position == '\n') ++line;

@@ -55,6 +55,10 @@ class MAYA_Lex : public QZGP_SuiteHandler {
   // have come as tokens that the main loop ignores; it stops before everything else.
   void SkipHarmless();
 
+  // The same inside a command of which only its end, strings, comments and options matter: stops before
+  // those, and before every word that begins with a "-".
+  void SkipHarmlessInCommand();
+
   // The same as SkipWhiteSpace over the bytes of a NUL-terminated set. Returns 0.
   std::int32_t SkipCharacters(const char* set);
 

@@ -50,12 +50,15 @@ void MAYA_Parse::WriteBackCurve() {
 // Reads to behind the key attribute; hands out the last number before it, the key count as a rule. False when
 // the command ends without one.
 bool MAYA_Parse::FindKeyAttribute(std::string_view* lastNumber) {
+  bool otherAttribute = false;
   for (;;) {
     const char* first = nullptr;
     const char* last = nullptr;
+    if (otherAttribute) SkipHarmlessInCommand();
     switch (NextInCommand(&first, &last)) {
       case String:
         if (NamesKeys(QuotedText(first, last))) return true;
+        otherAttribute = true;
         break;
       case Option:
         // Deliberate: any other option eats the token behind it, a ";" too; the command then runs on.

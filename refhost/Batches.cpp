@@ -42,23 +42,25 @@ bool isAscending(const std::vector<T_Time>& times) {
                             [](const T_Time& a, const T_Time& b) { return !timeLess(a, b); }) == times.end();
 }
 
-KeyColumns sorted(const KeyColumns& keys, std::size_t dimension) {
-  std::vector<std::size_t> order(keys.times.size());
+KeyColumns sorted(const std::vector<T_Time>& times, const std::vector<double>& values,
+                  std::size_t dimension) {
+  std::vector<std::size_t> order(times.size());
   std::iota(order.begin(), order.end(), std::size_t{0});
   std::stable_sort(order.begin(), order.end(),
-                   [&](std::size_t a, std::size_t b) { return timeLess(keys.times[a], keys.times[b]); });
-  KeyColumns result;
-  result.times.reserve(order.size());
-  result.values.reserve(order.size() * dimension);
+                   [&](std::size_t a, std::size_t b) { return timeLess(times[a], times[b]); });
+  std::vector<T_Time> sortedTimes;
+  std::vector<double> sortedValues;
+  sortedTimes.reserve(order.size());
+  sortedValues.reserve(order.size() * dimension);
   for (std::size_t place = 0; place < order.size(); ++place) {
     const bool laterOfSameTime =
-        place + 1 < order.size() && !timeLess(keys.times[order[place]], keys.times[order[place + 1]]);
+        place + 1 < order.size() && !timeLess(times[order[place]], times[order[place + 1]]);
     if (laterOfSameTime) continue;
-    result.times.push_back(keys.times[order[place]]);
-    const auto first = keys.values.begin() + static_cast<std::ptrdiff_t>(order[place] * dimension);
-    result.values.insert(result.values.end(), first, first + static_cast<std::ptrdiff_t>(dimension));
+    sortedTimes.push_back(times[order[place]]);
+    const auto first = values.begin() + static_cast<std::ptrdiff_t>(order[place] * dimension);
+    sortedValues.insert(sortedValues.end(), first, first + static_cast<std::ptrdiff_t>(dimension));
   }
-  return result;
+  return {std::move(sortedTimes), std::move(sortedValues)};
 }
 
 }  // namespace
@@ -98,19 +100,24 @@ bool timeLess(const T_Time& a, const T_Time& b) {
   return std::int64_t{a.value} * std::int64_t{b.scale} < std::int64_t{b.value} * std::int64_t{a.scale};
 }
 
-void commitKeys(Batch& batch, std::unique_ptr<KeyColumns>& keys) {
+void commitKeys(Batch& batch, std::unique_ptr<KeyColumns>& keys, KeyTimes* ascending) {
   dropKeysWithoutValue(batch);
   if (batch.times.empty()) return;
-  if (keys == nullptr) {
-    keys = std::make_unique<KeyColumns>(
-        KeyColumns{{batch.times.begin(), batch.times.end()}, {batch.values.begin(), batch.values.end()}});
-  } else {
-    keys->times.insert(keys->times.end(), batch.times.begin(), batch.times.end());
-    keys->values.insert(keys->values.end(), batch.values.begin(), batch.values.end());
+  std::vector<double> values;
+  if (keys != nullptr) values = std::move(keys->values);
+  values.insert(values.end(), batch.values.begin(), batch.values.end());
+  if (keys == nullptr && ascending->are(batch.times.begin(), batch.times.size())) {
+    keys = std::make_unique<KeyColumns>(KeyColumns{*ascending, std::move(values)});
+    return;
   }
-  if (!isAscending(keys->times)) {
-    *keys = sorted(*keys, static_cast<std::size_t>(batch.stream->dimension));
-  }
+  std::vector<T_Time> times;
+  if (keys != nullptr) times = keys->times;
+  times.insert(times.end(), batch.times.begin(), batch.times.end());
+  KeyColumns columns = isAscending(times)
+                           ? KeyColumns{std::move(times), std::move(values)}
+                           : sorted(times, values, static_cast<std::size_t>(batch.stream->dimension));
+  *ascending = columns.times;
+  keys = std::make_unique<KeyColumns>(std::move(columns));
 }
 
 }  // namespace refhost

@@ -62,7 +62,8 @@ struct Batch {
 
 // Takes the keys of the batch into the columns (null: there are none yet): sorted by time, stably, of equal
 // times the later stays (those of the batch are later than those that are there), keys without a value
-// dropped. The batch is spent afterwards.
-void commitKeys(Batch& batch, std::unique_ptr<KeyColumns>& keys);
+// dropped. Key times that are those of `ascending`, the times that were taken last, are shared with them; it
+// becomes the times that were taken now. The batch is spent afterwards.
+void commitKeys(Batch& batch, std::unique_ptr<KeyColumns>& keys, KeyTimes* ascending);
 
 }  // namespace refhost

@@ -162,7 +162,7 @@ HostError SetBatchKeyframeValue(VOR_AddKeyframesInfo* batch, std::int32_t index,
 // Keys that the stream does not keep are no longer the host's.
 void endBatch(HostState& host, Batch& batch, bool commit) {
   const std::size_t held = batch.stream->keyCount() + batch.times.size();
-  if (commit) ProjectEditor::commit(batch);
+  if (commit) host.editor.commit(batch);
   host.allowance.keys += static_cast<std::int64_t>(held - batch.stream->keyCount());
 }
 

@@ -13,6 +13,7 @@
 #include <vector>
 
 #include "hostapi/HostTypes.h"
+#include "refhost/KeyTimes.h"
 
 namespace refhost {
 
@@ -35,7 +36,7 @@ inline constexpr int32_t kFilmVertical = 2;
 
 // The keys of one stream, sorted by time, no two at one time. values holds `dimension` numbers per key.
 struct KeyColumns {
-  std::vector<T_Time> times;
+  KeyTimes times;
   std::vector<double> values;
 };
 

@@ -61,11 +61,11 @@ Layer& ProjectEditor::addCameraLayer(Composition& composition, const char* name,
       stream.value[1] = interest[1];
     } else if (stream.id == kZoomStream) {
       stream.value[0] = composition.width;
-      if (zoomKeys > 0) stream.keys = std::make_unique<KeyColumns>();
-      for (int32_t key = 0; key < zoomKeys; ++key) {
-        stream.keys->times.push_back({key, 1});
-        stream.keys->values.push_back(stream.value[0]);
-      }
+      if (zoomKeys < 1) continue;
+      std::vector<T_Time> times;
+      for (int32_t key = 0; key < zoomKeys; ++key) times.push_back({key, 1});
+      const std::vector<double> values(times.size(), stream.value[0]);
+      stream.keys = std::make_unique<KeyColumns>(KeyColumns{std::move(times), values});
     }
   }
   return layer;
@@ -97,7 +97,7 @@ void ProjectEditor::setFilm(Layer& camera, int32_t direction, double size) {
   camera.filmSize = size;
 }
 
-void ProjectEditor::commit(Batch& batch) { commitKeys(batch, batch.stream->keys); }
+void ProjectEditor::commit(Batch& batch) { commitKeys(batch, batch.stream->keys, &lastTimes_); }
 
 void ProjectEditor::setValue(Stream& stream, const double* value) {
   for (int32_t i = 0; i < stream.dimension; ++i) stream.value[i] = value[i];

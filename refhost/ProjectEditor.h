@@ -51,7 +51,7 @@ class ProjectEditor {
   static void setFlag(Layer& layer, int32_t flag, bool on);  // flags that mean nothing here are forgotten
   static void setFilm(Layer& camera, int32_t direction, double size);
   static void setValue(Stream& stream, const double* value);
-  static void commit(Batch& batch);
+  void commit(Batch& batch);
 
   // Null when the layer has none of that id.
   static Stream* findStream(Layer& layer, int32_t id) {
@@ -71,6 +71,7 @@ class ProjectEditor {
   Project project_;
   std::vector<Item> items_;
   std::vector<Layer*> layers_;  // by number - 1
+  KeyTimes lastTimes_;          // of the keys that were committed last
 };
 
 }  // namespace refhost

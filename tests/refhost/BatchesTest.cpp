@@ -174,7 +174,8 @@ TEST(LongBatch, OfAMillionKeysInDescendingOrderIsSorted) {
     batch.setValue(static_cast<std::size_t>(key), &value);
   }
   std::unique_ptr<KeyColumns> keys;
-  commitKeys(batch, keys);
+  KeyTimes last;
+  commitKeys(batch, keys, &last);
   ASSERT_EQ(keys->times.size(), static_cast<std::size_t>(count));
   for (std::size_t key = 0; key < keys->times.size(); ++key) {
     ASSERT_EQ(keys->times[key].value, static_cast<std::int32_t>(key) + 1);
