@@ -1,6 +1,7 @@
 // Keys of animation curves, and who owns them.
 #include "hostapi/ErrorCodes.h"
 #include "hostutil/HostSetup.h"
+#include "plugin/ErrorCodes.h"
 #include "tests/support/ReaderFixture.h"
 
 namespace testsupport {
@@ -43,6 +44,20 @@ TEST_F(KeysTest, AValueThatIsNoNumberIsLostAndCountsZero) {
 TEST_F(KeysTest, OtherTokensBetweenKeysArePassedOver) {
   EXPECT_EQ(KeysWith("setAttr \".ktv\" \"a\" 1 2 yes -k on 3 4 ( ) /*c*/ 5 6 : ;"),
             (Keys{{1, 2}, {3, 4}, {5, 6}}));
+}
+
+TEST_F(KeysTest, TheKeysAreFoundBehindALongOtherAttribute) {
+  std::string many;
+  for (int i = 0; i < 100; ++i) many += i % 9 == 0 ? "\n\t18.5 no" : " 1 yes";
+  for (const char* const between :
+       {" ", " \"x\" ", " /* ; */ ", " // ;\n", " -k on ", " -5 ", " -k ; ", " ( ) : + ", " sel "}) {
+    SCOPED_TRACE(between);
+    EXPECT_EQ(KeysWith("setAttr \".kit\" " + many + between + many + " \".ktv\" 3 4;"), (Keys{{3, 4}}));
+    EXPECT_EQ(KeysWith("setAttr \".kit\" " + many + between + many + ";\nsetAttr \".ktv\" 5 6;"),
+              (Keys{{5, 6}}));
+  }
+  EXPECT_EQ(ReadWith("setAttr \".kit\" " + many + " ? " + many + ";"), kReadingError);
+  EXPECT_EQ(ReadWith("setAttr \".kit\" " + many), kUnexpectedEnd);
 }
 
 TEST_F(KeysTest, TheAttributeIsFoundAnywhereInTheText) {

@@ -119,7 +119,8 @@ const refhost::Stream& BuilderTest::StreamOf(int id) {
 
 std::vector<T_Time> BuilderTest::KeyTimes(int id) {
   const refhost::Stream& stream = StreamOf(id);
-  return stream.keys != nullptr ? stream.keys->times : std::vector<T_Time>{};
+  if (stream.keys == nullptr) return {};
+  return stream.keys->times;
 }
 
 std::vector<double> BuilderTest::KeyValues(int id, std::size_t component) {
