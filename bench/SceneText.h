@@ -82,7 +82,8 @@ class SceneText {
 
   // What a curve that was edited after baking holds for each key beside its value, in commands of their own.
   void tangents(int keys) {
-    for (const auto& [attribute, word] : {std::pair{".kit", " 18"}, {".kot", " 18"}, {".ktl", " no"}, {".kwl", " no"}}) {
+    for (const auto& [attribute, word] :
+         {std::pair{".kit", " 18"}, {".kot", " 18"}, {".ktl", " no"}, {".kwl", " no"}}) {
       text("\tsetAttr -s ")
           .integer(keys)
           .text(" \"")

@@ -103,9 +103,11 @@ MayaToken MAYA_Parse::NextInCommand(const char** first, const char** last) {
 }
 
 double MAYA_Parse::ScanNumber(const char* first, const char* last) {
-  const std::string_view text = WordText(first, last);
+  // As WordText takes it: a token that is too long is empty. Its first NUL ends the number by itself.
+  const std::ptrdiff_t size = last - first + 1;
+  const bool isTaken = size <= static_cast<std::ptrdiff_t>(kLongestToken);
   double value = 0.0;
-  ThrowOnError(HostNumberScan(text.data(), static_cast<std::int64_t>(text.size()), &value));
+  ThrowOnError(HostNumberScan(first, isTaken ? size : 0, &value));
   return value;
 }
 

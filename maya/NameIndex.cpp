@@ -21,6 +21,18 @@ std::uint64_t FoldEight(std::uint64_t bytes) {
   return bytes | (upper >> 2);
 }
 
+// The first eight bytes, the first in the lowest bits on most processors; zeros where there are fewer.
+std::uint64_t LoadUpToEight(std::string_view text) {
+  std::uint64_t bytes = 0;
+  if (text.size() >= kWordSize) {
+    std::memcpy(&bytes, text.data(), kWordSize);
+    return bytes;
+  }
+  char* at = reinterpret_cast<char*>(&bytes);
+  for (const char c : text) *at++ = c;
+  return bytes;
+}
+
 // Differs from run to run, so that no scene can bring names that all meet in one place.
 std::uint64_t Seed() {
   static const std::uint64_t seed =
@@ -45,9 +57,7 @@ class NameIndex::FoldedName {
     const std::uint64_t seed = Seed();
     std::uint64_t state = seed + name.size();
     for (std::size_t at = 0; at < name.size(); at += kWordSize) {
-      std::uint64_t bytes = 0;
-      std::memcpy(&bytes, name.data() + at, std::min(kWordSize, name.size() - at));
-      const std::uint64_t folded = FoldEight(bytes);
+      const std::uint64_t folded = FoldEight(LoadUpToEight(name.substr(at)));
       words_[at / kWordSize] = folded;
       state = Mix(state + seed, folded);
     }
@@ -56,6 +66,13 @@ class NameIndex::FoldedName {
 
   std::uint32_t hash() const { return hash_; }
   std::uint32_t length() const { return length_; }
+
+  // Whether these are its words. A loop of its own, because names are a few words long.
+  bool Is(const std::uint64_t* words) const {
+    std::uint64_t difference = 0;
+    for (const std::uint64_t* own = begin(); own != end(); ++own, ++words) difference |= *own ^ *words;
+    return difference == 0;
+  }
   const std::uint64_t* begin() const { return words_; }
   const std::uint64_t* end() const { return words_ + (length_ + kWordSize - 1) / kWordSize; }
 
@@ -102,7 +119,7 @@ std::size_t NameIndex::Locate(const FoldedName& name) const {
   for (; entries_[at].index != kNoIndex; at = (at + 1) & mask) {
     const Entry& entry = entries_[at];
     if (entry.hash == name.hash() && entry.length == name.length() &&
-        std::equal(name.begin(), name.end(), words_.data() + entry.firstWord)) {
+        name.Is(words_.data() + entry.firstWord)) {
       break;
     }
   }
