@@ -45,7 +45,7 @@ void NodeChannels::ListSampled() {
 
 void NodeChannels::FetchRuns() {
   // Each sample reads each channel once, and one of them once more for its time.
-  std::int64_t gets = 2 * sharedCount;
+  std::int64_t gets = std::int64_t{2} * sharedCount;
   for (std::size_t i = 0; i < sampledCount; ++i) {
     Channel& channel = channels[sampled[i]];
     channel.run = static_cast<const MAYA_Key*>(RecordListGetRun(channel.keys, 0, channel.count, gets));

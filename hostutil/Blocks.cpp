@@ -45,6 +45,7 @@ void* TakePages(int64_t size) {
 }
 
 void* MovePages(void* block, int64_t size, int64_t newSize) {
+  if (WholePages(size) == WholePages(newSize)) return block;
   char* const target = ReservePages(WholePages(newSize));
   if (target == nullptr) return nullptr;
   const int how = MREMAP_MAYMOVE | MREMAP_FIXED;

@@ -1,7 +1,8 @@
 // The number scanner and the comparison of ratios.
 //
 // A number goes through one pass, which checks its form and gathers its digits. Most become a double by one
-// exact operation; the rest are read again by std::from_chars, which rounds correctly.
+// exact operation, or by one division that is rounded correctly; the rest are read again by std::from_chars,
+// very long ones in a form of bounded length.
 #include "hostutil/HostNumbers.h"
 
 #include <algorithm>
@@ -47,9 +48,10 @@ constexpr int64_t kExponentLimit = 100'000'000'000'000'000;
 constexpr int64_t kLongestPlainNumber = 64;
 
 bool IsDigit(char c) { return c >= '0' && c <= '9'; }
-unsigned DigitOf(char c) {
-  return static_cast<unsigned>(static_cast<unsigned char>(c)) - '0';
-}  // 10 and up: none
+
+// 10 and more for what is no digit.
+unsigned DigitOf(char c) { return static_cast<unsigned>(static_cast<unsigned char>(c)) - '0'; }
+
 bool IsLetter(char c) { return (c >= 'A' && c <= 'Z') || (c >= 'a' && c <= 'z'); }
 
 // A position in the text; at the end it reads as a NUL.

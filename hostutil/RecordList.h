@@ -45,8 +45,8 @@ HOSTUTIL_API HostError RecordListGet(const RecordList* list, int64_t index, void
 
 /* The address of `count` records (1 or more) from `index` on, which lie one behind the other, for one who is
  * going to copy them out `gets` times in all; those copies are then not to be made, and count as calls of
- * RecordListGet. Null where they have to be made one by one: when records are missing, or a failure is
- * planned. Valid until the next append. */
+ * RecordListGet at once, also those that an end before the last one leaves out. Null where they have to be
+ * made one by one: when records are missing, or a failure is planned. Valid until the next append. */
 HOSTUTIL_API const void* RecordListGetRun(const RecordList* list, int64_t index, int64_t count, int64_t gets);
 
 /* Hands out the address of record `index`, for reading and writing; it stays the same until the matching

@@ -1,13 +1,14 @@
 #include "maya/ConnectionScout.h"
 
-#include <cstring>
 #include <string_view>
+
+#include "maya/SceneRecords.h"
 
 namespace {
 
 constexpr std::string_view kCommand = "connectAttr \"";
 constexpr std::string_view kBetween = "\" \"";
-constexpr std::size_t kLongestName = 255;
+constexpr std::size_t kLongestName = kNameCapacity - 1;
 
 // The node's name in the plug at the beginning of the text, which then begins behind the plug. Empty where
 // there is no plug.
@@ -24,7 +25,7 @@ std::string_view TakePlug(std::string_view* text) {
 void ConnectionScout::LookAhead(const char* position, const char* end, const NameIndex& curves,
                                 const NameIndex& transforms) {
   ++reached_;
-  if (next_ < position || reached_ > read_) {
+  if (next_ == nullptr || next_ < position || reached_ > read_) {
     next_ = position;
     read_ = reached_;
   }

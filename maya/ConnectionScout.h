@@ -24,7 +24,7 @@ class ConnectionScout {
 
   bool ReadCommand(const char* end, Ends* ends);
 
-  const char* next_ = nullptr;  // behind the last command that was looked at
+  const char* next_ = nullptr;  // the line of the last command that was looked at; null before the first
   std::size_t read_ = 0;        // commands looked at
   std::size_t reached_ = 0;     // commands whose turn has come
   Ends ends_[kFar];

@@ -47,8 +47,9 @@ void MAYA_Parse::WriteBackCurve() {
   });
 }
 
-// Reads to behind the key attribute; hands out the last number before it, the key count as a rule. False when
-// the command ends without one.
+// Reads to behind the key attribute; hands out the last number before it, the key count as a rule. Numbers
+// behind another attribute are passed over, so that the count is then unknown, and no room is made before it
+// is needed. False when the command ends without one.
 bool MAYA_Parse::FindKeyAttribute(std::string_view* lastNumber) {
   bool otherAttribute = false;
   for (;;) {
