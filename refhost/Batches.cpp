@@ -29,11 +29,12 @@ void dropKeysWithoutValue(Batch& batch) {
 // Whether the times have one scale and grow. Looks at all of them, so that the compiler can take several at a
 // time.
 bool isPlainlyAscending(const std::vector<T_Time>& times) {
-  bool plain = times.front().scale != 0;
+  unsigned inOrder = times.front().scale != 0 ? 1 : 0;
   for (std::size_t i = 1; i < times.size(); ++i) {
-    plain &= (times[i].scale == times[0].scale) & (times[i].value > times[i - 1].value);
+    inOrder &= static_cast<unsigned>(times[i].scale == times[0].scale);
+    inOrder &= static_cast<unsigned>(times[i].value > times[i - 1].value);
   }
-  return plain;
+  return inOrder != 0;
 }
 
 bool isAscending(const std::vector<T_Time>& times) {
