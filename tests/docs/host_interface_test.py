@@ -88,7 +88,6 @@ class HostInterface(unittest.TestCase):
         )
         # What the headers' inline parts call, by what the sources write.
         inline = {
-            "HostCompareNoCase": "EqualNoCase",
             "HostTranslateAndReport": "TranslateAndReport",
             "UTF16StringRelease": "UTF16Handle",
         }

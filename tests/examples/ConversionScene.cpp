@@ -1,4 +1,5 @@
 #include "tests/examples/ConversionScene.h"
+#include "tests/support/SplitMix.h"
 
 #include <array>
 #include <cstdio>
@@ -44,13 +45,8 @@ ConversionScene::ConversionScene(const SceneTraits& traits, std::uint64_t seed)
   for (std::size_t point = 0; point < kPoints; ++point) addPoint(point);
 }
 
-// The same numbers on every platform (splitmix64).
 double ConversionScene::between(double low, double high) {
-  state_ += 0x9e3779b97f4a7c15u;
-  std::uint64_t mixed = state_;
-  mixed = (mixed ^ (mixed >> 30)) * 0xbf58476d1ce4e5b9u;
-  mixed = (mixed ^ (mixed >> 27)) * 0x94d049bb133111ebu;
-  mixed ^= mixed >> 31;
+  const std::uint64_t mixed = testsupport::SplitMix(&state_);
   constexpr double unit = 1.0 / 9007199254740992.0;  // 2^-53
   return low + (high - low) * (static_cast<double>(mixed >> 11) * unit);
 }

@@ -5,6 +5,8 @@
 #include <string>
 #include <string_view>
 
+#include "tests/support/SplitMix.h"
+
 namespace hostutil_tests {
 
 // The same numbers from the same seed on every machine.
@@ -12,12 +14,7 @@ class SeededBits {
  public:
   explicit SeededBits(std::uint64_t seed) : state_(seed) {}
 
-  std::uint64_t Next() {
-    std::uint64_t bits = state_ += 0x9e3779b97f4a7c15;
-    bits = (bits ^ (bits >> 30)) * 0xbf58476d1ce4e5b9;
-    bits = (bits ^ (bits >> 27)) * 0x94d049bb133111eb;
-    return bits ^ (bits >> 31);
-  }
+  std::uint64_t Next() { return testsupport::SplitMix(&state_); }
 
   // From `least` to `most`.
   int Pick(int least, int most) {

@@ -107,5 +107,35 @@ TEST_F(RecordListRunTest, ARunCountsAndFailsAsOneAppend) {
   EXPECT_EQ(Records(), (std::vector<int64_t>{1, 2, 3, 1}));
 }
 
+TEST_F(RecordListRunTest, ARunIsReadWhereItLiesAndCountsAsTheGetsItStandsFor) {
+  const std::array<int64_t, 4> records = {3, 5, 7, 9};
+  ASSERT_EQ(RecordListAppendRun(list_, records.data(), 4), HOST_ERR_NONE);
+  HostBeginRehearsal();
+  const auto* run = static_cast<const int64_t*>(RecordListGetRun(list_, 1, 3, 11));
+  ASSERT_NE(run, nullptr);
+  EXPECT_EQ((std::vector<int64_t>(run, run + 3)), (std::vector<int64_t>{5, 7, 9}));
+  EXPECT_EQ(HostUtilityCallCount(HOST_UTILITY_ListGet), 11);
+}
+
+TEST_F(RecordListRunTest, NoRunIsReadWhereRecordsAreMissingOrAFailureIsPlanned) {
+  const std::array<int64_t, 4> records = {3, 5, 7, 9};
+  ASSERT_EQ(RecordListAppendRun(list_, records.data(), 4), HOST_ERR_NONE);
+  HostBeginRehearsal();
+  EXPECT_EQ(RecordListGetRun(nullptr, 0, 1, 1), nullptr);
+  for (const auto& [index, count] : {std::pair<int64_t, int64_t>{-1, 2},
+                                     {0, 5},
+                                     {4, 1},
+                                     {2, 3},
+                                     {0, 0},
+                                     {0, -1},
+                                     {INT64_MAX, 1},
+                                     {0, INT64_MAX}})
+    EXPECT_EQ(RecordListGetRun(list_, index, count, 1), nullptr) << index << " " << count;
+  const HostUtilityFailure failure{HOST_UTILITY_ListGet, 50, 4711, HOST_THROW_NOTHING};
+  ASSERT_EQ(HostAddUtilityFailure(&failure), 0);
+  EXPECT_EQ(RecordListGetRun(list_, 0, 4, 4), nullptr);
+  EXPECT_EQ(HostUtilityCallCount(HOST_UTILITY_ListGet), 0);
+}
+
 }  // namespace
 }  // namespace hostutil_tests

@@ -15,8 +15,9 @@ HostOptions prepared(HostOptions options, std::ostream* trace) {
 
 }  // namespace
 
-StandIn::StandIn(HostOptions options, Callback callback)
-    : host_(prepared(std::move(options), &trace_)), folder_(host_.beginCallback(callback, "scene.ma")) {}
+StandIn::StandIn(HostOptions options, Callback callback, bool traced)
+    : host_(prepared(std::move(options), traced ? &trace_ : nullptr)),
+      folder_(host_.beginCallback(callback, "scene.ma")) {}
 
 VOR_Item* StandIn::enterAgain(Callback callback) {
   folder_ = host_.beginCallback(callback, "again.ma");

@@ -20,7 +20,7 @@ inline constexpr std::int32_t kPluginId = 7;
 class StandIn {
  public:
   // Begins the callback at once. The options' plug-in id and trace are the stand-in's own.
-  explicit StandIn(HostOptions options = {}, Callback callback = Callback::Import);
+  explicit StandIn(HostOptions options = {}, Callback callback = Callback::Import, bool traced = true);
 
   Host& host() { return host_; }
   VOR_Item* folder() { return folder_; }

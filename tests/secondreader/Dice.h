@@ -5,20 +5,15 @@
 #include <cstdint>
 #include <iterator>
 
+#include "tests/support/SplitMix.h"
+
 namespace secondreader {
 
 class Dice {
  public:
   explicit Dice(std::uint64_t seed) : state_(seed) {}
 
-  // The steps of SplitMix64.
-  std::uint64_t next() {
-    state_ += 0x9e3779b97f4a7c15u;
-    std::uint64_t mixed = state_;
-    mixed = (mixed ^ (mixed >> 30)) * 0xbf58476d1ce4e5b9u;
-    mixed = (mixed ^ (mixed >> 27)) * 0x94d049bb133111ebu;
-    return mixed ^ (mixed >> 31);
-  }
+  std::uint64_t next() { return testsupport::SplitMix(&state_); }
 
   std::size_t below(std::size_t bound) { return static_cast<std::size_t>(next() % bound); }
   // Both ends included.

@@ -7,12 +7,12 @@
 #include <iostream>
 #include <new>
 
+#include "refhost/ProcessMemory.h"
 #include "tools/mayascene/Arguments.h"
 #include "tools/mayascene/Diagnostics.h"
 #include "tools/mayascene/ImportCommand.h"
 #include "tools/mayascene/Interruption.h"
 #include "tools/mayascene/PrefsCommand.h"
-#include "tools/mayascene/ProcessMemory.h"
 #include "tools/mayascene/VerifyCommand.h"
 
 namespace {
@@ -47,7 +47,7 @@ void holdStandardDescriptors() {
 
 int main(int argc, char** argv) {
   holdStandardDescriptors();
-  mayascene::useLargePages();
+  refhost::useLargePages();
   mayascene::handleInterruptions();
   ExitStatus status = ExitStatus::CannotWrite;
   try {

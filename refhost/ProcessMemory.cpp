@@ -1,15 +1,16 @@
-#include "tools/mayascene/ProcessMemory.h"
+#include "refhost/ProcessMemory.h"
 
 #include <cstdint>
 #include <cstdlib>
 
 #if defined(__GLIBC__)
 #include <malloc.h>
-#include <sys/mman.h>
 #include <unistd.h>
+
+#include "hostutil/HostSetup.h"
 #endif
 
-namespace mayascene {
+namespace refhost {
 
 #if defined(__GLIBC__)
 namespace {
@@ -30,13 +31,10 @@ void useLargePages() {
   std::free(extended);
   mallopt(M_TOP_PAD, kUsualReserve);
   auto* const after = static_cast<char*>(sbrk(0));
-  if (after <= before) return;
-  const auto page = static_cast<std::uintptr_t>(sysconf(_SC_PAGESIZE));
-  auto* const first = before + (page - reinterpret_cast<std::uintptr_t>(before) % page) % page;
-  madvise(first, static_cast<std::size_t>(after - first), MADV_HUGEPAGE);
+  if (after > before) HostAdviseLargePages(before, after - before);
 }
 #else
 void useLargePages() {}
 #endif
 
-}  // namespace mayascene
+}  // namespace refhost
