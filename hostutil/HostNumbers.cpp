@@ -300,6 +300,7 @@ bool ScanRest(Cursor* cursor, Decimal* decimal) {
   for (unsigned digit = DigitOf(*at); digit <= 9; digit = DigitOf(*++at)) mantissa = mantissa * 10 + digit;
   int64_t digits = at - first;
   int64_t fraction = 0;
+  if (digits == 0 && *at != '.') return nullptr;
   if (*at == '.') {
     const char* const point = at++;
     at = PlainDigits(at, end, &mantissa);

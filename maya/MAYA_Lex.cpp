@@ -2,9 +2,11 @@
 // calls the host only to show its two messages.
 #include "maya/MAYA_Lex.h"
 
+#include <array>
 #include <cstring>
 #include <string_view>
 
+#include "maya/ByteScan.h"
 #include "maya/CharacterClasses.h"
 #include "maya/HarmlessText.h"
 #include "maya/Words.h"
@@ -15,7 +17,7 @@ namespace {
 
 struct Keyword {
   std::string_view word;
-  MayaToken kind;
+  MayaToken kind = Identifier;
 };
 
 constexpr Keyword kKeywords[] = {
@@ -31,12 +33,28 @@ constexpr Keyword kKeywords[] = {
     {"currentUnit", CurrentUnit},
 };
 
-MayaToken KeywordOrIdentifier(std::string_view word) {
-  const unsigned char first = FoldCase(static_cast<unsigned char>(word.front()));
+constexpr std::size_t kLongestKeyword = std::string_view("disconnectAttr").size();
+
+// Few keywords are of one length, and most words that are none are of a length that no keyword has.
+struct KeywordsOfLength {
+  std::array<Keyword, 2> keywords{};
+  std::size_t count = 0;
+};
+
+constexpr auto kKeywordsByLength = [] {
+  std::array<KeywordsOfLength, kLongestKeyword + 1> table{};
   for (const Keyword& keyword : kKeywords) {
-    if (first == static_cast<unsigned char>(keyword.word.front()) && SameWord(word, keyword.word)) {
-      return keyword.kind;
-    }
+    KeywordsOfLength& entry = table[keyword.word.size()];
+    entry.keywords[entry.count++] = keyword;
+  }
+  return table;
+}();
+
+MayaToken KeywordOrIdentifier(std::string_view word) {
+  if (word.size() > kLongestKeyword) return Identifier;
+  const KeywordsOfLength& candidates = kKeywordsByLength[word.size()];
+  for (std::size_t i = 0; i < candidates.count; ++i) {
+    if (SameWord(word, candidates.keywords[i].word)) return candidates.keywords[i].kind;
   }
   return Identifier;
 }
@@ -101,14 +119,15 @@ MayaToken MAYA_Lex::GetNextToken(const char** start, const char** last) {
 }
 
 void MAYA_Lex::SkipWhiteSpace() {
-  while (IsWhiteSpace(*position)) {
-    if (*position == '\n') ++line;
-    ++position;
-  }
-  tokenStart = position;
+  const char* at = position;
+  for (; IsWhiteSpace(*at); ++at) line += *at == '\n' ? 1 : 0;
+  tokenStart = position = at;
 }
 
 void MAYA_Lex::SkipHarmless() {
+  if (position > end_) return;
+  SkipWhiteSpace();
+  if (IsAny(*position, kStopClass)) return;  // as a rule the next command begins here
   static const SkipHarmlessText skip = HarmlessTextSkippers().back().skip;
   tokenStart = position = skip(position, end_, &line);
 }
@@ -132,8 +151,7 @@ MayaToken MAYA_Lex::ParseQuote() {
   // a quote keeps the string open. Reading escapes in pairs would end such a string earlier.
   const char* at = position;
   do {
-    ++at;
-    while (!IsAny(*at, kQuoteClass | kNulClass)) ++at;
+    at = FindQuote(at + 1, end_);
   } while (*at == '"' && at[-1] == '\\');
   position = at;
   if (*at == '\0') FailAtEnd();
@@ -192,7 +210,7 @@ MayaToken MAYA_Lex::ParseID() {
 void MAYA_Lex::ScanWord() {
   const char* at = position;
   for (;;) {
-    while (!IsAny(*at, kTerminatorClass | kNulClass)) ++at;
+    at = FindWordEnd(at, end_);
     // An embedded NUL is part of the word; only the end of the text is not.
     if (*at != '\0') break;
     position = at;

@@ -233,6 +233,7 @@ class MAYA_Parse : public MAYA_Lex {
   template <typename Record>
   void WriteBack(RecordList* list, const Record& record);
   void ReadOrthographic();
+  int ReadPlainPair(double* values, int capacity);
   int ReadNumbers(double* values, int capacity);
   template <std::size_t Count>
   void ReadComponents(double (&field)[Count]);

@@ -14,8 +14,9 @@ inline constexpr std::size_t kLongestToken = 254;
 inline std::string_view WordText(const char* first, const char* last) {
   const auto length = static_cast<std::size_t>(last - first) + 1;
   if (length > kLongestToken) return "";
-  const auto* nul = static_cast<const char*>(std::memchr(first, '\0', length));
-  return {first, nul != nullptr ? static_cast<std::size_t>(nul - first) : length};
+  std::size_t size = 0;
+  while (size < length && first[size] != '\0') ++size;
+  return {first, size};
 }
 
 // The text of a string token, without its quotes. The quotes count for its length.

@@ -56,6 +56,20 @@ TEST_F(LexTest, ThePositionStaysOnTheNulOfAnUnexpectedEnd) {
   }
 }
 
+TEST_F(LexTest, NothingIsPassedOverBehindTheEnd) {
+  const GuardedText text("a ");
+  MAYA_Lex lex(host_.basicSuite(), text.begin(), text.end());
+  const char* start = nullptr;
+  const char* last = nullptr;
+  while (lex.GetNextToken(&start, &last) != EndOfFile) continue;
+  const char* const behind = lex.position;
+  ASSERT_EQ(behind, text.end() + 1);
+  lex.SkipHarmless();
+  EXPECT_EQ(lex.position, behind);
+  lex.SkipHarmlessInCommand();
+  EXPECT_EQ(lex.position, behind);
+}
+
 TEST_F(LexTest, ALineCommentTakesItsLineEndAlong) {
   ExpectTokens("//a b\nc ", {{Comment, "//a b\n"}, {Identifier, "c"}});
   ExpectTokens("//a\r\nc ", {{Comment, "//a\r"}, {Identifier, "c"}});

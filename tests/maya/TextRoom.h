@@ -1,0 +1,46 @@
+// Texts right before a page that nobody may read.
+#pragma once
+
+#include <sys/mman.h>
+#include <unistd.h>
+
+#include <cstddef>
+#include <cstdlib>
+#include <cstring>
+#include <new>
+#include <string_view>
+
+namespace testsupport {
+
+// Where texts are put one after the other, with a page behind them that nobody may read.
+class TextRoom {
+ public:
+  TextRoom() : page_(static_cast<std::size_t>(sysconf(_SC_PAGESIZE))) {
+    region_ = mmap(nullptr, kRoom + page_, PROT_READ | PROT_WRITE, MAP_PRIVATE | MAP_ANONYMOUS, -1, 0);
+    if (region_ == MAP_FAILED) throw std::bad_alloc();
+    guard_ = static_cast<char*>(region_) + kRoom;
+    if (mprotect(guard_, page_, PROT_NONE) != 0) std::abort();
+  }
+  ~TextRoom() { munmap(region_, kRoom + page_); }
+  TextRoom(const TextRoom&) = delete;
+  TextRoom& operator=(const TextRoom&) = delete;
+
+  // Copies the text to where its NUL is followed by `gap` bytes, then by the page. Returns the NUL's place.
+  const char* Put(std::string_view text, std::size_t gap) {
+    char* const end = guard_ - gap - 1;
+    std::memcpy(end - text.size(), text.data(), text.size());
+    *end = '\0';
+    // Whoever reads these bytes sees keywords, quotes and terminators.
+    for (std::size_t i = 0; i < gap; ++i) end[1 + i] = "c \"/;-"[i % 6];
+    return end;
+  }
+
+ private:
+  static constexpr std::size_t kRoom = std::size_t{1} << 16;
+
+  std::size_t page_;
+  void* region_ = nullptr;
+  char* guard_ = nullptr;
+};
+
+}  // namespace testsupport
