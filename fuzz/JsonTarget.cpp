@@ -52,7 +52,7 @@ std::unique_ptr<refhost::KeyColumns> TakeKeys(Bytes& bytes, std::size_t count, s
     time += 1 + bytes.Take<std::uint8_t>();
     for (std::size_t i = 0; i < dimension; ++i) keys->values.push_back(bytes.Take<double>());
   }
-  keys->times = std::move(times);
+  keys->times = refhost::KeyTimes(std::move(times));
   return keys;
 }
 

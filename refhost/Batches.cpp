@@ -61,7 +61,12 @@ KeyColumns sorted(const std::vector<T_Time>& times, const std::vector<double>& v
     const auto first = values.begin() + static_cast<std::ptrdiff_t>(order[place] * dimension);
     sortedValues.insert(sortedValues.end(), first, first + static_cast<std::ptrdiff_t>(dimension));
   }
-  return {std::move(sortedTimes), std::move(sortedValues)};
+  return {KeyTimes(std::move(sortedTimes)), std::move(sortedValues)};
+}
+
+KeyColumns inOrder(std::vector<T_Time>&& times, std::vector<double>&& values, std::size_t dimension) {
+  if (!isAscending(times)) return sorted(times, values, dimension);
+  return {KeyTimes(std::move(times)), std::move(values)};
 }
 
 }  // namespace
@@ -114,9 +119,8 @@ void commitKeys(Batch& batch, std::unique_ptr<KeyColumns>& keys, KeyTimes* ascen
   std::vector<T_Time> times;
   if (keys != nullptr) times = keys->times;
   times.insert(times.end(), batch.times.begin(), batch.times.end());
-  KeyColumns columns = isAscending(times)
-                           ? KeyColumns{std::move(times), std::move(values)}
-                           : sorted(times, values, static_cast<std::size_t>(batch.stream->dimension));
+  const auto dimension = static_cast<std::size_t>(batch.stream->dimension);
+  KeyColumns columns = inOrder(std::move(times), std::move(values), dimension);
   *ascending = columns.times;
   keys = std::make_unique<KeyColumns>(std::move(columns));
 }

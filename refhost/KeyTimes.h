@@ -18,7 +18,7 @@ class KeyTimes {
   using const_iterator = std::vector<T_Time>::const_iterator;
 
   KeyTimes() : KeyTimes(std::vector<T_Time>{}) {}
-  KeyTimes(std::vector<T_Time> times)
+  explicit KeyTimes(std::vector<T_Time> times)
       : times_(std::make_shared<const std::vector<T_Time>>(std::move(times))) {}
   KeyTimes(std::initializer_list<T_Time> times) : KeyTimes(std::vector<T_Time>(times)) {}
 

@@ -65,7 +65,7 @@ Layer& ProjectEditor::addCameraLayer(Composition& composition, const char* name,
       std::vector<T_Time> times;
       for (int32_t key = 0; key < zoomKeys; ++key) times.push_back({key, 1});
       const std::vector<double> values(times.size(), stream.value[0]);
-      stream.keys = std::make_unique<KeyColumns>(KeyColumns{std::move(times), values});
+      stream.keys = std::make_unique<KeyColumns>(KeyColumns{KeyTimes(std::move(times)), values});
     }
   }
   return layer;

@@ -126,6 +126,8 @@ struct CameraStreamCase {
   const char* property;
 };
 
+void PrintTo(const CameraStreamCase& known, std::ostream* stream) { *stream << known.property; }
+
 class CameraStreams : public ::testing::TestWithParam<CameraStreamCase> {};
 
 TEST_P(CameraStreams, HandleWhoseValueWasRefusedIsKeptByDesign) {

@@ -69,7 +69,7 @@ refhost::Stream keyed(std::vector<T_Time> times, std::vector<double> values) {
   refhost::Stream stream;
   stream.dimension = 1;
   stream.keys = std::make_unique<refhost::KeyColumns>();
-  stream.keys->times = std::move(times);
+  stream.keys->times = refhost::KeyTimes(std::move(times));
   stream.keys->values = std::move(values);
   return stream;
 }
