@@ -16,7 +16,7 @@ namespace {
 
 using fuzz::Require;
 
-// A token that the reader's main loop acts on, or the error that reading ended with.
+// A token that the reader looks at, or the error that reading ended with.
 struct Event {
   std::int32_t kind;  // of the token, or the code of the error
   std::int64_t first;
@@ -26,13 +26,22 @@ struct Event {
   bool operator==(const Event&) const = default;
 };
 
-bool Acts(MayaToken kind) {
+enum class Where { BetweenCommands, InCommand };
+
+// What every skipper stops at. In a command these are its end, strings, comments and options.
+bool Acts(Where where, MayaToken kind) {
   switch (kind) {
     case CreateNode:
     case SetAttr:
     case ConnectAttr:
     case Select:
     case CurrentUnit:
+      return where == Where::BetweenCommands;
+    case Semicolon:
+    case Option:
+      return where == Where::InCommand;
+    case String:
+    case Comment:
     case EndOfFile:
       return true;
     default:
@@ -68,7 +77,7 @@ void CheckError(const Text& text, const MAYA_Lex& lexer, int code) {
 }
 
 // Reads all of the text, with the skipper, where there is one, before each token.
-void Read(const Text& text, SkipHarmlessText skip, std::vector<Event>* events) {
+void Read(const Text& text, Where where, SkipHarmlessText skip, std::vector<Event>* events) {
   events->clear();
   fuzz::ReaderHost host;
   MAYA_Lex lexer(host.basicSuite(), text.begin, text.end);
@@ -82,7 +91,7 @@ void Read(const Text& text, SkipHarmlessText skip, std::vector<Event>* events) {
       const char* last = nullptr;
       kind = lexer.GetNextToken(&first, &last);
       CheckToken(text, kind, before, first, last);
-      if (Acts(kind)) events->push_back({kind, offset(first), offset(last), lexer.line});
+      if (Acts(where, kind)) events->push_back({kind, offset(first), offset(last), lexer.line});
       if (kind == EndOfFile) CheckEnd(lexer, first);
     }
     Require(host.messages() == 0, "a text without an error has no message");
@@ -101,10 +110,12 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   static std::vector<Event> skipped;
   const char* const begin = memory.Hold(fuzz::TextOf(data, size), 1);
   const Text text{begin, begin + size};
-  Read(text, nullptr, &plain);
-  for (const HarmlessTextSkipper& skipper : HarmlessTextSkippers()) {
-    Read(text, skipper.skip, &skipped);
-    Require(skipped == plain, "passing over harmless text changes nothing of what is found");
+  for (const Where where : {Where::BetweenCommands, Where::InCommand}) {
+    Read(text, where, nullptr, &plain);
+    for (const HarmlessTextSkipper& skipper : HarmlessTextSkippers()) {
+      Read(text, where, where == Where::InCommand ? skipper.skipInCommand : skipper.skip, &skipped);
+      Require(skipped == plain, "passing over harmless text changes nothing of what is found");
+    }
   }
   return 0;
 }

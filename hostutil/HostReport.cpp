@@ -1,4 +1,5 @@
-// Translate-and-report: a standard exception becomes a message to the user and a code.
+// Translate-and-report: a standard exception becomes a message to the user and a code. And the note of a
+// line.
 #include "hostutil/HostReport.h"
 
 #include <cstring>
@@ -12,6 +13,9 @@ namespace {
 
 HostReporter currentReporter = nullptr;
 void* currentContext = nullptr;
+
+HostError notedCode = HOST_ERR_NONE;
+int64_t notedLine = 0;
 
 // The memory may be exhausted: the message is built in place, and cut behind its last character that fits.
 constexpr int64_t kMessageCapacity = 1024;
@@ -56,4 +60,15 @@ HostError HostTranslateAndReport(int32_t kind, const char* what) {
 void HostSetReporter(HostReporter reporter, void* context) {
   currentReporter = reporter;
   currentContext = context;
+}
+
+void HostNoteLine(HostError code, int64_t line) {
+  notedCode = code;
+  notedLine = line;
+}
+
+int64_t HostTakeNotedLine(HostError code) {
+  const int64_t line = code == notedCode ? notedLine : 0;
+  HostNoteLine(HOST_ERR_NONE, 0);
+  return line;
 }

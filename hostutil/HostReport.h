@@ -1,4 +1,5 @@
-/* What becomes of a standard exception that reaches a callback: the host shows it and names a code. */
+/* What a plug-in tells the host of its failures: a standard exception that reaches a callback, which the host
+ * shows and names a code for; and the line of a scene where a failure was found. */
 #ifndef HOSTUTIL_HOSTREPORT_H
 #define HOSTUTIL_HOSTREPORT_H
 
@@ -17,6 +18,11 @@ enum { HOST_EXCEPTION_MEMORY = 1, HOST_EXCEPTION_OTHER = 2 };
  * the code, then ": " and `what`, unless that is null or empty; it is cut at 1023 bytes, and bytes that are
  * no UTF-8 are U+FFFD. Nothing is allocated. */
 HOSTUTIL_API HostError HostTranslateAndReport(int32_t kind, const char* what);
+
+/* Notes at which line of the scene, from 1, the failure was found that the callback is about to return with
+ * that code. The host may show it beside the code; nothing else comes of it. The last note counts. Cannot
+ * fail, also not in a rehearsal. */
+HOSTUTIL_API void HostNoteLine(HostError code, int64_t line);
 
 #ifdef __cplusplus
 }

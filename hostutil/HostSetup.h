@@ -28,6 +28,9 @@ typedef void (*HostReporter)(void* context, HostError code, const char* text);
 /* Null as the reporter: nothing is shown. */
 HOSTUTIL_API void HostSetReporter(HostReporter reporter, void* context);
 
+/* The line that HostNoteLine noted last, when it was for that code; else 0. The note is gone afterwards. */
+HOSTUTIL_API int64_t HostTakeNotedLine(HostError code);
+
 /* --- Ledger ------------------------------------------------------------------------------------- */
 
 enum { HOST_LEDGER_FILE = 1, HOST_LEDGER_LIST = 2 };

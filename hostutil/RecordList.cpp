@@ -106,12 +106,9 @@ HostError RecordListCreate(int64_t recordSize, int64_t growth, int64_t initial, 
   return HOST_ERR_NONE;
 }
 
-HostError RecordListAppend(RecordList* list, const void* record) {
-  return RecordListAppendRun(list, record, 1);
-}
+namespace {
 
-HostError RecordListAppendRun(RecordList* list, const void* records, int64_t count) {
-  if (HostError code; hostutil::Rehearsed(HOST_UTILITY_ListAppend, &code)) return code;
+HostError AppendRecords(RecordList* list, const void* records, int64_t count) {
   if (!IsList(list) || records == nullptr || count < 0) return HOST_ERR_UTILITY_NULL;
   if (list->locks != 0) return HOST_ERR_LIST_LOCKED;
   if (count == 0) return HOST_ERR_NONE;
@@ -119,6 +116,30 @@ HostError RecordListAppendRun(RecordList* list, const void* records, int64_t cou
   std::memcpy(list->At(list->count), records, ByteCount(count, list->recordSize));
   list->count += count;
   return HOST_ERR_NONE;
+}
+
+// One by one, up to the first that fails.
+HostError AppendInRehearsal(RecordList* list, const void* records, int64_t count) {
+  if (!IsList(list) || records == nullptr || count < 0) return HOST_ERR_UTILITY_NULL;
+  const auto* record = static_cast<const unsigned char*>(records);
+  for (int64_t i = 0; i < count; ++i) {
+    if (const HostError code = RecordListAppend(list, record); code != HOST_ERR_NONE) return code;
+    record += list->recordSize;
+  }
+  return HOST_ERR_NONE;
+}
+
+}  // namespace
+
+HostError RecordListAppend(RecordList* list, const void* record) {
+  if (HostError code; hostutil::Rehearsed(HOST_UTILITY_ListAppend, &code)) return code;
+  return AppendRecords(list, record, 1);
+}
+
+HostError RecordListAppendRun(RecordList* list, const void* records, int64_t count) {
+  if (!hostutil::MayWorkInBulk()) return AppendInRehearsal(list, records, count);
+  hostutil::CountCalls(HOST_UTILITY_ListAppend, std::max(count, int64_t{0}));
+  return AppendRecords(list, records, count);
 }
 
 void RecordListReserve(RecordList* list, int64_t count) {

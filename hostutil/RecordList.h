@@ -33,7 +33,8 @@ HOSTUTIL_API HostError RecordListCreate(int64_t recordSize, int64_t growth, int6
 HOSTUTIL_API HostError RecordListAppend(RecordList* list, const void* record);
 
 /* Appends copies of `count` records (0 or more) that lie one behind the other; all or, after a failure, none.
- * Counts as one append, and fails as one. */
+ * Counts as `count` calls of RecordListAppend. Where a rehearsal plans a failure it makes them one by one,
+ * and those before the one that fails stay. */
 HOSTUTIL_API HostError RecordListAppendRun(RecordList* list, const void* records, int64_t count);
 
 /* Makes room for `count` more records, so that they will be appended without growing. A hint: where there is

@@ -1,11 +1,13 @@
 // The lexer: white space, words, strings and comments. Reads and writes `tokenStart`, `position` and `line`;
-// calls the host only to show its two messages.
+// calls the host only to show its two messages, and notes where they come from.
 #include "maya/MAYA_Lex.h"
 
+#include <algorithm>
 #include <array>
 #include <cstring>
 #include <string_view>
 
+#include "hostutil/HostUtilities.h"
 #include "maya/ByteScan.h"
 #include "maya/CharacterClasses.h"
 #include "maya/HarmlessText.h"
@@ -223,11 +225,28 @@ void MAYA_Lex::ScanWord() {
 void MAYA_Lex::ReportError(const char* message) { UtilitySuite7().ShowMessage(G_plugin_idL, message); }
 
 void MAYA_Lex::FailReading() {
+  NoteLine(kReadingError, tokenStart);
   ReportError(LocalizedText(kReadingMessage));
   throw int{kReadingError};
 }
 
 void MAYA_Lex::FailAtEnd() {
+  // Of a token that is never closed, its beginning tells more than the end of the text.
+  NoteLine(kUnexpectedEnd, tokenStart);
   ReportError(LocalizedText(kUnexpectedEndMessage));
   throw int{kUnexpectedEnd};
+}
+
+// Counted once, when it is needed: `line` leaves out what stands inside strings and comments. A line ends as
+// editors see it, with a line feed, a carriage return or both.
+void MAYA_Lex::NoteLine(std::int32_t code, const char* at) const {
+  const char* place = std::min(at, end_);
+  if (place == end_) {  // behind the last line that holds something
+    while (place != buffer && IsWhiteSpace(place[-1])) --place;
+  }
+  std::int64_t number = 1;
+  for (const char* byte = buffer; byte != place; ++byte) {
+    if (*byte == '\n' || (*byte == '\r' && byte[1] != '\n')) ++number;
+  }
+  HostNoteLine(code, number);
 }

@@ -102,12 +102,14 @@ MayaToken MAYA_Parse::NextInCommand(const char** first, const char** last) {
   return kind;
 }
 
-double MAYA_Parse::ScanNumber(const char* first, const char* last) {
+double MAYA_Parse::ScanNumber(const char* first, const char* last) const {
   // As WordText takes it: a token that is too long is empty. Its first NUL ends the number by itself.
   const std::ptrdiff_t size = last - first + 1;
   const bool isTaken = size <= static_cast<std::ptrdiff_t>(kLongestToken);
   double value = 0.0;
-  ThrowOnError(HostNumberScan(first, isTaken ? size : 0, &value));
+  const HostError code = HostNumberScan(first, isTaken ? size : 0, &value);
+  if (code != kNoError) NoteLine(code, first);
+  ThrowOnError(code);
   return value;
 }
 

@@ -220,7 +220,7 @@ class MAYA_Parse : public MAYA_Lex {
  private:
   // maya/MAYA_Parse.cpp
   MayaToken NextInCommand(const char** first, const char** last);
-  static double ScanNumber(const char* first, const char* last);
+  double ScanNumber(const char* first, const char* last) const;
   void ClearCurrent();
   void DisposeLooseKeys();
 

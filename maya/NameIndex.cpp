@@ -1,8 +1,11 @@
 #include "maya/NameIndex.h"
 
 #include <algorithm>
+#include <array>
 #include <chrono>
 #include <cstring>
+#include <exception>
+#include <random>
 
 #include "maya/SceneRecords.h"
 
@@ -33,19 +36,40 @@ std::uint64_t LoadUpToEight(std::string_view text) {
   return bytes;
 }
 
-// Differs from run to run, so that no scene can bring names that all meet in one place.
-std::uint64_t Seed() {
-  static const std::uint64_t seed =
-      (static_cast<std::uint64_t>(std::chrono::steady_clock::now().time_since_epoch().count()) ^
-       reinterpret_cast<std::uintptr_t>(&kFirstCapacity)) *
-          0x9e3779b97f4a7c15u |
-      1;
-  return seed;
+// The halves of the words of a name, and its length.
+constexpr std::size_t kMostParts = kNameCapacity / sizeof(std::uint32_t) + 1;
+using Multipliers = std::array<std::uint64_t, kMostParts>;
+
+// Drawn anew in every run.
+Multipliers DrawMultipliers() {
+  std::uint64_t seed =
+      static_cast<std::uint64_t>(std::chrono::steady_clock::now().time_since_epoch().count()) ^
+      reinterpret_cast<std::uintptr_t>(&kFirstCapacity);
+  try {
+    std::random_device device;
+    seed ^= (std::uint64_t{device()} << 32) | device();
+  } catch (const std::exception&) {
+    // Without a source of chance, the time and the place in memory have to do.
+  }
+  std::mt19937_64 random(seed);
+  Multipliers multipliers;
+  for (std::uint64_t& multiplier : multipliers) multiplier = random();
+  return multipliers;
 }
 
-std::uint64_t Mix(std::uint64_t state, std::uint64_t bytes) {
-  state = (state ^ bytes) * 0xff51afd7ed558ccdu;
-  return state ^ (state >> 32);
+// A hash is the upper half of a sum of the parts, each times a number of its own that nobody knows
+// beforehand. Two names meet by a chance of about one in 2^31 whatever they are, so that no scene can bring
+// names that all meet in one place, as it could with a mixing of known steps.
+const Multipliers& MultipliersOfThisRun() {
+  static const Multipliers multipliers = DrawMultipliers();
+  return multipliers;
+}
+
+// Keeps what differs different, and scatters the sums of names that are numbered in a row.
+std::uint32_t Scatter(std::uint32_t sum) {
+  sum = (sum ^ (sum >> 16)) * 0x85ebca6bu;
+  sum = (sum ^ (sum >> 13)) * 0xc2b2ae35u;
+  return sum ^ (sum >> 16);
 }
 
 }  // namespace
@@ -54,14 +78,15 @@ std::uint64_t Mix(std::uint64_t state, std::uint64_t bytes) {
 class NameIndex::FoldedName {
  public:
   explicit FoldedName(std::string_view name) : length_(static_cast<std::uint32_t>(name.size())) {
-    const std::uint64_t seed = Seed();
-    std::uint64_t state = seed + name.size();
+    const std::uint64_t* multiplier = MultipliersOfThisRun().data();
+    std::uint64_t sum = *multiplier++ * length_;
     for (std::size_t at = 0; at < name.size(); at += kWordSize) {
       const std::uint64_t folded = FoldEight(LoadUpToEight(name.substr(at)));
       words_[at / kWordSize] = folded;
-      state = Mix(state + seed, folded);
+      sum += *multiplier++ * static_cast<std::uint32_t>(folded);
+      sum += *multiplier++ * (folded >> 32);
     }
-    hash_ = static_cast<std::uint32_t>(Mix(state, seed) >> 16);
+    hash_ = Scatter(static_cast<std::uint32_t>(sum >> 32));
   }
 
   std::uint32_t hash() const { return hash_; }

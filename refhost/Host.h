@@ -68,6 +68,7 @@ struct Leftover {
 // What came of one callback. The texts are UTF-8.
 struct CallbackResult {
   HostError code = 0;                 // what the callback returned
+  std::int64_t line = 0;              // of the scene, from 1, where the failure was found; 0: not known
   bool canImport = false;             // verify only
   std::vector<std::string> messages;  // shown to the user, in order
   std::vector<std::string> refusals;  // which call broke which promise, in order

@@ -105,6 +105,7 @@ CallbackResult HostState::end(HostError code, bool canImport) {
     refuse(std::string(callbackName(callback)) + ": silent errors had begun and were never ended");
   }
   result.code = code;
+  result.line = HostTakeNotedLine(code);
   result.canImport = canImport;
   result.messages = messages.takeShown();
   result.suiteCalls = rehearsal.calls();

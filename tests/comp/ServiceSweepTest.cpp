@@ -44,15 +44,22 @@ class ServiceSweepTest : public ::testing::TestWithParam<FailureScene> {
     return options;
   }
 
-  // Calls work(service, run) for every call of every service.
+  enum class Extent { Once, Onwards };
+
+  // Calls work(service, run) for every call of every service: that call alone fails, or every call from it
+  // on.
   template <typename Work>
-  void ForEachPoint(refhost::Failure::Kind kind, HostError code, Work work) {
+  void ForEachPoint(refhost::Failure::Kind kind, HostError code, Work work, Extent extent = Extent::Once) {
+    constexpr std::int64_t kMostFurtherCalls = 16;  // than those of the good run, to clean up
     for (std::size_t i = 0; i < counts_.size(); ++i) {
       for (std::int64_t nth = 1; nth <= counts_[i] && !HasFailure(); ++nth) {
         ++points_;
         SCOPED_TRACE(std::string(kServices[i]) + " " + std::to_string(nth));
         refhost::HostOptions options = Options();
-        options.failures.push_back({kServices[i], nth, false, kind, code});
+        const std::int64_t last = extent == Extent::Once ? nth : counts_[i] + kMostFurtherCalls;
+        for (std::int64_t call = nth; call <= last; ++call) {
+          options.failures.push_back({kServices[i], call, false, kind, code});
+        }
         const ImportRun run = ImportFile(file_, options);
         CheckNothingLeft(run, run.host->callCount("FileName") != 0);
         work(std::string_view(kServices[i]), run);
@@ -86,6 +93,34 @@ class ServiceSweepTest : public ::testing::TestWithParam<FailureScene> {
     return call == "ReleaseSuiteByName" || call == "UnlockMemHandle" || call == "FreeMemHandle";
   }
 
+  void SweepCode(Extent extent) {
+    const auto check = [&](std::string_view service, const ImportRun& run) {
+      EXPECT_EQ(run.result.messages.size(), Shown(run));
+      if (service == "StringCopy") {  // a message that does not fit is not shown, and nothing else changes
+        EXPECT_EQ(run.result.code, goodCode_);
+        EXPECT_EQ(Shown(run), 0u);
+      } else {
+        EXPECT_EQ(run.result.code, kRehearsed);
+        CheckCleanUp(run);
+      }
+    };
+    ForEachPoint(refhost::Failure::Kind::Code, kRehearsed, check, extent);
+  }
+
+  void SweepExceptions(Extent extent) {
+    for (const auto& [kind, code] :
+         {std::pair{refhost::Failure::Kind::BadAlloc, HostError{HOST_ERR_EXCEPTION_MEMORY}},
+          std::pair{refhost::Failure::Kind::RuntimeError, HostError{HOST_ERR_EXCEPTION_OTHER}}}) {
+      const HostError expected = code;
+      const auto check = [&](std::string_view, const ImportRun& run) {
+        EXPECT_EQ(run.result.code, expected);
+        EXPECT_EQ(run.result.messages.size(), Shown(run) + 1);
+        CheckCleanUp(run);
+      };
+      ForEachPoint(kind, 0, check, extent);
+    }
+  }
+
   std::size_t Shown(const ImportRun& run) { return CallsOf(run.trace, "ShowMessage").size(); }
 
   const TemporaryFile file_;
@@ -95,30 +130,16 @@ class ServiceSweepTest : public ::testing::TestWithParam<FailureScene> {
   int points_ = 0;
 };
 
-TEST_P(ServiceSweepTest, AServiceThatFailsGivesItsCode) {
-  ForEachPoint(refhost::Failure::Kind::Code, kRehearsed, [&](std::string_view service, const ImportRun& run) {
-    EXPECT_EQ(run.result.messages.size(), Shown(run));
-    if (service == "StringCopy") {  // a message that does not fit is not shown, and nothing else changes
-      EXPECT_EQ(run.result.code, goodCode_);
-      EXPECT_EQ(Shown(run), 0u);
-    } else {
-      EXPECT_EQ(run.result.code, kRehearsed);
-      CheckCleanUp(run);
-    }
-  });
-}
+TEST_P(ServiceSweepTest, AServiceThatFailsGivesItsCode) { SweepCode(Extent::Once); }
+
+TEST_P(ServiceSweepTest, AServiceThatFailsForEverGivesItsCode) { SweepCode(Extent::Onwards); }
 
 TEST_P(ServiceSweepTest, AnExceptionOutOfAServiceIsReportedOnceAndBecomesItsCode) {
-  ForEachPoint(refhost::Failure::Kind::BadAlloc, 0, [&](std::string_view, const ImportRun& run) {
-    EXPECT_EQ(run.result.code, HOST_ERR_EXCEPTION_MEMORY);
-    EXPECT_EQ(run.result.messages.size(), Shown(run) + 1);
-    CheckCleanUp(run);
-  });
-  ForEachPoint(refhost::Failure::Kind::RuntimeError, 0, [&](std::string_view, const ImportRun& run) {
-    EXPECT_EQ(run.result.code, HOST_ERR_EXCEPTION_OTHER);
-    EXPECT_EQ(run.result.messages.size(), Shown(run) + 1);
-    CheckCleanUp(run);
-  });
+  SweepExceptions(Extent::Once);
+}
+
+TEST_P(ServiceSweepTest, EndlessExceptionsOutOfAServiceAreReportedOnceAndBecomeTheirCode) {
+  SweepExceptions(Extent::Onwards);
 }
 
 TEST_P(ServiceSweepTest, AServiceThatDoesNothingAndSaysSuccessGivesNoUnknownCode) {

@@ -90,5 +90,23 @@ TEST_F(HostReportTest, WithoutAReporterTheCodeIsReturnedAllTheSame) {
   EXPECT_TRUE(reports_.empty());
 }
 
+TEST_F(HostReportTest, ANotedLineIsTakenOnceByTheCodeThatItIsFor) {
+  HostNoteLine(2043, 7);
+  EXPECT_EQ(HostTakeNotedLine(2043), 7);
+  EXPECT_EQ(HostTakeNotedLine(2043), 0);
+}
+
+TEST_F(HostReportTest, ANotedLineIsGoneWhenAnotherCodeAsksForIt) {
+  HostNoteLine(2043, 7);
+  EXPECT_EQ(HostTakeNotedLine(2044), 0);
+  EXPECT_EQ(HostTakeNotedLine(2043), 0);
+}
+
+TEST_F(HostReportTest, TheLastNotedLineCounts) {
+  HostNoteLine(2043, 7);
+  HostNoteLine(2044, 9);
+  EXPECT_EQ(HostTakeNotedLine(2044), 9);
+}
+
 }  // namespace
 }  // namespace hostutil_tests

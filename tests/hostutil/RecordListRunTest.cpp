@@ -96,13 +96,25 @@ TEST_F(RecordListRunTest, RoomThatCannotBeMadeIsNoFailure) {
   EXPECT_EQ(Records(), (std::vector<int64_t>{7}));
 }
 
-TEST_F(RecordListRunTest, ARunCountsAndFailsAsOneAppend) {
+TEST_F(RecordListRunTest, ARunCountsAsSoManyAppends) {
   const std::array<int64_t, 3> run = {1, 2, 3};
-  WithFailure({HOST_UTILITY_ListAppend, 2, 4711, HOST_THROW_NOTHING}, [&] {
+  HostBeginRehearsal();
+  EXPECT_EQ(RecordListAppendRun(list_, run.data(), 3), HOST_ERR_NONE);
+  EXPECT_EQ(RecordListAppend(list_, run.data()), HOST_ERR_NONE);
+  EXPECT_EQ(RecordListAppendRun(list_, run.data(), 0), HOST_ERR_NONE);
+  HostEndRehearsal();
+  EXPECT_EQ(HostUtilityCallCount(HOST_UTILITY_ListAppend), 4);
+}
+
+TEST_F(RecordListRunTest, WhereAFailureIsPlannedARunIsAppendedUpToTheOneThatFails) {
+  const std::array<int64_t, 3> run = {1, 2, 3};
+  WithFailure({HOST_UTILITY_ListAppend, 5, 4711, HOST_THROW_NOTHING}, [&] {
     EXPECT_EQ(RecordListAppendRun(list_, run.data(), 3), HOST_ERR_NONE);
     EXPECT_EQ(RecordListAppendRun(list_, run.data(), 3), 4711);
-    EXPECT_EQ(RecordListAppend(list_, run.data()), HOST_ERR_NONE);
-    EXPECT_EQ(HostUtilityCallCount(HOST_UTILITY_ListAppend), 3);
+    EXPECT_EQ(HostUtilityCallCount(HOST_UTILITY_ListAppend), 5);
+    EXPECT_EQ(RecordListAppendRun(list_, nullptr, 1), HOST_ERR_UTILITY_NULL);
+    EXPECT_EQ(RecordListAppendRun(nullptr, run.data(), 1), HOST_ERR_UTILITY_NULL);
+    EXPECT_EQ(RecordListAppendRun(list_, run.data(), -1), HOST_ERR_UTILITY_NULL);
   });
   EXPECT_EQ(Records(), (std::vector<int64_t>{1, 2, 3, 1}));
 }

@@ -2,7 +2,10 @@
 
 #include <gtest/gtest.h>
 
+#include <cstdint>
+#include <set>
 #include <string>
+#include <vector>
 
 #include "maya/SceneRecords.h"
 
@@ -96,6 +99,54 @@ TEST_F(NameIndexTest, AnEmbeddedNulIsPartOfAName) {
   EXPECT_EQ(Find(std::string("rig\0", 4)), kNoIndex);
   EXPECT_EQ(Add(std::string("rig\0", 4)), 1);
   EXPECT_EQ(Find("RIG"), 0);
+}
+
+// Of n names two may meet by chance: by about n * n / 2^32.
+void ExpectNoMeetings(const std::vector<std::string>& names) {
+  std::set<std::uint32_t> hashes;
+  for (const std::string& name : names) hashes.insert(NameIndex::Hash(name));
+  EXPECT_GE(hashes.size() + 2, names.size());
+}
+
+TEST_F(NameIndexTest, NamesThatDifferInTheHighestBitsDoNotMeet) {
+  constexpr std::size_t kPairs = 12;  // of words of eight bytes; each pair differs in three bits or in none
+  std::vector<std::string> names;
+  for (unsigned choice = 0; choice < 1u << kPairs; ++choice) {
+    std::string name(kPairs * 16, 'n');
+    for (std::size_t pair = 0; pair < kPairs; ++pair) {
+      if ((choice >> pair & 1) == 0) continue;
+      for (const std::size_t byte : {7u, 11u, 15u}) name[pair * 16 + byte] = static_cast<char>('n' ^ 0x80);
+    }
+    names.push_back(name);
+  }
+  ExpectNoMeetings(names);
+}
+
+TEST_F(NameIndexTest, NamesThatDifferInOneBitOrTwoDoNotMeet) {
+  constexpr std::size_t kBytes = 24;
+  std::vector<std::string> names;
+  for (std::size_t first = 0; first < kBytes * 8; ++first) {
+    for (std::size_t second = first + 1; second < kBytes * 8; ++second) {
+      std::string name(kBytes, '\x80');  // its variants hold no letters whose case is folded
+      for (const std::size_t bit : {first, second})
+        name[bit / 8] = static_cast<char>(name[bit / 8] ^ (1 << bit % 8));
+      if (name.find_first_of("ABCDEFGHIJKLMNOPQRSTUVWXYZ") == std::string::npos) names.push_back(name);
+    }
+  }
+  ExpectNoMeetings(names);
+}
+
+TEST_F(NameIndexTest, NumberedNamesDoNotMeet) {
+  std::vector<std::string> names;
+  for (int number = 0; number < 50'000; ++number)
+    names.push_back("crowd_locatorShape_" + std::to_string(number));
+  ExpectNoMeetings(names);
+}
+
+TEST_F(NameIndexTest, NamesThatOnlyTheirLengthTellsApartDoNotMeet) {
+  std::vector<std::string> names;
+  for (std::size_t size = 0; size < kNameCapacity; ++size) names.push_back(std::string(size, '\0'));
+  ExpectNoMeetings(names);
 }
 
 }  // namespace

@@ -97,6 +97,7 @@ TEST(CompositionJson, WhatCameOfACallbackIsToldInFull) {
   scene.outcome = Outcome::Failed;
   scene.status = ExitStatus::Refused;
   scene.result.code = 2021;
+  scene.result.line = 12;
   scene.result.messages = {"first", "second"};
   scene.result.refusals = {"CreateComp: a width of 0"};
   scene.result.leftovers = {{"stream:3", false}, {"file:1", true}};
@@ -104,14 +105,15 @@ TEST(CompositionJson, WhatCameOfACallbackIsToldInFull) {
   const json document = documentOf(run);
   EXPECT_EQ(document["scenes"][0], json::parse(R"({"path": "a\ufffd.ma", "outcome": "failed", "status": 1,
       "error": {"code": 2021, "name": "FILE_OPEN",
-                "meaning": "the file cannot be opened, or is no regular file"},
+                "meaning": "the file cannot be opened, or is no regular file", "line": 12},
       "messages": ["first", "second"], "refusals": ["CreateComp: a width of 0"],
       "leftovers": [{"description": "stream:3", "keptByDesign": false},
                     {"description": "file:1", "keptByDesign": true}],
       "compositions": []})"));
   EXPECT_EQ(document["entry"],
             json::parse(R"({"error": null, "messages": [], "refusals": [], "leftovers": []})"));
-  EXPECT_EQ(document["deathHook"]["error"], json::parse(R"({"code": 77, "name": "", "meaning": ""})"));
+  EXPECT_EQ(document["deathHook"]["error"],
+            json::parse(R"({"code": 77, "name": "", "meaning": "", "line": null})"));
 }
 
 TEST(CompositionJson, EachOutcomeHasItsWord) {

@@ -131,6 +131,30 @@ TEST_F(ImportCommand, ACodeIsToldWithNameAndMeaningAndWhatWasMadeStays) {
       << result.err;
 }
 
+TEST_F(ImportCommand, AFailureOfTheTextIsToldWithItsLine) {
+  write("byte.ma",
+        "//Maya ASCII 2016 scene\n/* two\nthree */\ncreateNode camera -n \"c\";\n\tsetAttr \".fl\" #35;\n");
+  write("end.ma",
+        "//Maya ASCII 2016 scene\ncreateNode camera -n \"c\";\n\tsetAttr \".fl\" 35;\nselect \"open;\n\n");
+  write("number.ma", "//Maya ASCII 2016 scene\ncreateNode camera -n \"c\";\n\tsetAttr \".fl\" 1e999;\n");
+  EXPECT_EQ(
+      run({"import", "--quiet", "byte.ma"}).err,
+      "mayascene: byte.ma: message: Error reading Maya file.\n"
+      "mayascene: byte.ma: error 1289985 (MAYA_SYNTAX): the scene holds a character that cannot start a word "
+      "there, line 5\n");
+  EXPECT_EQ(
+      run({"import", "--quiet", "end.ma"}).err,
+      "mayascene: end.ma: message: Unexpected end of maya file.\n"
+      "mayascene: end.ma: error 1289986 (MAYA_UNEXPECTED_END): the scene ends inside a string, a comment, a "
+      "word or a command, line 4\n");
+  EXPECT_EQ(run({"import", "--quiet", "number.ma"}).err,
+            "mayascene: number.ma: error 2002 (NUMBER_RANGE): a number is too large to be held, line 3\n");
+  const ToolResult both = run({"import", "--quiet", "--json", "-", "byte.ma", "number.ma"});
+  const auto scenes = nlohmann::json::parse(both.out)["scenes"];
+  EXPECT_EQ(scenes[0]["error"]["line"], 5);
+  EXPECT_EQ(scenes[1]["error"]["line"], 3);
+}
+
 TEST_F(ImportCommand, QuietPrintsNothingButErrors) {
   write("still.ma", sceneText(stillCamera()));
   write("notes.txt", "just some notes\n");

@@ -80,6 +80,12 @@ void writeCallback(JsonWriter& json, const CallbackResult& result) {
     json.text(refhost::errorName(result.code));
     json.key("meaning");
     json.text(refhost::errorSentence(result.code));
+    json.key("line");
+    if (result.line == 0) {
+      json.null();
+    } else {
+      json.integer(result.line);
+    }
     json.endObject();
   }
   writeTexts(json, "messages", result.messages);

@@ -15,7 +15,7 @@ void Diagnostics::remark(std::string_view subject, std::string_view sentence) {
 
 ExitStatus Diagnostics::judge(std::string_view subject, const refhost::CallbackResult& result) {
   for (const std::string& refusal : result.refusals) complain(subject, "the host refused: " + refusal);
-  if (result.code != 0) complain(subject, describeCode(result.code));
+  if (result.code != 0) complain(subject, describeFailure(result));
   for (const refhost::Leftover& leftover : result.leftovers) {
     if (leftover.keptByDesign) {
       remark(subject, "kept by design: " + leftover.description);
@@ -42,6 +42,11 @@ std::string describeCode(HostError code) {
   const std::string_view name = refhost::errorName(code);
   if (name.empty()) return number + ": a code of no known meaning";
   return number + " (" + std::string(name) + "): " + std::string(refhost::errorSentence(code));
+}
+
+std::string describeFailure(const refhost::CallbackResult& result) {
+  const std::string place = result.line == 0 ? "" : ", line " + std::to_string(result.line);
+  return describeCode(result.code) + place;
 }
 
 }  // namespace mayascene
