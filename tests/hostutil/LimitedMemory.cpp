@@ -1,0 +1,40 @@
+#include "LimitedMemory.h"
+
+#include <cstdlib>
+#include <new>
+
+namespace {
+
+constexpr int64_t kUnlimited = -1;
+
+int64_t allocationsLeft = kUnlimited;
+int64_t refused = 0;
+
+}  // namespace
+
+// The forms for arrays and those that do not throw come down to these.
+void* operator new(std::size_t size) {
+  if (allocationsLeft == 0) {
+    ++refused;
+    throw std::bad_alloc();
+  }
+  if (allocationsLeft > 0) --allocationsLeft;
+  if (void* const memory = std::malloc(size != 0 ? size : 1)) return memory;
+  throw std::bad_alloc();
+}
+
+void operator delete(void* memory) noexcept { std::free(memory); }
+void operator delete(void* memory, std::size_t) noexcept { std::free(memory); }
+
+namespace hostutil_tests {
+
+LimitedMemory::LimitedMemory(int64_t allocations) {
+  allocationsLeft = allocations;
+  refused = 0;
+}
+
+LimitedMemory::~LimitedMemory() { allocationsLeft = kUnlimited; }
+
+int64_t RefusedAllocations() { return refused; }
+
+}  // namespace hostutil_tests
