@@ -4,8 +4,8 @@ usage: scripts/mutate [--count N] [--seed N] [--only FOLDER] [--jobs N] [--again
 
 Chooses mutants of plugin, maya, comp and hostutil, as many of each: comparisons that take in their limit or lose it,
 arithmetic and logic turned round, constants replaced by their neighbours, conditions negated. Each is built and tested
-by itself, in a copy of the sources below build/mutate: first the folder's own tests, then whole imports, then
-everything. It is caught when a test fails, crashes or does not come back; what does not compile is replaced by another
+by itself, in a copy of the sources below build/mutate: by the folder's own tests, then by whole imports; and what both
+let by, by everything. It is caught when a test fails, crashes or does not come back; what does not compile is replaced by another
 one. Prints those that no test catches, and the shares.
 
 Ends with 0 when at least 95 % were caught, 1 when fewer were, 2 for a wrong command line, 10 when the machine could not
@@ -25,7 +25,7 @@ from dataclasses import asdict
 from pathlib import Path
 
 from mutants import Mutant, mutants_of
-from workspace import STAGES, Workspace, WorkspaceError
+from workspace import LAST_STAGE, QUICK_STAGES, STAGES, Workspace, WorkspaceError
 
 ROOT = Path(__file__).resolve().parents[2]
 PLACE = ROOT / "build" / "mutate"
@@ -65,7 +65,11 @@ class Campaign:
             self.spares[folder] = found[share:]
         # Those of one file behind each other: so each takes one compilation, not two.
         self.waiting.sort(reverse=True)
-        self.results = []
+        self.results = {}  # verdicts by mutant
+
+    def wait_for_survivors(self):
+        """What has survived so far is to be tried again."""
+        self.waiting = self.survivors()[::-1]
 
     def take(self):
         with self.lock:
@@ -73,7 +77,7 @@ class Campaign:
 
     def note(self, mutant, verdict, seconds):
         with self.lock:
-            self.results.append((mutant, verdict))
+            self.results[mutant] = verdict
             spares = self.spares.get(mutant.file.split("/")[0])
             if verdict == NOT_COMPILED and spares:
                 self.waiting.insert(0, spares.pop(0))
@@ -82,28 +86,39 @@ class Campaign:
                   flush=True)
 
     def counted(self):
-        return [(mutant, verdict) for mutant, verdict in self.results if verdict != NOT_COMPILED]
+        return [(mutant, verdict) for mutant, verdict in self.results.items() if verdict != NOT_COMPILED]
 
     def survivors(self):
-        return sorted(mutant for mutant, verdict in self.results if verdict == SURVIVED)
+        return sorted(mutant for mutant, verdict in self.results.items() if verdict == SURVIVED)
 
 
-def work(workspace, campaign):
-    while mutant := campaign.take():
-        begin = time.monotonic()
-        campaign.note(mutant, verdict_on(workspace, mutant), time.monotonic() - begin)
-
-
-def verdict_on(workspace, mutant):
+def verdict_on(workspace, mutant, stages):
     with workspace.changed(mutant):
-        for number, stage in enumerate(STAGES):
-            targets = stage.targets(mutant.file)
-            if not workspace.build(targets):
-                # Later stages build the same sources into other programs.
-                return NOT_COMPILED if number == 0 else f"caught by {stage.name} (build)"
+        for stage in stages:
+            if not workspace.build(stage.targets(mutant.file)):
+                return NOT_COMPILED
             if failing := workspace.first_failure(stage, mutant.file):
                 return f"caught by {stage.name} ({failing})"
     return SURVIVED
+
+
+def try_all(spaces, campaign, stages, folders):
+    """Takes what waits through the stages, in all workspaces at once, which are shown to pass before."""
+    for space in spaces:
+        space.prepare(stages, folders)
+    spaces[0].measure(stages, folders)
+
+    def work(space):
+        space.limits = spaces[0].limits
+        while mutant := campaign.take():
+            begin = time.monotonic()
+            campaign.note(mutant, verdict_on(space, mutant, stages), time.monotonic() - begin)
+
+    threads = [threading.Thread(target=work, args=(space,)) for space in spaces]
+    for thread in threads:
+        thread.start()
+    for thread in threads:
+        thread.join()
 
 
 def print_survivors(survivors):
@@ -115,7 +130,7 @@ def print_survivors(survivors):
 
 def print_table(campaign):
     rows = {folder: Counter() for folder in (*FOLDERS, "together")}
-    for mutant, verdict in campaign.results:
+    for mutant, verdict in campaign.results.items():
         column = next((stage.name for stage in STAGES if stage.name in verdict), verdict)
         for row in (mutant.file.split("/")[0], "together"):
             rows[row][column] += 1
@@ -166,31 +181,19 @@ def write_survivors(survivors):
     RESULTS.write_text(json.dumps(entries, indent=1) + "\n", encoding="utf-8")
 
 
-def prepare(jobs):
-    """The workspaces, built from the unchanged sources, and shown to pass."""
-    spaces = [Workspace(ROOT, PLACE / str(number)) for number in range(1, jobs + 1)]
-    for space in spaces:
-        space.prepare()
-    spaces[0].measure()
-    for space in spaces[1:]:
-        space.limits = spaces[0].limits
-    return spaces
-
-
 def main():
     options = arguments()
     folders = (options.only,) if options.only else FOLDERS
     campaign = Campaign(survivors_of_last_run() if options.again else choose(folders, options.count, options.seed))
+    spaces = [Workspace(ROOT, PLACE / str(number)) for number in range(1, options.jobs + 1)]
     try:
-        spaces = prepare(options.jobs)
+        try_all(spaces, campaign, QUICK_STAGES, folders)
+        campaign.wait_for_survivors()
+        if campaign.waiting:
+            try_all(spaces, campaign, (LAST_STAGE,), folders)
     except (WorkspaceError, OSError, subprocess.SubprocessError) as error:
         print(f"scripts/mutate: {error}", file=sys.stderr)
         return SETUP_FAILED
-    threads = [threading.Thread(target=work, args=(space, campaign)) for space in spaces]
-    for thread in threads:
-        thread.start()
-    for thread in threads:
-        thread.join()
     for space in spaces:
         shutil.rmtree(space.scratch, ignore_errors=True)
     write_survivors(campaign.survivors())

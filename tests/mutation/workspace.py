@@ -9,7 +9,7 @@ import subprocess
 import time
 from dataclasses import dataclass
 
-# The programs by what they look at. What is not built by a program's name is run by ctest, by a pattern of names.
+# The programs by what they look at. What is no program of GoogleTest is run by ctest, by a pattern of names.
 OWN_TESTS = {
     "plugin": ("plugin_services_test", "plugin_entry_test", "plugin_module_test"),
     "maya": ("maya_test",),
@@ -21,6 +21,9 @@ EVERYTHING = ("plugin_services_test", "plugin_module_test", "maya_test", "comp_t
               "example_scenes_test", "tool_command_tests", "docs_peculiarities_test", "comp_failure_test")
 OTHER_TARGETS = ("number-campaign", "fuzz_targets", "mayascene", "MayaImport")
 OTHER_TESTS = r"^(hostutil\.number_campaign|TracesAgreeWithTheIndependentModel|fuzz\.|scaling\.)"
+
+# Files of two gigabytes are read when all else has passed.
+SLOW_TESTS = "*TwoGigabytes*"
 
 MOST_MEMORY = 8 << 30  # bytes of addresses for one program
 TIMES_AS_LONG = 4  # as the unchanged sources take ...
@@ -45,7 +48,9 @@ class Stage:
 
 
 OWN, IMPORTS, ALL = "own tests", "whole imports", "everything"
-STAGES = (Stage(OWN), Stage(IMPORTS), Stage(ALL))
+QUICK_STAGES = (Stage(OWN), Stage(IMPORTS))
+LAST_STAGE = Stage(ALL)
+STAGES = (*QUICK_STAGES, LAST_STAGE)
 
 
 def limit_program():
@@ -57,15 +62,15 @@ class Workspace:
     def __init__(self, root, place):
         self.root, self.place = root, place
         self.tree, self.built, self.scratch = place / "tree", place / "build", place / "scratch"
-        self.limits = {}  # seconds, by program
+        self.limits = {}  # seconds, by stage and program
 
     # --- Sources ---
 
-    def prepare(self):
-        """Brings the copy up to date and builds all that is going to be run."""
+    def prepare(self, stages, folders):
+        """Brings the copy up to date and builds what the stages are going to run."""
         self.copy_sources()
         self.configure()
-        targets = {target for stage in STAGES for folder in OWN_TESTS for target in stage.targets(folder + "/")}
+        targets = {target for stage in stages for folder in folders for target in stage.targets(folder + "/")}
         if not self.build(sorted(targets), quiet=False):
             raise WorkspaceError("the unchanged sources do not build")
 
@@ -113,29 +118,30 @@ class Workspace:
 
     def commands(self, stage, file):
         """Names and commands of what a stage runs."""
+        chosen = [] if stage.name == ALL else [f"--gtest_filter=-{SLOW_TESTS}"]
         for program in stage.programs(file):
-            yield program, [self.built / "bin" / program, "--gtest_brief=1", "--gtest_fail_fast"]
+            yield program, [self.built / "bin" / program, "--gtest_brief=1", "--gtest_fail_fast", *chosen]
         if stage.name == ALL:
             yield "other tests", ["ctest", "--test-dir", self.built, "-R", OTHER_TESTS, "--stop-on-failure", "-Q"]
 
-    def measure(self):
+    def measure(self, stages, folders):
         """How long each program takes on the unchanged sources, all of which have to pass."""
-        for stage in STAGES:
-            for folder in OWN_TESTS:
+        for stage in stages:
+            for folder in folders:
                 for name, command in self.commands(stage, folder + "/"):
-                    if name in self.limits:
+                    if (stage.name, name) in self.limits:
                         continue
                     begin = time.monotonic()
                     if not self.passes(command, None):
                         raise WorkspaceError(f"the unchanged sources fail {name}")
                     taken = time.monotonic() - begin
                     print(f"unchanged: {name} passes, {taken:.1f} s", flush=True)
-                    self.limits[name] = TIMES_AS_LONG * taken + LONGER
+                    self.limits[stage.name, name] = TIMES_AS_LONG * taken + LONGER
 
     def first_failure(self, stage, file):
         """The first program of the stage that fails, crashes or takes too long; None when all pass."""
         for name, command in self.commands(stage, file):
-            if not self.passes(command, self.limits[name]):
+            if not self.passes(command, self.limits[stage.name, name]):
                 return name
         return None
 

@@ -75,6 +75,13 @@ TEST_F(VerifyTest, AnEmptyPathIsNotTakenWithoutAnyCall) {
   EXPECT_EQ(taken, 0);
 }
 
+TEST_F(VerifyTest, ANullPathIsNotTaken) {
+  Load();
+  std::uint8_t taken = 1;
+  EXPECT_EQ(VerifyFileCallback(nullptr, nullptr, &taken), 0);
+  EXPECT_EQ(taken, 0);
+}
+
 TEST_F(VerifyTest, ANullResultIsThree) {
   Load();
   const HostUTF16Unit path[] = {'x', 0};
