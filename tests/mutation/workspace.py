@@ -104,10 +104,12 @@ class Workspace:
     def configure(self):
         if (self.built / "build.ninja").exists():
             return
-        # A change may bring warnings with it. A program need not be linked anew because a library that it loads was.
+        # A change may bring warnings with it. A program need not be linked anew because a library that it loads was,
+        # nor asked for its tests whenever it was linked.
         subprocess.run(["cmake", "-S", self.tree, "-B", self.built, "-G", "Ninja", "-DCMAKE_BUILD_TYPE=Debug",
                         "-DCMAKE_CXX_FLAGS_DEBUG=-O1", "-DCMAKE_CXX_FLAGS=-w", "-DBUILD_TESTING=ON",
-                        "-DCMAKE_LINK_DEPENDS_NO_SHARED=ON"], check=True, stdout=subprocess.DEVNULL)
+                        "-DCMAKE_LINK_DEPENDS_NO_SHARED=ON",
+                        "-DCMAKE_GTEST_DISCOVER_TESTS_DISCOVERY_MODE=PRE_TEST"], check=True, stdout=subprocess.DEVNULL)
 
     def build(self, targets, quiet=True):
         output = subprocess.DEVNULL if quiet else None
