@@ -1,8 +1,8 @@
 """Changes the importer one token at a time, and looks whether the tests notice.
 
-usage: scripts/mutate [--count N] [--seed N] [--only FOLDER] [--quick] [--jobs N] [--again]
+usage: scripts/mutate [--count N] [--seed N] [--only FOLDER] [--headers] [--quick] [--jobs N] [--again]
 
-Chooses mutants of plugin, maya, comp and hostutil, as many of each: comparisons that take in their limit or lose it,
+Chooses mutants of the sources of plugin, maya, comp and hostutil, as many of each: comparisons that take in their limit or lose it,
 arithmetic and logic turned round, constants replaced by their neighbours, conditions negated. Each is built and tested
 by itself, in a copy of the sources below build/mutate: by the folder's own tests, then by whole imports; and what both
 let by, by everything. It is caught when a test fails, crashes or does not come back; what does not compile is replaced by another
@@ -37,15 +37,15 @@ SETUP_FAILED = 10
 NOT_COMPILED, SURVIVED = "does not compile", "survived"
 
 
-def sources_of(folder):
-    return sorted(path for path in (ROOT / folder).iterdir() if path.suffix in (".h", ".cpp"))
+def sources_of(folder, suffixes):
+    return sorted(path for path in (ROOT / folder).iterdir() if path.suffix in suffixes)
 
 
-def choose(folders, count, seed):
+def choose(folders, count, seed, suffixes):
     """For each folder the mutants to try, in the order in which they replace each other, and how many are wanted."""
     wanted = {}
     for number, folder in enumerate(folders):
-        found = [mutant for path in sources_of(folder)
+        found = [mutant for path in sources_of(folder, suffixes)
                  for mutant in mutants_of(path.relative_to(ROOT).as_posix(), path.read_text(encoding="utf-8"))]
         random.Random(f"{seed} {folder}").shuffle(found)
         share = count // len(folders) + (number < count % len(folders))
@@ -150,6 +150,7 @@ def arguments():
     parser.add_argument("--count", type=int, default=240, metavar="N", help="how many mutants (240)")
     parser.add_argument("--seed", type=int, default=1, metavar="N", help="which ones are chosen (1)")
     parser.add_argument("--only", choices=FOLDERS, metavar="FOLDER", help="only those of one folder")
+    parser.add_argument("--headers", action="store_true", help="in headers too, each of which rebuilds much")
     parser.add_argument("--quick", action="store_true", help="not by everything, which takes minutes for each")
     parser.add_argument("--jobs", type=int, default=1, metavar="N", help="how many are tried at a time (1)")
     parser.add_argument("--again", action="store_true", help="only those that survived when it ran last")
@@ -184,7 +185,9 @@ def write_survivors(survivors):
 def main():
     options = arguments()
     folders = (options.only,) if options.only else FOLDERS
-    campaign = Campaign(survivors_of_last_run() if options.again else choose(folders, options.count, options.seed))
+    suffixes = (".h", ".cpp") if options.headers else (".cpp",)
+    campaign = Campaign(survivors_of_last_run() if options.again
+                        else choose(folders, options.count, options.seed, suffixes))
     spaces = [Workspace(ROOT, PLACE / str(number)) for number in range(1, options.jobs + 1)]
     try:
         try_all(spaces, campaign, QUICK_STAGES, folders)

@@ -149,7 +149,7 @@ class Workspace:
 
     def passes(self, command, limit):
         shutil.rmtree(self.scratch, ignore_errors=True)
-        self.scratch.mkdir(parents=True)
+        self.scratch.mkdir(parents=True, exist_ok=True)
         with subprocess.Popen(command, cwd=self.scratch, env=dict(os.environ, TMPDIR=str(self.scratch)),
                               stdin=subprocess.DEVNULL, stdout=subprocess.DEVNULL, stderr=subprocess.DEVNULL,
                               start_new_session=True, preexec_fn=limit_program) as process:
