@@ -294,6 +294,15 @@ TEST(HostMatrixDecomposeTest, TwoAxesOnOneLineWithoutAThirdTurnAsTheFirstAlone) 
   }
 }
 
+TEST(HostMatrixDecomposeTest, ThreeAxesOnACoordinateAxisTurnNothingAboutIt) {
+  const MatrixComponents flat = Decomposed(FromColumns({2, 0, 0}, {3, 0, 0}, {5, 0, 0}));
+  const MatrixComponents upright = Decomposed(FromColumns({0, 0, -2}, {0, 0, 3}, {0, 0, 5}));
+  for (int i = 0; i < 3; ++i) EXPECT_EQ(flat.rotation[i], 0) << i;
+  EXPECT_EQ(upright.rotation[0], 0);
+  EXPECT_DOUBLE_EQ(upright.rotation[1], kPi / 2);
+  EXPECT_EQ(upright.rotation[2], 0);
+}
+
 TEST(HostMatrixDecomposeTest, AxesNotAtRightAnglesLeaveYAndZToTheFirst) {
   const MatrixComponents sheared = Decomposed(FromColumns({3, 4, 0}, {1, 9, 2}, {5, -1, 7}));
   EXPECT_NEAR(sheared.rotation[2], std::atan2(4.0, 3.0), kTolerance);
