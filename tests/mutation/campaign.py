@@ -2,11 +2,12 @@
 
 usage: scripts/mutate [--count N] [--seed N] [--only FOLDER] [--headers] [--quick] [--jobs N] [--again]
 
-Chooses mutants of the sources of plugin, maya, comp and hostutil, as many of each: comparisons that take in their limit or lose it,
-arithmetic and logic turned round, constants replaced by their neighbours, conditions negated. Each is built and tested
-by itself, in a copy of the sources below build/mutate: by the folder's own tests, then by whole imports; and what both
-let by, by everything. It is caught when a test fails, crashes or does not come back; what does not compile is replaced by another
-one. Prints those that no test catches, and the shares.
+Chooses mutants of the sources of plugin, maya, comp and hostutil, as many of each: comparisons that take in their
+limit or lose it, arithmetic and logic turned round, constants replaced by their neighbours, conditions negated. Each
+is built and tested by itself, in a copy of the sources below build/mutate: by the folder's own tests, then by whole
+imports; and what both let by, by everything. It is caught when a test fails, crashes or does not come back; what does
+not compile is replaced by another one. Prints those that no test catches, and the shares. What
+tests/mutation/equivalents.txt names changes nothing that can be seen: it is counted by itself.
 
 Ends with 0 when at least 95 % were caught, 1 when fewer were, 2 for a wrong command line, 10 when the machine could not
 be set up or the unchanged sources do not pass.
@@ -34,7 +35,16 @@ FOLDERS = ("plugin", "maya", "comp", "hostutil")
 LEAST_CAUGHT = 95  # percent
 SETUP_FAILED = 10
 
-NOT_COMPILED, SURVIVED = "does not compile", "survived"
+EQUIVALENTS = ROOT / "tests" / "mutation" / "equivalents.txt"
+
+NOT_COMPILED, SURVIVED, EQUIVALENT = "does not compile", "survived", "equivalent"
+NOT_COUNTED = (NOT_COMPILED, EQUIVALENT)
+
+
+def equivalents():
+    """File and changed line of each mutant that is known to change nothing."""
+    lines = EQUIVALENTS.read_text(encoding="utf-8").splitlines()
+    return {tuple(line.split(" | ")[:2]) for line in lines if line and not line.startswith("#")}
 
 
 def sources_of(folder, suffixes):
@@ -65,6 +75,7 @@ class Campaign:
         # Those of one file behind each other: so each takes one compilation, not two.
         self.waiting.sort(reverse=True)
         self.results = {}  # verdicts by mutant
+        self.equivalents = equivalents()
 
     def wait_for_survivors(self):
         """What has survived so far is to be tried again."""
@@ -76,16 +87,18 @@ class Campaign:
 
     def note(self, mutant, verdict, seconds):
         with self.lock:
+            source = (ROOT / mutant.file).read_text(encoding="utf-8")
+            if verdict == SURVIVED and (mutant.file, mutant.before_and_after(source)[1]) in self.equivalents:
+                verdict = EQUIVALENT
             self.results[mutant] = verdict
             spares = self.spares.get(mutant.file.split("/")[0])
-            if verdict == NOT_COMPILED and spares:
+            if verdict in NOT_COUNTED and spares:
                 self.waiting.insert(0, spares.pop(0))
-            source = (ROOT / mutant.file).read_text(encoding="utf-8")
             print(f"{len(self.counted()):4} {mutant.file}:{mutant.line(source)} {mutant.kind}: {verdict}, {seconds:.0f} s",
                   flush=True)
 
     def counted(self):
-        return [(mutant, verdict) for mutant, verdict in self.results.items() if verdict != NOT_COMPILED]
+        return [(mutant, verdict) for mutant, verdict in self.results.items() if verdict not in NOT_COUNTED]
 
     def survivors(self):
         return sorted(mutant for mutant, verdict in self.results.items() if verdict == SURVIVED)
@@ -134,12 +147,13 @@ def print_table(campaign):
         for row in (mutant.file.split("/")[0], "together"):
             rows[row][column] += 1
     print("\n" + " ".join(f"{head:>16}" for head in ("folder", "tried", *(stage.name for stage in STAGES), SURVIVED,
-                                                     "caught", NOT_COMPILED)))
+                                                     "caught", *NOT_COUNTED)))
     for folder, row in rows.items():
-        tried = row.total() - row[NOT_COMPILED]
+        tried = row.total() - sum(row[verdict] for verdict in NOT_COUNTED)
         if tried:
             caught = f"{100 * (tried - row[SURVIVED]) / tried:.1f} %"
-            cells = (folder, tried, *(row[stage.name] for stage in STAGES), row[SURVIVED], caught, row[NOT_COMPILED])
+            cells = (folder, tried, *(row[stage.name] for stage in STAGES), row[SURVIVED], caught,
+                     *(row[verdict] for verdict in NOT_COUNTED))
             print(" ".join(f"{cell:>16}" for cell in cells))
 
 
