@@ -12,7 +12,7 @@ int64_t refused = 0;
 
 }  // namespace
 
-// The forms for arrays and those that do not throw come down to these.
+// The forms for arrays come down to these, or to a sanitizer's own.
 void* operator new(std::size_t size) {
   if (allocationsLeft == 0) {
     ++refused;
@@ -21,6 +21,14 @@ void* operator new(std::size_t size) {
   if (allocationsLeft > 0) --allocationsLeft;
   if (void* const memory = std::malloc(size != 0 ? size : 1)) return memory;
   throw std::bad_alloc();
+}
+
+void* operator new(std::size_t size, const std::nothrow_t&) noexcept {
+  try {
+    return operator new(size);
+  } catch (const std::bad_alloc&) {
+    return nullptr;
+  }
 }
 
 void operator delete(void* memory) noexcept { std::free(memory); }
