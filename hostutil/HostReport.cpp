@@ -20,7 +20,7 @@ int64_t notedLine = 0;
 // The memory may be exhausted: the message is built in place, and cut behind its last character that fits.
 constexpr int64_t kMessageCapacity = 1024;
 
-const char* SentenceOf(HostError code) {
+consteval const char* SentenceOf(HostError code) {
   switch (code) {
 #define HOST_ERROR_SENTENCE(name, number, sentence) \
   case HOST_ERR_##name:                             \
@@ -44,11 +44,12 @@ void AppendShown(hostutil::BoundedText<char>* out, const char* text) {
 }  // namespace
 
 HostError HostTranslateAndReport(int32_t kind, const char* what) {
-  const HostError code = kind == HOST_EXCEPTION_MEMORY ? HOST_ERR_EXCEPTION_MEMORY : HOST_ERR_EXCEPTION_OTHER;
+  const bool memory = kind == HOST_EXCEPTION_MEMORY;
+  const HostError code = memory ? HOST_ERR_EXCEPTION_MEMORY : HOST_ERR_EXCEPTION_OTHER;
   if (currentReporter == nullptr) return code;
   char message[kMessageCapacity];
   hostutil::BoundedText<char> out(message, kMessageCapacity);
-  AppendShown(&out, SentenceOf(code));
+  AppendShown(&out, memory ? SentenceOf(HOST_ERR_EXCEPTION_MEMORY) : SentenceOf(HOST_ERR_EXCEPTION_OTHER));
   if (what != nullptr && *what != '\0') {
     AppendShown(&out, ": ");
     AppendShown(&out, what);

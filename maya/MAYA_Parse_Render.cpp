@@ -65,21 +65,9 @@ void MAYA_Parse::ParseRenderSetAttr() {
     kind = NextInCommand(&first, &last);
     if (kind != Number) continue;
     const double value = ScanNumber(first, last);
-    switch (attribute) {
-      case RenderAttribute::Width:
-        resolutionWidth = TruncateToInt32(value);
-        break;
-      case RenderAttribute::Height:
-        resolutionHeight = TruncateToInt32(value);
-        break;
-      case RenderAttribute::DeviceAspect:
-        deviceAspectRatio = value;
-        break;
-      case RenderAttribute::PixelAspect:
-        pixelAspect = value;
-        break;
-      case RenderAttribute::None:
-        break;
-    }
+    if (attribute == RenderAttribute::Width) resolutionWidth = TruncateToInt32(value);
+    if (attribute == RenderAttribute::Height) resolutionHeight = TruncateToInt32(value);
+    if (attribute == RenderAttribute::DeviceAspect) deviceAspectRatio = value;
+    if (attribute == RenderAttribute::PixelAspect) pixelAspect = value;
   }
 }

@@ -69,18 +69,8 @@ void MAYA_Parse::ParseCurrentUnit() {
     }
     if (kind != Identifier) continue;
     const std::string_view name = WordText(first, last);
-    switch (option) {
-      case UnitOption::Linear:
-        SetUnit(name, kLinearUnits, &linearUnit);
-        break;
-      case UnitOption::Angle:
-        SetUnit(name, kAngleUnits, &angleUnit);
-        break;
-      case UnitOption::Time:
-        SetUnit(name, kTimeUnits, &timeUnit);
-        break;
-      case UnitOption::Other:
-        break;
-    }
+    if (option == UnitOption::Linear) SetUnit(name, kLinearUnits, &linearUnit);
+    if (option == UnitOption::Angle) SetUnit(name, kAngleUnits, &angleUnit);
+    if (option == UnitOption::Time) SetUnit(name, kTimeUnits, &timeUnit);
   }
 }

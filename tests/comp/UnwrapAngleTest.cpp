@@ -35,6 +35,18 @@ TEST(UnwrapAngleTest, AnAngleWithinHalfATurnStaysBitForBit) {
   EXPECT_EQ(Bits(UnwrapAngle(-0.0, 0.0)), Bits(-0.0));
 }
 
+// At a power of two a turn may still change an angle towards 0, where doubles lie closer, and not away from
+// it.
+TEST(UnwrapAngleTest, AnAngleThatATurnChangesOnOneSideOnlyStays) {
+  const double edge = std::ldexp(1.0, 56);
+  ASSERT_NE(edge - kTurn, edge);
+  ASSERT_EQ(edge + kTurn, edge);
+  for (const double angle : {edge, -edge}) {
+    EXPECT_EQ(Bits(UnwrapAngle(angle, 0.0)), Bits(angle));
+    EXPECT_EQ(Bits(UnwrapAngle(1.0, angle)), Bits(1.0));
+  }
+}
+
 TEST(UnwrapAngleTest, AnAngleAcrossTheSeamKeepsRunningOn) {
   EXPECT_DOUBLE_EQ(UnwrapAngle(-3.0, 3.0), -3.0 + kTurn);
   EXPECT_DOUBLE_EQ(UnwrapAngle(3.0, -3.0), 3.0 - kTurn);

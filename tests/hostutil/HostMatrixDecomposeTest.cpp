@@ -273,6 +273,36 @@ TEST(HostMatrixDecomposeTest, AxesOnOneLineOrNotAtRightAnglesGiveNoNaN) {
   }
 }
 
+// Two directions on one line do not tell the third: the rotation is that of the first alone.
+TEST(HostMatrixDecomposeTest, TwoAxesOnOneLineWithoutAThirdTurnAsTheFirstAlone) {
+  const Point none{0, 0, 0};
+  const Point line{-0.48, 0.6, 0.64};
+  const Point same{-0.96, 1.2, 1.28};
+  const Point back{0.48, -0.6, -0.64};
+  for (const Point& other : {same, back}) {
+    const struct {
+      TransformMatrix both, alone;
+    } cases[] = {{FromColumns(line, other, none), FromColumns(line, none, none)},
+                 {FromColumns(line, none, other), FromColumns(line, none, none)},
+                 {FromColumns(none, line, other), FromColumns(none, line, none)}};
+    for (const auto& one : cases) {
+      const MatrixComponents both = Decomposed(one.both);
+      const MatrixComponents alone = Decomposed(one.alone);
+      ExpectForm(both);
+      for (int i = 0; i < 3; ++i) EXPECT_NEAR(both.rotation[i], alone.rotation[i], kTolerance) << i;
+    }
+  }
+}
+
+TEST(HostMatrixDecomposeTest, ThreeAxesOnACoordinateAxisTurnNothingAboutIt) {
+  const MatrixComponents flat = Decomposed(FromColumns({2, 0, 0}, {3, 0, 0}, {5, 0, 0}));
+  const MatrixComponents upright = Decomposed(FromColumns({0, 0, -2}, {0, 0, 3}, {0, 0, 5}));
+  for (int i = 0; i < 3; ++i) EXPECT_EQ(flat.rotation[i], 0) << i;
+  EXPECT_EQ(upright.rotation[0], 0);
+  EXPECT_DOUBLE_EQ(upright.rotation[1], kPi / 2);
+  EXPECT_EQ(upright.rotation[2], 0);
+}
+
 TEST(HostMatrixDecomposeTest, AxesNotAtRightAnglesLeaveYAndZToTheFirst) {
   const MatrixComponents sheared = Decomposed(FromColumns({3, 4, 0}, {1, 9, 2}, {5, -1, 7}));
   EXPECT_NEAR(sheared.rotation[2], std::atan2(4.0, 3.0), kTolerance);

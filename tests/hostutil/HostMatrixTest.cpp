@@ -102,6 +102,18 @@ TEST(HostMatrixTest, ARotationAboutAnyAxisKeepsTheAxisAndTurnsByTheAngle) {
   }
 }
 
+// One component of 1 does not make a coordinate axis: the others count.
+TEST(HostMatrixTest, AnAxisThatSharesComponentsWithACoordinateAxisIsNotTakenForIt) {
+  for (const Point& axis : {Point{1, 0, 2}, Point{1, 2, 0}, Point{0, 1, 2}, Point{2, 1, 0}, Point{0, 2, 1},
+                            Point{2, 0, 1}, Point{1, 1, 1}, Point{0, 0, 2}, Point{-1, 0, 0}}) {
+    TransformMatrix matrix = Identity();
+    ASSERT_EQ(MatrixRotateAxis(&matrix, axis[0], axis[1], axis[2], 0.7), HOST_ERR_NONE);
+    ExpectNear(Transformed(matrix, axis), axis, kTolerance);
+    // The trace of a rotation is 1 + 2 cos.
+    EXPECT_NEAR(matrix.m[0][0] + matrix.m[1][1] + matrix.m[2][2], 1 + 2 * std::cos(0.7), kTolerance);
+  }
+}
+
 TEST(HostMatrixTest, TheLengthOfTheAxisDoesNotMatter) {
   TransformMatrix unit = Identity();
   MatrixRotateAxis(&unit, 0.6, 0, 0.8, 1.25);

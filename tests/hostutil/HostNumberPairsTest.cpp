@@ -8,6 +8,7 @@
 
 #include "UtilityTest.h"
 #include "hostutil/HostNumbers.h"
+#include "tests/support/GuardedText.h"
 
 namespace hostutil_tests {
 namespace {
@@ -20,13 +21,15 @@ struct Pairs {
   int32_t lineFeeds;
 };
 
+// Behind the text nothing can be read, so that a byte too far ends the program.
 Pairs Scan(const std::string& text, int64_t capacity = kCapacity) {
+  const testsupport::GuardedText guarded(text);
   double pairs[kCapacity][2] = {};
   const char* behind = nullptr;
   int32_t lineFeeds = 0;
-  const char* end = text.c_str() + text.size();
-  const int64_t count = HostNumberScanPairs(text.c_str(), end, pairs, capacity, &behind, &lineFeeds);
-  Pairs result{{}, behind - text.c_str(), lineFeeds};
+  const int64_t count =
+      HostNumberScanPairs(guarded.begin(), guarded.end(), pairs, capacity, &behind, &lineFeeds);
+  Pairs result{{}, behind - guarded.begin(), lineFeeds};
   for (int64_t i = 0; i < count; ++i) result.values.push_back({pairs[i][0], pairs[i][1]});
   return result;
 }

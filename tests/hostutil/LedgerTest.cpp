@@ -59,9 +59,10 @@ TEST_F(LedgerTest, TextsAreNotInTheLedgerAndAreFreedWithTheLeftovers) {
 }
 
 TEST_F(LedgerTest, ADescriptionIsOneLineWhateverThePathHolds) {
-  HostFile* file = MakeFile("a\nb\x1B[1m\x7F\xC2\x85\xE2\x80\xA8\xFF\xC3\xA9");
-  EXPECT_EQ(Descriptions(),
-            (std::vector<std::string>{"file a\\u000ab\\u001b[1m\\u007f\\u0085\\u2028\xEF\xBF\xBD\xC3\xA9"}));
+  HostFile* file = MakeFile("a\nb\x1B[1m\x7F\xC2\x85\xE2\x80\xA8\xE2\x80\xA9\xFF\xC3\xA9");
+  EXPECT_EQ(
+      Descriptions(),
+      (std::vector<std::string>{"file a\\u000ab\\u001b[1m\\u007f\\u0085\\u2028\\u2029\xEF\xBF\xBD\xC3\xA9"}));
   EXPECT_EQ(HostFileDispose(file), HOST_ERR_NONE);
 }
 

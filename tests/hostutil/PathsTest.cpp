@@ -92,6 +92,13 @@ TEST(PathsTest, EveryLoneSurrogateIsShownAsTheReplacementCharacter) {
   EXPECT_EQ(ShownUnits({0xDFAC, 0xD83C}), std::string(kReplaced) + kReplaced);
 }
 
+TEST(PathsTest, AHighSurrogateBeforeWhatIsNoLowOneStaysAlone) {
+  EXPECT_EQ(ShownUnits({0xD800, 'a'}), std::string(kReplaced) + "a");
+  EXPECT_EQ(ShownUnits({0xD800, 0xD800}), std::string(kReplaced) + kReplaced);
+  EXPECT_EQ(ShownUnits({0xDBFF, 0xE000}), std::string(kReplaced) + "\xEE\x80\x80");
+  EXPECT_EQ(ShownUnits({0xD800}), kReplaced);
+}
+
 TEST(PathsTest, ASmallCapacityTakesWholeCharactersAndTheirNul) {
   const char* path =
       "a\xF0\x9F\x8E\xAC"

@@ -116,6 +116,37 @@ TEST_F(HarmlessTextTest, EveryByteAtEveryPlaceOfABlockIsSeenAlike) {
   }
 }
 
+// Whoever stops where he need not is right all the same, but slow.
+TEST_F(HarmlessTextTest, EveryOneGoesAsFarAsItMay) {
+  constexpr std::string_view kWhiteSpace = " \t\r\n;";
+  constexpr std::string_view kNumeral = "0123456789.";
+  for (int value = 1; value < 256; ++value) {
+    const char byte = static_cast<char>(value);
+    const bool letter = (byte >= 'A' && byte <= 'Z') || (byte >= 'a' && byte <= 'z');
+    const bool keyword = byte == 'c' || byte == 'C' || byte == 's' || byte == 'S';
+    const bool numeral = kNumeral.find(byte) != std::string_view::npos;
+    const bool white = kWhiteSpace.find(byte) != std::string_view::npos;
+    for (const std::size_t place : {0u, 17u, 40u, 63u}) {
+      std::string text(256, ' ');
+      text[place] = byte;
+      std::string option = text;
+      option[place] = '-';
+      option[place + 1] = byte;
+      for (const HarmlessTextSkipper& skipper : HarmlessTextSkippers()) {
+        const auto stop = [](const auto skip, const std::string& in) {
+          std::int32_t lines = 0;
+          return static_cast<std::size_t>(skip(in.data(), in.data() + in.size(), &lines) - in.data());
+        };
+        const bool harmless = white || numeral || (letter && !keyword);
+        EXPECT_EQ(stop(skipper.skip, text) > 64, harmless) << skipper.name << " " << value << " at " << place;
+        EXPECT_EQ(stop(skipper.skipInCommand, text) > 64, harmless && byte != ';') << skipper.name << value;
+        EXPECT_EQ(stop(skipper.skip, option) > 64, letter || numeral || byte == '-')
+            << skipper.name << " -" << value << " at " << place;
+      }
+    }
+  }
+}
+
 TEST_F(HarmlessTextTest, PairsOfBytesAcrossTheEdgeOfABlockAreSeenAlike) {
   for (const char first : std::string_view(" \n;\"/(:+-.09@AZ[`aczCS{\v\x80\0", 26)) {
     for (int second = 0; second < 256; ++second) {

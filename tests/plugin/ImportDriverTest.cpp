@@ -161,5 +161,12 @@ TEST_F(ImportTest, ASecondImportKnowsNothingOfAFailedOne) {
 
 TEST_F(ImportTest, AnEmptyPathCannotBeOpened) { EXPECT_EQ(Import("").code, HOST_ERR_FILE_OPEN); }
 
+TEST_F(ImportTest, ANullPathIsAnEmptyOne) {
+  Load();
+  VOR_Item* const folder = host_->beginCallback(refhost::Callback::Import, "");
+  EXPECT_EQ(ImportFileCallback(nullptr, nullptr, nullptr, folder), HOST_ERR_FILE_OPEN);
+  ExpectSound(host_->endCallback(HOST_ERR_FILE_OPEN));
+}
+
 }  // namespace
 }  // namespace testsupport

@@ -40,6 +40,20 @@ TEST_F(VerifyTest, AMayaAsciiFileIsTakenInAnyCase) {
   EXPECT_TRUE(Takes("//mAyAxxxxxxx"));
 }
 
+// The host's flag is one byte: 1 for yes, nothing else.
+TEST_F(VerifyTest, TheAnswerIsOneOrZero) {
+  Load();
+  for (const bool maya : {true, false}) {
+    const std::string path = Write("scene.ma", maya ? "//Maya ASCII" : "//May be it").string();
+    const std::vector<HostUTF16Unit> units(path.c_str(), path.c_str() + path.size() + 1);
+    host_->beginCallback(refhost::Callback::Verify, path);
+    std::uint8_t taken = 77;
+    EXPECT_EQ(VerifyFileCallback(units.data(), nullptr, &taken), 0);
+    EXPECT_EQ(taken, maya ? 1 : 0);
+    host_->endCallback(0);
+  }
+}
+
 TEST_F(VerifyTest, AnyOtherFileIsNotTakenAndNothingIsShown) {
   EXPECT_FALSE(Takes("/*Maya ASCII 2020 scene"));
   EXPECT_FALSE(Takes("//May ASCII 2020 scene"));
@@ -72,6 +86,13 @@ TEST_F(VerifyTest, AnEmptyPathIsNotTakenWithoutAnyCall) {
   std::uint8_t taken = 1;
   const HostUTF16Unit empty[] = {0, 'x', 0};
   EXPECT_EQ(VerifyFileCallback(empty, nullptr, &taken), 0);
+  EXPECT_EQ(taken, 0);
+}
+
+TEST_F(VerifyTest, ANullPathIsNotTaken) {
+  Load();
+  std::uint8_t taken = 1;
+  EXPECT_EQ(VerifyFileCallback(nullptr, nullptr, &taken), 0);
   EXPECT_EQ(taken, 0);
 }
 
