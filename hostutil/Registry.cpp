@@ -22,8 +22,11 @@ constinit Chain texts;
 Chain& ChainOf(LiveObject::Kind kind) { return kind == LiveObject::Kind::Text ? texts : held; }
 
 void DestroyAll(const Chain& chain) {
-  // NOLINTNEXTLINE(clang-analyzer-cplusplus.NewDelete): an object takes itself out of its chain when it goes.
-  while (chain.first != nullptr) delete chain.first;
+  while (chain.first != nullptr) {
+    // NOLINTNEXTLINE(clang-analyzer-cplusplus.NewDelete): an object takes itself out of its chain when it
+    // goes.
+    delete chain.first;
+  }
 }
 
 // Without the memory for a description, the ledger still names the kind.

@@ -130,5 +130,6 @@ void UTF16StringRetain(UTF16String* text) {
 }
 
 void UTF16StringRelease(UTF16String* text) {
-  if (text != nullptr && --text->references == 0) delete text;
+  if (text == nullptr || --text->references != 0) return;
+  delete text;
 }

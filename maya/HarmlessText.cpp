@@ -55,7 +55,7 @@ std::span<const HarmlessTextSkipper> HarmlessTextSkippers() {
       {kPlain,
        {"SSE2", SkipHarmlessTextSse2, SkipInCommandSse2},
        {"AVX2", SkipHarmlessTextAvx2, SkipInCommandAvx2}}};
-  static const std::size_t count = HasAvx2() ? 3 : 2;
+  const std::size_t count = HasAvx2() ? 3 : 2;
   return std::span(kSkippers).first(count);
 #else
   static constexpr std::array<HarmlessTextSkipper, 1> kSkippers = {kPlain};

@@ -35,7 +35,9 @@ constexpr Keyword kKeywords[] = {
     {"currentUnit", CurrentUnit},
 };
 
-constexpr std::size_t kLongestKeyword = std::string_view("disconnectAttr").size();
+constexpr std::size_t kLongestKeyword = std::ranges::max_element(kKeywords, {}, [](const Keyword& keyword) {
+                                          return keyword.word.size();
+                                        })->word.size();
 
 // Few keywords are of one length, and most words that are none are of a length that no keyword has.
 struct KeywordsOfLength {
