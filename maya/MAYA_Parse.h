@@ -241,9 +241,9 @@ class MAYA_Parse : public MAYA_Lex {
 
   // maya/MAYA_Parse_Keys.cpp
   bool FindKeyAttribute(std::string_view* lastNumber);
-  void ReadKeys(std::int64_t countHint);
-  void ReadPlainKeys(std::int64_t countHint);
-  void AppendKeys(const void* keys, std::int64_t count, std::int64_t countHint);
+  void ReadKeys(std::string_view keyCount);
+  void ReadPlainKeys(std::string_view keyCount);
+  void AppendKeys(const void* keys, std::int64_t count, std::int64_t room);
   void WriteBackCurve();
 
   // maya/MAYA_Parse_Connections.cpp

@@ -18,22 +18,23 @@ bool NamesKeys(std::string_view text) {
   return text.find(".ktv") != std::string_view::npos || text.find(".keyTimeValue") != std::string_view::npos;
 }
 
-// How many keys to make room for: what the command says, but never more than its own text could hold.
-std::int64_t KeyCountHint(std::string_view text, const char* keys, const char* end) {
+// How many more keys to make room for, where so many were read: as many as the command says, but never more
+// than the rest of its own text could hold.
+std::int64_t MoreKeys(std::string_view keyCount, std::int64_t read, const char* keys, const char* end) {
   constexpr std::int64_t kShortestKey = 4;  // two digits and two blanks
   const auto* commandEnd =
       static_cast<const char*>(std::memchr(keys, ';', static_cast<std::size_t>(end - keys)));
   const std::int64_t bytesLeft = (commandEnd != nullptr ? commandEnd : end) - keys;
   std::int64_t count = 0;
-  std::from_chars(text.data(), text.data() + text.size(), count);
-  return std::clamp(count, std::int64_t{0}, bytesLeft / kShortestKey);
+  std::from_chars(keyCount.data(), keyCount.data() + keyCount.size(), count);
+  return std::clamp(std::max(count, read) - read, std::int64_t{0}, bytesLeft / kShortestKey);
 }
 
 }  // namespace
 
 void MAYA_Parse::ParseAnimSetAttr() {
   std::string_view keyCount;
-  if (FindKeyAttribute(&keyCount)) ReadKeys(KeyCountHint(keyCount, position, end()));
+  if (FindKeyAttribute(&keyCount)) ReadKeys(keyCount);
   WriteBackCurve();
 }
 
@@ -78,9 +79,9 @@ bool MAYA_Parse::FindKeyAttribute(std::string_view* lastNumber) {
 
 // Reads on to the ";". Every number begins a key; the number behind it is its value, anything else is dropped
 // and makes the value 0.
-void MAYA_Parse::ReadKeys(std::int64_t countHint) {
+void MAYA_Parse::ReadKeys(std::string_view keyCount) {
   for (bool ended = false; !ended;) {
-    ReadPlainKeys(countHint);
+    ReadPlainKeys(keyCount);
     const char* first = nullptr;
     const char* last = nullptr;
     const MayaToken kind = NextInCommand(&first, &last);
@@ -91,30 +92,33 @@ void MAYA_Parse::ReadKeys(std::int64_t countHint) {
     const MayaToken next = NextInCommand(&first, &last);
     if (next == Number) key.value = ScanNumber(first, last);
     ended = next == Semicolon;
-    AppendKeys(&key, 1, countHint);
+    AppendKeys(&key, 1, 1);
   }
 }
 
 // Reads the keys that stand there as pairs of plain numbers, many at a time. What it leaves is read token by
-// token.
-void MAYA_Parse::ReadPlainKeys(std::int64_t countHint) {
+// token. Most curves end within the first run, whose keys then are all that there will be; the text behind it
+// is not looked through for the end of the command before it is read.
+void MAYA_Parse::ReadPlainKeys(std::string_view keyCount) {
   constexpr std::int64_t kRun = 256;
   static_assert(sizeof(MAYA_Key) == sizeof(double[2]) && offsetof(MAYA_Key, value) == sizeof(double));
   double pairs[kRun][2];
   for (std::int64_t count = kRun; count == kRun;) {
     const char* behind = position;
     count = HostNumberScanPairs(position, end(), pairs, kRun, &behind, &line);
-    if (count > 0) AppendKeys(pairs, count, countHint);
     tokenStart = position = behind;
+    std::int64_t room = count;
+    if (count == kRun && current.curve.keys == nullptr) room += MoreKeys(keyCount, kRun, position, end());
+    if (count > 0) AppendKeys(pairs, count, room);
   }
 }
 
-// Appends records of MAYA_Key to the current curve, whose list is made on first use.
-void MAYA_Parse::AppendKeys(const void* keys, std::int64_t count, std::int64_t countHint) {
+// Appends records of MAYA_Key to the current curve, whose list is made on first use, with room for so many.
+void MAYA_Parse::AppendKeys(const void* keys, std::int64_t count, std::int64_t room) {
   RecordList** const list = &current.curve.keys;
   if (*list == nullptr) {
     MakeList<MAYA_Key>(list);
-    RecordListReserve(*list, countHint);
+    RecordListReserve(*list, room);
   }
   ThrowOnError(RecordListAppendRun(*list, keys, count));
 }
