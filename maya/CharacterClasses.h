@@ -11,7 +11,7 @@ enum CharacterClass : std::uint8_t {
   kLetterClass = 8,
   kNumberStartClass = 16,  // digits, "-" and "."
   kQuoteClass = 32,
-  kStopClass = 64,  // where a token starts with it, the main loop has to look: quotes and the letters c and s
+  kKeywordStartClass = 64,  // the first letters of the keywords that the main loop acts on
 };
 
 inline constexpr auto kCharacterClasses = [] {
@@ -24,7 +24,7 @@ inline constexpr auto kCharacterClasses = [] {
   add(';', kTerminatorClass);
   add('\0', kNulClass);
   add('"', kQuoteClass);
-  for (const char c : {'"', 'c', 'C', 's', 'S'}) add(c, kStopClass);
+  for (const char c : {'c', 'C', 's', 'S'}) add(c, kKeywordStartClass);
   for (char c = 'a'; c <= 'z'; ++c) add(c, kLetterClass);
   for (char c = 'A'; c <= 'Z'; ++c) add(c, kLetterClass);
   for (char c = '0'; c <= '9'; ++c) add(c, kNumberStartClass);

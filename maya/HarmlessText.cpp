@@ -7,10 +7,8 @@
 
 namespace {
 
-constexpr bool IsKeywordStart(char c) { return c == 'c' || c == 'C' || c == 's' || c == 'S'; }
-
 constexpr bool BeginsHarmlessWord(const char* at) {
-  return *at == '-' ? IsWordByte(at[1]) : IsWordByte(*at) && !IsKeywordStart(*at);
+  return *at == '-' ? IsWordByte(at[1]) : IsWordByte(*at) && !IsAny(*at, kKeywordStartClass);
 }
 
 enum ByteClass : unsigned char { kInWord, kTerminator, kLineFeed };

@@ -131,7 +131,7 @@ void MAYA_Lex::SkipWhiteSpace() {
 void MAYA_Lex::SkipHarmless() {
   if (position > end_) return;
   SkipWhiteSpace();
-  if (IsAny(*position, kStopClass)) return;  // as a rule the next command begins here
+  if (IsAny(*position, kKeywordStartClass | kQuoteClass)) return;  // as a rule the next command begins here
   static const SkipHarmlessText skip = HarmlessTextSkippers().back().skip;
   tokenStart = position = skip(position, end_, &line);
 }

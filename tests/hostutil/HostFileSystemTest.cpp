@@ -1,4 +1,5 @@
 // What a file system can put in the way of a reader.
+#include <fcntl.h>
 #include <gtest/gtest.h>
 #include <unistd.h>
 
@@ -153,10 +154,12 @@ TEST_F(HostFileSystemTest, ALoneSurrogateThatStandsForNoByteNamesNoFileOfAnother
 
 TEST_F(HostFileSystemTest, NoDescriptorIsLeftOpen) {
   const auto openDescriptors = [] {
-    return std::distance(std::filesystem::directory_iterator("/proc/self/fd"),
-                         std::filesystem::directory_iterator());
+    constexpr int kMore = 1024;  // than a test has open
+    int open = 0;
+    for (int descriptor = 0; descriptor < kMore; ++descriptor)
+      open += fcntl(descriptor, F_GETFD) != -1 ? 1 : 0;
+    return open;
   };
-  if (!std::filesystem::exists("/proc/self/fd")) GTEST_SKIP();
   const std::string path = folder_.Write("scene.ma", "abc");
   const auto before = openDescriptors();
   HostFile* file = MakeFile(path);

@@ -5,7 +5,6 @@
 
 #include <cerrno>
 #include <cstdarg>
-#include <fstream>
 #include <string>
 
 #include "TemporaryFolder.h"
@@ -28,10 +27,6 @@ struct Disturbance {
 Disturbance opening, reading, closing;
 size_t mostBytes = SIZE_MAX;  // that one read gives
 
-int Open(const char* path, int flags, mode_t mode) {
-  return opening.Strikes() ? -1 : static_cast<int>(syscall(SYS_openat, AT_FDCWD, path, flags, mode));
-}
-
 }  // namespace
 
 // In the place of the system library's, for the whole program, the utility library included.
@@ -42,16 +37,10 @@ SYSTEM_CALL int open64(const char* path, int flags, ...) {
   va_start(rest, flags);
   const mode_t mode = (flags & O_CREAT) != 0 ? va_arg(rest, mode_t) : 0;
   va_end(rest);
-  return Open(path, flags, mode);
+  return opening.Strikes() ? -1 : static_cast<int>(syscall(SYS_openat, AT_FDCWD, path, flags, mode));
 }
 
-SYSTEM_CALL int open(const char* path, int flags, ...) {
-  va_list rest;
-  va_start(rest, flags);
-  const mode_t mode = (flags & O_CREAT) != 0 ? va_arg(rest, mode_t) : 0;
-  va_end(rest);
-  return Open(path, flags, mode);
-}
+SYSTEM_CALL int open(const char* path, int flags, ...) __attribute__((alias("open64"), nothrow));
 
 SYSTEM_CALL ssize_t read(int descriptor, void* buffer, size_t count) {
   if (reading.Strikes()) return -1;
@@ -68,11 +57,7 @@ namespace {
 
 class InterruptedFileTest : public UtilityTest {
  protected:
-  void SetUp() override {
-    const std::string path = (folder_.path() / "scene.ma").string();
-    std::ofstream(path) << "//Maya ASCII";
-    file_ = MakeFile(path);
-  }
+  void SetUp() override { file_ = MakeFile(folder_.Write("scene.ma", "//Maya ASCII")); }
   void TearDown() override {
     opening = reading = closing = {};
     mostBytes = SIZE_MAX;

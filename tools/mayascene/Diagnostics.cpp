@@ -1,6 +1,23 @@
 #include "tools/mayascene/Diagnostics.h"
 
 namespace mayascene {
+namespace {
+
+// "error 2021 (FILE_OPEN): the file cannot be opened, or is no regular file"; behind it ", line 7" where the
+// line of the scene is known.
+std::string describeFailure(const refhost::CallbackResult& result) {
+  std::string text = "error " + std::to_string(result.code);
+  const std::string_view name = refhost::errorName(result.code);
+  if (name.empty()) {
+    text += ": a code of no known meaning";
+  } else {
+    text += " (" + std::string(name) + "): " + std::string(refhost::errorSentence(result.code));
+  }
+  if (result.line != 0) text += ", line " + std::to_string(result.line);
+  return text;
+}
+
+}  // namespace
 
 Diagnostics::Diagnostics(std::ostream& stream, Style style, bool quiet)
     : stream_(stream), style_(style), quiet_(quiet) {}
@@ -35,18 +52,6 @@ void Diagnostics::line(std::string_view subject, std::string_view sentence, bool
   if (!subject.empty()) stream_ << terminalText(subject) << ": ";
   const std::string text = terminalText(sentence);
   stream_ << (alarming ? style_.alarm(text) : text) << '\n' << std::flush;
-}
-
-std::string describeCode(HostError code) {
-  const std::string number = "error " + std::to_string(code);
-  const std::string_view name = refhost::errorName(code);
-  if (name.empty()) return number + ": a code of no known meaning";
-  return number + " (" + std::string(name) + "): " + std::string(refhost::errorSentence(code));
-}
-
-std::string describeFailure(const refhost::CallbackResult& result) {
-  const std::string place = result.line == 0 ? "" : ", line " + std::to_string(result.line);
-  return describeCode(result.code) + place;
 }
 
 }  // namespace mayascene

@@ -35,10 +35,4 @@ class Diagnostics {
   bool quiet_;
 };
 
-// "error 2021 (FILE_OPEN): the file cannot be opened, or is no regular file"
-std::string describeCode(HostError code);
-
-// The same for what a callback returned; behind it ", line 7" where the line of the scene is known.
-std::string describeFailure(const refhost::CallbackResult& result);
-
 }  // namespace mayascene
