@@ -5,6 +5,7 @@
 
 #include "plugin/Entry.h"
 #include "plugin/Globals.h"
+#include "tests/secondreader/ProjectText.h"
 #include "tests/secondreader/SceneGenerator.h"
 #include "tests/secondreader/TraceComparison.h"
 
@@ -13,17 +14,18 @@ namespace {
 
 constexpr std::uint64_t kFailureSeeds = 0x5eed0000000000u;
 
-// What the callbacks gave.
+// What the callbacks gave, and what they made.
 struct Results {
   refhost::CallbackResult entry;
   refhost::CallbackResult verify;
   std::vector<refhost::CallbackResult> imports;
   refhost::CallbackResult death;
+  std::string project;
 };
 
-Results runHost(refhost::HostOptions options, const std::string& path, int imports, std::string* trace) {
-  std::ostringstream out;
-  options.trace = &out;
+// `trace` may be null: nobody watches the host then, and it takes its short ways.
+Results runHost(refhost::HostOptions options, const std::string& path, int imports, std::ostream* trace) {
+  options.trace = trace;
   G_use_linear_unitsL = 0;
   Results results;
   {
@@ -31,11 +33,11 @@ Results runHost(refhost::HostOptions options, const std::string& path, int impor
     host.load(&MayaImportEntry, &results.entry);
     results.verify = host.verifyScene(path);
     for (int i = 0; i < imports; ++i) results.imports.push_back(host.importScene(path));
+    results.project = textOf(host.project());
     results.death = host.unload();
   }
   // What a death hook that could not be registered left.
   DeathHook(0);
-  *trace = out.str();
   return results;
 }
 
@@ -55,6 +57,35 @@ void compare(std::ostringstream& words, const char* callback, const PredictedCal
   }
   for (const refhost::Leftover& leftover : result.leftovers) {
     if (!leftover.keptByDesign) words << callback << ": left behind: " << leftover.description << '\n';
+  }
+}
+
+std::vector<std::string> describe(const std::vector<refhost::Leftover>& leftovers) {
+  std::vector<std::string> words;
+  for (const refhost::Leftover& leftover : leftovers) words.push_back(leftover.description);
+  return words;
+}
+
+void compareUnwatched(std::ostringstream& words, const char* callback, const refhost::CallbackResult& watched,
+                      const refhost::CallbackResult& unwatched) {
+  const bool same = watched.code == unwatched.code && watched.line == unwatched.line &&
+                    watched.canImport == unwatched.canImport && watched.messages == unwatched.messages &&
+                    watched.refusals == unwatched.refusals && watched.suiteCalls == unwatched.suiteCalls &&
+                    describe(watched.leftovers) == describe(unwatched.leftovers);
+  if (!same) words << callback << ": another result when nobody watches the host\n";
+}
+
+void compareUnwatched(std::ostringstream& words, const Results& watched, const Results& unwatched) {
+  compareUnwatched(words, "entry", watched.entry, unwatched.entry);
+  compareUnwatched(words, "verify", watched.verify, unwatched.verify);
+  for (std::size_t i = 0; i < watched.imports.size(); ++i) {
+    compareUnwatched(words, "import", watched.imports[i], unwatched.imports[i]);
+  }
+  compareUnwatched(words, "death", watched.death, unwatched.death);
+  if (watched.project != unwatched.project) {
+    words << "another project when nobody watches the host\nwatched:\n"
+          << watched.project << "unwatched:\n"
+          << unwatched.project;
   }
 }
 
@@ -86,10 +117,10 @@ RunReport SceneRunner::run(const refhost::HostOptions& options, const std::strin
   report.skipped = report.prediction.processEnds;
   if (report.skipped) return report;
   folder_.write(fileName, scene);
-  std::string trace;
+  std::ostringstream trace;
   const Results results = runHost(options, path, imports, &trace);
   std::ostringstream words;
-  if (const auto difference = firstDifference(report.prediction.trace, linesOf(trace))) {
+  if (const auto difference = firstDifference(report.prediction.trace, linesOf(trace.str()))) {
     words << "line " << difference->line << " of the trace:\n  predicted: " << difference->predicted
           << "\n  traced:    " << difference->traced << '\n';
   }
@@ -99,6 +130,7 @@ RunReport SceneRunner::run(const refhost::HostOptions& options, const std::strin
     compare(words, "import", report.prediction.imports[i], results.imports[i]);
   }
   compare(words, "death", report.prediction.death, results.death);
+  compareUnwatched(words, results, runHost(options, path, imports, nullptr));
   if (!words.str().empty()) report.disagreement = words.str();
   return report;
 }

@@ -1,4 +1,5 @@
-// Runs a scene through the importer under the embedded host, and holds what came of it to the prediction.
+// Runs a scene through the importer under the embedded host, and holds what came of it to the prediction. A
+// second run, without a trace, has to come to the same results and the same project.
 #pragma once
 
 #include <cstdint>
