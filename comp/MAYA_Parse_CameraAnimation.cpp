@@ -41,8 +41,7 @@ void MAYA_Parse::ApplyZoomAnimation(VOR_Layer* layer, const MAYA_Camera* camera)
 
 void MAYA_Parse::InsertZoomKeys(VOR_AddKeyframesInfo* batch, VOR_Stream* stream, const MAYA_Camera* camera,
                                 const RecordList* keys) {
-  const std::int64_t count = RecordCount(keys);
-  for (std::int64_t k = 0; k < count; ++k) {
+  for (std::int64_t k = 0; k < RecordCount(keys); ++k) {
     const auto key = FetchRecord<MAYA_Key>(keys, k);
     const T_Time time = ConvertTime(key.time, k == 0 ? 1 : 0);
     const double zoom = CalculateZoom(camera, CalculatePixelFit(camera), &key.value);

@@ -13,7 +13,9 @@ constexpr std::size_t kLongestName = kNameCapacity - 1;
 // The node's name in the plug at the beginning of the text, which then begins behind the plug. Empty where
 // there is no plug.
 std::string_view TakePlug(std::string_view* text) {
-  const std::string_view name = text->substr(0, text->substr(0, kLongestName).find('.'));
+  const std::size_t dot = text->substr(0, kLongestName).find('.');
+  if (dot == std::string_view::npos) return {};
+  const std::string_view name = text->substr(0, dot);
   const std::size_t quote = text->substr(0, 2 * kLongestName).find('"', name.size());
   if (quote == std::string_view::npos) return {};
   text->remove_prefix(quote);

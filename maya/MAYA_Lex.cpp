@@ -123,6 +123,7 @@ MayaToken MAYA_Lex::GetNextToken(const char** start, const char** last) {
 }
 
 void MAYA_Lex::SkipWhiteSpace() {
+  if (position > end_) return;
   const char* at = position;
   for (; IsWhiteSpace(*at); ++at) line += *at == '\n' ? 1 : 0;
   tokenStart = position = at;
@@ -142,6 +143,7 @@ void MAYA_Lex::SkipHarmlessInCommand() {
 }
 
 std::int32_t MAYA_Lex::SkipCharacters(const char* set) {
+  if (position > end_) return 0;
   while (*position != '\0' && std::strchr(set, *position) != nullptr) {
     if (*position == '\n') ++line;
     ++position;

@@ -114,6 +114,20 @@ TEST(HostMatrixTest, AnAxisThatSharesComponentsWithACoordinateAxisIsNotTakenForI
   }
 }
 
+TEST(HostMatrixTest, AlongACoordinateAxisLengthDoesNotMatterAndDirectionDoes) {
+  for (int axis = 0; axis < 3; ++axis) {
+    const auto turned = [&](double length, double angle) {
+      TransformMatrix matrix = Identity();
+      const auto on = [&](int which) { return which == axis ? length : 0.0; };
+      EXPECT_EQ(MatrixRotateAxis(&matrix, on(0), on(1), on(2), angle), HOST_ERR_NONE);
+      return matrix;
+    };
+    EXPECT_LT(Distance(turned(-1.0, 0.7), turned(1.0, -0.7)), kTolerance);
+    EXPECT_LT(Distance(turned(2.5, 0.7), turned(1.0, 0.7)), kTolerance);
+    EXPECT_LT(Distance(turned(-0.3, 0.7), turned(1.0, -0.7)), kTolerance);
+  }
+}
+
 TEST(HostMatrixTest, TheLengthOfTheAxisDoesNotMatter) {
   TransformMatrix unit = Identity();
   MatrixRotateAxis(&unit, 0.6, 0, 0.8, 1.25);

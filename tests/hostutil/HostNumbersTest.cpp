@@ -218,14 +218,18 @@ TEST(HostNumberScanTest, NullPointersAndNegativeLengthsAreRefused) {
   EXPECT_TRUE(SameBits(value, kUntouched));
 }
 
-TEST(HostNumberScanTest, TheLocaleChangesNothing) {
+// Where the machine has no locale with a decimal comma, there is nothing to see, and this says so.
+TEST(HostNumberScanTest, ALocaleWithADecimalCommaChangesNothing) {
   const std::string before = std::setlocale(LC_ALL, nullptr);
-  for (const char* locale : {"de_DE.UTF-8", "fr_FR.UTF-8", "de_DE", "C.UTF-8"}) {
-    if (std::setlocale(LC_ALL, locale) == nullptr) continue;
+  bool seen = false;
+  for (const char* locale : {"de_DE.UTF-8", "fr_FR.UTF-8", "de_DE.utf8", "de_DE"}) {
+    if (std::setlocale(LC_ALL, locale) == nullptr || *std::localeconv()->decimal_point != ',') continue;
+    seen = true;
     ExpectValue("1.5", 1.5);
     ExpectRefused("1,5", HOST_ERR_NUMBER_SYNTAX);
   }
   std::setlocale(LC_ALL, before.c_str());
+  if (!seen) GTEST_SKIP() << "no locale with a decimal comma is installed";
 }
 
 TEST(HostNumberScanTest, TimeIsLinearInTheLength) {

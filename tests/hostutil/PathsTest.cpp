@@ -90,6 +90,7 @@ TEST(PathsTest, EveryLoneSurrogateIsShownAsTheReplacementCharacter) {
   }
   EXPECT_EQ(ShownUnits({0xD83C, 'x'}), std::string(kReplaced) + "x");
   EXPECT_EQ(ShownUnits({0xDFAC, 0xD83C}), std::string(kReplaced) + kReplaced);
+  EXPECT_EQ(ShownUnits({0xDC00, 0xDC01}), std::string(kReplaced) + kReplaced);
 }
 
 TEST(PathsTest, AHighSurrogateBeforeWhatIsNoLowOneStaysAlone) {

@@ -57,6 +57,16 @@ TEST_F(UTF16StringTest, TheEmptyTextHasNoUnitsButTheNul) {
   UTF16StringRelease(text);
 }
 
+TEST_F(UTF16StringTest, UnitsEndAtTheirFirstNul) {
+  const HostUTF16Unit units[] = {0, 'x', 0};
+  for (const std::size_t from : {0u, 1u}) {
+    UTF16String* text = nullptr;
+    ASSERT_EQ(UTF16StringMakeFromUnits(units + from, &text), HOST_ERR_NONE);
+    EXPECT_EQ(UnitsOf(text), from == 0 ? Units{} : Units{'x'});
+    UTF16StringRelease(text);
+  }
+}
+
 TEST_F(UTF16StringTest, ANullTextReadsAsTheEmptyOne) {
   EXPECT_EQ(UTF16StringLength(nullptr), 0);
   ASSERT_NE(UTF16StringUnits(nullptr), nullptr);

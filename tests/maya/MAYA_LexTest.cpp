@@ -169,6 +169,7 @@ TEST_F(LexTest, TheByteOfAReadingErrorIsWhereThePositionStays) {
     const char* last = nullptr;
     EXPECT_THROW(lex.GetNextToken(&start, &last), int);
     EXPECT_EQ(lex.tokenStart, text.begin());
+    EXPECT_EQ(lex.position, text.begin());
   }
 }
 

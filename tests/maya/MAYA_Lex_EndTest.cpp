@@ -66,6 +66,10 @@ TEST_F(LexTest, NothingIsPassedOverBehindTheEnd) {
   ASSERT_EQ(behind, text.end() + 1);
   lex.SkipHarmless();
   EXPECT_EQ(lex.position, behind);
+  lex.SkipWhiteSpace();
+  EXPECT_EQ(lex.position, behind);
+  EXPECT_EQ(lex.SkipCharacters("a"), 0);
+  EXPECT_EQ(lex.position, behind);
   lex.SkipHarmlessInCommand();
   EXPECT_EQ(lex.position, behind);
 }

@@ -63,12 +63,17 @@ std::size_t AddressSpace() {
 }
 
 TEST_F(ScaleTest, AKeyCountThatLiesReservesNoMoreThanItsCommandCouldHold) {
-  constexpr int kCurves = 20000;
-  constexpr std::size_t kBytesPerCurve = 4096;  // two records of half a kilobyte, a list, and its few keys
+  constexpr int kCurves = 2000;
+  constexpr int kKeysOfACurve = 300;  // the count is looked at behind a first run of 256
+  // Two records of half a kilobyte, a list, and its keys; those that could still follow are no more than
+  // there are.
+  constexpr std::size_t kBytesPerCurve = 4096 + 2 * kKeysOfACurve * sizeof(MAYA_Key);
+  std::string keys;
+  for (int key = 0; key < kKeysOfACurve; ++key) keys += " " + std::to_string(key) + " 5";
   std::string text;
   for (int number = 0; number < kCurves; ++number) {
     text += "createNode animCurveTL -n \"c" + std::to_string(number) +
-            "\";\nsetAttr -s 999999999 \".ktv[0:1]\" 1 0 2 5;\n";
+            "\";\nsetAttr -s 999999999 \".ktv[0:299]\"" + keys + ";\n";
   }
   const std::size_t before = AddressSpace();
   ASSERT_EQ(Read(text), 0);

@@ -1,6 +1,6 @@
 """Changes the importer one token at a time, and looks whether the tests notice.
 
-usage: scripts/mutate [--count N] [--seed N] [--only FOLDER] [--headers] [--quick] [--jobs N] [--again]
+usage: scripts/mutate [--count N] [--seed N] [--only FOLDER] [--headers] [--quick | --own] [--jobs N] [--again]
 
 Chooses mutants of the sources of plugin, maya, comp and hostutil, as many of each: comparisons that take in their
 limit or lose it, arithmetic and logic turned round, constants replaced by their neighbours, conditions negated. Each
@@ -26,7 +26,7 @@ from dataclasses import asdict
 from pathlib import Path
 
 from mutants import Mutant, mutants_of
-from workspace import LAST_STAGE, QUICK_STAGES, STAGES, Workspace, WorkspaceError
+from workspace import FIRST_STAGE, LAST_STAGE, QUICK_STAGES, STAGES, Workspace, WorkspaceError
 
 ROOT = Path(__file__).resolve().parents[2]
 PLACE = ROOT / "build" / "mutate"
@@ -165,7 +165,9 @@ def arguments():
     parser.add_argument("--seed", type=int, default=1, metavar="N", help="which ones are chosen (1)")
     parser.add_argument("--only", choices=FOLDERS, metavar="FOLDER", help="only those of one folder")
     parser.add_argument("--headers", action="store_true", help="in headers too, each of which rebuilds much")
-    parser.add_argument("--quick", action="store_true", help="not by everything, which takes minutes for each")
+    stages = parser.add_mutually_exclusive_group()
+    stages.add_argument("--quick", action="store_true", help="not by everything, which takes minutes for each")
+    stages.add_argument("--own", action="store_true", help="by the folder's own tests alone")
     parser.add_argument("--jobs", type=int, default=1, metavar="N", help="how many are tried at a time (1)")
     parser.add_argument("--again", action="store_true", help="only those that survived when it ran last")
     options = parser.parse_args()
@@ -204,9 +206,10 @@ def main():
                         else choose(folders, options.count, options.seed, suffixes))
     spaces = [Workspace(ROOT, PLACE / str(number)) for number in range(1, options.jobs + 1)]
     try:
-        try_all(spaces, campaign, QUICK_STAGES, folders)
+        try_all(spaces, campaign, (FIRST_STAGE,) if options.own else QUICK_STAGES, folders)
+        write_survivors(campaign.survivors())
         campaign.wait_for_survivors()
-        if campaign.waiting and not options.quick:
+        if campaign.waiting and not (options.own or options.quick):
             try_all(spaces, campaign, (LAST_STAGE,), folders)
     except (WorkspaceError, OSError, subprocess.SubprocessError) as error:
         print(f"scripts/mutate: {error}", file=sys.stderr)

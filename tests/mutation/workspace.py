@@ -48,7 +48,8 @@ class Stage:
 
 
 OWN, IMPORTS, ALL = "own tests", "whole imports", "everything"
-QUICK_STAGES = (Stage(OWN), Stage(IMPORTS))
+FIRST_STAGE = Stage(OWN)
+QUICK_STAGES = (FIRST_STAGE, Stage(IMPORTS))
 LAST_STAGE = Stage(ALL)
 STAGES = (*QUICK_STAGES, LAST_STAGE)
 

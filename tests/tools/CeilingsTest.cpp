@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include <chrono>
+#include <nlohmann/json.hpp>
 #include <string>
 
 #include "refhost/Host.h"
@@ -30,10 +31,18 @@ TEST_F(Ceilings, LayersBeyondTheMostAreACodeAndASentenceAndTheOthersAreShown) {
 }
 
 TEST_F(Ceilings, KeysBeyondTheMostAreACodeAndTheFirstOnesStay) {
-  const ToolResult result = run({"import", "--most-keys", "2", "crane.ma"});
+  const ToolResult result = run({"import", "--most-keys", "2", "--json", "out.json", "crane.ma"});
   EXPECT_EQ(result.status, 1);
   EXPECT_THAT(result.err, HasSubstr("error 3035 (TOO_MANY_KEYS)"));
   EXPECT_THAT(result.err, HasSubstr("the host takes no more than 2 keys"));
+  std::size_t keys = 0;
+  const auto report = nlohmann::json::parse(read("out.json"));
+  for (const auto& layer : report["scenes"][0]["compositions"][0]["layers"]) {
+    for (const auto& stream : layer["streams"]) {
+      if (!stream["keys"].is_null()) keys += stream["keys"]["times"].size();
+    }
+  }
+  EXPECT_EQ(keys, 2u) << report;
 }
 
 TEST_F(Ceilings, MemoryBeyondTheMostIsACode) {
@@ -68,7 +77,8 @@ TEST_F(Ceilings, TheHelpNamesTheDefaults) {
   const std::string help = run({"import", "--help"}).out;
   EXPECT_THAT(help, HasSubstr("layers that the project takes (" + std::to_string(defaults.mostLayers) + ")"));
   EXPECT_THAT(help, HasSubstr("keys that the project takes (" + std::to_string(defaults.mostKeys) + ")"));
-  EXPECT_THAT(help, HasSubstr("given at one time (" + std::to_string(defaults.mostMemory) + ")"));
+  EXPECT_THAT(help,
+              HasSubstr("behind memory handles at one time (" + std::to_string(defaults.mostMemory) + ")"));
 }
 
 // Each locator has a chain of parents of its own: a text of a few kilobytes that asks for a hundred million

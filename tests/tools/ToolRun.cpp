@@ -49,9 +49,18 @@ int ToolTest::spawn(const std::vector<std::string>& arguments, const std::string
   posix_spawn_file_actions_addopen(&actions, STDOUT_FILENO, out.c_str(), O_WRONLY | O_CREAT | O_TRUNC, 0600);
   posix_spawn_file_actions_addopen(&actions, STDERR_FILENO, err.c_str(), O_WRONLY | O_CREAT | O_TRUNC, 0600);
   for (const int closed : closedDescriptors) posix_spawn_file_actions_addclose(&actions, closed);
+  // A shell ignores interruptions on behalf of what it runs in the background, and what that runs would too.
+  posix_spawnattr_t attributes;
+  posix_spawnattr_init(&attributes);
+  sigset_t defaults;
+  sigemptyset(&defaults);
+  for (const int signal : {SIGINT, SIGHUP, SIGTERM, SIGPIPE}) sigaddset(&defaults, signal);
+  posix_spawnattr_setsigdefault(&attributes, &defaults);
+  posix_spawnattr_setflags(&attributes, POSIX_SPAWN_SETSIGDEF);
   pid_t process = -1;
-  const int failure = ::posix_spawn(&process, MAYASCENE_TOOL, &actions, nullptr, pointers(words).data(),
+  const int failure = ::posix_spawn(&process, MAYASCENE_TOOL, &actions, &attributes, pointers(words).data(),
                                     pointers(variables).data());
+  posix_spawnattr_destroy(&attributes);
   posix_spawn_file_actions_destroy(&actions);
   if (failure != 0) throw std::runtime_error("the tool cannot be started");
   return process;
