@@ -1,5 +1,7 @@
-// The reader of preference files, against a second reader.
+// The reader and the writer of preference files, against a second reader.
 #include <cstdint>
+#include <filesystem>
+#include <iterator>
 #include <map>
 #include <optional>
 #include <string>
@@ -12,11 +14,16 @@
 #include "fuzz/Require.h"
 #include "fuzz/Target.h"
 #include "refhost/Preferences.h"
+#include "tests/support/TemporaryFolder.h"
 
 namespace {
 
 using fuzz::Require;
 using Entries = std::map<std::pair<std::string, std::string>, std::int32_t>;
+
+constexpr const char* kFileName = "preferences";
+// So many texts are read for one that is written too, which takes ten times as long.
+constexpr std::size_t kOneIn = 16;
 
 // Decimal digits with an optional "-" that fit 32 bits, and nothing else.
 std::optional<std::int32_t> IntegerOf(std::string_view text) {
@@ -54,12 +61,53 @@ void CheckEntries(const refhost::Preferences& preferences, const Entries& expect
     Require(preferences.find(place.first, place.second) == value, "an entry is read");
 }
 
-// A value more than the file has, beside which the others stay.
-void CheckAddition(refhost::Preferences& preferences, Entries expected) {
+void Add(refhost::Preferences& preferences, Entries& entries, std::string_view section, std::string_view key,
+         std::int32_t value) {
+  preferences.set(std::string(section), std::string(key), value);
+  entries[{std::string(section), std::string(key)}] = value;
+}
+
+// Values more than the file has, beside which the others stay. Two have names of any bytes.
+void CheckAdditions(refhost::Preferences& preferences, Entries& entries, std::string_view text) {
   constexpr std::int32_t kValue = -7;
-  preferences.set("Maya Camera", "Use Linear Units", kValue);
-  expected[{"Maya Camera", "Use Linear Units"}] = kValue;
-  CheckEntries(preferences, expected);
+  const std::size_t half = text.size() / 2;
+  Add(preferences, entries, text.substr(0, half), "key", kValue);
+  Add(preferences, entries, "section", text.substr(half), kValue);
+  Add(preferences, entries, "Maya Camera", "Use Linear Units", kValue);
+  CheckEntries(preferences, entries);
+}
+
+bool FitsALine(std::string_view name) { return name.find_first_of("\r\n") == std::string_view::npos; }
+
+// What a file can hold: all but the names with a line end.
+Entries Writable(Entries entries) {
+  std::erase_if(entries, [](const auto& entry) {
+    return !FitsALine(entry.first.first) || !FitsALine(entry.first.second);
+  });
+  return entries;
+}
+
+void Write(const refhost::Preferences& preferences, const std::filesystem::path& folder) {
+  std::string failure;
+  Require(preferences.write(&failure), "preferences can be written");
+  Require(failure.empty(), "a file that is written has no failure");
+  const auto files = std::filesystem::directory_iterator(folder);
+  Require(std::distance(begin(files), end(files)) == 1, "nothing is left beside the file");
+}
+
+// The text as a file that is read, written, read back and written again.
+void CheckWriter(std::string_view text, Entries entries) {
+  static const testsupport::TemporaryFolder folder;
+  refhost::Preferences preferences(folder.write(kFileName, text));
+  CheckAdditions(preferences, entries, text);
+  Write(preferences, folder.path());
+  const std::string bytes = folder.read(kFileName);
+  const Entries writable = Writable(entries);
+  Require(Expected(bytes) == writable, "the file holds each entry that it can hold, and no other");
+  const refhost::Preferences again(folder.path() / kFileName);
+  CheckEntries(again, writable);
+  Write(again, folder.path());
+  Require(folder.read(kFileName) == bytes, "what is read back is written as it was");
 }
 
 }  // namespace
@@ -70,10 +118,11 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   file.Write(text);
   refhost::Preferences preferences(file.path());
   Require(preferences.fileExists(), "a file that is there is seen");
-  const Entries expected = Expected(text);
-  CheckEntries(preferences, expected);
+  Entries entries = Expected(text);
+  CheckEntries(preferences, entries);
   Require(!preferences.find("a section that no file has\n", "a key"),
           "an entry that is not there is not read");
-  CheckAddition(preferences, expected);
+  if (size % kOneIn == 0) CheckWriter(text, entries);
+  CheckAdditions(preferences, entries, text);
   return 0;
 }

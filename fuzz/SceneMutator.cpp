@@ -100,9 +100,10 @@ std::string NodeWithShape(Dice& dice) {
 // Two of three links make no constraint, so all three come at once.
 std::string AimConstraint(Dice& dice) {
   const std::string node = Name(dice), turned = Name(dice), target = Name(dice);
+  const std::string follows(dice.Pick(kFollowingAttributes)), turns(dice.Pick(kTurningAttributes));
   return "createNode aimConstraint -n " + Quoted(node) + ";\nconnectAttr " + Quoted(turned + ".t") + ' ' +
-         Quoted(node + ".ct") + ";\nconnectAttr " + Quoted(target + ".t") + ' ' +
-         Quoted(node + ".target[0].targetTranslate") + ";\nconnectAttr " + Quoted(node + ".cr") + ' ' +
+         Quoted(node + follows) + ";\nconnectAttr " + Quoted(target + ".t") + ' ' +
+         Quoted(node + ".target[0].targetTranslate") + ";\nconnectAttr " + Quoted(node + turns) + ' ' +
          Quoted(turned + ".r");
 }
 

@@ -30,6 +30,29 @@ inline constexpr std::string_view kNames[] = {"a",   "b",    "c",       "cam",  
                                               "loc", "aim",  "k1",      "k2",   "k3",       "k4", "",
                                               "a.b", "null", "NULLish", "|a|b", "x\\\"y"};
 
+// What a constraint gives to the node that it turns, and what it takes from there.
+inline constexpr std::string_view kTurningAttributes[] = {".cr",
+                                                          ".crx",
+                                                          ".cry",
+                                                          ".crz",
+                                                          ".cv",
+                                                          ".constraintRotate",
+                                                          ".constraintRotateX",
+                                                          ".constraintRotateY",
+                                                          ".constraintRotateZ",
+                                                          ".constraintVector",
+                                                          ".constraintVectorX",
+                                                          ".constraintVectorY",
+                                                          ".constraintVectorZ"};
+inline constexpr std::string_view kFollowingAttributes[] = {".ct",
+                                                            ".ctx",
+                                                            ".cty",
+                                                            ".ctz",
+                                                            ".constraintTranslate",
+                                                            ".constraintTranslateX",
+                                                            ".constraintTranslateY",
+                                                            ".constraintTranslateZ"};
+
 // Those between which a connection means something come more often.
 inline constexpr std::string_view kSourceAttributes[] = {
     ".o", ".output", ".o", ".t", ".r", ".cr", ".crx", ".constraintRotateY", ".cv", ".pim", "", ".w0"};
@@ -45,6 +68,14 @@ inline constexpr std::string_view kDestinationAttributes[] = {".tx",
                                                               ".fl",
                                                               ".focalLength",
                                                               ".translateX",
+                                                              ".translateY",
+                                                              ".translateZ",
+                                                              ".rotateX",
+                                                              ".rotateY",
+                                                              ".rotateZ",
+                                                              ".scaleX",
+                                                              ".scaleY",
+                                                              ".scaleZ",
                                                               ".ct",
                                                               ".ctx",
                                                               ".tg[0].tt",
@@ -66,12 +97,12 @@ inline constexpr std::string_view kRenderAttributes[] = {
     ".w", ".width", ".h", ".height", ".dar", ".deviceAspectRatio", ".pa", ".pixelAspect"};
 
 inline constexpr std::string_view kUnits[] = {
-    "-l mm",      "-l cm",        "-l centimeter", "-l m",        "-l km",       "-l in",
-    "-l foot",    "-linear yd",   "-l mi",         "-a deg",      "-a rad",      "-angle degree",
-    "-t hour",    "-t min",       "-t sec",        "-t millisec", "-t game",     "-t film",
-    "-t pal",     "-t ntsc",      "-t show",       "-t palf",     "-time ntscf", "-t 12",
-    "-t 29.97df", "-t 23.976fps", "-t 0",          "-t -5",       "-t 1e9",      "-x film",
-    "-l",
+    "-l mm",        "-l millimeter", "-l cm",   "-l centimeter", "-l m",    "-l meter",   "-l km",
+    "-l kilometer", "-l in",         "-l inch", "-l ft",         "-l foot", "-l yd",      "-l yard",
+    "-linear yd",   "-l mi",         "-l mile", "-a deg",        "-a rad",  "-a radian",  "-angle degree",
+    "-t hour",      "-t min",        "-t sec",  "-t millisec",   "-t game", "-t film",    "-t pal",
+    "-t ntsc",      "-t show",       "-t palf", "-time ntscf",   "-t 12",   "-t 29.97df", "-t 23.976fps",
+    "-t 0",         "-t -5",         "-t 1e9",  "-x film",       "-l",
 };
 
 inline constexpr std::string_view kOptions[] = {"-n",     "-name", "-p", "-parent", "-s", "-type", "-k",

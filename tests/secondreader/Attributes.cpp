@@ -3,6 +3,7 @@
 #include <cmath>
 
 #include "hostutil/HostNumbers.h"
+#include "tests/secondreader/KnownWords.h"
 #include "tests/secondreader/SceneReader.h"
 
 namespace secondreader {
@@ -55,15 +56,15 @@ void SceneReader::setTransformAttr() {
   const Token token = lexer_.next();
   if (token.kind != Kind::String) return;
   const std::string attribute = unquoted(token.text);
-  if (isOneOf(attribute, {".t", ".translate"})) {
+  if (means(kAttributes, attribute, Means::Translate)) {
     readTriple(transform_.translate, kNone);
-  } else if (isOneOf(attribute, {".r", ".rotate"})) {
+  } else if (means(kAttributes, attribute, Means::Rotate)) {
     readTriple(transform_.rotate, kNone);
-  } else if (isOneOf(attribute, {".s", ".scale"})) {
+  } else if (means(kAttributes, attribute, Means::Scale)) {
     readTriple(transform_.scale, kUnscaled);
-  } else if (isOneOf(attribute, {".rp", ".rotatePivot"})) {
+  } else if (means(kAttributes, attribute, Means::RotatePivot)) {
     readTriple(transform_.rotatePivot, kNone);
-  } else if (isOneOf(attribute, {".sp", ".scalePivot"})) {
+  } else if (means(kAttributes, attribute, Means::ScalePivot)) {
     readTriple(transform_.scalePivot, kNone);
   } else {
     return;
@@ -79,16 +80,16 @@ void SceneReader::setCameraAttr() {
   }
   if (token.kind != Kind::String) return;
   const std::string attribute = unquoted(token.text);
-  const bool orthographic = isOneOf(attribute, {".o", ".orthographic"});
-  const bool interest = isOneOf(attribute, {".wci", ".worldCenterOfInterest"});
-  const bool fit = isOneOf(attribute, {".ff", ".filmFit"});
-  const bool focal = isOneOf(attribute, {".fl", ".focalLength"});
-  const bool aperture = isOneOf(attribute, {".cap", ".cameraAperture"});
+  const bool orthographic = means(kAttributes, attribute, Means::Orthographic);
+  const bool interest = means(kAttributes, attribute, Means::Interest);
+  const bool fit = means(kAttributes, attribute, Means::FilmFit);
+  const bool focal = means(kAttributes, attribute, Means::FocalLength);
+  const bool aperture = means(kAttributes, attribute, Means::Aperture);
   if (!orthographic && !interest && !fit && !focal && !aperture) return;
   Triple values{};
   std::size_t count = 0;
   for (token = inCommand(); token.kind != Kind::Semicolon; token = inCommand()) {
-    if (orthographic && token.kind == Kind::Identifier && same(copied(token.text), "yes")) {
+    if (orthographic && token.kind == Kind::Identifier && means(kBareWords, copied(token.text), Means::Yes)) {
       camera_.orthographic = true;
     }
     if (token.kind != Kind::Number) continue;
@@ -118,11 +119,9 @@ bool SceneReader::findKeys() {
   for (;;) {
     const Token token = inCommand();
     if (token.kind == Kind::Semicolon) return false;
-    if (token.kind == Kind::Option && !same(copied(token.text), "-s")) lexer_.next();
+    if (token.kind == Kind::Option && !means(kBareWords, copied(token.text), Means::KeyCount)) lexer_.next();
     if (token.kind != Kind::String) continue;
-    const std::string attribute = unquoted(token.text);
-    if (attribute.find(".ktv") != std::string::npos) return true;
-    if (attribute.find(".keyTimeValue") != std::string::npos) return true;
+    if (holds(kAttributes, unquoted(token.text), Means::Keys)) return true;
   }
 }
 
@@ -143,10 +142,10 @@ void SceneReader::setRenderAttr() {
   for (Token token = inCommand(); token.kind != Kind::Semicolon; token = inCommand()) {
     if (token.kind != Kind::String) continue;
     const std::string attribute = unquoted(token.text);
-    const bool width = isOneOf(attribute, {".w", ".width"});
-    const bool height = isOneOf(attribute, {".h", ".height"});
-    const bool device = isOneOf(attribute, {".dar", ".deviceAspectRatio"});
-    const bool pixel = isOneOf(attribute, {".pa", ".pixelAspect"});
+    const bool width = means(kAttributes, attribute, Means::Width);
+    const bool height = means(kAttributes, attribute, Means::Height);
+    const bool device = means(kAttributes, attribute, Means::DeviceAspect);
+    const bool pixel = means(kAttributes, attribute, Means::PixelAspect);
     if (!width && !height && !device && !pixel) continue;
     token = inCommand();
     if (token.kind == Kind::Semicolon) return;

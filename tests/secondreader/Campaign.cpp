@@ -46,7 +46,7 @@ int run(const Campaign& campaign) {
   for (std::uint64_t seed = campaign.first; seed < campaign.first + campaign.count; ++seed) {
     const secondreader::SeedReport report = runSeed(runner, seed, campaign.failures);
     total.runs += report.runs;
-    total.skipped += report.skipped;
+    total.ended += report.ended;
     total.imported += report.imported;
     total.lines += report.lines;
     if (!report.disagreement) continue;
@@ -58,9 +58,9 @@ int run(const Campaign& campaign) {
   }
   const std::chrono::duration<double> taken = std::chrono::steady_clock::now() - start;
   std::printf(
-      "%llu scenes, %d runs (%d imported with code 0, %d not run because they end the process), "
+      "%llu scenes, %d runs (%d imported with code 0, %d ended their process as predicted), "
       "%llu lines, %llu disagreements, %.1f seconds\n",
-      static_cast<unsigned long long>(campaign.count), total.runs, total.imported, total.skipped,
+      static_cast<unsigned long long>(campaign.count), total.runs, total.imported, total.ended,
       static_cast<unsigned long long>(total.lines), static_cast<unsigned long long>(disagreements),
       taken.count());
   return disagreements == 0 ? 0 : 1;

@@ -1,33 +1,11 @@
 // Which curve drives what, and how a constraint is wired.
+#include "tests/secondreader/KnownWords.h"
 #include "tests/secondreader/SceneReader.h"
 
 namespace secondreader {
 namespace {
 
-// The place in Transform::curve that an attribute stands for; -1 for none.
-int channelOf(std::string_view attribute) {
-  constexpr std::string_view kShort[kChannels] = {"tx", "ty", "tz", "rx", "ry", "rz", "sx", "sy", "sz"};
-  constexpr std::string_view kLong[kChannels] = {"translateX", "translateY", "translateZ",
-                                                 "rotateX",    "rotateY",    "rotateZ",
-                                                 "scaleX",     "scaleY",     "scaleZ"};
-  for (std::size_t i = 0; i < kChannels; ++i) {
-    if (isOneOf(attribute, {kShort[i], kLong[i]})) return static_cast<int>(i);
-  }
-  return -1;
-}
-
-bool isOutput(std::string_view attribute) { return isOneOf(attribute, {"output", "o"}); }
-
-bool turns(std::string_view attribute) {
-  return isOneOf(attribute, {"constraintRotate", "cr", "constraintRotateX", "crx", "constraintRotateY", "cry",
-                             "constraintRotateZ", "crz", "constraintVector", "cv", "constraintVectorX",
-                             "constraintVectorY", "constraintVectorZ"});
-}
-
-bool follows(std::string_view attribute) {
-  return isOneOf(attribute, {"constraintTranslate", "ct", "constraintTranslateX", "ctx",
-                             "constraintTranslateY", "cty", "constraintTranslateZ", "ctz"});
-}
+bool isOutput(std::string_view attribute) { return means(kPlugs, attribute, Means::Output); }
 
 }  // namespace
 
@@ -64,7 +42,8 @@ void SceneReader::connect(const std::string& source, const std::string& destinat
     return;
   }
   const int camera = findNamed(scene_.cameras, node);
-  if (camera >= 0 && curve >= 0 && isOutput(sourceAttribute) && isOneOf(attribute, {"fl", "focalLength"})) {
+  if (camera >= 0 && curve >= 0 && isOutput(sourceAttribute) &&
+      means(kPlugs, attribute, Means::FocalLength)) {
     scene_.cameras[static_cast<std::size_t>(camera)].focalLengthCurve = curve;
   }
 }
@@ -74,13 +53,14 @@ void SceneReader::connectTransform(int source, bool isCurve, const std::string& 
   auto& links = scene_.transforms[destination].curve;
   if (source < 0) return;
   if (isCurve) {
-    const int channel = channelOf(destinationAttribute);
-    if (channel >= 0 && isOutput(attribute)) links[static_cast<std::size_t>(channel)] = source;
-  } else if (turns(attribute)) {
+    constexpr int kNone = -1;
+    const int channel = codeOf(kPlugs, destinationAttribute, Means::Channel, kNone);
+    if (channel != kNone && isOutput(attribute)) links[static_cast<std::size_t>(channel)] = source;
+  } else if (means(kPlugs, attribute, Means::Turns)) {
     scene_.transforms[static_cast<std::size_t>(source)].curve[kConstrained] = static_cast<int>(destination);
-  } else if (follows(destinationAttribute)) {
+  } else if (means(kPlugs, destinationAttribute, Means::Follows)) {
     links[kFollowed] = source;
-  } else if (destinationAttribute.find("target") != std::string::npos) {
+  } else if (holds(kPlugs, destinationAttribute, Means::Target)) {
     links[kTarget] = source;
   }
 }

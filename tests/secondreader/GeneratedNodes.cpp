@@ -4,8 +4,31 @@
 namespace secondreader {
 namespace {
 
-constexpr std::string_view kChannels[] = {"tx", "ty", "tz",         "rx", "ry",     "rz",      "sx",    "sy",
-                                          "sz", "rx", "translateX", "tz", "scaleZ", "rotateY", "scaleX"};
+constexpr std::string_view kChannels[] = {"tx", "ty", "tz", "rx", "ry", "rz", "sx", "sy", "sz"};
+constexpr std::string_view kLongChannels[] = {"translateX", "translateY", "translateZ", "rotateX", "rotateY",
+                                              "rotateZ",    "scaleX",     "scaleY",     "scaleZ"};
+// What a constraint takes from the node that it turns, and what it gives to it.
+constexpr std::string_view kFollowing[] = {".ct",
+                                           ".ctx",
+                                           ".cty",
+                                           ".ctz",
+                                           ".constraintTranslate",
+                                           ".constraintTranslateX",
+                                           ".constraintTranslateY",
+                                           ".constraintTranslateZ"};
+constexpr std::string_view kTurning[] = {".cr",
+                                         ".crx",
+                                         ".cry",
+                                         ".crz",
+                                         ".cv",
+                                         ".constraintRotate",
+                                         ".constraintRotateX",
+                                         ".constraintRotateY",
+                                         ".constraintRotateZ",
+                                         ".constraintVector",
+                                         ".constraintVectorX",
+                                         ".constraintVectorY",
+                                         ".constraintVectorZ"};
 
 bool isAngle(std::string_view channel) { return channel.front() == 'r'; }
 
@@ -97,11 +120,11 @@ void SceneGenerator::cameraAttributes() {
     if (odd()) words(dice_.oneOf(kOdd));
     switch (dice_.between(0, 6)) {
       case 0:
-        quoted(anyCase(".o"));
+        quoted(anyCase(dice_.chance(50) ? ".o" : ".orthographic"));
         word(dice_.chance(15) ? anyCase("yes") : "no");
         break;
       case 1:
-        quoted(anyCase(".wci"));
+        quoted(anyCase(dice_.chance(50) ? ".wci" : ".worldCenterOfInterest"));
         triple(&SceneGenerator::number);
         break;
       case 2:
@@ -145,8 +168,14 @@ void SceneGenerator::curve(const std::string& name, int keys, bool angles) {
       word(anyCase("setAttr"));
       if (dice_.chance(60)) word("-s " + std::to_string(keys));
       if (odd()) words(dice_.oneOf(kHeads));
-      quoted(dice_.chance(90) ? ".ktv[0:" + std::to_string(keys) + "]"
-                              : (odd() ? ".KTV[0]" : "x.keyTimeValue"));
+      const std::string range = "[0:" + std::to_string(keys) + "]";
+      if (dice_.chance(85)) {
+        quoted(".ktv" + range);
+      } else if (dice_.chance(70)) {
+        quoted(".keyTimeValue" + range);
+      } else {
+        quoted(odd() ? ".KTV[0]" : "x.keyTimeValue");
+      }
     }
     if (keys == 0) break;
     word(odd() ? oddNumber() : std::to_string(time) + std::string(dice_.oneOf(kFractions)));
@@ -159,7 +188,7 @@ void SceneGenerator::curve(const std::string& name, int keys, bool angles) {
 void SceneGenerator::animateTransform(const std::string& name) {
   const int keys = dice_.chance(10) ? dice_.between(0, 2) : dice_.between(2, 9);
   for (int count = dice_.between(1, 5); count > 0; --count) {
-    const std::string_view channel = dice_.oneOf(kChannels);
+    const std::string_view channel = dice_.chance(60) ? dice_.oneOf(kChannels) : dice_.oneOf(kLongChannels);
     const std::string driver =
         odd() && dice_.chance(30) ? knownName(curves_) : name + "_" + std::string(channel);
     int own = keys;
@@ -181,9 +210,9 @@ void SceneGenerator::constraint(const std::string& turned, const std::string& ta
   const std::string name = newName("aim");
   createNode(dice_.chance(50) ? "aimConstraint" : "lookAt", name, turned);
   transforms_.push_back(name);
-  if (!odd()) connect(turned + ".t", name + (dice_.chance(50) ? ".ct" : ".constraintTranslate"));
+  if (!odd()) connect(turned + ".t", name + anyCase(dice_.oneOf(kFollowing)));
   if (!odd()) connect(target + ".t", name + ".target[0].targetTranslate");
-  if (!odd()) connect(name + (dice_.chance(70) ? ".crx" : ".constraintVectorY"), turned + ".rx");
+  if (!odd()) connect(name + anyCase(dice_.oneOf(kTurning)), turned + ".rx");
   if (odd()) connect(name + ".cameraW0", name + ".target[0].targetWeight");
 }
 

@@ -1,7 +1,5 @@
 #include "tests/secondreader/Lexer.h"
 
-#include <array>
-
 #include "hostapi/ErrorCodes.h"
 #include "tests/secondreader/Words.h"
 
@@ -11,23 +9,6 @@ namespace {
 bool isLetter(char byte) { return (byte >= 'a' && byte <= 'z') || (byte >= 'A' && byte <= 'Z'); }
 bool isDigit(char byte) { return byte >= '0' && byte <= '9'; }
 bool isWhite(char byte) { return byte == '\t' || byte == '\r' || byte == '\n' || byte == ' '; }
-
-struct Keyword {
-  std::string_view word;
-  Kind kind;
-};
-constexpr std::array<Keyword, 10> kKeywords = {{
-    {"file", Kind::File},
-    {"requires", Kind::Requires},
-    {"createnode", Kind::CreateNode},
-    {"setattr", Kind::SetAttr},
-    {"addattr", Kind::AddAttr},
-    {"parent", Kind::Parent},
-    {"connectattr", Kind::ConnectAttr},
-    {"disconnectattr", Kind::DisconnectAttr},
-    {"select", Kind::Select},
-    {"currentunit", Kind::CurrentUnit},
-}};
 
 }  // namespace
 

@@ -1,6 +1,7 @@
 // Cuts a scene text into tokens, one byte at a time.
 #pragma once
 
+#include <array>
 #include <cstddef>
 #include <functional>
 #include <string_view>
@@ -36,6 +37,23 @@ struct Token {
   Kind kind = Kind::Unknown;
   std::string_view text;
 };
+
+struct Keyword {
+  std::string_view word;
+  Kind kind;
+};
+inline constexpr std::array<Keyword, 10> kKeywords = {{
+    {"file", Kind::File},
+    {"requires", Kind::Requires},
+    {"createnode", Kind::CreateNode},
+    {"setattr", Kind::SetAttr},
+    {"addattr", Kind::AddAttr},
+    {"parent", Kind::Parent},
+    {"connectattr", Kind::ConnectAttr},
+    {"disconnectattr", Kind::DisconnectAttr},
+    {"select", Kind::Select},
+    {"currentunit", Kind::CurrentUnit},
+}};
 
 // The messages that a lexical error shows, by their number in the table of localised strings.
 inline constexpr int kReadingMessage = 3;

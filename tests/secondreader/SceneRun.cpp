@@ -1,5 +1,7 @@
 #include "tests/secondreader/SceneRun.h"
 
+#include <csignal>
+#include <fstream>
 #include <sstream>
 #include <vector>
 
@@ -8,6 +10,7 @@
 #include "tests/secondreader/ProjectText.h"
 #include "tests/secondreader/SceneGenerator.h"
 #include "tests/secondreader/TraceComparison.h"
+#include "tests/support/OwnProcess.h"
 
 namespace secondreader {
 namespace {
@@ -39,6 +42,13 @@ Results runHost(refhost::HostOptions options, const std::string& path, int impor
   // What a death hook that could not be registered left.
   DeathHook(0);
   return results;
+}
+
+void compareTrace(std::ostringstream& words, const Prediction& prediction, std::string_view trace) {
+  if (const auto difference = firstDifference(prediction.trace, linesOf(trace))) {
+    words << "line " << difference->line << " of the trace:\n  predicted: " << difference->predicted
+          << "\n  traced:    " << difference->traced << '\n';
+  }
 }
 
 void compare(std::ostringstream& words, const char* callback, const PredictedCallback& predicted,
@@ -107,6 +117,44 @@ std::string describe(const refhost::HostOptions& options) {
   return words.str();
 }
 
+void compareReturn(std::ostringstream& words, const Prediction& prediction,
+                   const refhost::HostOptions& options, const std::string& path, int imports) {
+  std::ostringstream trace;
+  const Results results = runHost(options, path, imports, &trace);
+  compareTrace(words, prediction, trace.str());
+  compare(words, "entry", prediction.entry, results.entry);
+  compare(words, "verify", prediction.verify, results.verify);
+  for (std::size_t i = 0; i < results.imports.size(); ++i) {
+    compare(words, "import", prediction.imports[i], results.imports[i]);
+  }
+  compare(words, "death", prediction.death, results.death);
+  compareUnwatched(words, results, runHost(options, path, imports, nullptr));
+}
+
+void compareEnd(std::ostringstream& words, const Prediction& prediction, const refhost::HostOptions& options,
+                const std::string& path, int imports, const testsupport::TemporaryFolder& folder) {
+  constexpr const char* kTraceName = "trace of a process that ends";
+  const auto expectAborted = [&words](const char* which, int signal) {
+    if (signal == SIGABRT) return;
+    words << which << ": the process was to end, and ";
+    if (signal == 0) {
+      words << "the callbacks returned\n";
+    } else {
+      words << "signal " << signal << " ended it\n";
+    }
+  };
+  expectAborted("watched", testsupport::SignalOfOwnProcess([&] {
+                  std::ofstream trace;
+                  // What is still in a buffer would be lost.
+                  trace.rdbuf()->pubsetbuf(nullptr, 0);
+                  trace.open(folder.path() / kTraceName, std::ios::binary);
+                  runHost(options, path, imports, &trace);
+                }));
+  compareTrace(words, prediction, folder.read(kTraceName));
+  expectAborted("unwatched",
+                testsupport::SignalOfOwnProcess([&] { runHost(options, path, imports, nullptr); }));
+}
+
 }  // namespace
 
 RunReport SceneRunner::run(const refhost::HostOptions& options, const std::string& fileName,
@@ -114,23 +162,13 @@ RunReport SceneRunner::run(const refhost::HostOptions& options, const std::strin
   RunReport report;
   const std::string path = (folder_.path() / fileName).string();
   report.prediction = predict(options, path, scene, imports);
-  report.skipped = report.prediction.processEnds;
-  if (report.skipped) return report;
   folder_.write(fileName, scene);
-  std::ostringstream trace;
-  const Results results = runHost(options, path, imports, &trace);
   std::ostringstream words;
-  if (const auto difference = firstDifference(report.prediction.trace, linesOf(trace.str()))) {
-    words << "line " << difference->line << " of the trace:\n  predicted: " << difference->predicted
-          << "\n  traced:    " << difference->traced << '\n';
+  if (report.prediction.processEnds) {
+    compareEnd(words, report.prediction, options, path, imports, folder_);
+  } else {
+    compareReturn(words, report.prediction, options, path, imports);
   }
-  compare(words, "entry", report.prediction.entry, results.entry);
-  compare(words, "verify", report.prediction.verify, results.verify);
-  for (std::size_t i = 0; i < results.imports.size(); ++i) {
-    compare(words, "import", report.prediction.imports[i], results.imports[i]);
-  }
-  compare(words, "death", report.prediction.death, results.death);
-  compareUnwatched(words, results, runHost(options, path, imports, nullptr));
   if (!words.str().empty()) report.disagreement = words.str();
   return report;
 }
@@ -141,8 +179,8 @@ SeedReport runSeed(SceneRunner& runner, std::uint64_t seed, bool failures) {
   const auto runOnce = [&] {
     const RunReport run = runner.run(scene.options, scene.fileName, scene.bytes, scene.imports);
     report.runs += 1;
-    report.skipped += run.skipped ? 1 : 0;
-    report.imported += !run.skipped && run.prediction.imports.front().code == 0 ? 1 : 0;
+    report.ended += run.prediction.processEnds ? 1 : 0;
+    report.imported += !run.prediction.processEnds && run.prediction.imports.front().code == 0 ? 1 : 0;
     report.lines += run.prediction.trace.size();
     if (run.disagreement) {
       report.disagreement = "scene " + std::to_string(seed) + ", rehearsing:" + describe(scene.options) +

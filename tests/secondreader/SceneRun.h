@@ -1,5 +1,6 @@
 // Runs a scene through the importer under the embedded host, and holds what came of it to the prediction. A
-// second run, without a trace, has to come to the same results and the same project.
+// second run, without a trace, has to come to the same results and the same project. Where the process is to
+// end, both run in a process of their own, which has to end by SIGABRT with the predicted trace behind it.
 #pragma once
 
 #include <cstdint>
@@ -15,7 +16,6 @@ namespace secondreader {
 
 struct RunReport {
   Prediction prediction;
-  bool skipped = false;                     // the process would have ended
   std::optional<std::string> disagreement;  // in words
 };
 
@@ -31,8 +31,8 @@ class SceneRunner {
 // The generated scene of a seed, run without failures and, if they are asked for, once more with failures.
 struct SeedReport {
   int runs = 0;
-  int skipped = 0;
-  int imported = 0;                         // runs whose first import returned 0
+  int ended = 0;                            // runs that ended their process, as predicted
+  int imported = 0;                         // runs that returned, whose first import gave 0
   std::uint64_t lines = 0;                  // of all predicted traces
   std::optional<std::string> disagreement;  // names the seed
 };

@@ -2,7 +2,6 @@
 #pragma once
 
 #include <algorithm>
-#include <initializer_list>
 #include <string>
 #include <string_view>
 
@@ -16,10 +15,6 @@ inline char lower(char letter) {
 inline bool same(std::string_view a, std::string_view b) {
   return a.size() == b.size() &&
          std::equal(a.begin(), a.end(), b.begin(), [](char x, char y) { return lower(x) == lower(y); });
-}
-
-inline bool isOneOf(std::string_view word, std::initializer_list<std::string_view> words) {
-  return std::any_of(words.begin(), words.end(), [&](std::string_view other) { return same(word, other); });
 }
 
 // What of a token is kept: nothing of one of 255 bytes or more, and nothing behind a NUL.

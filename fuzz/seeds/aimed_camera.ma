@@ -1,0 +1,23 @@
+//Maya ASCII 2020 scene
+createNode transform -n "target";
+	setAttr ".translate" 4 5 6;
+createNode transform -n "crane";
+createNode transform -n "eye" -p "crane";
+	setAttr ".t" -type "double3" 0 10 0 ;
+createNode camera -n "eyeShape" -p "eye";
+	setAttr ".focalLength" 50;
+createNode aimConstraint -n "aim" -p "eye";
+	setAttr ".a" -type "double3" 0 0 -1 ;
+createNode animCurveTL -n "target_tx";
+	setAttr -s 2 ".ktv[0:1]"  0 4 24 -4;
+createNode animCurveTL -n "eye_tz";
+	setAttr -s 2 ".ktv[0:1]"  0 30 24 12.5;
+connectAttr "target_tx.o" "target.tx";
+connectAttr "eye_tz.o" "eye.tz";
+connectAttr "eye.t" "aim.ct";
+connectAttr "target.t" "aim.tg[0].tt";
+connectAttr "target.t" "aim.target[0].targetTranslate";
+connectAttr "aim.crx" "eye.rx" -l on;
+connectAttr "aim.cry" "eye.ry" -l on;
+select -ne :defaultResolution;
+	setAttr ".pixelAspect" 1;

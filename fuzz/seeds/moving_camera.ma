@@ -1,0 +1,25 @@
+//Maya ASCII 2020 scene
+currentUnit -l cm -a deg -t film;
+createNode transform -n "dolly";
+	setAttr ".t" -type "double3" 10 2.5 -30 ;
+createNode transform -n "head" -p "dolly";
+	setAttr ".r" -type "double3" -5 90 0 ;
+createNode camera -n "headShape" -p "head";
+	setAttr -k off ".v";
+	setAttr ".cap" -type "double2" 1.41732 0.94488 ;
+	setAttr ".ff" 1;
+	setAttr ".fl" 35;
+createNode animCurveTL -n "dolly_translateX";
+	setAttr ".tan" 18;
+	setAttr -s 3 ".ktv[0:2]"  1 10 2 11.25 3 13;
+createNode animCurveTA -n "head_rotateY";
+	setAttr -s 3 ".ktv[0:2]"  1 90 2 179 3 -178;
+createNode animCurveTU -n "zoom";
+	setAttr -s 2 ".ktv[0:1]"  1 35 3 70.5;
+select -ne :defaultResolution;
+	setAttr ".w" 640;
+	setAttr ".h" 360;
+	setAttr ".pa" 1;
+connectAttr "dolly_translateX.o" "dolly.tx";
+connectAttr "head_rotateY.o" "head.ry";
+connectAttr "zoom.o" "headShape.fl";

@@ -1,0 +1,23 @@
+//Maya ASCII 2020 scene
+createNode transform -n "a" -p "b";
+createNode transform -n "b" -p "a";
+createNode transform -n "A" -p "gone";
+	setAttr ".t" 7;
+createNode camera -n "k" -p "a";
+	setAttr ".orthographic" no;
+createNode camera -n "K" -p "b";
+createNode camera -n "front" -p "a";
+	setAttr ".o" yes;
+createNode animCurveTL -n "x";
+	setAttr ".ktv[0]" 0 1;
+	setAttr ".ktv[1]" 6 3;
+createNode animCurveTL -n "x";
+	setAttr ".ktv[0:1]" 0 1 5 2;
+createNode mesh -n "m" -p "a";
+	setAttr ".fl" 5;
+parent -s -nc "a" "b";
+connectAttr "x.o" "B.tx";
+connectAttr "x.o" "k.focalLength";
+disconnectAttr "x.o" "b.tx";
+select -ne :defaultResolution;
+	setAttr ".width" 320 ".height" 240 ".pa" 1.009;

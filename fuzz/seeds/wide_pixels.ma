@@ -1,0 +1,20 @@
+//Maya ASCII 2020 scene
+requires maya "2020";
+currentUnit -linear inch -angle radian -time ntsc;
+createNode transform -n "pan";
+	setAttr ".rp" 0 1 0;
+	setAttr ".sp" 2 0 .5;
+	setAttr ".rotate" 0.25 -1.5707963 3.1;
+createNode stereoRigCamera -n "panShape" -p "pan";
+	setAttr ".ff" 2;
+	setAttr ".worldCenterOfInterest" -type "double3" 1 2 3 ;
+createNode animCurveTA -n "pan_ry";
+	setAttr -k on ".keyTimeValue[0:1]" 1 0 12 6.2831853;
+select -ne :time1;
+	setAttr ".o" 12;
+select -ne :defaultResolution;
+	setAttr ".w" 1440;
+	setAttr ".h" 1080;
+	setAttr ".dar" 1.7777778;
+	setAttr ".pa" 1.3333334;
+connectAttr -f "pan_ry.o" "pan.rotateY";
