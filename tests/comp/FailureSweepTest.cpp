@@ -5,8 +5,8 @@
 #include <cstdio>
 
 #include "hostapi/ErrorCodes.h"
-#include "tests/comp/FailureModel.h"
 #include "tests/comp/FailureScenes.h"
+#include "tests/support/FailureModel.h"
 
 namespace testsupport {
 namespace {
@@ -21,6 +21,7 @@ class FailureSweepTest : public ::testing::TestWithParam<FailureScene> {
     ImportRun run = ImportFile(file_, Options());
     good_ = run.trace;
     goodCode_ = run.result.code;
+    goodMessages_ = run.result.messages;
     CheckHost(run);
   }
 
@@ -96,6 +97,7 @@ class FailureSweepTest : public ::testing::TestWithParam<FailureScene> {
   const TemporaryFile file_;
   std::vector<std::string> good_;
   HostError goodCode_ = 0;
+  std::vector<std::string> goodMessages_;
   int points_ = 0;
 };
 
@@ -176,6 +178,7 @@ TEST_P(FailureSweepTest, ACallThatDoesNothingAndSaysSuccessLeavesNothingBehind) 
     const ImportRun run = Rehearse(index, refhost::Failure::Kind::Code, 0, false);
     EXPECT_EQ(run.result.code, CodeAfterIdle(good_, index, goodCode_));
     CheckHost(run, index);
+    EXPECT_THAT(run.result.messages, ::testing::IsSubsetOf(goodMessages_));
     for (std::size_t i = 0; i < index; ++i) EXPECT_EQ(run.trace[i], good_[i]);
     if (HasFailure()) break;
   }
@@ -228,6 +231,13 @@ TEST(FailureScenesTest, TogetherTheyReachEverySuiteCallOfAnImport) {
                                           "GetStreamKeyframeCount", "BeginKeyframeBatch", "AddBatchKeyframe",
                                           "SetBatchKeyframeValue",  "EndKeyframeBatch"};
   EXPECT_EQ(reached, expected);
+}
+
+TEST(FailureScenesTest, TogetherTheyEndWithEveryCodeOfTheImportersOwn) {
+  std::set<HostError> codes;
+  for (const FailureScene& scene : FailureScenes()) codes.insert(ImportText(scene.text).result.code);
+  EXPECT_EQ(codes, (std::set<HostError>{0, HOST_ERR_MAYA_SYNTAX, HOST_ERR_MAYA_UNEXPECTED_END,
+                                        HOST_ERR_MAYA_KEY_COUNTS}));
 }
 
 }  // namespace
