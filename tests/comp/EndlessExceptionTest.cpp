@@ -6,7 +6,6 @@
 #include <csignal>
 #include <cstdio>
 
-#include "hostapi/ErrorCodes.h"
 #include "tests/comp/FailureScenes.h"
 #include "tests/comp/SweptImport.h"
 #include "tests/support/BuilderRun.h"
@@ -14,17 +13,6 @@
 
 namespace testsupport {
 namespace {
-
-struct Exception {
-  refhost::Failure::Kind kind;
-  HostError code;
-  const char* error;
-};
-
-constexpr Exception kExceptions[] = {
-    {refhost::Failure::Kind::BadAlloc, HOST_ERR_EXCEPTION_MEMORY, "\"bad_alloc\""},
-    {refhost::Failure::Kind::RuntimeError, HOST_ERR_EXCEPTION_OTHER, "\"runtime_error\""},
-};
 
 // The calls that a failed one leads to, as far as the first suite release; `left` is what it left to do.
 std::vector<std::string> LastCalls(const std::string& failed, const HeldByCallback& left) {
@@ -38,7 +26,7 @@ std::vector<std::string> LastCalls(const std::string& failed, const HeldByCallba
 
 // The calls before the failure are those of the good run; then come the last ones, and each of them threw.
 void ExpectCalls(const EndedCallback& ended, const std::vector<std::string>& good, std::size_t index,
-                 const std::vector<std::string>& last, const Exception& exception) {
+                 const std::vector<std::string>& last, const Way& exception) {
   ASSERT_EQ(ended.trace.size(), index + last.size());
   EXPECT_TRUE(
       std::equal(good.begin(), good.begin() + static_cast<std::ptrdiff_t>(index), ended.trace.begin()));
@@ -66,7 +54,7 @@ int ExpectEnds(const std::filesystem::path& scene, refhost::HostOptions options,
       const std::vector<std::string> last = LastCalls(good[index], left);
       // Only while no suite is held does nothing have to be released.
       const bool ends = CallName(last.back()) == "ReleaseSuiteByName";
-      for (const Exception& exception : kExceptions) {
+      for (const Way& exception : kExceptions) {
         ++points;
         options.failures = {{"", static_cast<std::int64_t>(index) + 1, true, exception.kind, 0}};
         const EndedCallback ended = CallInAProcess(refhost::Callback::Import, scene, options);

@@ -4,8 +4,8 @@
 #include <gtest/gtest.h>
 
 #include <cstdio>
+#include <set>
 #include <string>
-#include <utility>
 #include <vector>
 
 #include "hostapi/ErrorCodes.h"
@@ -96,6 +96,14 @@ class ExampleSweepTest : public ::testing::TestWithParam<std::string> {
   int points_ = 0;
 };
 
+TEST_P(ExampleSweepTest, OfEveryOperationACallIsWalked) {
+  std::set<std::string> there;
+  std::set<std::string> walked;
+  for (const std::string& line : import_.good()) there.insert(CallName(line));
+  ForEachCall([&](const SweepCursor& cursor) { walked.insert(CallName(cursor.line())); });
+  EXPECT_EQ(walked, there);
+}
+
 TEST_P(ExampleSweepTest, ACallThatFailsGivesItsCodeOrIsIgnored) {
   ForEachCall([this](const SweepCursor& cursor) {
     const SweptRun run = Rehearse(cursor.index(), Failure::Kind::Code, kRehearsed, false);
@@ -130,13 +138,7 @@ TEST_P(ExampleSweepTest, WhereEverythingFailsFromACallOnTheImportEndsAllTheSame)
 }
 
 TEST_P(ExampleSweepTest, AStandardExceptionIsReportedOnceAndBecomesItsCode) {
-  const struct {
-    Failure::Kind kind;
-    HostError code;
-    const char* error;
-  } exceptions[] = {{Failure::Kind::BadAlloc, HOST_ERR_EXCEPTION_MEMORY, "\"bad_alloc\""},
-                    {Failure::Kind::RuntimeError, HOST_ERR_EXCEPTION_OTHER, "\"runtime_error\""}};
-  for (const auto& exception : exceptions) {
+  for (const Way& exception : kExceptions) {
     ForEachCall([&](const SweepCursor& cursor) {
       const std::string call = CallName(cursor.line());
       if (call == "ReleaseSuiteByName") return;  // ends the process: a test of its own
@@ -177,26 +179,24 @@ TEST_P(ExampleSweepTest, AUtilityServiceThatFailsGivesItsCodeAndAnExceptionIsRep
     made.push_back(cursor.madeAfter(cleanUp));
     if (cursor.isAtEnd()) break;
   }
-  const std::pair<Failure::Kind, HostError> kinds[] = {
-      {Failure::Kind::Code, kRehearsed},
-      {Failure::Kind::BadAlloc, HOST_ERR_EXCEPTION_MEMORY},
-      {Failure::Kind::RuntimeError, HOST_ERR_EXCEPTION_OTHER}};
+  std::vector<Way> ways = {{Failure::Kind::Code, kRehearsed, kRehearsedText}};
+  ways.insert(ways.end(), std::begin(kExceptions), std::end(kExceptions));
   for (const auto& [service, places] :
        PlacesOfServices(refhost::Callback::Import, ExampleScene(GetParam()))) {
     const std::size_t stride = SweepStride(places.size(), kSmallShare);
     for (std::size_t call = 0; call < places.size() && !HasFailure(); call += stride) {
       const std::size_t place = places[call];
-      for (const auto& [kind, code] : kinds) {
+      for (const Way& way : ways) {
         SCOPED_TRACE(service + " " + std::to_string(call + 1));
         ++points_;
         refhost::HostOptions options;
-        options.failures.push_back({service, static_cast<std::int64_t>(call) + 1, false, kind, code});
+        options.failures.push_back({service, static_cast<std::int64_t>(call) + 1, false, way.kind, way.code});
         const SweptRun run = import_.Run(options);
-        EXPECT_EQ(run.result.code, code);
+        EXPECT_EQ(run.result.code, way.code);
         EXPECT_TRUE(run.calls == std::string(import_.FirstCalls(place)) + cleanUps[place]);
         Made expected = made[place];
         expected.leftovers += run.host->callCount("FileName") != 0 ? kFileObject : 0;
-        ExpectMade(run, expected, kind == Failure::Kind::Code ? 0 : 1);
+        ExpectMade(run, expected, way.kind == Failure::Kind::Code ? 0 : 1);
       }
     }
   }

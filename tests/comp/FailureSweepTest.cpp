@@ -136,20 +136,18 @@ TEST_P(FailureSweepTest, WhereEverythingFailsFromACallOnTheImportEndsAllTheSame)
 }
 
 TEST_P(FailureSweepTest, AStandardExceptionIsReportedOnceAndBecomesItsCode) {
-  for (const auto& [kind, code] :
-       {std::pair(refhost::Failure::Kind::BadAlloc, HOST_ERR_EXCEPTION_MEMORY),
-        std::pair(refhost::Failure::Kind::RuntimeError, HOST_ERR_EXCEPTION_OTHER)}) {
+  for (const Way& way : kExceptions) {
     for (std::size_t index = 0; index < good_.size(); ++index) {
       const std::string call = CallName(good_[index]);
       if (call == "ReleaseSuiteByName") continue;  // ends the process: a test of its own
       SCOPED_TRACE("call " + std::to_string(index + 1) + ": " + good_[index]);
-      const ImportRun run = Rehearse(index, kind, 0, false);
+      const ImportRun run = Rehearse(index, way.kind, 0, false);
       CheckHost(run, kNoCall, 1);
       if (call == "UnlockMemHandle" || call == "FreeMemHandle") {
-        EXPECT_EQ(run.result.code, goodCode_ != 0 ? goodCode_ : code);
+        EXPECT_EQ(run.result.code, goodCode_ != 0 ? goodCode_ : way.code);
         CheckSameCalls(run);
       } else {
-        EXPECT_EQ(run.result.code, code);
+        EXPECT_EQ(run.result.code, way.code);
         CheckCleanUp(run, index);
       }
       if (HasFailure()) return;

@@ -6,11 +6,13 @@
 #include <algorithm>
 #include <csignal>
 #include <cstdio>
+#include <optional>
 #include <set>
 
 #include "hostapi/ErrorCodes.h"
 #include "plugin/Entry.h"
 #include "plugin/Globals.h"
+#include "tests/plugin/CallbackModel.h"
 #include "tests/support/BuilderRun.h"
 #include "tests/support/EndedCallback.h"
 #include "tests/support/FailureModel.h"
@@ -44,59 +46,7 @@ const std::vector<Case>& Cases() {
   return cases;
 }
 
-// A way to fail, the code that it becomes, and how the trace writes it.
-struct Way {
-  Failure::Kind kind;
-  HostError code;
-  const char* error;
-};
-
 constexpr Way kCode = {Failure::Kind::Code, kRehearsed, "-77"};
-constexpr Way kExceptions[] = {
-    {Failure::Kind::BadAlloc, HOST_ERR_EXCEPTION_MEMORY, "\"bad_alloc\""},
-    {Failure::Kind::RuntimeError, HOST_ERR_EXCEPTION_OTHER, "\"runtime_error\""},
-};
-
-// What a callback is expected to come to.
-struct Outcome {
-  HostError code = 0;
-  bool canImport = false;
-  std::vector<std::string> calls;
-  HostError reported = 0;  // the code of the one message; 0: there is none
-  std::size_t files = 0;   // left behind, because their own end was made to fail
-};
-
-std::string WithError(const std::string& line, const std::string& error) {
-  return WithoutError(line) + ",\"error\":" + error + "}";
-}
-
-std::string WithNull(std::string line, std::string_view key) {
-  const std::string_view value = Field(line, key);
-  if (value.empty()) return line;
-  return line.replace(static_cast<std::size_t>(value.data() - line.data()), value.size(), "null");
-}
-
-// The line of a call that fails: it hands nothing out.
-std::string Failed(const std::string& line, const std::string& error) {
-  const std::string call = CallName(line);
-  std::string failed = WithError(line, error);
-  if (call == "GetAppPrefsBlob") return WithNull(failed, "store");
-  if (call == "GetPrefLong") return WithNull(failed, "value");
-  if (call == "RegisterImporterName") return WithNull(failed, "importer");
-  return failed;
-}
-
-// Without a store the host refuses to look a preference up.
-void LoseTheStore(std::vector<std::string>* calls) {
-  bool lost = false;
-  for (std::string& line : *calls) {
-    const std::string call = CallName(line);
-    if (call == "GetAppPrefsBlob") lost = !Succeeded(line);
-    if (call != "GetPrefLong" || !lost) continue;
-    if (Succeeded(line)) line = Failed(line, std::to_string(HOST_ERR_BAD_HANDLE));
-    line = WithNull(line, "store");
-  }
-}
 
 bool Did(const std::vector<std::string>& calls, std::string_view call) {
   const std::vector<std::string> lines = CallsOf(calls, call);
@@ -109,15 +59,16 @@ class CallbackSweepTest : public ::testing::TestWithParam<Case> {
  protected:
   CallbackSweepTest() : file_(GetParam().text) {
     const ImportRun run = Run(Options({}));
-    good_ = run.trace;
-    goodCode_ = run.result.code;
-    CheckRun(run, {GetParam().code, GetParam().canImport, good_});
+    model_.emplace(run.trace, run.result.code, run.result.canImport);
+    CheckRun(run, {GetParam().code, GetParam().canImport, good()});
   }
 
   ~CallbackSweepTest() override {
-    std::printf("%s: %d points walked of %zu calls\n", GetParam().name.c_str(), points_, good_.size());
+    std::printf("%s: %d points walked of %zu calls\n", GetParam().name.c_str(), points_, good().size());
     RecordProperty("points", points_);
   }
+
+  const std::vector<std::string>& good() const { return model_->good(); }
 
   // In a module that was just loaded.
   static refhost::HostOptions Options(std::vector<Failure> failures) {
@@ -172,69 +123,11 @@ class CallbackSweepTest : public ::testing::TestWithParam<Case> {
     DeathHook(0);
   }
 
-  // A failure after that of the good run changes nothing of its code.
-  HostError CodeBehind(const Way& way) const { return goodCode_ != 0 ? goodCode_ : way.code; }
-
-  // What comes of it when call `index` fails, or with `onwards` every call from it on.
-  Outcome WhereCallsFail(std::size_t index, const Way& way, bool onwards) const {
-    const bool thrown = way.kind != Failure::Kind::Code;
-    Outcome outcome;
-    outcome.calls.assign(good_.begin(), good_.begin() + static_cast<std::ptrdiff_t>(index));
-    std::size_t end = index;  // of the good run: the call whose failure ends it
-    while (end < good_.size() && !thrown && IsCodeIgnored(good_, end)) ++end;
-    const std::size_t lastFailed = onwards ? end : index;
-    if (!onwards && end != index) end = good_.size();
-    for (std::size_t i = index; i < end; ++i) {
-      outcome.calls.push_back(i <= lastFailed ? Failed(good_[i], way.error) : good_[i]);
-    }
-    outcome.code = goodCode_;
-    outcome.canImport = GetParam().canImport;
-    if (end < good_.size()) {
-      const bool endsSilence = CallName(good_[end]) == "EndSilentErrors";
-      outcome.calls.push_back(Failed(good_[end], way.error));
-      for (const std::string& call : HeldAfter(good_, end + 1, true).CleanUp()) {
-        outcome.calls.push_back(WithError(call, onwards ? way.error : "0"));
-      }
-      outcome.code = endsSilence ? CodeBehind(way) : way.code;
-      if (!thrown && CallName(good_[end]) == "AcquireSuite") outcome.code = HOST_ERR_MISSING_SUITE;
-      outcome.canImport = endsSilence && GetParam().canImport;
-      outcome.reported = thrown && !endsSilence ? way.code : 0;  // what is shown while silent is not shown
-    }
-    LoseTheStore(&outcome.calls);
-    return outcome;
-  }
-
-  // What comes of it when a service fails behind so many calls of the good run.
-  Outcome WhereAServiceFails(const std::string& service, std::size_t place, const Way& way) const {
-    const bool thrown = way.kind != Failure::Kind::Code;
-    const bool disposal = service == "FileDispose";
-    Outcome outcome;
-    outcome.calls.assign(good_.begin(), good_.begin() + static_cast<std::ptrdiff_t>(place));
-    const HeldByCallback held = HeldAfter(good_, place, false);
-    for (const std::string& call : held.CleanUp()) outcome.calls.push_back(WithError(call, "0"));
-    const bool behind = disposal || (service == "FileClose" && !thrown);
-    outcome.code = behind ? CodeBehind(way) : way.code;
-    outcome.canImport = disposal && GetParam().canImport;
-    outcome.files = disposal ? 1 : 0;
-    outcome.reported = thrown && !held.IsSilent() ? way.code : 0;
-    if (service == "RegisterStringTable" && !thrown) outcome.calls = CallsWithoutImporter();
-    return outcome;
-  }
-
-  // Without its texts the plug-in registers no importer.
-  std::vector<std::string> CallsWithoutImporter() const {
-    std::vector<std::string> calls = good_;
-    std::erase_if(calls, [](const std::string& line) {
-      return Field(line, "suite") == "\"QZGP File Import Manager Suite\"";
-    });
-    return calls;
-  }
-
   void SweepCalls(const Way& way, bool onwards) {
-    for (std::size_t index = 0; index < good_.size(); ++index) {
-      if (way.kind != Failure::Kind::Code && CallName(good_[index]) == "ReleaseSuiteByName") continue;
-      SCOPED_TRACE("call " + std::to_string(index + 1) + ": " + good_[index]);
-      Expect(Options(FromCall(index, way, onwards)), WhereCallsFail(index, way, onwards));
+    for (std::size_t index = 0; index < good().size(); ++index) {
+      if (way.kind != Failure::Kind::Code && CallName(good()[index]) == "ReleaseSuiteByName") continue;
+      SCOPED_TRACE("call " + std::to_string(index + 1) + ": " + good()[index]);
+      Expect(Options(FromCall(index, way, onwards)), model_->WhereCallsFail(index, way, onwards));
     }
   }
 
@@ -248,7 +141,7 @@ class CallbackSweepTest : public ::testing::TestWithParam<Case> {
         for (std::size_t call = first; call < end; ++call) {
           failures.push_back({service, static_cast<std::int64_t>(call) + 1, false, way.kind, way.code});
         }
-        Expect(Options(failures), WhereAServiceFails(service, places[first], way));
+        Expect(Options(failures), model_->WhereAServiceFails(service, places[first], way));
       }
     }
   }
@@ -256,7 +149,7 @@ class CallbackSweepTest : public ::testing::TestWithParam<Case> {
   // The process ends in the first suite release that throws; before it come the expected calls.
   void ExpectEnd(std::size_t index, const Way& way, bool onwards) {
     ++points_;
-    Outcome expected = WhereCallsFail(index, way, onwards);
+    Outcome expected = model_->WhereCallsFail(index, way, onwards);
     const auto end =
         std::find_if(expected.calls.begin() + static_cast<std::ptrdiff_t>(index), expected.calls.end(),
                      [](const std::string& line) { return CallName(line) == "ReleaseSuiteByName"; });
@@ -270,8 +163,7 @@ class CallbackSweepTest : public ::testing::TestWithParam<Case> {
   }
 
   const TemporaryFile file_;
-  std::vector<std::string> good_;
-  HostError goodCode_ = 0;
+  std::optional<CallbackModel> model_;
   int points_ = 0;
 };
 
@@ -286,30 +178,30 @@ TEST_P(CallbackSweepTest, AStandardExceptionIsReportedOnceAndBecomesItsCode) {
 }
 
 TEST_P(CallbackSweepTest, AnExceptionOutOfASuiteReleaseEndsTheProcessThere) {
-  for (std::size_t index = 0; index < good_.size(); ++index) {
-    if (CallName(good_[index]) != "ReleaseSuiteByName") continue;
-    SCOPED_TRACE("call " + std::to_string(index + 1) + ": " + good_[index]);
+  for (std::size_t index = 0; index < good().size(); ++index) {
+    if (CallName(good()[index]) != "ReleaseSuiteByName") continue;
+    SCOPED_TRACE("call " + std::to_string(index + 1) + ": " + good()[index]);
     for (const Way& way : kExceptions) ExpectEnd(index, way, false);
   }
 }
 
 TEST_P(CallbackSweepTest, EndlessExceptionsEndTheProcessAtTheFirstSuiteReleaseOrAreReported) {
-  for (std::size_t index = 0; index < good_.size(); ++index) {
-    SCOPED_TRACE("from call " + std::to_string(index + 1) + ": " + good_[index]);
+  for (std::size_t index = 0; index < good().size(); ++index) {
+    SCOPED_TRACE("from call " + std::to_string(index + 1) + ": " + good()[index]);
     for (const Way& way : kExceptions) ExpectEnd(index, way, true);
   }
 }
 
 TEST_P(CallbackSweepTest, ASuiteThatIsRefusedIsThirteen) {
-  for (std::size_t index = 0; index < good_.size(); ++index) {
-    if (CallName(good_[index]) != "AcquireSuite") continue;
-    SCOPED_TRACE("refused " + good_[index]);
-    const std::string_view quoted = Field(good_[index], "suite");
+  for (std::size_t index = 0; index < good().size(); ++index) {
+    if (CallName(good()[index]) != "AcquireSuite") continue;
+    SCOPED_TRACE("refused " + good()[index]);
+    const std::string_view quoted = Field(good()[index], "suite");
     refhost::HostOptions options = Options({});
     options.refusedSuites.push_back({std::string(quoted.substr(1, quoted.size() - 2)),
-                                     std::stoi(std::string(Field(good_[index], "version")))});
+                                     std::stoi(std::string(Field(good()[index], "version")))});
     const std::string refused = std::to_string(HOST_ERR_SUITE_REFUSED);
-    Expect(options, WhereCallsFail(index, {Failure::Kind::Code, kRehearsed, refused.c_str()}, false));
+    Expect(options, model_->WhereCallsFail(index, {Failure::Kind::Code, kRehearsed, refused.c_str()}, false));
   }
 }
 

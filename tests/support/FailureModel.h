@@ -9,7 +9,8 @@
 #include <utility>
 #include <vector>
 
-#include "hostapi/HostTypes.h"
+#include "hostapi/ErrorCodes.h"
+#include "refhost/Host.h"
 #include "tests/support/BuilderRun.h"
 
 namespace testsupport {
@@ -23,6 +24,18 @@ std::vector<std::string> WithoutErrors(const std::vector<std::string>& lines);
 
 // Whether the call gave back 0.
 bool Succeeded(std::string_view line);
+
+// A way to fail, the code that it becomes, and how a trace writes it.
+struct Way {
+  refhost::Failure::Kind kind;
+  HostError code;
+  const char* error;
+};
+
+inline constexpr Way kExceptions[] = {
+    {refhost::Failure::Kind::BadAlloc, HOST_ERR_EXCEPTION_MEMORY, "\"bad_alloc\""},
+    {refhost::Failure::Kind::RuntimeError, HOST_ERR_EXCEPTION_OTHER, "\"runtime_error\""},
+};
 
 // Follows a trace line by line and knows what is held.
 class HeldByCallback {
