@@ -5,7 +5,6 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
-#include <charconv>
 #include <cstddef>
 #include <cstdio>
 #include <cstdlib>
@@ -75,8 +74,7 @@ EndedCallback CallInAProcess(refhost::Callback callback, const std::filesystem::
     return ended;
   }
   if (WEXITSTATUS(status) != EXIT_SUCCESS) throw std::runtime_error("a process could not make its callback");
-  const std::string_view code = Field(LinesOf(trace).back(), "error");
-  std::from_chars(code.data(), code.data() + code.size(), ended.code);
+  ended.code = std::stoi(std::string(Field(LinesOf(trace).back(), "error")));
   return ended;
 }
 
