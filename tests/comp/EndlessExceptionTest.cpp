@@ -1,61 +1,69 @@
 // From one call on every call throws: sooner or later one of them is a suite release, and that ends the
 // process.
 #include <gtest/gtest.h>
-#include <sys/resource.h>
-#include <sys/wait.h>
-#include <unistd.h>
 
+#include <algorithm>
 #include <csignal>
 #include <cstdio>
-#include <cstdlib>
 
-#include "hostapi/ErrorCodes.h"
 #include "tests/comp/FailureScenes.h"
 #include "tests/comp/SweptImport.h"
 #include "tests/support/BuilderRun.h"
+#include "tests/support/EndedCallback.h"
 
 namespace testsupport {
 namespace {
 
-using refhost::Failure;
-
-// How a process of its own ends that makes the import: the signal, or 0 when it returned that code.
-int EndOf(const std::filesystem::path& scene, const refhost::HostOptions& options, HostError code) {
-  std::fflush(nullptr);
-  const pid_t process = fork();
-  if (process == 0) {
-    const rlimit none{0, 0};
-    setrlimit(RLIMIT_CORE, &none);
-    if (std::freopen("/dev/null", "w", stderr) == nullptr) _exit(EXIT_FAILURE);
-    _exit(ImportPath(scene, options).result.code == code ? EXIT_SUCCESS : EXIT_FAILURE);
+// The calls that a failed one leads to, as far as the first suite release; `left` is what it left to do.
+std::vector<std::string> LastCalls(const std::string& failed, const HeldByCallback& left) {
+  std::vector<std::string> calls = {failed};
+  for (const std::string& call : left.CleanUp()) {
+    if (CallName(calls.back()) == "ReleaseSuiteByName") break;
+    calls.push_back(call);
   }
-  int status = 0;
-  EXPECT_EQ(waitpid(process, &status, 0), process);
-  if (WIFSIGNALED(status)) return WTERMSIG(status);
-  EXPECT_EQ(WEXITSTATUS(status), EXIT_SUCCESS);
-  return 0;
+  return calls;
+}
+
+// The calls before the failure are those of the good run; then come the last ones, and each of them threw.
+void ExpectCalls(const EndedCallback& ended, const std::vector<std::string>& good, std::size_t index,
+                 const std::vector<std::string>& last, const Way& exception) {
+  ASSERT_EQ(ended.trace.size(), index + last.size());
+  EXPECT_TRUE(
+      std::equal(good.begin(), good.begin() + static_cast<std::ptrdiff_t>(index), ended.trace.begin()));
+  for (std::size_t i = 0; i < last.size(); ++i) {
+    const std::string& line = ended.trace[index + i];
+    EXPECT_EQ(Field(line, "error"), exception.error) << line;
+    EXPECT_EQ(CallName(line), CallName(last[i]));
+    if (i != 0) {  // what the first would have handed out is null
+      EXPECT_EQ(WithoutError(line), last[i]);
+    }
+  }
 }
 
 // Walks the calls of the good run, and returns how many points those are.
 int ExpectEnds(const std::filesystem::path& scene, refhost::HostOptions options, std::size_t share) {
   const std::vector<std::string> good = ImportPath(scene, options).trace;
-  const std::size_t stride = SweepStride(good.size(), share);
+  const std::vector<bool> walked = WalkedCalls(good, share);
   int points = 0;
-  HeldByImport held;
+  HeldByCallback held;
   for (std::size_t index = 0; index < good.size(); ++index) {
-    HeldByImport left = held;
-    left.Take(good[index], true);
-    // Only while no suite is held does nothing have to be released.
-    const bool ends = !left.CleanUp().empty() || CallName(good[index]) == "ReleaseSuiteByName";
-    held.Take(good[index], false);
-    if (index % stride != 0) continue;
-    for (const auto& [kind, code] : {std::pair(Failure::Kind::BadAlloc, HOST_ERR_EXCEPTION_MEMORY),
-                                     std::pair(Failure::Kind::RuntimeError, HOST_ERR_EXCEPTION_OTHER)}) {
-      ++points;
-      options.failures = {{"", static_cast<std::int64_t>(index) + 1, true, kind, 0}};
-      EXPECT_EQ(EndOf(scene, options, code), ends ? SIGABRT : 0)
-          << "from call " << index + 1 << ": " << good[index];
+    if (walked[index]) {
+      SCOPED_TRACE("from call " + std::to_string(index + 1) + ": " + good[index]);
+      HeldByCallback left = held;
+      left.Take(good[index], true);
+      const std::vector<std::string> last = LastCalls(good[index], left);
+      // Only while no suite is held does nothing have to be released.
+      const bool ends = CallName(last.back()) == "ReleaseSuiteByName";
+      for (const Way& exception : kExceptions) {
+        ++points;
+        options.failures = {{"", static_cast<std::int64_t>(index) + 1, true, exception.kind, 0}};
+        const EndedCallback ended = CallInAProcess(refhost::Callback::Import, scene, options);
+        EXPECT_EQ(ended.signal, ends ? SIGABRT : 0);
+        EXPECT_EQ(ended.code, ends ? 0 : exception.code);
+        ExpectCalls(ended, good, index, last, exception);
+      }
     }
+    held.Take(good[index], false);
   }
   std::printf("%s: %d points walked\n", scene.stem().c_str(), points);
   return points;
@@ -63,7 +71,7 @@ int ExpectEnds(const std::filesystem::path& scene, refhost::HostOptions options,
 
 class EndlessExceptionTest : public ::testing::TestWithParam<FailureScene> {};
 
-TEST_P(EndlessExceptionTest, EndsTheProcessAtASuiteReleaseOrIsReported) {
+TEST_P(EndlessExceptionTest, EndsTheProcessAtTheFirstSuiteReleaseOrIsReported) {
   refhost::HostOptions options;
   options.zoomKeys = GetParam().zoomKeys;
   EXPECT_GT(ExpectEnds(TemporaryFile(GetParam().text).path(), options, kShareOfCalls), 0);
@@ -74,7 +82,7 @@ INSTANTIATE_TEST_SUITE_P(Scenes, EndlessExceptionTest, ::testing::ValuesIn(Failu
 
 class EndlessExceptionInExampleTest : public ::testing::TestWithParam<std::string> {};
 
-TEST_P(EndlessExceptionInExampleTest, EndsTheProcessAtASuiteReleaseOrIsReported) {
+TEST_P(EndlessExceptionInExampleTest, EndsTheProcessAtTheFirstSuiteReleaseOrIsReported) {
   EXPECT_GT(ExpectEnds(ExampleScene(GetParam()), {}, kSmallShare), 0);
 }
 

@@ -4,12 +4,13 @@
 #include <gtest/gtest.h>
 
 #include <cstdio>
+#include <set>
 #include <string>
-#include <utility>
 #include <vector>
 
 #include "hostapi/ErrorCodes.h"
 #include "tests/comp/SweptImport.h"
+#include "tests/support/ServicePlaces.h"
 
 namespace testsupport {
 namespace {
@@ -22,7 +23,7 @@ constexpr std::size_t kFileObject = 1;
 
 class ExampleSweepTest : public ::testing::TestWithParam<std::string> {
  protected:
-  ExampleSweepTest() : import_(ExampleScene(GetParam())), stride_(SweepStride(import_.good().size())) {}
+  ExampleSweepTest() : import_(ExampleScene(GetParam())), walked_(WalkedCalls(import_.good())) {}
 
   ~ExampleSweepTest() override {
     std::printf("%s: %d points walked of %zu calls\n", GetParam().c_str(), points_, import_.good().size());
@@ -40,7 +41,7 @@ class ExampleSweepTest : public ::testing::TestWithParam<std::string> {
   template <typename Work>
   void ForEachCall(Work work) {
     for (SweepCursor cursor(import_); !cursor.isAtEnd() && !HasFailure(); cursor.Next()) {
-      if (cursor.index() % stride_ != 0) continue;
+      if (!walked_[cursor.index()]) continue;
       SCOPED_TRACE("call " + std::to_string(cursor.index() + 1) + ": " + cursor.line());
       work(cursor);
     }
@@ -52,7 +53,7 @@ class ExampleSweepTest : public ::testing::TestWithParam<std::string> {
                      const std::string& error, bool onwards) {
     const std::vector<std::string>& good = import_.good();
     std::string expected(import_.FirstCalls(cursor.index()));
-    HeldByImport held = cursor.held();
+    HeldByCallback held = cursor.held();
     for (std::size_t i = cursor.index(); i < thrown; ++i) {
       held.Take(good[i], true);
       expected += WithErrors({WithoutError(good[i])}, error);
@@ -91,9 +92,17 @@ class ExampleSweepTest : public ::testing::TestWithParam<std::string> {
   }
 
   const SweptImport import_;
-  const std::size_t stride_;
+  const std::vector<bool> walked_;
   int points_ = 0;
 };
+
+TEST_P(ExampleSweepTest, OfEveryOperationACallIsWalked) {
+  std::set<std::string> there;
+  std::set<std::string> walked;
+  for (const std::string& line : import_.good()) there.insert(CallName(line));
+  ForEachCall([&](const SweepCursor& cursor) { walked.insert(CallName(cursor.line())); });
+  EXPECT_EQ(walked, there);
+}
 
 TEST_P(ExampleSweepTest, ACallThatFailsGivesItsCodeOrIsIgnored) {
   ForEachCall([this](const SweepCursor& cursor) {
@@ -129,13 +138,7 @@ TEST_P(ExampleSweepTest, WhereEverythingFailsFromACallOnTheImportEndsAllTheSame)
 }
 
 TEST_P(ExampleSweepTest, AStandardExceptionIsReportedOnceAndBecomesItsCode) {
-  const struct {
-    Failure::Kind kind;
-    HostError code;
-    const char* error;
-  } exceptions[] = {{Failure::Kind::BadAlloc, HOST_ERR_EXCEPTION_MEMORY, "\"bad_alloc\""},
-                    {Failure::Kind::RuntimeError, HOST_ERR_EXCEPTION_OTHER, "\"runtime_error\""}};
-  for (const auto& exception : exceptions) {
+  for (const Way& exception : kExceptions) {
     ForEachCall([&](const SweepCursor& cursor) {
       const std::string call = CallName(cursor.line());
       if (call == "ReleaseSuiteByName") return;  // ends the process: a test of its own
@@ -176,29 +179,24 @@ TEST_P(ExampleSweepTest, AUtilityServiceThatFailsGivesItsCodeAndAnExceptionIsRep
     made.push_back(cursor.madeAfter(cleanUp));
     if (cursor.isAtEnd()) break;
   }
-  const std::pair<Failure::Kind, HostError> kinds[] = {
-      {Failure::Kind::Code, kRehearsed},
-      {Failure::Kind::BadAlloc, HOST_ERR_EXCEPTION_MEMORY},
-      {Failure::Kind::RuntimeError, HOST_ERR_EXCEPTION_OTHER}};
-  for (const char* const service : SweptServices()) {
-    const auto calls = import_.serviceCalls(service);
-    const auto stride = static_cast<std::int64_t>(SweepStride(static_cast<std::size_t>(calls), kSmallShare));
-    for (std::int64_t nth = 1; nth <= calls; nth += stride) {
-      for (const auto& [kind, code] : kinds) {
-        SCOPED_TRACE(std::string(service) + " " + std::to_string(nth));
+  std::vector<Way> ways = {{Failure::Kind::Code, kRehearsed, kRehearsedText}};
+  ways.insert(ways.end(), std::begin(kExceptions), std::end(kExceptions));
+  for (const auto& [service, places] :
+       PlacesOfServices(refhost::Callback::Import, ExampleScene(GetParam()))) {
+    const std::size_t stride = SweepStride(places.size(), kSmallShare);
+    for (std::size_t call = 0; call < places.size() && !HasFailure(); call += stride) {
+      const std::size_t place = places[call];
+      for (const Way& way : ways) {
+        SCOPED_TRACE(service + " " + std::to_string(call + 1));
         ++points_;
         refhost::HostOptions options;
-        options.failures.push_back({service, nth, false, kind, code});
+        options.failures.push_back({service, static_cast<std::int64_t>(call) + 1, false, way.kind, way.code});
         const SweptRun run = import_.Run(options);
-        EXPECT_EQ(run.result.code, code);
-        // What every import ends with is clean-up also where the good run goes on with it.
-        std::size_t same = import_.LinesInCommon(run.calls);
-        while (same > 0 && EndsTheImport(import_.good()[same - 1])) --same;
-        EXPECT_EQ(run.calls, std::string(import_.FirstCalls(same)) + cleanUps[same]);
-        Made expected = made[same];
+        EXPECT_EQ(run.result.code, way.code);
+        EXPECT_TRUE(run.calls == std::string(import_.FirstCalls(place)) + cleanUps[place]);
+        Made expected = made[place];
         expected.leftovers += run.host->callCount("FileName") != 0 ? kFileObject : 0;
-        ExpectMade(run, expected, kind == Failure::Kind::Code ? 0 : 1);
-        if (HasFailure()) return;
+        ExpectMade(run, expected, way.kind == Failure::Kind::Code ? 0 : 1);
       }
     }
   }

@@ -36,6 +36,7 @@ std::vector<FailureScene> MakeScenes() {
       {"DifferentKeyCounts", Head() + Rig() + Lens() + Animation("rig.tx", {{1, 0}, {2, 5}}) +
                                  Animation("rig.ty", {{1, 0}, {2, 5}, {3, 6}})},
       {"BrokenText", Head() + Rig() + Lens() + "setAttr _underscore 1;\n"},
+      {"TextThatEndsTooSoon", Head() + Rig() + Lens() + "createNode transform -n \"half"},
       {"NoMayaFile", "This is a letter and not a scene.\n"},
   };
 }

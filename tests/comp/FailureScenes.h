@@ -1,4 +1,4 @@
-// Small scenes that together reach every suite call of an import.
+// Small scenes that together reach every suite call, utility service and code of an import.
 #pragma once
 
 #include <ostream>

@@ -5,8 +5,8 @@
 #include <cstdio>
 
 #include "hostapi/ErrorCodes.h"
-#include "tests/comp/FailureModel.h"
 #include "tests/comp/FailureScenes.h"
+#include "tests/support/FailureModel.h"
 
 namespace testsupport {
 namespace {
@@ -21,6 +21,7 @@ class FailureSweepTest : public ::testing::TestWithParam<FailureScene> {
     ImportRun run = ImportFile(file_, Options());
     good_ = run.trace;
     goodCode_ = run.result.code;
+    goodMessages_ = run.result.messages;
     CheckHost(run);
   }
 
@@ -96,6 +97,7 @@ class FailureSweepTest : public ::testing::TestWithParam<FailureScene> {
   const TemporaryFile file_;
   std::vector<std::string> good_;
   HostError goodCode_ = 0;
+  std::vector<std::string> goodMessages_;
   int points_ = 0;
 };
 
@@ -134,20 +136,18 @@ TEST_P(FailureSweepTest, WhereEverythingFailsFromACallOnTheImportEndsAllTheSame)
 }
 
 TEST_P(FailureSweepTest, AStandardExceptionIsReportedOnceAndBecomesItsCode) {
-  for (const auto& [kind, code] :
-       {std::pair(refhost::Failure::Kind::BadAlloc, HOST_ERR_EXCEPTION_MEMORY),
-        std::pair(refhost::Failure::Kind::RuntimeError, HOST_ERR_EXCEPTION_OTHER)}) {
+  for (const Way& way : kExceptions) {
     for (std::size_t index = 0; index < good_.size(); ++index) {
       const std::string call = CallName(good_[index]);
       if (call == "ReleaseSuiteByName") continue;  // ends the process: a test of its own
       SCOPED_TRACE("call " + std::to_string(index + 1) + ": " + good_[index]);
-      const ImportRun run = Rehearse(index, kind, 0, false);
+      const ImportRun run = Rehearse(index, way.kind, 0, false);
       CheckHost(run, kNoCall, 1);
       if (call == "UnlockMemHandle" || call == "FreeMemHandle") {
-        EXPECT_EQ(run.result.code, goodCode_ != 0 ? goodCode_ : code);
+        EXPECT_EQ(run.result.code, goodCode_ != 0 ? goodCode_ : way.code);
         CheckSameCalls(run);
       } else {
-        EXPECT_EQ(run.result.code, code);
+        EXPECT_EQ(run.result.code, way.code);
         CheckCleanUp(run, index);
       }
       if (HasFailure()) return;
@@ -176,6 +176,7 @@ TEST_P(FailureSweepTest, ACallThatDoesNothingAndSaysSuccessLeavesNothingBehind) 
     const ImportRun run = Rehearse(index, refhost::Failure::Kind::Code, 0, false);
     EXPECT_EQ(run.result.code, CodeAfterIdle(good_, index, goodCode_));
     CheckHost(run, index);
+    EXPECT_THAT(run.result.messages, ::testing::IsSubsetOf(goodMessages_));
     for (std::size_t i = 0; i < index; ++i) EXPECT_EQ(run.trace[i], good_[i]);
     if (HasFailure()) break;
   }
@@ -228,6 +229,13 @@ TEST(FailureScenesTest, TogetherTheyReachEverySuiteCallOfAnImport) {
                                           "GetStreamKeyframeCount", "BeginKeyframeBatch", "AddBatchKeyframe",
                                           "SetBatchKeyframeValue",  "EndKeyframeBatch"};
   EXPECT_EQ(reached, expected);
+}
+
+TEST(FailureScenesTest, TogetherTheyEndWithEveryCodeOfTheImportersOwn) {
+  std::set<HostError> codes;
+  for (const FailureScene& scene : FailureScenes()) codes.insert(ImportText(scene.text).result.code);
+  EXPECT_EQ(codes, (std::set<HostError>{0, HOST_ERR_MAYA_SYNTAX, HOST_ERR_MAYA_UNEXPECTED_END,
+                                        HOST_ERR_MAYA_KEY_COUNTS}));
 }
 
 }  // namespace

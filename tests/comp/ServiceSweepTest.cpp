@@ -5,11 +5,12 @@
 
 #include <algorithm>
 #include <cstdio>
+#include <set>
 
 #include "hostapi/ErrorCodes.h"
-#include "hostutil/HostSetup.h"
-#include "tests/comp/FailureModel.h"
 #include "tests/comp/FailureScenes.h"
+#include "tests/support/FailureModel.h"
+#include "tests/support/ServicePlaces.h"
 
 namespace testsupport {
 namespace {
@@ -17,20 +18,20 @@ namespace {
 using ::testing::ElementsAreArray;
 
 constexpr HostError kRehearsed = -77;  // no code of the host's or the importer's own
-
-const char* const kServices[] = {
-#define SERVICE_NAME(name) #name,
-    HOST_UTILITY_TABLE(SERVICE_NAME)
-#undef SERVICE_NAME
-};
+constexpr const char* kOnlyMayaAsciiText = "Only Baked Maya Ascii files are supported.";
 
 class ServiceSweepTest : public ::testing::TestWithParam<FailureScene> {
  protected:
-  ServiceSweepTest() : file_(GetParam().text) {
-    ImportRun run = ImportFile(file_, Options());
+  ServiceSweepTest()
+      : file_(GetParam().text),
+        places_(PlacesOfServices(refhost::Callback::Import, file_.path(), Options())) {
+    const ImportRun run = ImportFile(file_, Options());
     good_ = run.trace;
     goodCode_ = run.result.code;
-    for (const char* const service : kServices) counts_.push_back(run.host->callCount(service));
+    goodMessages_ = run.result.messages;
+    for (const auto& [service, places] : places_) {
+      EXPECT_EQ(run.host->callCount(service), static_cast<std::int64_t>(places.size())) << service;
+    }
   }
 
   ~ServiceSweepTest() override {
@@ -46,23 +47,23 @@ class ServiceSweepTest : public ::testing::TestWithParam<FailureScene> {
 
   enum class Extent { Once, Onwards };
 
-  // Calls work(service, run) for every call of every service: that call alone fails, or every call from it
-  // on.
+  // Calls work(service, place, run) for every call of every service, which has a place between the suite
+  // calls of the good run: that call alone fails, or every call from it on.
   template <typename Work>
   void ForEachPoint(refhost::Failure::Kind kind, HostError code, Work work, Extent extent = Extent::Once) {
-    constexpr std::int64_t kMostFurtherCalls = 16;  // than those of the good run, to clean up
-    for (std::size_t i = 0; i < counts_.size(); ++i) {
-      for (std::int64_t nth = 1; nth <= counts_[i] && !HasFailure(); ++nth) {
+    constexpr std::size_t kMostFurtherCalls = 16;  // than those of the good run, to clean up
+    for (const auto& [service, places] : places_) {
+      for (std::size_t first = 0; first < places.size() && !HasFailure(); ++first) {
         ++points_;
-        SCOPED_TRACE(std::string(kServices[i]) + " " + std::to_string(nth));
+        SCOPED_TRACE(service + " " + std::to_string(first + 1));
         refhost::HostOptions options = Options();
-        const std::int64_t last = extent == Extent::Once ? nth : counts_[i] + kMostFurtherCalls;
-        for (std::int64_t call = nth; call <= last; ++call) {
-          options.failures.push_back({kServices[i], call, false, kind, code});
+        const std::size_t end = extent == Extent::Once ? first + 1 : places.size() + kMostFurtherCalls;
+        for (std::size_t call = first; call < end; ++call) {
+          options.failures.push_back({service, static_cast<std::int64_t>(call) + 1, false, kind, code});
         }
         const ImportRun run = ImportFile(file_, options);
         CheckNothingLeft(run, run.host->callCount("FileName") != 0);
-        work(std::string_view(kServices[i]), run);
+        work(service, places[first], run);
       }
     }
   }
@@ -77,56 +78,45 @@ class ServiceSweepTest : public ::testing::TestWithParam<FailureScene> {
   }
 
   // The calls are those of the good run up to the failure; then the import cleans up.
-  void CheckCleanUp(const ImportRun& run) {
-    auto same = static_cast<std::size_t>(
-        std::mismatch(good_.begin(), good_.end(), run.trace.begin(), run.trace.end()).first - good_.begin());
-    while (same > 0 && EndsTheImport(good_[same - 1])) --same;
-    std::vector<std::string> expected(good_.begin(), good_.begin() + static_cast<std::ptrdiff_t>(same));
+  void CheckCleanUp(const ImportRun& run, std::size_t place) {
+    std::vector<std::string> expected(good_.begin(), good_.begin() + static_cast<std::ptrdiff_t>(place));
     expected = WithoutErrors(expected);
-    for (std::string& call : HeldAfter(good_, same, false).CleanUp()) expected.push_back(call);
+    for (std::string& call : HeldAfter(good_, place, false).CleanUp()) expected.push_back(call);
     EXPECT_THAT(WithoutErrors(run.trace), ElementsAreArray(expected));
   }
 
-  // A call that every import ends with.
-  static bool EndsTheImport(const std::string& line) {
-    const std::string call = CallName(line);
-    return call == "ReleaseSuiteByName" || call == "UnlockMemHandle" || call == "FreeMemHandle";
-  }
-
   void SweepCode(Extent extent) {
-    const auto check = [&](std::string_view service, const ImportRun& run) {
+    const auto check = [&](std::string_view service, std::size_t place, const ImportRun& run) {
       EXPECT_EQ(run.result.messages.size(), Shown(run));
       if (service == "StringCopy") {  // a message that does not fit is not shown, and nothing else changes
         EXPECT_EQ(run.result.code, goodCode_);
         EXPECT_EQ(Shown(run), 0u);
       } else {
         EXPECT_EQ(run.result.code, kRehearsed);
-        CheckCleanUp(run);
+        CheckCleanUp(run, place);
       }
     };
     ForEachPoint(refhost::Failure::Kind::Code, kRehearsed, check, extent);
   }
 
   void SweepExceptions(Extent extent) {
-    for (const auto& [kind, code] :
-         {std::pair{refhost::Failure::Kind::BadAlloc, HostError{HOST_ERR_EXCEPTION_MEMORY}},
-          std::pair{refhost::Failure::Kind::RuntimeError, HostError{HOST_ERR_EXCEPTION_OTHER}}}) {
-      const HostError expected = code;
-      const auto check = [&](std::string_view, const ImportRun& run) {
-        EXPECT_EQ(run.result.code, expected);
+    for (const Way& way : kExceptions) {
+      const auto check = [&](std::string_view, std::size_t place, const ImportRun& run) {
+        EXPECT_EQ(run.result.code, way.code);
         EXPECT_EQ(run.result.messages.size(), Shown(run) + 1);
-        CheckCleanUp(run);
+        CheckCleanUp(run, place);
       };
-      ForEachPoint(kind, 0, check, extent);
+      ForEachPoint(way.kind, 0, check, extent);
     }
   }
 
   std::size_t Shown(const ImportRun& run) { return CallsOf(run.trace, "ShowMessage").size(); }
 
   const TemporaryFile file_;
+  const ServicePlaces places_;
   std::vector<std::string> good_;
   HostError goodCode_ = 0;
-  std::vector<std::int64_t> counts_;
+  std::vector<std::string> goodMessages_;
   int points_ = 0;
 };
 
@@ -142,18 +132,40 @@ TEST_P(ServiceSweepTest, EndlessExceptionsOutOfAServiceAreReportedOnceAndBecomeT
   SweepExceptions(Extent::Onwards);
 }
 
-TEST_P(ServiceSweepTest, AServiceThatDoesNothingAndSaysSuccessGivesNoUnknownCode) {
-  ForEachPoint(refhost::Failure::Kind::Code, 0, [&](std::string_view service, const ImportRun& run) {
+TEST_P(ServiceSweepTest, AServiceThatDoesNothingAndSaysSuccessGivesNoUnknownCodeAndShowsNothingElse) {
+  const auto check = [&](std::string_view service, std::size_t place, const ImportRun& run) {
     const HostError code = run.result.code;
     EXPECT_TRUE(code == 0 || !refhost::errorName(code).empty()) << code;
+    std::vector<std::string> may = goodMessages_;
+    // A file whose first bytes cannot be read is no scene.
+    if (service == "FileRead" && place == 0) may.emplace_back(kOnlyMayaAsciiText);
+    // A message that is not copied is an empty one.
+    if (service == "StringCopy") std::fill(may.begin(), may.end(), "");
     // A list that counts nothing, though it holds records, is an exception where it is indexed.
+    if (code == HOST_ERR_EXCEPTION_OTHER) may.push_back(run.result.messages.back());
+    EXPECT_THAT(run.result.messages, ::testing::IsSubsetOf(may));
     EXPECT_EQ(run.result.messages.size(), Shown(run) + (code == HOST_ERR_EXCEPTION_OTHER ? 1 : 0));
     EXPECT_TRUE(service != "FileCreate" || code == HOST_ERR_NULL_ARGUMENT) << code;  // no file object
-  });
+  };
+  ForEachPoint(refhost::Failure::Kind::Code, 0, check);
 }
 
 INSTANTIATE_TEST_SUITE_P(Scenes, ServiceSweepTest, ::testing::ValuesIn(FailureScenes()),
                          [](const auto& scene) { return scene.param.name; });
+
+TEST(FailureScenesTest, TogetherTheyReachEveryUtilityServiceOfAnImport) {
+  std::set<std::string> reached;
+  for (const FailureScene& scene : FailureScenes()) {
+    const TemporaryFile file(scene.text);
+    for (const auto& [service, places] : PlacesOfServices(refhost::Callback::Import, file.path())) {
+      reached.insert(service);
+    }
+  }
+  std::set<std::string> expected(ServiceNames().begin(), ServiceNames().end());
+  expected.erase("RegisterStringTable");  // at the entry
+  expected.erase("FileDispose");          // after a verification
+  EXPECT_EQ(reached, expected);
+}
 
 }  // namespace
 }  // namespace testsupport

@@ -4,11 +4,11 @@
 
 #include <algorithm>
 #include <cstdlib>
+#include <set>
 #include <stdexcept>
 #include <utility>
 
-#include "hostutil/HostSetup.h"
-#include "plugin/Entry.h"
+#include "tests/support/BuilderRun.h"
 
 namespace testsupport {
 namespace {
@@ -35,15 +35,6 @@ std::filesystem::path ExampleScene(const std::string& name) {
   return std::filesystem::path(MAYASCENE_SOURCE_DIR "/examples") / (name + ".ma");
 }
 
-const std::vector<const char*>& SweptServices() {
-  static const std::vector<const char*> services = {
-#define SERVICE_NAME(name) #name,
-      HOST_UTILITY_TABLE(SERVICE_NAME)
-#undef SERVICE_NAME
-  };
-  return services;
-}
-
 std::size_t SweepStride(std::size_t calls, std::size_t share) {
   const char* const wanted = std::getenv("MAYASCENE_SWEEP");
   if (wanted != nullptr && std::string_view(wanted) == "all") return 1;
@@ -51,9 +42,15 @@ std::size_t SweepStride(std::size_t calls, std::size_t share) {
   return ((calls + share - 1) / share) | 1;
 }
 
-bool EndsTheImport(std::string_view line) {
-  const std::string call = CallName(line);
-  return call == "ReleaseSuiteByName" || call == "UnlockMemHandle" || call == "FreeMemHandle";
+std::vector<bool> WalkedCalls(const std::vector<std::string>& calls, std::size_t share) {
+  const std::size_t stride = SweepStride(calls.size(), share);
+  std::set<std::string> met;
+  std::vector<bool> walked;
+  for (const std::string& call : calls) {
+    const bool first = met.insert(CallName(call)).second;
+    walked.push_back(first || walked.size() % stride == 0);
+  }
+  return walked;
 }
 
 SweptImport::SweptImport(std::filesystem::path scene) : scene_(std::move(scene)) {
@@ -66,15 +63,6 @@ SweptImport::SweptImport(std::filesystem::path scene) : scene_(std::move(scene))
     facts_.emplace_back(line);
     ends_.push_back(ends_.back() + line.size() + 1);
   }
-  for (const char* const service : SweptServices())
-    serviceCalls_.emplace_back(service, run.host->callCount(service));
-}
-
-std::int64_t SweptImport::serviceCalls(std::string_view service) const {
-  for (const auto& [name, count] : serviceCalls_) {
-    if (name == service) return count;
-  }
-  return 0;
 }
 
 SweptRun SweptImport::Run(refhost::HostOptions options) const {
@@ -82,15 +70,10 @@ SweptRun SweptImport::Run(refhost::HostOptions options) const {
   run.written = std::make_unique<std::ostringstream>();
   options.trace = run.written.get();
   run.host = std::make_unique<refhost::Host>(std::move(options));
-  refhost::CallbackResult entry;
-  if (!run.host->load(MayaImportEntry, &entry) || entry.code != 0) {
-    throw std::runtime_error("the importer's entry failed");
-  }
-  run.written->str("");
-  run.result = run.host->importScene(scene_);
+  run.result = MakeCallback(*run.host, refhost::Callback::Import, scene_);
   run.calls = std::move(*run.written).str();
   run.calls.erase(run.calls.rfind("{\"call\":\"leave\""));
-  run.calls.erase(0, run.calls.find('\n') + 1);
+  run.calls.erase(0, run.calls.find('\n', run.calls.rfind("{\"call\":\"enter\"")) + 1);
   return run;
 }
 
@@ -100,12 +83,6 @@ Made SweptImport::MadeWithout(std::size_t index) const {
     if (i != index) count.Take(facts_[i]);
   }
   return count.made();
-}
-
-std::size_t SweptImport::LinesInCommon(std::string_view calls) const {
-  const auto differs = std::mismatch(text_.begin(), text_.end(), calls.begin(), calls.end()).first;
-  const auto bytes = static_cast<std::size_t>(differs - text_.begin());
-  return static_cast<std::size_t>(std::upper_bound(ends_.begin(), ends_.end(), bytes) - ends_.begin()) - 1;
 }
 
 void SweepCursor::Next() {

@@ -13,7 +13,7 @@
 #include <vector>
 
 #include "refhost/Host.h"
-#include "tests/comp/FailureModel.h"
+#include "tests/support/FailureModel.h"
 
 namespace testsupport {
 
@@ -21,18 +21,15 @@ namespace testsupport {
 std::vector<std::string> ExampleNames();
 std::filesystem::path ExampleScene(const std::string& name);
 
-// The utility services that can be made to fail.
-const std::vector<const char*>& SweptServices();
-
 // Of so many calls every such one is walked: each of them where the environment says MAYASCENE_SWEEP=all,
 // else so many that no more than `share` are walked, under a sanitizer a tenth of that. Odd, so that of calls
 // that come in pairs both are met.
 inline constexpr std::size_t kShareOfCalls = 700;
 inline constexpr std::size_t kSmallShare = 60;
-std::size_t SweepStride(std::size_t calls, std::size_t share = kShareOfCalls);
+std::size_t SweepStride(std::size_t calls, std::size_t share);
 
-// A call that every import ends with.
-bool EndsTheImport(std::string_view line);
+// For each of these lines whether its call is walked: every so many, and the first of each operation.
+std::vector<bool> WalkedCalls(const std::vector<std::string>& calls, std::size_t share = kShareOfCalls);
 
 // One import; the host lives on, for looking at what it holds. One at a time.
 struct SweptRun {
@@ -48,7 +45,6 @@ class SweptImport {
 
   // The calls of the good run, which is over.
   const std::vector<std::string>& good() const { return good_; }
-  std::int64_t serviceCalls(std::string_view service) const;
 
   SweptRun Run(refhost::HostOptions options) const;
 
@@ -61,9 +57,6 @@ class SweptImport {
   // What the whole run makes and leaves when that call does nothing.
   Made MadeWithout(std::size_t index) const;
 
-  // How many of the good run's first lines a text begins with.
-  std::size_t LinesInCommon(std::string_view calls) const;
-
  private:
   friend class SweepCursor;
 
@@ -72,7 +65,6 @@ class SweptImport {
   std::vector<CallFacts> facts_;
   std::string text_;
   std::vector<std::size_t> ends_;  // where in the text the first so many lines end
-  std::vector<std::pair<std::string, std::int64_t>> serviceCalls_;
 };
 
 // The state of the good run right before a call.
@@ -84,7 +76,7 @@ class SweepCursor {
   bool isAtEnd() const { return index_ == import_.good().size(); }
   void Next();
 
-  const HeldByImport& held() const { return held_; }
+  const HeldByCallback& held() const { return held_; }
   const std::string& line() const { return import_.good()[index_]; }
 
   // What exists and is held now, and after the calls that clean up.
@@ -94,7 +86,7 @@ class SweepCursor {
  private:
   const SweptImport& import_;
   std::size_t index_ = 0;
-  HeldByImport held_;
+  HeldByCallback held_;
   MadeCount made_;
 };
 

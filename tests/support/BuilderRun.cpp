@@ -11,23 +11,20 @@
 namespace testsupport {
 namespace {
 
-ImportRun Import(const std::filesystem::path& scene, refhost::HostOptions options, bool traced) {
+ImportRun Run(refhost::Callback callback, const std::filesystem::path& scene, refhost::HostOptions options,
+              bool traced) {
   ImportRun run;
   run.written = std::make_unique<std::ostringstream>();
+  options.during = callback;
   if (traced) options.trace = run.written.get();
   run.host = std::make_unique<refhost::Host>(std::move(options));
-  refhost::CallbackResult entry;
-  if (!run.host->load(MayaImportEntry, &entry) || entry.code != 0) {
-    throw std::runtime_error("the importer's entry failed");
-  }
-  run.written->str("");
-  run.result = run.host->importScene(scene);
-  if (!traced) return run;
-  run.trace = LinesOf(run.written->str());
-  if (run.trace.size() < 2) throw std::runtime_error("the trace has no bracket");
-  run.trace.erase(run.trace.begin());
-  run.trace.pop_back();
+  run.result = MakeCallback(*run.host, callback, scene);
+  if (traced) run.trace = LastCallback(run.written->str());
   return run;
+}
+
+ImportRun Import(const std::filesystem::path& scene, refhost::HostOptions options, bool traced) {
+  return Run(refhost::Callback::Import, scene, std::move(options), traced);
 }
 
 // Where the value that starts there ends: at the "," or "}" that belongs to the line itself.
@@ -68,6 +65,20 @@ ImportRun ImportText(std::string_view text, refhost::HostOptions options) {
   return Import(TemporaryFile(text).path(), std::move(options), true);
 }
 
+ImportRun RunCallback(refhost::Callback callback, const std::filesystem::path& scene,
+                      refhost::HostOptions options) {
+  return Run(callback, scene, std::move(options), true);
+}
+
+refhost::CallbackResult MakeCallback(refhost::Host& host, refhost::Callback callback,
+                                     const std::filesystem::path& scene) {
+  refhost::CallbackResult entry;
+  const bool loaded = host.load(MayaImportEntry, &entry);
+  if (callback == refhost::Callback::Entry) return entry;
+  if (!loaded || entry.code != 0) throw std::runtime_error("the importer's entry failed");
+  return callback == refhost::Callback::Verify ? host.verifyScene(scene) : host.importScene(scene);
+}
+
 ImportRun ImportUntraced(const TemporaryFile& file, refhost::HostOptions options) {
   return Import(file.path(), std::move(options), false);
 }
@@ -76,6 +87,15 @@ std::vector<std::string> LinesOf(const std::string& text) {
   std::vector<std::string> lines;
   std::istringstream stream(text);
   for (std::string line; std::getline(stream, line);) lines.push_back(line);
+  return lines;
+}
+
+std::vector<std::string> LastCallback(const std::string& trace) {
+  const std::size_t enter = trace.rfind("{\"call\":\"enter\"");
+  if (enter == std::string::npos) throw std::runtime_error("the trace has no bracket");
+  std::vector<std::string> lines = LinesOf(trace.substr(enter));
+  lines.erase(lines.begin());
+  if (!lines.empty() && lines.back().starts_with("{\"call\":\"leave\"")) lines.pop_back();
   return lines;
 }
 

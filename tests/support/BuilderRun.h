@@ -37,11 +37,22 @@ ImportRun ImportPath(const std::filesystem::path& scene, refhost::HostOptions op
 ImportRun ImportFile(const TemporaryFile& file, refhost::HostOptions options = {});
 ImportRun ImportText(std::string_view text, refhost::HostOptions options = {});
 
+// The same for another of the host's callbacks; the entry has no file.
+ImportRun RunCallback(refhost::Callback callback, const std::filesystem::path& scene,
+                      refhost::HostOptions options = {});
+
+// Loads the importer into the host and makes the callback.
+refhost::CallbackResult MakeCallback(refhost::Host& host, refhost::Callback callback,
+                                     const std::filesystem::path& scene);
+
 // Without a trace.
 ImportRun ImportUntraced(const TemporaryFile& file, refhost::HostOptions options = {});
 
 // The lines of a text, without their ends.
 std::vector<std::string> LinesOf(const std::string& text);
+
+// The suite calls of the last callback of a trace, without the lines around them.
+std::vector<std::string> LastCallback(const std::string& trace);
 
 // The value of a line's key as it stands there; "" when the line has no such key. Texts keep their quotes.
 std::string_view Field(std::string_view line, std::string_view key);

@@ -1,4 +1,4 @@
-#include "tests/comp/FailureModel.h"
+#include "tests/support/FailureModel.h"
 
 #include <algorithm>
 
@@ -58,13 +58,22 @@ std::vector<std::string> WithoutErrors(const std::vector<std::string>& lines) {
 
 bool Succeeded(std::string_view line) { return Field(line, "error") == "0"; }
 
-void HeldByImport::Take(std::string_view line, bool failed) {
+void HeldByCallback::Take(std::string_view line, bool failed) {
   const std::string call = CallName(line);
   const std::string suite = std::string("{\"call\":\"ReleaseSuiteByName\",\"suite\":") +
                             std::string(Field(line, "suite")) +
                             ",\"version\":" + std::string(Field(line, "version"));
   if (call == "AcquireSuite") {
     if (!failed) (reading_ ? driverSuites_ : parserSuites_).emplace(ReleasePlace(line), suite);
+  } else if (call == "ReleaseSuiteByName") {
+    // The parser gives its suites back before the driver does.
+    if (parserSuites_.erase({ReleasePlace(line), suite}) == 0) {
+      driverSuites_.erase({ReleasePlace(line), suite});
+    }
+  } else if (call == "BeginSilentErrors") {
+    silent_ = !failed;
+  } else if (call == "EndSilentErrors") {
+    silent_ = false;
   } else if (call == "NewMemHandle") {
     if (!failed) memory_ = Field(line, "handle");
   } else if (call == "LockMemHandle") {
@@ -90,7 +99,7 @@ void HeldByImport::Take(std::string_view line, bool failed) {
   }
 }
 
-void HeldByImport::TakeStream(std::string_view line) {
+void HeldByCallback::TakeStream(std::string_view line) {
   const std::string handle(Field(line, "stream"));
   const std::string layer(Field(line, "layer"));
   const std::string id(Field(line, "streamId"));
@@ -101,8 +110,9 @@ void HeldByImport::TakeStream(std::string_view line) {
   streams_.push_back({handle, unguarded, id == "11" && !unguarded, false});
 }
 
-std::vector<std::string> HeldByImport::CleanUp() const {
+std::vector<std::string> HeldByCallback::CleanUp() const {
   std::vector<std::string> calls;
+  if (silent_) calls.push_back(Line("EndSilentErrors", "QZGP Utility Suite", 7, ",\"report\":0"));
   for (const Stream& stream : streams_) {
     if (!stream.unguarded && !stream.zoom) calls.push_back(ReleaseStreamLine(stream.handle));
   }
@@ -122,21 +132,22 @@ std::vector<std::string> HeldByImport::CleanUp() const {
   return calls;
 }
 
-bool HeldByImport::IsUnguarded(std::string_view stream) const {
+bool HeldByCallback::IsUnguarded(std::string_view stream) const {
   return unguarded_.count(std::string(stream)) != 0;
 }
 
-HeldByImport HeldAfter(const std::vector<std::string>& trace, std::size_t count, bool lastFailed) {
-  HeldByImport held;
+HeldByCallback HeldAfter(const std::vector<std::string>& trace, std::size_t count, bool lastFailed) {
+  HeldByCallback held;
   for (std::size_t i = 0; i < count; ++i) held.Take(trace[i], lastFailed && i + 1 == count);
   return held;
 }
 
-bool IsCodeIgnored(std::string_view line, const HeldByImport& before) {
+bool IsCodeIgnored(std::string_view line, const HeldByCallback& before) {
   const std::string call = CallName(line);
   if (call == "ReleaseStream") return !before.IsUnguarded(Field(line, "stream"));
   return call == "ReleaseSuiteByName" || call == "ShowMessage" || call == "EndKeyframeBatch" ||
-         call == "UnlockMemHandle" || call == "FreeMemHandle";
+         call == "UnlockMemHandle" || call == "FreeMemHandle" || call == "GetAppPrefsBlob" ||
+         call == "GetPrefLong" || call == "RegisterDeathHook";
 }
 
 bool IsCodeIgnored(const std::vector<std::string>& trace, std::size_t index) {

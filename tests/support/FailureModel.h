@@ -1,4 +1,4 @@
-// What an import owes the host after a failure, told from the calls that it made before.
+// What a callback owes the host after a failure, told from the calls that it made before.
 #pragma once
 
 #include <cstddef>
@@ -9,7 +9,8 @@
 #include <utility>
 #include <vector>
 
-#include "hostapi/HostTypes.h"
+#include "hostapi/ErrorCodes.h"
+#include "refhost/Host.h"
 #include "tests/support/BuilderRun.h"
 
 namespace testsupport {
@@ -24,15 +25,30 @@ std::vector<std::string> WithoutErrors(const std::vector<std::string>& lines);
 // Whether the call gave back 0.
 bool Succeeded(std::string_view line);
 
+// A way to fail, the code that it becomes, and how a trace writes it.
+struct Way {
+  refhost::Failure::Kind kind;
+  HostError code;
+  const char* error;
+};
+
+inline constexpr Way kExceptions[] = {
+    {refhost::Failure::Kind::BadAlloc, HOST_ERR_EXCEPTION_MEMORY, "\"bad_alloc\""},
+    {refhost::Failure::Kind::RuntimeError, HOST_ERR_EXCEPTION_OTHER, "\"runtime_error\""},
+};
+
 // Follows a trace line by line and knows what is held.
-class HeldByImport {
+class HeldByCallback {
  public:
   // A call that did nothing counts as failed, whatever its code.
   void Take(std::string_view line, bool failed);
 
-  // The calls, in order, that end an import that fails now: the stream in use, open batches, the zoom stream,
-  // the parser's suites, the text, the driver's suites.
+  // The calls, in order, that end a callback that fails now: the silence, the stream in use, open batches,
+  // the zoom stream, the parser's suites, the text, the driver's suites.
   std::vector<std::string> CleanUp() const;
+
+  // Whether silent errors have begun and not ended.
+  bool IsSilent() const { return silent_; }
 
   // Whether the handle's value is set without a guard: the first position and the first zoom of a camera
   // layer.
@@ -55,6 +71,7 @@ class HeldByImport {
   std::set<Suite> driverSuites_;
   std::set<Suite> parserSuites_;
   bool reading_ = true;  // until the text is locked
+  bool silent_ = false;
   std::string memory_;
   bool unlocked_ = false;
   std::set<std::string> cameraLayers_;
@@ -66,10 +83,10 @@ class HeldByImport {
 };
 
 // What is held after the first `count` calls of the trace; with `lastFailed` the last of them had failed.
-HeldByImport HeldAfter(const std::vector<std::string>& trace, std::size_t count, bool lastFailed);
+HeldByCallback HeldAfter(const std::vector<std::string>& trace, std::size_t count, bool lastFailed);
 
 // Whether a code that the call gives back changes nothing.
-bool IsCodeIgnored(std::string_view line, const HeldByImport& before);
+bool IsCodeIgnored(std::string_view line, const HeldByCallback& before);
 bool IsCodeIgnored(const std::vector<std::string>& trace, std::size_t index);
 
 struct Made {
