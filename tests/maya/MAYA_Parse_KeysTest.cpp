@@ -221,5 +221,12 @@ TEST_F(KeysTest, TheEndInsideAKeyCommandIsAnUnexpectedEnd) {
   }
 }
 
+TEST_F(KeysTest, TheEndBehindManyKeysIsAnUnexpectedEndToo) {
+  std::string text = "createNode animCurveTL -n \"a\";\nsetAttr -s 999999999 \".ktv\"";
+  for (int key = 0; key < 1000; ++key) text += " " + std::to_string(key) + " 5";
+  EXPECT_EQ(Read(text + " "), 1289986);
+  EXPECT_THAT(Messages(), ElementsAre(kUnexpectedEndText));
+}
+
 }  // namespace
 }  // namespace testsupport
