@@ -35,7 +35,7 @@ void MAYA_Parse::ApplyZoomAnimation(VOR_Layer* layer, const MAYA_Camera* camera)
     InsertZoomKeys(batch, stream, camera, curve.keys);
   });
   if (batch != nullptr) KeepFirst(&kept, Guarded([&] { EndAddingKeyframes(batch); }));
-  if (stream != nullptr) KeepFirst(&kept, Guarded([&] { StreamSuite7().ReleaseStream(stream); }));
+  if (stream != nullptr) StreamSuite7().ReleaseStream(stream);
   ThrowOnError(kept);
 }
 

@@ -23,8 +23,8 @@ Chain& ChainOf(LiveObject::Kind kind) { return kind == LiveObject::Kind::Text ? 
 
 void DestroyAll(const Chain& chain) {
   while (chain.first != nullptr) {
-    // NOLINTNEXTLINE(clang-analyzer-cplusplus.NewDelete): an object takes itself out of its chain when it
-    // goes.
+    // An object takes itself out of its chain when it goes.
+    // NOLINTNEXTLINE(clang-analyzer-cplusplus.NewDelete)
     delete chain.first;
   }
 }

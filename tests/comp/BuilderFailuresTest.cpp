@@ -182,6 +182,17 @@ TEST(BuilderFailuresTest, AZoomStreamIsReleasedAfterAFailureWithoutABatch) {
   }
 }
 
+TEST(BuilderFailuresTest, AnExceptionOutOfTheReleaseOfAZoomStreamGoesBeforeTheCodeThatWasKept) {
+  using Kind = refhost::Failure::Kind;
+  const auto codeWith = [](Kind kind) {
+    refhost::HostOptions options = Failing("GetStreamKeyframeCount", 1, Kind::BadAlloc);
+    options.failures.push_back({"ReleaseStream", 3, false, kind, kRehearsed});
+    return ImportText(Scene(CameraText("lens", "") + Animation("lens.fl", kTenKeys)), options).result.code;
+  };
+  EXPECT_EQ(codeWith(Kind::RuntimeError), HOST_ERR_EXCEPTION_OTHER);
+  EXPECT_EQ(codeWith(Kind::Code), HOST_ERR_EXCEPTION_MEMORY);
+}
+
 TEST(BuilderFailuresTest, DifferentKeyCountsAreToldOnceAndWhatWasMadeStays) {
   const ImportRun run = ImportText(Scene(TransformText("arm") + TransformText("rig", "arm") +
                                          CameraText("lens", "rig") + Animation("arm.tx", {{1, 0}, {2, 1}}) +
