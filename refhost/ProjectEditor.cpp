@@ -63,6 +63,7 @@ Layer& ProjectEditor::addCameraLayer(Composition& composition, const char* name,
       stream.value[0] = composition.width;
       if (zoomKeys < 1) continue;
       std::vector<T_Time> times;
+      times.reserve(static_cast<std::size_t>(zoomKeys));
       for (int32_t key = 0; key < zoomKeys; ++key) times.push_back({key, 1});
       const std::vector<double> values(times.size(), stream.value[0]);
       stream.keys = std::make_unique<KeyColumns>(KeyColumns{KeyTimes(std::move(times)), values});
