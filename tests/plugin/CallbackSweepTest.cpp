@@ -224,8 +224,8 @@ TEST(CallbackCasesTest, TogetherTheyReachWhatAnImportDoesNotCall) {
   std::set<std::string> reached;
   for (const Case& each : Cases()) {
     const TemporaryFile file(each.text);
-    const auto run = RunCallback(each.callback, file.path());
-    for (const std::string& line : run.trace) reached.insert(CallName(line));
+    const std::vector<std::string> trace = RunCallback(each.callback, file.path()).trace;
+    for (const std::string& line : trace) reached.insert(CallName(line));
     for (const auto& [service, places] : PlacesOfServices(each.callback, file.path())) {
       reached.insert(service);
     }
