@@ -77,7 +77,7 @@ MayaToken MAYA_Lex::GetNextToken(const char** start, const char** last) {
     *start = *last = end_;
     return EndOfFile;
   }
-  SkipWhiteSpace();
+  PassWhiteSpace();
   MayaToken kind = Unknown;
   switch (*position) {
     case '\0':
@@ -123,7 +123,10 @@ MayaToken MAYA_Lex::GetNextToken(const char** start, const char** last) {
 }
 
 void MAYA_Lex::SkipWhiteSpace() {
-  if (position > end_) return;
+  if (position <= end_) PassWhiteSpace();
+}
+
+void MAYA_Lex::PassWhiteSpace() {
   const char* at = position;
   for (; IsWhiteSpace(*at); ++at) line += *at == '\n' ? 1 : 0;
   tokenStart = position = at;
@@ -131,7 +134,7 @@ void MAYA_Lex::SkipWhiteSpace() {
 
 void MAYA_Lex::SkipHarmless() {
   if (position > end_) return;
-  SkipWhiteSpace();
+  PassWhiteSpace();
   if (IsAny(*position, kKeywordStartClass | kQuoteClass)) return;  // as a rule the next command begins here
   static const SkipHarmlessText skip = HarmlessTextSkippers().back().skip;
   tokenStart = position = skip(position, end_, &line);
