@@ -1,4 +1,4 @@
-// The words that the mutator makes scenes of.
+// The words that scenes are made of.
 #pragma once
 
 #include <string_view>

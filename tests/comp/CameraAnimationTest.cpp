@@ -1,3 +1,4 @@
+#include "hostutil/HostSetup.h"
 #include "plugin/Globals.h"
 #include "tests/support/BuilderFixture.h"
 #include "tests/support/BuilderRun.h"
@@ -8,6 +9,7 @@ namespace {
 
 using ::testing::ElementsAre;
 using ::testing::IsEmpty;
+using ::testing::SizeIs;
 
 constexpr double kNear = 1e-9;
 
@@ -114,6 +116,22 @@ TEST_F(CameraAnimationTest, AZoomThatAlreadyHasKeysIsLeftAloneUnreleasedAndTheTr
   const refhost::CallbackResult result = End();
   ASSERT_EQ(result.leftovers.size(), 1u);
   EXPECT_TRUE(result.leftovers[0].keptByDesign);
+}
+
+TEST_F(CameraAnimationTest, TheZoomKeysAreCountedAgainBeforeEachAndAFailedCountKeepsThoseBefore) {
+  const std::int32_t service = HOST_UTILITY_ListCount;
+  for (std::size_t added = 0; added <= 3; ++added) {
+    SCOPED_TRACE(added);
+    Use(Animation("lens.fl", {{1, 35}, {2, 70}, {3, 50}}));
+    // The first count asks whether there is a key at all.
+    const std::int64_t nth = HostUtilityCallCount(service) + 2 + static_cast<std::int64_t>(added);
+    const HostUtilityFailure failure{service, nth, 4242, HOST_THROW_NOTHING};
+    ASSERT_EQ(HostAddUtilityFailure(&failure), 0);
+    EXPECT_EQ(CodeOf([&] { Apply(); }), 4242);
+    HostClearUtilityFailures();
+    EXPECT_EQ(StreamOf(kZoom).keyCount(), added);
+    EXPECT_THAT(CallsOf(TakeTrace(), "ReleaseStream"), SizeIs(1));
+  }
 }
 
 TEST_F(CameraAnimationTest, ACurveIndexPastTheListIsTheListsCode) {

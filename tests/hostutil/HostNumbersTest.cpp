@@ -4,11 +4,13 @@
 
 #include <clocale>
 #include <cmath>
+#include <cstdlib>
 #include <cstring>
 #include <limits>
 #include <string>
 #include <vector>
 
+#include "TemporaryFolder.h"
 #include "UtilityTest.h"
 
 namespace hostutil_tests {
@@ -218,18 +220,39 @@ TEST(HostNumberScanTest, NullPointersAndNegativeLengthsAreRefused) {
   EXPECT_TRUE(SameBits(value, kUntouched));
 }
 
-// Where the machine has no locale with a decimal comma, there is nothing to see, and this says so.
-TEST(HostNumberScanTest, ALocaleWithADecimalCommaChangesNothing) {
-  const std::string before = std::setlocale(LC_ALL, nullptr);
-  bool seen = false;
-  for (const char* locale : {"de_DE.UTF-8", "fr_FR.UTF-8", "de_DE.utf8", "de_DE"}) {
-    if (std::setlocale(LC_ALL, locale) == nullptr || *std::localeconv()->decimal_point != ',') continue;
-    seen = true;
-    ExpectValue("1.5", 1.5);
-    ExpectRefused("1,5", HOST_ERR_NUMBER_SYNTAX);
+// A locale of the test's own, whose decimal point is a comma, in force as long as this is.
+class DecimalComma {
+ public:
+  DecimalComma() {
+    folder_.Write("characters",
+                  "<code_set_name> ANSI_X3.4-1968\n<comment_char> %\n<escape_char> /\n"
+                  "CHARMAP\n<U0000>..<U007F> /x00\nEND CHARMAP\n");
+    folder_.Write("source",
+                  "LC_NUMERIC\ndecimal_point \",\"\nthousands_sep \"\"\ngrouping -1\nEND LC_NUMERIC\n");
+    // It warns of all that a locale has beside numbers, and ends with 1 for that.
+    const std::string compile = "cd '" + folder_.path().string() +
+                                "' && localedef --no-archive -c -f ./characters -i source ./comma >log 2>&1";
+    static_cast<void>(std::system(compile.c_str()));
+    setenv("LOCPATH", folder_.path().c_str(), 1);
+    if (std::setlocale(LC_ALL, "comma") == nullptr) ADD_FAILURE() << compile << '\n' << folder_.read("log");
   }
-  std::setlocale(LC_ALL, before.c_str());
-  if (!seen) GTEST_SKIP() << "no locale with a decimal comma is installed";
+  ~DecimalComma() {
+    std::setlocale(LC_ALL, before_.c_str());
+    unsetenv("LOCPATH");
+  }
+  DecimalComma(const DecimalComma&) = delete;
+  DecimalComma& operator=(const DecimalComma&) = delete;
+
+ private:
+  const std::string before_ = std::setlocale(LC_ALL, nullptr);
+  const TemporaryFolder folder_;
+};
+
+TEST(HostNumberScanTest, ALocaleWithADecimalCommaChangesNothing) {
+  const DecimalComma locale;
+  ASSERT_STREQ(std::localeconv()->decimal_point, ",");
+  ExpectValue("1.5", 1.5);
+  ExpectRefused("1,5", HOST_ERR_NUMBER_SYNTAX);
 }
 
 TEST(HostNumberScanTest, TimeIsLinearInTheLength) {

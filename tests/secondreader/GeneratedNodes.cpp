@@ -1,4 +1,5 @@
 // Nodes with their attributes and keys.
+#include "fuzz/SceneWords.h"
 #include "tests/secondreader/SceneGenerator.h"
 
 namespace secondreader {
@@ -7,28 +8,6 @@ namespace {
 constexpr std::string_view kChannels[] = {"tx", "ty", "tz", "rx", "ry", "rz", "sx", "sy", "sz"};
 constexpr std::string_view kLongChannels[] = {"translateX", "translateY", "translateZ", "rotateX", "rotateY",
                                               "rotateZ",    "scaleX",     "scaleY",     "scaleZ"};
-// What a constraint takes from the node that it turns, and what it gives to it.
-constexpr std::string_view kFollowing[] = {".ct",
-                                           ".ctx",
-                                           ".cty",
-                                           ".ctz",
-                                           ".constraintTranslate",
-                                           ".constraintTranslateX",
-                                           ".constraintTranslateY",
-                                           ".constraintTranslateZ"};
-constexpr std::string_view kTurning[] = {".cr",
-                                         ".crx",
-                                         ".cry",
-                                         ".crz",
-                                         ".cv",
-                                         ".constraintRotate",
-                                         ".constraintRotateX",
-                                         ".constraintRotateY",
-                                         ".constraintRotateZ",
-                                         ".constraintVector",
-                                         ".constraintVectorX",
-                                         ".constraintVectorY",
-                                         ".constraintVectorZ"};
 
 bool isAngle(std::string_view channel) { return channel.front() == 'r'; }
 
@@ -210,9 +189,9 @@ void SceneGenerator::constraint(const std::string& turned, const std::string& ta
   const std::string name = newName("aim");
   createNode(dice_.chance(50) ? "aimConstraint" : "lookAt", name, turned);
   transforms_.push_back(name);
-  if (!odd()) connect(turned + ".t", name + anyCase(dice_.oneOf(kFollowing)));
+  if (!odd()) connect(turned + ".t", name + anyCase(dice_.oneOf(fuzz::kFollowingAttributes)));
   if (!odd()) connect(target + ".t", name + ".target[0].targetTranslate");
-  if (!odd()) connect(name + anyCase(dice_.oneOf(kTurning)), turned + ".rx");
+  if (!odd()) connect(name + anyCase(dice_.oneOf(fuzz::kTurningAttributes)), turned + ".rx");
   if (odd()) connect(name + ".cameraW0", name + ".target[0].targetWeight");
 }
 

@@ -1,12 +1,9 @@
 #include "tests/support/EndedCallback.h"
 
 #include <sys/mman.h>
-#include <sys/resource.h>
-#include <sys/wait.h>
 #include <unistd.h>
 
 #include <cstddef>
-#include <cstdio>
 #include <cstdlib>
 #include <ostream>
 #include <stdexcept>
@@ -14,6 +11,7 @@
 #include <utility>
 
 #include "tests/support/BuilderRun.h"
+#include "tests/support/OwnProcess.h"
 
 namespace testsupport {
 namespace {
@@ -42,39 +40,26 @@ class SharedBuffer : public std::streambuf {
   void* const memory_;
 };
 
-[[noreturn]] void CallHere(refhost::Callback callback, const std::filesystem::path& scene,
-                           refhost::HostOptions options, SharedBuffer* buffer) {
-  const rlimit none{0, 0};
-  setrlimit(RLIMIT_CORE, &none);
-  if (std::freopen("/dev/null", "w", stderr) == nullptr) _exit(EXIT_FAILURE);
-  std::ostream trace(buffer);
-  options.during = callback;
-  options.trace = &trace;
-  refhost::Host host(std::move(options));
-  MakeCallback(host, callback, scene);
-  _exit(trace ? EXIT_SUCCESS : EXIT_FAILURE);
-}
-
 }  // namespace
 
 EndedCallback CallInAProcess(refhost::Callback callback, const std::filesystem::path& scene,
                              refhost::HostOptions options) {
   SharedBuffer buffer;
-  std::fflush(nullptr);
-  const pid_t process = fork();
-  if (process == 0) CallHere(callback, scene, std::move(options), &buffer);
-  int status = 0;
-  if (process < 0 || waitpid(process, &status, 0) != process) throw std::runtime_error("no process");
-
   EndedCallback ended;
+  ended.signal = SignalOfOwnProcess([&] {
+    std::ostream trace(&buffer);
+    options.during = callback;
+    options.trace = &trace;
+    refhost::Host host(std::move(options));
+    MakeCallback(host, callback, scene);
+    _exit(EXIT_SUCCESS);  // before the host ends the plug-in, which is a callback too
+  });
   const std::string trace = buffer.text();
   ended.trace = LastCallback(trace);
-  if (WIFSIGNALED(status)) {
-    ended.signal = WTERMSIG(status);
-    return ended;
-  }
-  if (WEXITSTATUS(status) != EXIT_SUCCESS) throw std::runtime_error("a process could not make its callback");
-  ended.code = std::stoi(std::string(Field(LinesOf(trace).back(), "error")));
+  if (ended.signal != 0) return ended;
+  const std::string leave = LinesOf(trace).back();
+  if (!leave.starts_with("{\"call\":\"leave\"")) throw std::runtime_error("the callback did not return");
+  ended.code = std::stoi(std::string(Field(leave, "error")));
   return ended;
 }
 
