@@ -28,7 +28,8 @@ inline constexpr std::size_t kShareOfCalls = 700;
 inline constexpr std::size_t kSmallShare = 60;
 std::size_t SweepStride(std::size_t calls, std::size_t share);
 
-// For each of these lines whether its call is walked: every so many, and the first of each operation.
+// For each of these lines whether its call is walked: every so many, and beside them the first of each
+// operation.
 std::vector<bool> WalkedCalls(const std::vector<std::string>& calls, std::size_t share = kShareOfCalls);
 
 // One import; the host lives on, for looking at what it holds. One at a time.

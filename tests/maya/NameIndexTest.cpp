@@ -101,12 +101,12 @@ TEST_F(NameIndexTest, AnEmbeddedNulIsPartOfAName) {
   EXPECT_EQ(Find("RIG"), 0);
 }
 
-// The hash is drawn anew in each run, and under a few draws some hundreds of similar names meet. Under none
-// do all.
-void ExpectFewMeetings(const std::vector<std::string>& names) {
+// The hash is drawn anew in each run, and once in some hundred thousand draws one difference between names is
+// none between hashes, so that all names which differ by just that meet. Hence the limits are not 0.
+void ExpectMeetings(const std::vector<std::string>& names, std::size_t atMost) {
   std::set<std::uint32_t> hashes;
   for (const std::string& name : names) hashes.insert(NameIndex::Hash(name));
-  EXPECT_GE(hashes.size(), names.size() - names.size() / 10);
+  EXPECT_GE(hashes.size() + atMost, names.size());
 }
 
 TEST_F(NameIndexTest, NamesThatDifferInTheHighestBitsHardlyMeet) {
@@ -120,7 +120,7 @@ TEST_F(NameIndexTest, NamesThatDifferInTheHighestBitsHardlyMeet) {
     }
     names.push_back(name);
   }
-  ExpectFewMeetings(names);
+  ExpectMeetings(names, names.size() / 10);
 }
 
 TEST_F(NameIndexTest, NamesThatDifferInOneBitOrTwoHardlyMeet) {
@@ -134,20 +134,21 @@ TEST_F(NameIndexTest, NamesThatDifferInOneBitOrTwoHardlyMeet) {
       if (name.find_first_of("ABCDEFGHIJKLMNOPQRSTUVWXYZ") == std::string::npos) names.push_back(name);
     }
   }
-  ExpectFewMeetings(names);
+  // A byte that does not count makes more meet.
+  ExpectMeetings(names, names.size() / 50);
 }
 
 TEST_F(NameIndexTest, NumberedNamesHardlyMeet) {
   std::vector<std::string> names;
   for (int number = 0; number < 50'000; ++number)
     names.push_back("crowd_locatorShape_" + std::to_string(number));
-  ExpectFewMeetings(names);
+  ExpectMeetings(names, names.size() / 10);
 }
 
 TEST_F(NameIndexTest, NamesThatOnlyTheirLengthTellsApartHardlyMeet) {
   std::vector<std::string> names;
   for (std::size_t size = 0; size < kNameCapacity; ++size) names.push_back(std::string(size, '\0'));
-  ExpectFewMeetings(names);
+  ExpectMeetings(names, names.size() / 10);
 }
 
 }  // namespace

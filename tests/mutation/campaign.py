@@ -42,9 +42,10 @@ NOT_COUNTED = (NOT_COMPILED, EQUIVALENT)
 
 
 def equivalents():
-    """File and changed line of each mutant that is known to change nothing."""
+    """File and changed line of each mutant that is known to change nothing. The line may hold a bar of its own."""
     lines = EQUIVALENTS.read_text(encoding="utf-8").splitlines()
-    return {tuple(line.split(" | ")[:2]) for line in lines if line and not line.startswith("#")}
+    named = (line.rsplit(" | ", 1)[0] for line in lines if line and not line.startswith("#"))
+    return {tuple(entry.split(" | ", 1)) for entry in named}
 
 
 def sources_of(folder, suffixes):

@@ -2,6 +2,7 @@
 
 import unittest
 
+from campaign import ROOT, equivalents
 from mutants import mutants_of
 
 
@@ -71,6 +72,17 @@ class Mutants(unittest.TestCase):
         mutant, = mutants_of("a.cpp", source)
         self.assertEqual(mutant.line(source), 2)
         self.assertEqual(mutant.before_and_after(source), ("int b = 2;", "int b = 3;"))
+
+
+class Equivalents(unittest.TestCase):
+    def test_each_that_is_listed_is_a_change_of_the_sources(self):
+        listed = equivalents()
+        made = set()
+        for file in {file for file, _ in listed}:
+            source = (ROOT / file).read_text(encoding="utf-8")
+            made |= {(file, mutant.before_and_after(source)[1]) for mutant in mutants_of(file, source)}
+        self.assertEqual(listed - made, set())
+        self.assertGreater(len(listed), 0)
 
 
 if __name__ == "__main__":

@@ -53,6 +53,13 @@ bool Did(const std::vector<std::string>& calls, std::string_view call) {
   return !lines.empty() && Succeeded(lines.front());
 }
 
+// Those that the host refuses of its own accord, because they bring no handle.
+std::size_t RefusedCalls(const std::vector<std::string>& calls) {
+  return static_cast<std::size_t>(std::count_if(calls.begin(), calls.end(), [](const std::string& line) {
+    return Field(line, "error") == std::to_string(HOST_ERR_BAD_HANDLE);
+  }));
+}
+
 void PrintTo(const Case& swept, std::ostream* out) { *out << swept.name; }
 
 class CallbackSweepTest : public ::testing::TestWithParam<Case> {
@@ -105,6 +112,7 @@ class CallbackSweepTest : public ::testing::TestWithParam<Case> {
     for (const refhost::Leftover& left : run.result.leftovers) {
       EXPECT_TRUE(left.keptByDesign) << left.description;
     }
+    EXPECT_EQ(run.result.refusals.size(), RefusedCalls(expected.calls));
     EXPECT_THAT(run.result.refusals,
                 ::testing::Each(::testing::HasSubstr("GetPrefLong: the preference store")));
     if (GetParam().callback == Callback::Entry) CheckRegistered(*run.host, expected.calls);

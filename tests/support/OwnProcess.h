@@ -12,7 +12,7 @@
 namespace testsupport {
 
 // Forks, and runs the work there; what it writes on standard error is dropped. The signal that ended the
-// process, or 0 when the work came to an end of its own.
+// process, or 0 when the work came to its end. Throws when there is no such process, or the work threw.
 template <typename Work>
 int SignalOfOwnProcess(Work work) {
   std::fflush(nullptr);
@@ -32,7 +32,10 @@ int SignalOfOwnProcess(Work work) {
   }
   int status = 0;
   if (waitpid(process, &status, 0) != process) throw std::runtime_error("a process of its own got lost");
-  return WIFSIGNALED(status) ? WTERMSIG(status) : 0;
+  if (WIFSIGNALED(status)) return WTERMSIG(status);
+  if (WEXITSTATUS(status) != EXIT_SUCCESS)
+    throw std::runtime_error("a process of its own could not do its work");
+  return 0;
 }
 
 }  // namespace testsupport
