@@ -112,14 +112,16 @@ function(set_test_options name)
             MAYASCENE_MODULE="$<TARGET_FILE:MayaImport>")
 endfunction()
 
-# add_room_test(NAME SOURCES ... [LINKS ...]): one GoogleTest program; each of its tests is a test of ctest. The
-# headers that all test sources include are compiled once, for all programs.
+# add_room_test(NAME [ALONE] SOURCES ... [LINKS ...]): one GoogleTest program; each of its tests is a test of ctest. The
+# headers that all test sources include are compiled once, for all programs. ALONE: it runs neither tool nor module.
 function(add_room_test name)
-  cmake_parse_arguments(TEST "" "" "SOURCES;LINKS" ${ARGN})
+  cmake_parse_arguments(TEST "ALONE" "" "SOURCES;LINKS" ${ARGN})
   add_executable(${name} ${TEST_SOURCES})
   target_link_libraries(${name} PRIVATE ${TEST_LINKS} GTest::gmock_main)
   set_test_options(${name})
   target_precompile_headers(${name} REUSE_FROM test_headers)
-  add_dependencies(${name} mayascene MayaImport)
+  if(NOT TEST_ALONE)
+    add_dependencies(${name} mayascene MayaImport)
+  endif()
   gtest_discover_tests(${name} PROPERTIES TIMEOUT 300)
 endfunction()
