@@ -41,8 +41,13 @@ target_compile_options(
             -ffp-contract=off)
 # Tests are compiled more often than run: not to optimise them is the faster way to know.
 target_compile_options(mayascene_test_options INTERFACE -O0)
+# 1 under the sanitizers, where what takes long is done in part; the other builds do all of it.
+target_compile_definitions(mayascene_test_options INTERFACE MAYASCENE_SANITIZED=$<BOOL:${MAYASCENE_SANITIZE}>)
 if(MAYASCENE_SANITIZE)
-  set(MAYASCENE_SANITIZERS -fsanitize=address,undefined,float-cast-overflow -fno-sanitize-recover=all)
+  # "function" tells a call through a pointer by the address of a type's description, of which every shared library has
+  # its own: it would take each call across the border for a wrong one.
+  set(MAYASCENE_SANITIZERS -fsanitize=address,undefined,float-cast-overflow -fno-sanitize-recover=all
+                           $<$<CXX_COMPILER_ID:Clang>:-fno-sanitize=function>)
   target_compile_options(mayascene_options INTERFACE ${MAYASCENE_SANITIZERS} -fno-omit-frame-pointer)
   # The tests' own code has those that see a bad read or write in either and bad arithmetic in inline functions, and
   # compiles four times faster so.
@@ -59,9 +64,8 @@ if(MAYASCENE_COVERAGE)
   target_link_options(mayascene_common_options INTERFACE --coverage)
 endif()
 if(MAYASCENE_FUZZ)
-  # "function" tells a call through a pointer by the address of a type's description, of which every shared library has
-  # its own: it would take each call across the border for a wrong one. Comparisons are not traced: the dictionary and
-  # the mutator know the words, and tracing takes half of the runs.
+  # "function" is left out as above. Comparisons are not traced: the dictionary and the mutator know the words, and
+  # tracing takes half of the runs.
   target_compile_options(
     mayascene_options
     INTERFACE -fsanitize=fuzzer-no-link,address,undefined,float-cast-overflow,integer
@@ -90,7 +94,8 @@ function(add_room name kind)
 endfunction()
 
 # precompile_headers(NAME): has a library of the host's side begin with the standard headers that it mostly includes,
-# compiled once for all of them. What a source uses it includes nevertheless: scripts/determinism builds without them.
+# compiled once for all of them. What a source uses it includes nevertheless: the fuzz preset and scripts/determinism
+# build without them.
 function(precompile_headers name)
   if(name STREQUAL refhost)
     target_precompile_headers(refhost PRIVATE <algorithm> <charconv> <deque> <filesystem> <fstream> <map> <memory>

@@ -14,11 +14,7 @@ namespace testsupport {
 namespace {
 
 // A sanitizer makes an import some ten times as long.
-#ifdef __SANITIZE_ADDRESS__
-constexpr std::size_t kShareDivisor = 10;
-#else
-constexpr std::size_t kShareDivisor = 1;
-#endif
+constexpr std::size_t kShareDivisor = MAYASCENE_SANITIZED ? 10 : 1;
 
 }  // namespace
 

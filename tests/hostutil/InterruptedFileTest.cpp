@@ -32,15 +32,16 @@ size_t mostBytes = SIZE_MAX;  // that one read gives
 // In the place of the system library's, for the whole program, the utility library included.
 #define SYSTEM_CALL extern "C" __attribute__((visibility("default")))
 
-SYSTEM_CALL int open64(const char* path, int flags, ...) {
-  va_list rest;
-  va_start(rest, flags);
-  const mode_t mode = (flags & O_CREAT) != 0 ? va_arg(rest, mode_t) : 0;
-  va_end(rest);
-  return opening.Strikes() ? -1 : static_cast<int>(syscall(SYS_openat, AT_FDCWD, path, flags, mode));
-}
-
-SYSTEM_CALL int open(const char* path, int flags, ...) __attribute__((alias("open64"), nothrow));
+#define OPEN_AS(name)                                                                                   \
+  SYSTEM_CALL int name(const char* path, int flags, ...) {                                              \
+    va_list rest;                                                                                       \
+    va_start(rest, flags);                                                                              \
+    const mode_t mode = (flags & O_CREAT) != 0 ? va_arg(rest, mode_t) : 0;                              \
+    va_end(rest);                                                                                       \
+    return opening.Strikes() ? -1 : static_cast<int>(syscall(SYS_openat, AT_FDCWD, path, flags, mode)); \
+  }
+OPEN_AS(open64)
+OPEN_AS(open)
 
 SYSTEM_CALL ssize_t read(int descriptor, void* buffer, size_t count) {
   if (reading.Strikes()) return -1;

@@ -178,12 +178,7 @@ TEST_F(HarmlessTextTest, ASceneIsSeenAlikeAtEveryAlignment) {
   for (std::size_t gap = 0; gap < 128; ++gap) ExpectNoDifference(scene, gap);
 }
 
-// How many random texts: all of them where the code is optimised and not watched.
-#if defined(__SANITIZE_ADDRESS__) || !defined(__OPTIMIZE__)
-constexpr int kRandomTexts = 100'000;
-#else
-constexpr int kRandomTexts = 1'000'000;
-#endif
+constexpr int kRandomTexts = MAYASCENE_SANITIZED ? 100'000 : 1'000'000;
 
 TEST_F(HarmlessTextTest, RandomHostileTextsAreSeenAlike) {
   HostileTexts texts(20240229);

@@ -54,7 +54,7 @@ TEST_F(ScaleTest, ManyUnnamedNodes) {
   EXPECT_EQ(TransformCount(), kNodes);
 }
 
-#if defined(__linux__) && !defined(__SANITIZE_ADDRESS__)
+#if defined(__linux__) && !MAYASCENE_SANITIZED
 // The bytes of addresses that the process has taken.
 std::size_t AddressSpace() {
   std::size_t pages = 0;

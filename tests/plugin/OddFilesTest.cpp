@@ -140,7 +140,7 @@ TEST_F(OddFilesTest, AFileThatShrinksWhileItIsReadIsAShortReadAndNothingIsBuilt)
 }
 
 // Under the address sanitizer such files take twice the memory and many times the time.
-#ifndef __SANITIZE_ADDRESS__
+#if !MAYASCENE_SANITIZED
 
 constexpr std::int64_t kTwoGigabytes = std::int64_t{1} << 31;
 

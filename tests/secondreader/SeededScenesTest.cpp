@@ -15,7 +15,7 @@ namespace secondreader {
 namespace {
 
 constexpr std::uint64_t kShares = 4;  // of which several can run at once
-constexpr std::uint64_t kScenesPerShare = 500;
+constexpr std::uint64_t kScenesPerShare = MAYASCENE_SANITIZED ? 125 : 500;
 
 class SeededScenesTest : public ::testing::TestWithParam<std::uint64_t> {};
 
@@ -45,6 +45,8 @@ TEST(SceneGeneratorTest, ASeedAlwaysGivesTheSameScene) {
   EXPECT_NE(SceneGenerator(17).make().bytes, SceneGenerator(18).make().bytes);
 }
 
+// A look at the generator, not at the importer; few scenes would not do.
+#if !MAYASCENE_SANITIZED
 TEST(SceneGeneratorTest, TheScenesReachEveryCallOfAnImportAndEveryKindOfFailure) {
   std::set<std::string> calls;
   std::map<HostError, int> codes;
@@ -67,6 +69,7 @@ TEST(SceneGeneratorTest, TheScenesReachEveryCallOfAnImportAndEveryKindOfFailure)
     EXPECT_GT(codes[code], 0) << code;
   }
 }
+#endif
 
 }  // namespace
 }  // namespace secondreader
