@@ -17,7 +17,7 @@ namespace {
 
 // Of the replaced bytes every such one is tried, and of the cuts of the examples. Eleven bytes stand in the
 // place of each, so each of these is tried at some places.
-constexpr std::size_t kStride = MAYASCENE_SANITIZED ? 3 : 1;
+constexpr std::size_t kStride = MAYASCENE_SANITIZED ? 5 : 1;
 constexpr std::size_t kSmallExamples = 2;  // so many of the examples are cut too, the smallest
 
 refhost::HostOptions options() {
