@@ -49,8 +49,8 @@ if(MAYASCENE_SANITIZE)
   set(MAYASCENE_SANITIZERS -fsanitize=address,undefined,float-cast-overflow -fno-sanitize-recover=all
                            $<$<CXX_COMPILER_ID:Clang>:-fno-sanitize=function>)
   target_compile_options(mayascene_options INTERFACE ${MAYASCENE_SANITIZERS} -fno-omit-frame-pointer)
-  # The tests' own code has those that see a bad read or write in either and bad arithmetic in inline functions, and
-  # compiles four times faster so.
+  # The tests' own code has those that see a bad read or write in either and bad arithmetic in inline functions,
+  # and compiles faster so.
   target_compile_options(
     mayascene_test_options
     INTERFACE -fsanitize=address,float-cast-overflow,signed-integer-overflow,shift,integer-divide-by-zero,bounds
@@ -93,13 +93,12 @@ function(add_room name kind)
   endif()
 endfunction()
 
-# precompile_headers(NAME): has a library of the host's side begin with the standard headers that it mostly includes,
-# compiled once for all of them. What a source uses it includes nevertheless: the fuzz preset and scripts/determinism
+# precompile_headers(NAME [HEADER...]): has the sources of a library begin with these headers, compiled once; with those
+# of refhost where none are named. What a source uses it includes nevertheless: the fuzz preset and scripts/determinism
 # build without them.
 function(precompile_headers name)
-  if(name STREQUAL refhost)
-    target_precompile_headers(refhost PRIVATE <algorithm> <charconv> <deque> <filesystem> <fstream> <map> <memory>
-                              <optional> <set> <string> <string_view> <vector>)
+  if(ARGN)
+    target_precompile_headers(${name} PRIVATE ${ARGN})
   else()
     target_precompile_headers(${name} REUSE_FROM refhost)
   endif()
