@@ -3,8 +3,8 @@
 usage: check_traces.py TOOL SOURCE_DIR
 
 Every example scene is imported, and its golden trace checked as well, so that a golden trace cannot be renewed
-into something wrong. Scenes beside the source folder (../shared/scenes and ../shared/hazards) join where they
-are there.
+into something wrong. So are the scenes of tests/scenes. Scenes beside the source folder (../shared/scenes and
+../shared/hazards) join where they are there.
 """
 
 import glob
@@ -19,6 +19,8 @@ sys.path.insert(0, os.path.join(HERE, "model"))
 from compare import first_difference  # noqa: E402
 from composition import whole_trace  # noqa: E402
 
+OWN = ("examples/*.ma", "tests/scenes/hazards/*.ma", "tests/scenes/production/*.ma")
+OUTSIDE = {"../shared/scenes/*.ma": 13, "../shared/hazards/h*.ma": 27}  # and how many there are, where they are
 LINEAR_UNITS = "--linear-units 1"  # as a scene's comment asks for it
 
 
@@ -37,10 +39,8 @@ def traced(tool, source_dir, path, options):
             return status, lines.read()
 
 
-def scenes_of(source_dir):
-    for pattern in ("examples/*.ma", "../shared/scenes/*.ma", "../shared/hazards/h*.ma"):
-        for path in sorted(glob.glob(os.path.join(source_dir, pattern))):
-            yield os.path.relpath(path, source_dir)
+def scenes_of(source_dir, pattern):
+    return [os.path.relpath(path, source_dir) for path in sorted(glob.glob(os.path.join(source_dir, pattern)))]
 
 
 def complaint_about(tool, source_dir, path):
@@ -63,15 +63,20 @@ def complaint_about(tool, source_dir, path):
 
 def main():
     tool, source_dir = sys.argv[1:]
-    complaints, count = [], 0
-    for path in scenes_of(source_dir):
-        count += 1
+    own = [scenes_of(source_dir, pattern) for pattern in OWN]
+    outside = {pattern: scenes_of(source_dir, pattern) for pattern in OUTSIDE}
+    scenes = sum(own, []) + sum(outside.values(), [])
+    complaints = ["no scenes: %s" % pattern for pattern, found in zip(OWN, own) if not found]
+    for path in scenes:
         problem = complaint_about(tool, source_dir, path)
         if problem:
             complaints.append("%s: %s" % (path, problem))
     print("\n".join(complaints))
-    print("%d scenes compared, %d differ" % (count, len(complaints)))
-    return 1 if complaints or count == 0 else 0
+    print("%d scenes compared, %d complaints" % (len(scenes), len(complaints)))
+    left_out = sum(max(OUTSIDE[pattern] - len(found), 0) for pattern, found in outside.items())
+    if left_out:
+        print("LEFT OUT: the traces of %d scenes of ../shared, beside the source folder" % left_out)
+    return 1 if complaints else 0
 
 
 if __name__ == "__main__":

@@ -12,6 +12,7 @@
 
 #include "plugin/Entry.h"
 #include "tests/plugin/PluginRun.h"
+#include "tests/support/LeftOut.h"
 
 namespace testsupport {
 namespace {
@@ -157,7 +158,7 @@ bool HasMemory(std::int64_t bytes) {
 }
 
 TEST_F(OddFilesTest, FilesJustBelowTwoGigabytesAreTakenAndThoseFromThereOnAreNot) {
-  if (!HasMemory(2 * kTwoGigabytes)) GTEST_SKIP() << "the memory is short";
+  if (!HasMemory(2 * kTwoGigabytes)) GTEST_SKIP() << kLeftOut << "files of 2 GB, because the memory is short";
   for (const std::int64_t size : {kTwoGigabytes - 3, kTwoGigabytes - 2, kTwoGigabytes - 1}) {
     const auto path = Write("large.ma", kScene);
     ASSERT_EQ(truncate(path.c_str(), size), 0);

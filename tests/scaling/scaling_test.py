@@ -210,7 +210,7 @@ def main():
     if arguments.tool is None:
         parser.error("--tool is missing")
     if shutil.which(arguments.valgrind) is None:
-        print("there is no valgrind")
+        print("LEFT OUT: how the work grows, because there is no valgrind")
         return SKIPPED
     with tempfile.TemporaryDirectory() as folder:
         judged = [judge(name, arguments, pathlib.Path(folder)) for name in arguments.workloads or WORKLOADS]

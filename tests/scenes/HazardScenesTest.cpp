@@ -1,121 +1,144 @@
-// Scenes made to do harm: each returns, with the code that its text deserves, and leaves nothing behind.
+// Scenes made to do harm, one hazard each: each returns, with the code that its text deserves, and leaves
+// nothing behind.
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include <filesystem>
-#include <set>
+#include <cstdint>
 #include <string>
 #include <vector>
 
 #include "hostapi/ErrorCodes.h"
 #include "tests/scenes/ImportedScene.h"
+#include "tests/scenes/SceneOutcome.h"
+#include "tests/support/TemporaryFolder.h"
 
 namespace {
 
 using refhost::LayerKind;
 using scenes::ImportedScene;
-using scenes::sharedFolder;
-using testing::ElementsAreArray;
+using scenes::ownFolder;
+using scenes::SceneOutcome;
+using testing::ElementsAre;
 using testing::IsEmpty;
+using testing::UnorderedElementsAreArray;
 
-struct Hazard {
-  const char* name;
-  HostError code = 0;
-  std::size_t compositions = 0;
-  std::vector<std::string> cameras = {};
-  std::vector<std::string> nulls = {};
-};
+std::filesystem::path hazard(const char* name) { return ownFolder("hazards") / (std::string(name) + ".ma"); }
 
-void PrintTo(const Hazard& hazard, std::ostream* out) { *out << hazard.name; }
-
-const std::vector<Hazard>& hazards() {
+const std::vector<SceneOutcome>& hazards() {
   // The pixels of a scene that says nothing of them are not square, so a scene with a camera makes two
   // compositions.
-  static const std::vector<Hazard> all = {
-      {.name = "h01_word_at_eof", .code = HOST_ERR_MAYA_UNEXPECTED_END},
-      {.name = "h02_eof_in_createnode", .code = HOST_ERR_MAYA_UNEXPECTED_END},
-      {.name = "h02b_eof_in_select", .code = HOST_ERR_MAYA_UNEXPECTED_END},
-      {.name = "h02c_eof_in_connect", .code = HOST_ERR_MAYA_UNEXPECTED_END},
-      {.name = "h02d_eof_in_setattr", .code = HOST_ERR_MAYA_UNEXPECTED_END},
-      {.name = "h02e_eof_after_createNode_word"},
-      {.name = "h03_embedded_nul_word", .compositions = 2, .cameras = {"c"}},
-      {.name = "h03b_embedded_nul_between"},
-      {.name = "h04_blockcomment_star_eof", .code = HOST_ERR_MAYA_UNEXPECTED_END},
-      {.name = "h05_quote_unclosed", .code = HOST_ERR_MAYA_UNEXPECTED_END},
-      {.name = "h06_highbyte", .code = HOST_ERR_MAYA_SYNTAX},
-      {.name = "h10_dupcurve_two_keys"},
-      {.name = "h11_dupcurve_nokeys_tan"},
-      {.name = "h12_keys_then_bad_number", .code = HOST_ERR_NUMBER_SYNTAX},
-      {.name = "h13_keys_then_lex_error", .code = HOST_ERR_MAYA_SYNTAX},
-      {.name = "h14_unnamed_two_curves"},
-      {.name = "h15_longname_two_curves"},
-      {.name = "h16_select_between"},
-      {.name = "h20_selfparent", .compositions = 2, .cameras = {"c"}},
-      {.name = "h21_twocycle", .compositions = 2, .cameras = {"c"}, .nulls = {"b"}},
-      {.name = "h22_valid_scene_same_names", .compositions = 2, .cameras = {"shotShape"}, .nulls = {"rig"}},
-      {.name = "h23_locator_cycle", .compositions = 2, .cameras = {"c"}, .nulls = {"null1"}},
-      {.name = "h30_w_huge"},
-      {.name = "h31_key_time_overflow", .compositions = 2, .cameras = {"c"}},
-      {.name = "h32_key_inf", .code = HOST_ERR_NUMBER_RANGE},
-      {.name = "h33_short_scale"},
-      {.name = "h40_option_eats_semicolon", .compositions = 2, .cameras = {"kept"}},
+  static const std::vector<SceneOutcome> all = {
+      // The text ends too soon, or where it may.
+      {.name = "word_runs_into_the_end", .code = HOST_ERR_MAYA_UNEXPECTED_END},
+      {.name = "node_creation_runs_into_the_end", .code = HOST_ERR_MAYA_UNEXPECTED_END},
+      {.name = "select_runs_into_the_end", .code = HOST_ERR_MAYA_UNEXPECTED_END},
+      {.name = "connection_runs_into_the_end", .code = HOST_ERR_MAYA_UNEXPECTED_END},
+      {.name = "value_runs_into_the_end", .code = HOST_ERR_MAYA_UNEXPECTED_END},
+      {.name = "comment_open_after_a_star", .code = HOST_ERR_MAYA_UNEXPECTED_END},
+      {.name = "string_stays_open", .code = HOST_ERR_MAYA_UNEXPECTED_END},
+      {.name = "node_type_is_missing_at_the_end", .compositions = 2, .cameras = {"kept"}},
+      // Bytes that no scene should have.
+      {.name = "nul_inside_a_word", .compositions = 2, .cameras = {"afterNul"}},
+      {.name = "nul_between_commands", .compositions = 2, .cameras = {"before"}},
+      {.name = "byte_that_is_no_ascii", .code = HOST_ERR_MAYA_SYNTAX},
+      // Who owns a curve's keys.
+      {.name = "two_curves_of_one_name", .compositions = 2, .cameras = {"dollyShape"}, .keys = 15},
+      {.name = "second_curve_of_a_name_has_no_keys", .compositions = 2, .cameras = {"dollyShape"}},
+      {.name = "selection_between_keys", .compositions = 2, .cameras = {"dollyShape"}, .keys = 15},
+      {.name = "curves_without_a_name", .compositions = 2, .cameras = {"beside"}},
+      {.name = "curve_names_too_long_to_keep", .compositions = 2, .cameras = {"beside"}},
+      {.name = "keys_before_a_bad_number", .code = HOST_ERR_NUMBER_SYNTAX},
+      {.name = "keys_before_a_refused_byte", .code = HOST_ERR_MAYA_SYNTAX},
+      // Parents in a circle.
+      {.name = "transform_is_its_own_parent", .compositions = 2, .cameras = {"loopShape"}},
+      {.name = "two_transforms_are_each_others_parents",
+       .compositions = 2,
+       .cameras = {"henShape"},
+       .nulls = {"egg"}},
+      {.name = "parent_and_child_of_one_name",
+       .compositions = 2,
+       .cameras = {"takeShape"},
+       .nulls = {"crane"}},
+      {.name = "marked_locator_under_a_circle",
+       .compositions = 2,
+       .cameras = {"eye"},
+       .nulls = {"loop_nullShape"}},
+      // Numbers out of range, too few of them, and a command that runs into the next.
+      {.name = "width_beyond_every_integer", .compositions = 1, .cameras = {"wide"}},
+      {.name = "key_time_beyond_the_range", .compositions = 2, .cameras = {"eye"}},
+      {.name = "key_time_without_bound", .code = HOST_ERR_NUMBER_RANGE},
+      {.name = "scale_of_one_number", .compositions = 2, .cameras = {"shortShape"}},
+      {.name = "option_takes_the_semicolon", .compositions = 2, .cameras = {"read"}},
   };
   return all;
 }
 
-std::vector<std::string> messagesOf(HostError code) {
-  if (code == HOST_ERR_MAYA_SYNTAX) return {"Error reading Maya file."};
-  if (code == HOST_ERR_MAYA_UNEXPECTED_END) return {"Unexpected end of maya file."};
-  return {};
-}
-
-class HazardScenes : public testing::Test {
- protected:
-  void SetUp() override {
-    if (!std::filesystem::exists(sharedFolder("hazards")))
-      GTEST_SKIP() << "no hazards beside the source folder";
-  }
-};
-
-class HazardScene : public HazardScenes, public testing::WithParamInterface<Hazard> {};
+class HazardScene : public testing::TestWithParam<SceneOutcome> {};
 
 TEST_P(HazardScene, ReturnsItsCodeAndLeavesNothingBehind) {
-  const Hazard& hazard = GetParam();
-  ImportedScene scene(sharedFolder("hazards") / (std::string(hazard.name) + ".ma"));
-  ASSERT_TRUE(scene.loaded());
-  EXPECT_EQ(scene.result().code, hazard.code);
-  EXPECT_EQ(scene.compositions(), hazard.compositions);
-  EXPECT_THAT(scene.names(LayerKind::Camera), ElementsAreArray(hazard.cameras));
-  EXPECT_THAT(scene.names(LayerKind::Null), ElementsAreArray(hazard.nulls));
-  EXPECT_THAT(scene.result().messages, ElementsAreArray(messagesOf(hazard.code)));
-  EXPECT_THAT(scene.result().refusals, IsEmpty());
-  EXPECT_TRUE(scene.result().ledgerClean());
-  EXPECT_TRUE(scene.unload().ledgerClean());
+  scenes::expectOutcome(ownFolder("hazards"), GetParam());
 }
 
 INSTANTIATE_TEST_SUITE_P(All, HazardScene, testing::ValuesIn(hazards()),
-                         [](const auto& test) { return std::string(test.param.name); });
+                         [](const auto& test) { return scenes::nameOf(test.param); });
 
-TEST_F(HazardScenes, KeyTimesPastTheRangeAreHeldAtItsEnd) {
-  ImportedScene scene(sharedFolder("hazards") / "h31_key_time_overflow.ma");
+TEST(HazardScenes, AreAllImported) {
+  std::vector<std::string> known;
+  for (const SceneOutcome& outcome : hazards()) known.push_back(outcome.name);
+  EXPECT_THAT(scenes::scenesIn(ownFolder("hazards")), UnorderedElementsAreArray(known));
+}
+
+TEST(HazardScenes, KeyTimesPastTheRangeAreHeldAtItsEnd) {
+  ImportedScene scene(hazard("key_time_beyond_the_range"));
   ASSERT_TRUE(scene.loaded());
   ASSERT_EQ(scene.compositions(), 2u);
   EXPECT_EQ(scene.project().compositions()[0].duration.value, 2147483647);
   EXPECT_EQ(scene.project().compositions()[0].duration.scale, 1000u);
 }
 
-TEST_F(HazardScenes, OfTwoTransformsOfOneNameTheFirstIsPlaced) {
-  ImportedScene scene(sharedFolder("hazards") / "h22_valid_scene_same_names.ma");
+TEST(HazardScenes, WidthsPastTheRangeAreHeldAtItsEnd) {
+  ImportedScene scene(hazard("width_beyond_every_integer"));
   ASSERT_TRUE(scene.loaded());
-  for (const refhost::Layer& layer : scene.project().layers()) {
-    if (layer.name != "rig") continue;
-    EXPECT_NEAR(layer.findStream(1)->value[2], -5.0, 1e-12);
-    EXPECT_EQ(layer.parent, nullptr);
-  }
+  ASSERT_EQ(scene.compositions(), 1u);
+  EXPECT_EQ(scene.project().compositions()[0].width, 2147483647);
+  EXPECT_EQ(scene.project().compositions()[0].height, 1080);
 }
 
-TEST_F(HazardScenes, AThousandParentsAboveEachOfAThousandLocatorsAllBecomeNulls) {
-  ImportedScene scene(sharedFolder("hazards") / "q_chain_1000.ma");
+TEST(HazardScenes, OfTwoTransformsOfOneNameTheSecondIsPlaced) {
+  ImportedScene scene(hazard("parent_and_child_of_one_name"));
+  ASSERT_TRUE(scene.loaded());
+  const refhost::Layer* crane = scene.layer("crane");
+  ASSERT_NE(crane, nullptr);
+  EXPECT_NEAR(crane->findStream(refhost::kPositionStream)->value[2], -20.0, 1e-12);
+  EXPECT_EQ(crane->parent, nullptr);
+}
+
+TEST(HazardScenes, NumbersThatAreMissingFromATripleAreThoseOfATransformAtRest) {
+  ImportedScene scene(hazard("scale_of_one_number"));
+  ASSERT_TRUE(scene.loaded());
+  const refhost::Layer* camera = scene.layer("shortShape");
+  ASSERT_NE(camera, nullptr);
+  EXPECT_THAT(camera->findStream(refhost::kPositionStream)->value, ElementsAre(2.0, 0.0, 0.0));
+  EXPECT_THAT(camera->findStream(refhost::kScaleStream)->value, ElementsAre(300.0, 100.0, 100.0));
+}
+
+// 85 KB of text ask for a million layers.
+std::string chainAboveEachOfManyLocators() {
+  std::string text =
+      "//Maya ASCII 2024 scene\ncreateNode camera -n \"eye\";\ncreateNode transform -n \"link0\";\n";
+  for (int link = 1; link < 1000; ++link) {
+    const std::string above = std::to_string(link - 1);
+    text += "createNode transform -n \"link" + std::to_string(link) + "\" -p \"link" + above + "\";\n";
+  }
+  for (int locator = 0; locator < 1000; ++locator) {
+    text += "createNode locator -n \"null" + std::to_string(locator) + "\" -p \"link999\";\n";
+  }
+  return text;
+}
+
+TEST(HazardScenes, AThousandParentsAboveEachOfAThousandLocatorsAllBecomeNulls) {
+  const testsupport::TemporaryFolder folder;
+  ImportedScene scene(folder.write("chains.ma", chainAboveEachOfManyLocators()));
   ASSERT_TRUE(scene.loaded());
   EXPECT_EQ(scene.result().code, 0);
   EXPECT_TRUE(scene.result().ledgerClean());
@@ -131,28 +154,19 @@ TEST_F(HazardScenes, AThousandParentsAboveEachOfAThousandLocatorsAllBecomeNulls)
   EXPECT_EQ(tops, 1000u);
 }
 
-TEST_F(HazardScenes, ParentsWithoutEndAreRefusedAtTheCeilingAndTheNullsBeforeStay) {
+TEST(HazardScenes, ParentsWithoutEndAreRefusedAtTheCeilingAndTheNullsBeforeStay) {
   constexpr std::int32_t kMost = 5000;
   refhost::HostOptions options;
   options.mostLayers = kMost;
-  ImportedScene scene(sharedFolder("hazards") / "q_chain_1000.ma", options);
+  const testsupport::TemporaryFolder folder;
+  ImportedScene scene(folder.write("chains.ma", chainAboveEachOfManyLocators()), options);
   ASSERT_TRUE(scene.loaded());
   EXPECT_EQ(scene.result().code, HOST_ERR_TOO_MANY_LAYERS);
-  EXPECT_THAT(scene.result().refusals,
-              testing::ElementsAre("NewNullLayer: the host takes no more than 5000 layers"));
+  EXPECT_THAT(scene.result().refusals, ElementsAre("NewNullLayer: the host takes no more than 5000 layers"));
   EXPECT_THAT(scene.result().messages, IsEmpty());
   EXPECT_TRUE(scene.result().ledgerClean());
   EXPECT_EQ(scene.project().layers().size(), std::size_t{kMost});
   EXPECT_EQ(scene.layers(LayerKind::Camera), 1u);
-}
-
-TEST_F(HazardScenes, AreAllKnown) {
-  std::set<std::string> known = {"q_chain_1000"}, there;
-  for (const Hazard& hazard : hazards()) known.insert(hazard.name);
-  for (const auto& entry : std::filesystem::directory_iterator(sharedFolder("hazards"))) {
-    if (entry.path().extension() == ".ma") there.insert(entry.path().stem().string());
-  }
-  EXPECT_THAT(there, testing::ContainerEq(known));
 }
 
 }  // namespace

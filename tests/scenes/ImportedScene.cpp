@@ -5,10 +5,6 @@
 
 namespace scenes {
 
-std::filesystem::path sharedFolder(const char* folder) {
-  return std::filesystem::path(MAYASCENE_SOURCE_DIR) / ".." / "shared" / folder;
-}
-
 ImportedScene::ImportedScene(const std::filesystem::path& path, bool linearUnits)
     : ImportedScene(path, refhost::HostOptions(), linearUnits) {}
 

@@ -10,9 +10,6 @@
 
 namespace scenes {
 
-// ../shared/FOLDER beside the source folder.
-std::filesystem::path sharedFolder(const char* folder);
-
 class ImportedScene {
  public:
   explicit ImportedScene(const std::filesystem::path& path, bool linearUnits = false);

@@ -1,0 +1,7 @@
+//Maya ASCII 2024 scene
+// Two names of 300 bytes, which both read as empty.
+createNode animCurveTL -n "translate_translate_translate_translate_translate_translate_translate_translate_translate_translate_translate_translate_translate_translate_translate_translate_translate_translate_translate_translate_translate_translate_translate_translate_translate_translate_translate_translate_translate_translate_";
+	setAttr ".ktv[0:1]" 1 0 2 1;
+createNode animCurveTA -n "rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_rotateXYZ_";
+	setAttr ".ktv[0]" 1 2;
+createNode camera -n "beside";

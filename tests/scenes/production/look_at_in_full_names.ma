@@ -1,0 +1,31 @@
+//Maya ASCII 2024 scene
+// The same look-at in full names aims the camera at its target.
+requires maya "2024";
+requires "stereoCamera" "10.0";
+currentUnit -l centimeter -a degree -t film;
+fileInfo "application" "maya";
+fileInfo "osv" "Linux 5.14 x86_64 #1 SMP (\"PREEMPT\")\n";
+createNode transform -s -n "persp";
+	rename -uid "5B1C0E5A-0001-4D11-9C00-000000000005";
+	setAttr ".v" no;
+	setAttr ".t" -type "double3" 0 100.1 0 ;
+createNode camera -s -n "perspShape" -p "persp";
+	setAttr -k off ".v" no;
+	setAttr ".fl" 34.999999999999993;
+	setAttr ".hc" -type "string" "viewSet -p %camera";
+createNode transform -n "stage";
+createNode aimConstraint -n "watch_group" -p "stage";
+	setAttr ".a" -type "double3" 0 0 -1 ;
+createNode transform -n "watch" -p "stage";
+	setAttr ".t" -type "double3" 3 4 40 ;
+createNode camera -n "watchShape" -p "watch";
+	setAttr ".fl" 35;
+createNode transform -n "watch_aim" -p "stage";
+	setAttr ".t" -type "double3" 5 6 -7 ;
+createNode locator -n "watch_aimShape" -p "watch_aim";
+connectAttr "watch.translate" "watch_group.constraintTranslate";
+connectAttr "watch_group.constraintRotateX" "watch.rotateX";
+connectAttr "watch_group.constraintRotateY" "watch.rotateY";
+connectAttr "watch_group.constraintRotateZ" "watch.rotateZ";
+connectAttr "watch_aim.translate" "watch_group.target[0].targetTranslate";
+connectAttr "watch_aim.parentMatrix[0]" "watch_group.target[0].targetParentMatrix";

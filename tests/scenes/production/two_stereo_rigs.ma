@@ -1,0 +1,44 @@
+//Maya ASCII 2024 scene
+// Two rigs of three cameras each. A copy of the perspective camera has a name of its own, so it comes over
+// too.
+requires maya "2024";
+requires "stereoCamera" "10.0";
+currentUnit -l centimeter -a degree -t film;
+fileInfo "application" "maya";
+fileInfo "osv" "Linux 5.14 x86_64 #1 SMP (\"PREEMPT\")\n";
+createNode transform -s -n "persp";
+	rename -uid "5B1C0E5A-0001-4D11-9C00-000000000005";
+	setAttr ".v" no;
+	setAttr ".t" -type "double3" 0 100.1 0 ;
+createNode camera -s -n "perspShape" -p "persp";
+	setAttr -k off ".v" no;
+	setAttr ".fl" 34.999999999999993;
+	setAttr ".hc" -type "string" "viewSet -p %camera";
+createNode transform -n "persp1";
+createNode camera -n "perspShape2" -p "persp1";
+createNode stereoRigTransform -n "dome";
+	setAttr ".t" -type "double3" 10 0 0 ;
+createNode stereoRigCamera -n "domeCenterShape" -p "dome";
+createNode stereoRigFrustum -n "domeFrustum" -p "dome";
+createNode transform -n "domeLeft" -p "dome";
+	setAttr ".t" -type "double3" -3 0 0 ;
+createNode camera -n "domeLeftShape" -p "domeLeft";
+createNode transform -n "domeRight" -p "dome";
+	setAttr ".t" -type "double3" 3 0 0 ;
+createNode camera -n "domeRightShape" -p "domeRight";
+createNode stereoRigTransform -n "hall";
+	setAttr ".t" -type "double3" -20 0 0 ;
+createNode stereoRigCamera -n "hallCenterShape" -p "hall";
+createNode stereoRigFrustum -n "hallFrustum" -p "hall";
+createNode transform -n "hallLeft" -p "hall";
+	setAttr ".t" -type "double3" -3 0 0 ;
+createNode camera -n "hallLeftShape" -p "hallLeft";
+createNode transform -n "hallRight" -p "hall";
+	setAttr ".t" -type "double3" 3 0 0 ;
+createNode camera -n "hallRightShape" -p "hallRight";
+createNode cameraView -n "cameraView1";
+	setAttr ".e" -type "double3" 1 2 3 ;
+select -ne :defaultResolution;
+	setAttr ".w" 1920;
+	setAttr ".h" 1080;
+	setAttr ".pa" 1;
