@@ -1,0 +1,72 @@
+// The codes of all diagnostics, and what the one table says about each.
+//
+// A code's number is its name: Code::OpenString is 101, shown as MA0101. Numbers are given once and are never
+// used again. They go by topic:
+//   100  reading the text            400  what drives a channel
+//   200  nodes, names, units         500  cameras and locators
+//   300  curves                      600  what a bake writes
+#pragma once
+
+#include <cstdint>
+#include <span>
+#include <string>
+#include <string_view>
+
+namespace diag {
+
+enum class Code : std::uint16_t {
+  // Reading the text: diag/ReadingCodes.cpp
+  OpenString = 101,
+  OpenComment = 102,
+  CommandCutOff = 103,
+  CommandWithoutEnd = 104,
+  ConflictMark = 105,
+  TemplateField = 106,
+  UnexpectedByte = 107,
+  IncompleteCommand = 108,
+  UnreadableValue = 109,
+  TextTooLong = 110,
+  // Nodes, names, units: diag/NodeCodes.cpp
+  NoCurrentNode = 201,
+  NameTaken = 202,
+  AmbiguousName = 203,
+  ParentMissing = 204,
+  ParentInReference = 205,
+  ParentCircle = 206,
+  UnknownNode = 207,
+  AlreadyConnected = 208,
+  UnknownUnit = 209,
+  SecondUnit = 210,
+  ReferenceNotRead = 211,
+};
+
+// Ordered: a later one is worse.
+enum class Severity : std::uint8_t { Note, Warning, Error };
+
+// One row of the table. Texts are static and in plain English.
+struct Entry {
+  Code code;
+  Severity severity;
+  std::string_view symbol;    // the code's name as it is written above
+  std::string_view sentence;  // what is so; {0}, {1} … stand for the arguments
+  std::string_view meaning;   // what it means, for the page
+  std::string_view example;   // lines of a scene that give it
+  std::string_view help;      // what to do, in a compositor's words; may have the sentence's placeholders
+};
+
+// All rows, in the order of their numbers. Lives as long as the program.
+std::span<const Entry> Table();
+
+// The row of a code. Every code has one.
+const Entry& EntryOf(Code code);
+
+// How many arguments a row's texts have: one more than the largest placeholder.
+std::size_t ArgumentCount(const Entry& entry);
+
+// "MA0101"
+std::string NameOf(Code code);
+
+// "note", "warning", "error"
+std::string_view NameOf(Severity severity);
+
+}  // namespace diag

@@ -1,0 +1,39 @@
+// Lines and columns of a text, found from byte offsets.
+#pragma once
+
+#include <cstdint>
+#include <string_view>
+#include <vector>
+
+namespace diag {
+
+// Both count from 1. A column counts bytes. A line ends after its line feed.
+struct LineAndColumn {
+  std::uint32_t line = 1;
+  std::uint32_t column = 1;
+
+  bool operator==(const LineAndColumn&) const = default;
+};
+
+// Refers to the text, which must outlive it. The first question costs one pass over the text, every further
+// one a look at a few thousand bytes of it.
+class Lines {
+ public:
+  explicit Lines(std::string_view text) : text_(text) {}
+
+  // Of the byte at the offset. An offset beyond the text counts as its end.
+  LineAndColumn At(std::uint64_t offset);
+
+ private:
+  struct Block {
+    std::uint32_t lineFeeds;  // before the block
+    std::uint64_t lineStart;  // of the line that its first byte stands in
+  };
+
+  void Prepare();
+
+  std::string_view text_;
+  std::vector<Block> blocks_;
+};
+
+}  // namespace diag

@@ -1,0 +1,13 @@
+// The parts of the table, one per topic.
+#pragma once
+
+#include <span>
+
+#include "diag/Codes.h"
+
+namespace diag {
+
+std::span<const Entry> ReadingCodes();
+std::span<const Entry> NodeCodes();
+
+}  // namespace diag
