@@ -55,19 +55,41 @@ class SceneText {
     text("fileInfo \"application\" \"bench\";\n");
   }
 
-  void footer() {
+  void renderSettings() {
     text("select -ne :defaultResolution;\n\tsetAttr \".w\" 1920;\n\tsetAttr \".h\" 1080;\n");
-    text("\tsetAttr \".dar\" 1.7777777910232544;\n\tsetAttr \".pa\" 1;\n// End of measured.ma\n");
+    text("\tsetAttr \".dar\" 1.7777777910232544;\n\tsetAttr \".pa\" 1;\n");
+  }
+
+  void footer() {
+    renderSettings();
+    text("// End of measured.ma\n");
+  }
+
+  // A node, and the name that no other node of any scene has. Without a parent it lies at the top.
+  SceneText& node(std::string_view type, std::string_view name, std::string_view parent = {}) {
+    text("createNode ").text(type).text(" -n \"").text(name);
+    if (!parent.empty()) text("\" -p \"").text(parent);
+    text("\";\n\trename -uid \"");
+    const std::uint64_t first = random_();
+    const std::uint64_t second = random_();
+    hex(first >> 32, 8).text("-").hex(first >> 16, 4).text("-").hex(first, 4).text("-");
+    return hex(second >> 48, 4).text("-").hex(second, 12).text("\";\n");
+  }
+
+  // Three numbers in the form of most attributes of a transform.
+  SceneText& triple(std::string_view attribute, double x, double y, double z, int decimals) {
+    text("\tsetAttr \"").text(attribute).text("\" -type \"double3\" ");
+    return real(x, decimals).text(" ").real(y, decimals).text(" ").real(z, decimals).text(" ;\n");
   }
 
   // A curve of baked keys from frame 1 on: a motion that changes its speed a little from frame to frame.
   void curve(std::string_view type, const std::string& name, int keys, int decimals, double range) {
-    text("createNode ")
-        .text(type)
-        .text(" -n \"")
-        .text(name)
-        .text("\";\n\tsetAttr \".tan\" 18;\n\tsetAttr -s ");
-    integer(keys).text(" \".ktv[0:").integer(keys - 1).text("]\" ");
+    node(type, name)
+        .text("\tsetAttr \".tan\" 18;\n\tsetAttr -s ")
+        .integer(keys)
+        .text(" \".ktv[0:")
+        .integer(keys - 1)
+        .text("]\" ");
     constexpr double kDrag = 0.9;
     constexpr double kPush = 0.01;
     double value = number(range);
@@ -96,12 +118,19 @@ class SceneText {
     }
   }
 
-  void connect(const std::string& source, const std::string& destination) {
+  void connect(std::string_view source, std::string_view destination) {
     text("connectAttr \"").text(source).text("\" \"").text(destination).text("\";\n");
   }
 
  private:
   static constexpr std::size_t kBufferBytes = 1 << 20;
+
+  // The last `count` digits of a number to the base of 16.
+  SceneText& hex(std::uint64_t value, int count) {
+    char digits[16];
+    for (int i = count - 1; i >= 0; --i, value >>= 4) digits[i] = "0123456789ABCDEF"[value & 15];
+    return text({digits, static_cast<std::size_t>(count)});
+  }
 
   void flush() {
     out_.write(buffer_.data(), static_cast<std::streamsize>(buffer_.size()));

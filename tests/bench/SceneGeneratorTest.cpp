@@ -3,11 +3,12 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include <ostream>
+#include <regex>
+#include <set>
 #include <sstream>
-#include <streambuf>
 #include <string>
 #include <string_view>
+#include <utility>
 
 namespace bench {
 namespace {
@@ -26,35 +27,57 @@ int Count(std::string_view scene, std::string_view part) {
   return count;
 }
 
-// Takes bytes and keeps nothing but their number.
-class Scales : public std::streambuf {
- public:
-  double megabytes() const { return static_cast<double>(bytes_) / 1e6; }
-
- private:
-  std::streamsize xsputn(const char*, std::streamsize count) override {
-    bytes_ += count;
-    return count;
-  }
-  int_type overflow(int_type byte) override {
-    ++bytes_;
-    return byte;
-  }
-
-  std::streamsize bytes_ = 0;
-};
-
-double Megabytes(std::string_view workload) {
-  Scales scales;
-  std::ostream out(&scales);
-  findWorkload(workload)->write(out, 1.0, kSeed);
-  return scales.megabytes();
+double Megabytes(std::string_view workload, double scale) {
+  return static_cast<double>(Scene(workload, scale).size()) / 1e6;
 }
 
-TEST(SceneGeneratorTest, MeshIsOf200Megabytes) { EXPECT_NEAR(Megabytes("mesh"), 200.0, 4.0); }
-TEST(SceneGeneratorTest, KeysIsOf125Megabytes) { EXPECT_NEAR(Megabytes("keys"), 125.0, 2.5); }
-TEST(SceneGeneratorTest, NodesIsOf50Megabytes) { EXPECT_NEAR(Megabytes("nodes"), 50.0, 1.5); }
-TEST(SceneGeneratorTest, CompositionIsOf42Megabytes) { EXPECT_NEAR(Megabytes("composition"), 42.5, 0.8); }
+// The size of the whole workload, by that of two small parts of it.
+double WholeMegabytes(std::string_view workload) {
+  constexpr double kPart = 0.05;
+  const double part = Megabytes(workload, kPart);
+  const double growth = Megabytes(workload, 2 * kPart) - part;
+  return part + growth * (1.0 - kPart) / kPart;
+}
+
+TEST(SceneGeneratorTest, WorkloadsAreOfTheSizesInTheDocuments) {
+  // The whole is larger than its parts foretell: its numbers have more digits.
+  constexpr double kLongerNumbers = 0.05;
+  const std::pair<const char*, double> sizes[] = {
+      {"mesh", 200.0}, {"keys", 125.0}, {"nodes", 65.0}, {"composition", 43.0}, {"shot", 50.0}};
+  for (const auto& [workload, size] : sizes) {
+    EXPECT_NEAR(WholeMegabytes(workload), size, size * kLongerNumbers) << workload;
+  }
+}
+
+TEST(SceneGeneratorTest, SizeLayersAndKeysGrowWithTheScale) {
+  constexpr double kSmall = 0.02;
+  for (const Workload& workload : Workloads()) {
+    std::ostringstream texts[3];
+    Built built[3];
+    for (int i = 0; i < 3; ++i) built[i] = workload.write(texts[i], kSmall * (1 << i), kSeed);
+    const auto grown = [&](auto measure) {
+      return measure(2) - measure(1) - 2.0 * (measure(1) - measure(0));
+    };
+    const auto bytes = [&](int i) { return static_cast<double>(texts[i].str().size()); };
+    const auto layers = [&](int i) { return static_cast<double>(built[i].layers); };
+    const auto keys = [&](int i) { return static_cast<double>(built[i].keys); };
+    EXPECT_NEAR(grown(bytes), 0.0, 0.03 * bytes(2)) << workload.name;
+    EXPECT_NEAR(grown(layers), 0.0, 0.05 * layers(2)) << workload.name;
+    EXPECT_NEAR(grown(keys), 0.0, 0.05 * keys(2)) << workload.name;
+  }
+}
+
+TEST(SceneGeneratorTest, TheTwoFormsOfTheShotDifferInTheQuotesOfPathsOnly) {
+  std::string quoted = Scene("shot", 0.02);
+  std::string unquoted = Scene("shot_unquoted", 0.02);
+  EXPECT_EQ(quoted.size(), unquoted.size());
+  EXPECT_EQ(Count(quoted, "\n\t\t1 \"|crew"), 10 * 4);
+  EXPECT_EQ(Count(unquoted, "\n\t\t1 |crew"), 10 * 4);
+  EXPECT_EQ(Count(quoted, " |"), 0);
+  for (std::string* text : {&quoted, &unquoted})
+    std::erase_if(*text, [](char c) { return c == '"' || c == ' '; });
+  EXPECT_EQ(quoted, unquoted);
+}
 
 TEST(SceneGeneratorTest, MeshHoldsTheDataOf90MeshesAndFourBakedCameras) {
   const std::string scene = Scene("mesh", 0.01);
@@ -73,12 +96,15 @@ TEST(SceneGeneratorTest, KeysHoldsNineConnectedCurvesATransform) {
   EXPECT_EQ(Count(scene, "createNode animCurve"), 270);
   EXPECT_EQ(Count(scene, "-s 240 \".ktv[0:239]"), 270);
   EXPECT_EQ(Count(scene, "connectAttr "), 270);
+  EXPECT_EQ(Count(scene, "_nullShape\" -p \"joint"), 2) << "at the end of every other chain";
 }
 
 TEST(SceneGeneratorTest, NodesHoldsManyNodesAndConnections) {
   const std::string scene = Scene("nodes", 0.01);
   EXPECT_EQ(Count(scene, "createNode transform "), 1200 + 1);
   EXPECT_EQ(Count(scene, "createNode locator "), 800);
+  EXPECT_EQ(Count(scene, "createNode locator -n \"crowd_nullShape_"), 34)
+      << "of every third chain that has one";
   EXPECT_EQ(Count(scene, "createNode animCurve"), 100);
   EXPECT_EQ(Count(scene, "connectAttr "), 2000);
 }
@@ -92,8 +118,35 @@ TEST(SceneGeneratorTest, CompositionHoldsAMarkedLocatorWithKeysForEveryTransform
   EXPECT_EQ(Count(scene, "connectAttr "), 10);
 }
 
+TEST(SceneGeneratorTest, ShotHoldsReferencesRigsMeshesAndATrackedCamera) {
+  const std::string scene = Scene("shot", 0.01);
+  EXPECT_EQ(Count(scene, "file -r -ns"), 10);
+  EXPECT_EQ(Count(scene, "createNode reference "), 10);
+  EXPECT_EQ(Count(scene, "-type \"dataReferenceEdits\""), 10);
+  EXPECT_EQ(Count(scene, ".placeHolderList["), 10 * 7 * 6);
+  EXPECT_EQ(Count(scene, "createNode skinCluster "), 12);
+  EXPECT_EQ(Count(scene, "createNode parentConstraint "), 12);
+  EXPECT_EQ(Count(scene, "createNode mesh "), 20);
+  EXPECT_EQ(Count(scene, "createNode camera "), 4 + 1);
+  EXPECT_EQ(Count(scene, "-s 240 \".ktv[0:239]"), 7) << "of the tracked camera";
+}
+
+TEST(SceneGeneratorTest, EveryNodeHasAnIdentifierOfItsOwn) {
+  for (const Workload& workload : Workloads()) {
+    const std::string scene = Scene(workload.name, 0.002);
+    const std::regex form(
+        "createNode [^\n]*;\n\trename -uid "
+        "\"([0-9A-F]{8}-[0-9A-F]{4}-[0-9A-F]{4}-[0-9A-F]{4}-[0-9A-F]{12})\";\n");
+    std::set<std::string> identifiers;
+    for (std::sregex_iterator at(scene.begin(), scene.end(), form), end; at != end; ++at) {
+      identifiers.insert((*at)[1]);
+    }
+    EXPECT_EQ(static_cast<int>(identifiers.size()), Count(scene, "createNode ")) << workload.name;
+  }
+}
+
 TEST(SceneGeneratorTest, TheSameSeedGivesTheSameScene) {
-  for (const Workload& workload : kWorkloads) {
+  for (const Workload& workload : Workloads()) {
     const std::string scene = Scene(workload.name, 0.002);
     EXPECT_EQ(scene, Scene(workload.name, 0.002)) << workload.name;
     EXPECT_NE(scene, Scene(workload.name, 0.002, kSeed + 1)) << workload.name;
