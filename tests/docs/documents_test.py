@@ -91,7 +91,11 @@ class Readme(unittest.TestCase):
     def test_every_option_in_the_documents_is_one_of_the_tool(self):
         arguments = read("tools/mayascene/Arguments.cpp") + read("README.md").partition("Building by hand")[2]
         for name in DOCUMENTS:
-            for option in re.findall(r"(?<![\w-])(--[a-z][\w-]+)", read(name)):
+            text = read(name)
+            for script, option in re.findall(r"(scripts/\w+) (--[a-z][\w-]+)", text):
+                self.assertIn(option, read(script), f"{name} names {script} {option}")
+            text = re.sub(r"scripts/\w+ --[a-z][\w-]+", "", text)
+            for option in re.findall(r"(?<![\w-])(--[a-z][\w-]+)", text):
                 self.assertIn(option, arguments + "--help --version", f"{name} names {option}")
 
     def test_it_has_every_preset(self):
