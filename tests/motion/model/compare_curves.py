@@ -3,7 +3,8 @@
 usage: compare_curves.py [--jobs N] CURVE_VALUES COUNT
 
 CURVE_VALUES is the program that writes the curves of the seeds 1 to COUNT with their values. Every value agrees to 1e-9
-of the larger of its own size and the curve's span, and to 1e-5 where handles were moved to keep time running.
+of the larger of its own size and the curve's span, and to 1e-5 where handles were moved to keep time running. The span
+is the range of values that the curve goes through between its first key and its last one.
 """
 
 import argparse
@@ -42,8 +43,10 @@ class Comparison:
     def __init__(self):
         self.tally = Tally()
         self.seed = self.units = self.model = None
+        self.values = []
 
     def curve(self, seed, weighted, units, pre, post):
+        self.finish()
         self.tally.curves += 1
         self.seed, self.units = seed, float(units)
         self.model = Model(weighted == "1", int(pre), int(post))
@@ -54,19 +57,31 @@ class Comparison:
         )
 
     def value(self, time, value):
-        tally, keys = self.tally, self.model.keys
-        ours = float(value) * self.units
         theirs = self.model.at(float(time))
-        span = max(key.value for key in keys) - min(key.value for key in keys)
-        scale = max(abs(theirs), span)
+        self.values.append((float(time), float(value) * self.units, theirs, self.model.moved))
+
+    def finish(self):
+        """Judges the values of the curve that is complete."""
+        if not self.values:
+            return
+        keys = self.model.keys
+        reached = [key.value for key in keys]
+        reached += [theirs for time, _, theirs, _ in self.values if keys[0].time <= time <= keys[-1].time]
+        span = max(reached) - min(reached)
+        for time, ours, theirs, moved in self.values:
+            self.judge(time, ours, theirs, moved, max(abs(theirs), span))
+        self.values = []
+
+    def judge(self, time, ours, theirs, moved, scale):
+        tally = self.tally
         off = abs(ours - theirs) / scale if scale else abs(ours - theirs)
         tally.values += 1
-        if self.model.moved:
+        if moved:
             tally.moved += 1
             tally.worst_moved = max(tally.worst_moved, off)
         else:
             tally.worst = max(tally.worst, off)
-        if not off <= (AGREES_WHERE_MOVED if self.model.moved else AGREES):
+        if not off <= (AGREES_WHERE_MOVED if moved else AGREES):
             tally.wrong += 1
             if len(tally.complaints) < SHOWN:
                 tally.complaints.append(f"curve {self.seed} at {time}: {ours!r}, by the model {theirs!r}")
@@ -78,6 +93,7 @@ def compare(program, first, count):
     for line in run.stdout.splitlines():
         kind, *words = line.split()
         {"curve": comparison.curve, "key": comparison.key, "value": comparison.value}[kind](*words)
+    comparison.finish()
     return comparison.tally
 
 

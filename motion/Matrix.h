@@ -1,0 +1,84 @@
+// Points and matrices, as a scene writes them.
+//
+// Row vectors: a point p becomes p·M, and in A·B what A does comes first. The rows of a matrix are where the
+// unit axes go; the last one is where the origin goes. Right-handed. The last column is always 0 0 0 1 and
+// not kept.
+#pragma once
+
+#include <cmath>
+
+namespace motion {
+
+struct Vector {
+  double x = 0.0;
+  double y = 0.0;
+  double z = 0.0;
+
+  // 0, 1, 2: x, y, z.
+  double& operator[](int axis) { return axis == 0 ? x : axis == 1 ? y : z; }
+  double operator[](int axis) const { return axis == 0 ? x : axis == 1 ? y : z; }
+
+  friend bool operator==(const Vector&, const Vector&) = default;
+};
+
+inline Vector operator+(const Vector& a, const Vector& b) { return {a.x + b.x, a.y + b.y, a.z + b.z}; }
+inline Vector operator-(const Vector& a, const Vector& b) { return {a.x - b.x, a.y - b.y, a.z - b.z}; }
+inline Vector operator-(const Vector& a) { return {-a.x, -a.y, -a.z}; }
+inline Vector operator*(const Vector& a, double factor) { return {a.x * factor, a.y * factor, a.z * factor}; }
+inline double Dot(const Vector& a, const Vector& b) { return a.x * b.x + a.y * b.y + a.z * b.z; }
+inline Vector Cross(const Vector& a, const Vector& b) {
+  return {a.y * b.z - a.z * b.y, a.z * b.x - a.x * b.z, a.x * b.y - a.y * b.x};
+}
+// No overflow and no underflow on the way.
+inline double Length(const Vector& a) { return std::hypot(a.x, a.y, a.z); }
+
+struct Matrix {
+  Vector x{1.0, 0.0, 0.0};
+  Vector y{0.0, 1.0, 0.0};
+  Vector z{0.0, 0.0, 1.0};
+  Vector origin;
+
+  Vector& Axis(int axis) { return axis == 0 ? x : axis == 1 ? y : z; }
+  const Vector& Axis(int axis) const { return axis == 0 ? x : axis == 1 ? y : z; }
+
+  friend bool operator==(const Matrix&, const Matrix&) = default;
+};
+
+inline Vector TransformDirection(const Vector& a, const Matrix& m) {
+  return m.x * a.x + m.y * a.y + m.z * a.z;
+}
+inline Vector TransformPoint(const Vector& a, const Matrix& m) { return TransformDirection(a, m) + m.origin; }
+
+// First a, then b.
+inline Matrix operator*(const Matrix& a, const Matrix& b) {
+  return {TransformDirection(a.x, b), TransformDirection(a.y, b), TransformDirection(a.z, b),
+          TransformPoint(a.origin, b)};
+}
+
+inline Matrix Translation(const Vector& by) {
+  Matrix matrix;
+  matrix.origin = by;
+  return matrix;
+}
+
+inline Matrix Scaling(const Vector& by) { return {{by.x, 0.0, 0.0}, {0.0, by.y, 0.0}, {0.0, 0.0, by.z}, {}}; }
+
+inline Matrix WithoutOrigin(Matrix matrix) {
+  matrix.origin = {};
+  return matrix;
+}
+
+bool IsFinite(const Vector& vector);
+bool IsFinite(const Matrix& matrix);
+
+// The volume of the unit cube's image; negative where the matrix mirrors.
+double Determinant(const Matrix& matrix);
+
+// Fails where the matrix is flat or not finite; *inverse is then unchanged.
+bool Invert(const Matrix& matrix, Matrix* inverse);
+
+// The axes turned square to each other, the first one keeping its direction and the second one its plane, all
+// of length 1 and right-handed. An axis of no length takes what the others leave.
+Matrix RotationOf(const Matrix& matrix);
+
+}  // namespace motion

@@ -1,0 +1,76 @@
+// The matrix of one transform or joint. Angles are radians, lengths the scene's own.
+#pragma once
+
+#include "motion/Matrix.h"
+#include "motion/Rotation.h"
+
+namespace motion {
+
+// What a channel may not go beyond, where that is switched on.
+struct Limit {
+  double least = 0.0;
+  double most = 0.0;
+  bool hasLeast = false;
+  bool hasMost = false;
+};
+
+double Limited(double value, const Limit& limit);
+
+struct Shear {
+  double xy = 0.0;
+  double xz = 0.0;
+  double yz = 0.0;
+};
+
+struct Transform {
+  Vector translate;
+  Vector rotate;
+  Vector scale{1.0, 1.0, 1.0};
+  Shear shear;
+  RotateOrder order = RotateOrder::kXYZ;
+  Vector rotateAxis;
+  Vector rotatePivot;
+  Vector rotatePivotTranslate;
+  Vector scalePivot;
+  Vector scalePivotTranslate;
+
+  // A joint has no pivots and no shear, whatever stands above.
+  bool isJoint = false;
+  Vector jointOrient;
+  bool segmentScale = true;
+  Vector inverseScale{1.0, 1.0, 1.0};  // the scale of the parent joint, which segmentScale takes back
+
+  Limit translateLimit[3];
+  Limit rotateLimit[3];
+  Limit scaleLimit[3];
+};
+
+// From the node's own space to the space that its parent matrix starts from.
+Matrix LocalMatrix(const Transform& transform);
+
+// What of a transform would be lost if it were written as translation, rotation in XYZ order and scale.
+enum class TransformForm {
+  kPlain,    // nothing
+  kPivoted,  // the rotate pivot and the scale pivot
+  kOther,    // more
+};
+
+TransformForm FormOf(const Transform& transform);
+
+// A matrix taken apart: scale first, then shear, rotation in XYZ order, translation.
+struct MatrixParts {
+  Vector translate;
+  Vector rotate;
+  Vector scale;
+  Shear shear;
+};
+
+// A matrix that mirrors has a negative x scale. An axis of no length has scale 0 and no shear. `near` are the
+// angles of the previous frame, which the new ones follow. The matrix is finite.
+MatrixParts TakeApart(const Matrix& matrix, const Vector& near = {});
+
+// The largest cosine between two axes of a matrix: what no translation, rotation and scale can say. 0 where
+// they are square.
+double Skew(const Matrix& matrix);
+
+}  // namespace motion
