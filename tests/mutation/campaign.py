@@ -1,6 +1,7 @@
 """Changes the importer one token at a time, and looks whether the tests notice.
 
 usage: scripts/mutate [--count N] [--seed N] [--only FOLDER] [--headers] [--quick | --own] [--jobs N] [--again]
+       scripts/mutate --named [WORD...]
 
 Chooses mutants of the sources of plugin, maya, comp and hostutil, as many of each: comparisons that take in their
 limit or lose it, arithmetic and logic turned round, constants replaced by their neighbours, conditions negated. Each
@@ -8,6 +9,9 @@ is built and tested by itself, in a copy of the sources below build/mutate: by t
 imports; and what both let by, by everything. It is caught when a test fails, crashes or does not come back; what does
 not compile is replaced by another one. Prints those that no test catches, and the shares. What
 tests/mutation/equivalents.txt names changes nothing that can be seen: it is counted by itself.
+
+--named applies the sixty faults of tests/mutation/faults.py instead, or those with one of the words in their names,
+and shows which tests catch each; it ends with 0 when each is caught, 1 when one is not.
 
 Ends with 0 when at least 95 % were caught, 1 when fewer were, 2 for a wrong command line, 10 when the machine could not
 be set up or the unchanged sources do not pass.
@@ -25,6 +29,7 @@ from collections import Counter
 from dataclasses import asdict
 from pathlib import Path
 
+import named
 from mutants import Mutant, mutants_of
 from workspace import FIRST_STAGE, LAST_STAGE, QUICK_STAGES, STAGES, Workspace, WorkspaceError
 
@@ -160,7 +165,7 @@ def print_table(campaign):
 
 def arguments():
     parser = argparse.ArgumentParser(
-        prog="scripts/mutate", usage=__doc__.split("usage: ")[1].split("\n")[0],
+        prog="scripts/mutate", usage=__doc__.split("usage: ")[1].split("\n\n")[0],
         description=__doc__.split("\n\n", 2)[2], formatter_class=argparse.RawDescriptionHelpFormatter)
     parser.add_argument("--count", type=int, default=240, metavar="N", help="how many mutants (240)")
     parser.add_argument("--seed", type=int, default=1, metavar="N", help="which ones are chosen (1)")
@@ -171,6 +176,7 @@ def arguments():
     stages.add_argument("--own", action="store_true", help="by the folder's own tests alone")
     parser.add_argument("--jobs", type=int, default=1, metavar="N", help="how many are tried at a time (1)")
     parser.add_argument("--again", action="store_true", help="only those that survived when it ran last")
+    parser.add_argument("--named", nargs="*", metavar="WORD", help="the faults of tests/mutation/faults.py")
     options = parser.parse_args()
     if options.count < 1 or options.jobs < 1:
         parser.error("--count and --jobs are at least 1")
@@ -199,8 +205,18 @@ def write_survivors(survivors):
     RESULTS.write_text(json.dumps(entries, indent=1) + "\n", encoding="utf-8")
 
 
+def try_named(words):
+    try:
+        return named.run(Workspace(ROOT, PLACE / "named"), words)
+    except (WorkspaceError, OSError, subprocess.SubprocessError) as error:
+        print(f"scripts/mutate: {error}", file=sys.stderr)
+        return SETUP_FAILED
+
+
 def main():
     options = arguments()
+    if options.named is not None:
+        return try_named(options.named)
     folders = (options.only,) if options.only else FOLDERS
     suffixes = (".h", ".cpp") if options.headers else (".cpp",)
     campaign = Campaign(survivors_of_last_run() if options.again

@@ -15,6 +15,8 @@ OWN_TESTS = {
     "maya": ("maya_test",),
     "comp": ("comp_test",),
     "hostutil": ("hostutil_tests",),
+    "refhost": ("refhost_test",),
+    "tools": ("tool_tests", "tool_command_tests"),
 }
 WHOLE_IMPORTS = ("golden_trace_test", "conversion_test", "second_reader_test", "plugin_entry_test")
 EVERYTHING = ("plugin_services_test", "plugin_module_test", "maya_test", "comp_test", "hostutil_tests", "refhost_test",
@@ -149,15 +151,19 @@ class Workspace:
         return None
 
     def passes(self, command, limit):
+        return self.run(command, limit, subprocess.DEVNULL) == 0
+
+    def run(self, command, limit, output):
+        """The status of the command, whose text goes to `output`; None when it takes more than `limit` seconds."""
         shutil.rmtree(self.scratch, ignore_errors=True)
         self.scratch.mkdir(parents=True, exist_ok=True)
         with subprocess.Popen(command, cwd=self.scratch, env=dict(os.environ, TMPDIR=str(self.scratch)),
-                              stdin=subprocess.DEVNULL, stdout=subprocess.DEVNULL, stderr=subprocess.DEVNULL,
+                              stdin=subprocess.DEVNULL, stdout=output, stderr=subprocess.DEVNULL,
                               start_new_session=True, preexec_fn=limit_program) as process:
             try:
-                return process.wait(limit) == 0
+                return process.wait(limit)
             except subprocess.TimeoutExpired:
-                return False
+                return None
             finally:
                 with contextlib.suppress(ProcessLookupError):
                     os.killpg(process.pid, signal.SIGKILL)

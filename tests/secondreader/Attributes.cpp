@@ -2,8 +2,8 @@
 #include <algorithm>
 #include <cmath>
 
-#include "hostutil/HostNumbers.h"
 #include "tests/secondreader/KnownWords.h"
+#include "tests/secondreader/Numbers.h"
 #include "tests/secondreader/SceneReader.h"
 
 namespace secondreader {
@@ -151,8 +151,8 @@ void SceneReader::setRenderAttr() {
     if (token.kind == Kind::Semicolon) return;
     if (token.kind != Kind::Number) continue;
     const double value = number(token);
-    if (width) scene_.width = TruncateToInt32(value);
-    if (height) scene_.height = TruncateToInt32(value);
+    if (width) scene_.width = wholePart(value);
+    if (height) scene_.height = wholePart(value);
     if (device) scene_.deviceAspectRatio = value;
     if (pixel) scene_.pixelAspect = value;
   }

@@ -3,7 +3,7 @@
 
 #include <utility>
 
-#include "hostutil/HostNumbers.h"
+#include "tests/secondreader/Numbers.h"
 
 namespace secondreader {
 namespace {
@@ -67,7 +67,7 @@ Handle Builder::makeComps(Handle folder, const std::string& name) {
   std::int32_t order = 0;
   HostError code = HOST_ERR_NONE;
   if (!host.serviceFails("RatioCompare", &code)) {
-    code = HostRatioCompare(&kSquare, &display.pixelAspect, &order);
+    order = compareRatios(kSquare, display.pixelAspect);
   }
   check(code);
   Handle comp = 0;
@@ -82,9 +82,9 @@ Handle Builder::makeComps(Handle folder, const std::string& name) {
   const bool noName = host.serviceFails("StringFormat", &code);
   check(code);
   square.name = noName ? "" : formatted(host.localized(kSquarePattern), word, name);
-  square.width = TruncateToInt32(static_cast<double>(display.width) * display.pixelAspect.numerator /
-                                     display.pixelAspect.denominator +
-                                 0.5);
+  square.width = wholePart(static_cast<double>(display.width) * display.pixelAspect.numerator /
+                               display.pixelAspect.denominator +
+                           0.5);
   square.pixelAspect = kSquare;
   check(suites_.createComp(square, &comp));
   Handle outer = 0;

@@ -6,8 +6,8 @@
 #include <string>
 #include <vector>
 
-#include "hostutil/HostMatrix.h"
 #include "tests/secondreader/Conversions.h"
+#include "tests/secondreader/Matrices.h"
 #include "tests/secondreader/Records.h"
 #include "tests/secondreader/SuiteUser.h"
 
@@ -50,7 +50,9 @@ class Builder {
   void withBatches(Handle layer, std::vector<Batch> batches, Work work);
 
   // BuilderMatrices.cpp
-  MatrixComponents decomposed(const Transform& transform, Triple translate, Triple rotate, Triple scale);
+  Parts decomposed(const Transform& transform, const Triple& translate, const Triple& rotate,
+                   const Triple& scale) const;
+  Triple hostPoint(const Triple& point) const;
   void setTransform(Handle layer, const Transform& transform);
   void setAnchor(Handle layer, const Transform& transform);
 

@@ -1,4 +1,7 @@
 // Keys: counted, sampled one by one, and written.
+#include <array>
+
+#include "tests/secondreader/AngleRounding.h"
 #include "tests/secondreader/Builder.h"
 #include "tests/secondreader/BuilderTemplates.h"
 
@@ -58,6 +61,7 @@ void Builder::animate(Handle layer, const Transform& node) {
   if (count < 1) return;
   withBatches(layer, {{2}, {8}, {9}, {3}, {1}}, [&](const std::vector<Batch>& batches) {
     Triple previous{};
+    std::array<AngleRounding, 3> angleRoundings;
     for (std::size_t key = 0; key < static_cast<std::size_t>(count); ++key) {
       const T_Time time = keyTime(node, key);
       Triple scale = node.scale;
@@ -66,20 +70,19 @@ void Builder::animate(Handle layer, const Transform& node) {
       sample(node, 2, key, scale);
       sample(node, 1, key, rotate);
       sample(node, 0, key, translate);
-      for (double& value : rotate) value = convert_.angle(value);
-      for (double& value : translate) value = convert_.distance(value);
-      const MatrixComponents parts = decomposed(node, translate, rotate, scale);
-      Triple angles{parts.rotation[0], parts.rotation[1], parts.rotation[2]};
-      for (std::size_t axis = 0; key > 0 && axis < angles.size(); ++axis) {
-        angles[axis] = unwrapped(angles[axis], previous[axis]);
-      }
+      const Parts parts = decomposed(node, translate, rotate, scale);
+      const Rounding rounding = roundingAfter(rotate);
       insertKey(layer, batches[0], time,
-                {parts.scale[0] * kPercent, parts.scale[1] * kPercent, parts.scale[2] * kPercent});
-      insertKey(layer, batches[1], time, {angles[0] * kDegreesPerRadian});
-      insertKey(layer, batches[2], time, {angles[1] * kDegreesPerRadian});
-      insertKey(layer, batches[3], time, {angles[2] * kDegreesPerRadian});
-      insertKey(layer, batches[4], time, {parts.translation[0], parts.translation[1], parts.translation[2]});
-      previous = angles;
+                {parts.scale[0] * kPercent, parts.scale[1] * kPercent, parts.scale[2] * kPercent, rounding});
+      for (std::size_t axis = 0; axis < previous.size(); ++axis) {
+        const double angle = parts.rotation[axis];
+        AngleRounding& known = angleRoundings[axis];
+        const Rounding how = key > 0 ? known.next(angle, previous[axis]) : known.first(angle);
+        previous[axis] = key > 0 ? unwrapped(angle, previous[axis]) : angle;
+        insertKey(layer, batches[1 + axis], time, {previous[axis] * kDegreesPerRadian, 0.0, 0.0, how});
+      }
+      insertKey(layer, batches[4], time,
+                {parts.translation[0], parts.translation[1], parts.translation[2], rounding});
     }
   });
 }
@@ -92,8 +95,8 @@ void Builder::animateAnchor(Handle layer, const Transform& node) {
       const T_Time time = keyTime(node, key);
       Triple point = node.translate;
       sample(node, 0, key, point);
-      for (double& value : point) value = convert_.distance(value);
-      insertKey(layer, batches[0], time, {point[0], -point[1], -point[2]});
+      point = hostPoint(point);
+      insertKey(layer, batches[0], time, {point[0], point[1], point[2]});
     }
   });
 }

@@ -1,4 +1,5 @@
 // Static transforms, and the matrix that keys use too.
+#include "tests/secondreader/AngleRounding.h"
 #include "tests/secondreader/Builder.h"
 
 namespace secondreader {
@@ -8,49 +9,54 @@ constexpr double kRadiansPerDegree = 0.017453292519943295;
 constexpr double kDegreesPerRadian = 57.29577951308232;
 constexpr double kPercent = 100.0;
 
+Triple reversed(const Triple& point) { return {-point[0], -point[1], -point[2]}; }
+
 }  // namespace
 
-// The translation in points, the rotation in degrees.
-MatrixComponents Builder::decomposed(const Transform& transform, Triple translate, Triple rotate,
-                                     Triple scale) {
-  Triple sp = transform.scalePivot;
-  Triple rp = transform.rotatePivot;
-  for (double& value : sp) value = convert_.distance(value);
-  for (double& value : rp) value = convert_.distance(value);
-  TransformMatrix matrix;
-  check(MatrixSetIdentity(&matrix));
-  check(MatrixTranslate(&matrix, -sp[0], sp[1], sp[2]));
-  check(MatrixScale(&matrix, scale[0], scale[1], scale[2]));
-  check(MatrixTranslate(&matrix, sp[0], -sp[1], -sp[2]));
-  check(MatrixTranslate(&matrix, -rp[0], rp[1], rp[2]));
-  check(MatrixRotateAxis(&matrix, 1.0, 0.0, 0.0, rotate[0] * kRadiansPerDegree));
-  check(MatrixRotateAxis(&matrix, 0.0, 1.0, 0.0, rotate[1] * -kRadiansPerDegree));
-  check(MatrixRotateAxis(&matrix, 0.0, 0.0, 1.0, rotate[2] * -kRadiansPerDegree));
-  check(MatrixTranslate(&matrix, rp[0], -rp[1], -rp[2]));
-  check(MatrixTranslate(&matrix, translate[0], -translate[1], -translate[2]));
-  MatrixComponents components{};
-  check(MatrixDecompose(&matrix, &components, nullptr));
-  return components;
+// The host's Y and Z axes point the other way.
+Triple Builder::hostPoint(const Triple& point) const {
+  return {convert_.distance(point[0]), -convert_.distance(point[1]), -convert_.distance(point[2])};
+}
+
+// The translation in points; the rotation in radians. What is turned about Y or Z in the scene turns the
+// other way in the host.
+Parts Builder::decomposed(const Transform& transform, const Triple& translate, const Triple& rotate,
+                          const Triple& scale) const {
+  const Triple scalePivot = hostPoint(transform.scalePivot);
+  const Triple rotatePivot = hostPoint(transform.rotatePivot);
+  Matrix matrix = identity();
+  matrix = after(translation(reversed(scalePivot)), matrix);
+  matrix = after(scaling(scale), matrix);
+  matrix = after(translation(scalePivot), matrix);
+  matrix = after(translation(reversed(rotatePivot)), matrix);
+  matrix = after(rotation(0, convert_.angle(rotate[0]) * kRadiansPerDegree), matrix);
+  matrix = after(rotation(1, convert_.angle(rotate[1]) * -kRadiansPerDegree), matrix);
+  matrix = after(rotation(2, convert_.angle(rotate[2]) * -kRadiansPerDegree), matrix);
+  matrix = after(translation(rotatePivot), matrix);
+  matrix = after(translation(hostPoint(translate)), matrix);
+  const auto parts = takeApart(matrix);
+  check(parts ? HOST_ERR_NONE : HOST_ERR_MATRIX_NOT_FINITE);
+  return *parts;
 }
 
 void Builder::setTransform(Handle layer, const Transform& transform) {
-  Triple translate = transform.translate;
-  Triple rotate = transform.rotate;
-  for (double& value : translate) value = convert_.distance(value);
-  for (double& value : rotate) value = convert_.angle(value);
-  const MatrixComponents parts = decomposed(transform, translate, rotate, transform.scale);
+  const Parts parts = decomposed(transform, transform.translate, transform.rotate, transform.scale);
+  const Rounding rounding = roundingAfter(transform.rotate);
+  const auto setAngle = [&](std::int32_t stream, double angle) {
+    setStream(layer, stream, {angle * kDegreesPerRadian, 0.0, 0.0, AngleRounding().first(angle)});
+  };
   setStream(layer, 0, {});
-  setStream(layer, 2, {parts.scale[0] * kPercent, parts.scale[1] * kPercent, parts.scale[2] * kPercent});
-  setStream(layer, 8, {parts.rotation[0] * kDegreesPerRadian});
-  setStream(layer, 9, {parts.rotation[1] * kDegreesPerRadian});
-  setStream(layer, 3, {parts.rotation[2] * kDegreesPerRadian});
-  setStream(layer, 1, {parts.translation[0], parts.translation[1], parts.translation[2]});
+  setStream(layer, 2,
+            {parts.scale[0] * kPercent, parts.scale[1] * kPercent, parts.scale[2] * kPercent, rounding});
+  setAngle(8, parts.rotation[0]);
+  setAngle(9, parts.rotation[1]);
+  setAngle(3, parts.rotation[2]);
+  setStream(layer, 1, {parts.translation[0], parts.translation[1], parts.translation[2], rounding});
 }
 
 void Builder::setAnchor(Handle layer, const Transform& transform) {
-  Triple point = transform.translate;
-  for (double& value : point) value = convert_.distance(value);
-  setStream(layer, 0, {point[0], -point[1], -point[2]});
+  const Triple point = hostPoint(transform.translate);
+  setStream(layer, 0, {point[0], point[1], point[2]});
 }
 
 }  // namespace secondreader

@@ -2,7 +2,7 @@
 
 #include <cmath>
 
-#include "hostutil/HostNumbers.h"
+#include "tests/secondreader/Numbers.h"
 
 namespace secondreader {
 namespace {
@@ -82,7 +82,7 @@ T_Time Conversions::time(double value, bool first) {
   }
   const bool frames = scene_.timeUnit >= 6 && scene_.timeUnit <= kCustomRate;
   if (frames && first) offset_ = value;
-  return {TruncateToInt32((value - offset_) * kThousand + 0.5), TruncateToUInt32(factor * kThousand)};
+  return {wholePart((value - offset_) * kThousand + 0.5), wholePartUnsigned(factor * kThousand)};
 }
 
 T_Time Conversions::longestAnimation() const {
@@ -94,7 +94,7 @@ T_Time Conversions::longestAnimation() const {
     }
   }
   if (!(longest > 0.0)) longest = 10.0;
-  T_Time duration{TruncateToInt32((longest - offset_) * kThousand + 0.5), 1000};
+  T_Time duration{wholePart((longest - offset_) * kThousand + 0.5), 1000};
   switch (scene_.timeUnit) {
     case 1:
       duration.scale = 3600000;
@@ -127,7 +127,7 @@ T_Time Conversions::longestAnimation() const {
       duration.scale = 60000;
       break;
     case kCustomRate:
-      duration.scale = scene_.frameRate > 0.0 ? TruncateToUInt32(scene_.frameRate * kThousand) : 29970;
+      duration.scale = scene_.frameRate > 0.0 ? wholePartUnsigned(scene_.frameRate * kThousand) : 29970;
       break;
     default:
       break;
@@ -150,7 +150,7 @@ HostRatio Conversions::frameRate() const {
     case 11:
       return {60, 1};
     case kCustomRate:
-      return {TruncateToInt32(scene_.frameRate * kThousand), 1000};
+      return {wholePart(scene_.frameRate * kThousand), 1000};
     default:
       return {30, 1};
   }
@@ -158,7 +158,7 @@ HostRatio Conversions::frameRate() const {
 
 HostRatio Conversions::pixelAspect() const {
   if (std::fabs(scene_.pixelAspect - 1.0) < 0.01) return {1000, 1000};
-  return {TruncateToInt32(scene_.pixelAspect * kThousand), 1000};
+  return {wholePart(scene_.pixelAspect * kThousand), 1000};
 }
 
 double Conversions::filmSize(const Camera& camera) const {

@@ -42,7 +42,8 @@ TEST(FuzzSeedsTest, EachIsShortAndImportedWholeAndTogetherTheyReachEveryCallThat
     const RunReport report = runner.run({}, path.filename(), read.str());
     EXPECT_EQ(report.disagreement, std::nullopt) << path;
     EXPECT_EQ(report.prediction.imports.front().code, 0) << path;
-    for (const std::string& line : report.prediction.trace) {
+    for (const PredictedLine& predicted : report.prediction.trace) {
+      const std::string& line = predicted.text;
       calls.insert(callOf(line));
       if (line.find(R"("flag":8192,"value":1)") != std::string::npos) ++aimedCameras;
     }

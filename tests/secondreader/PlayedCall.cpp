@@ -3,14 +3,11 @@
 #include <charconv>
 #include <cmath>
 
-#include "refhost/ShownText.h"
+#include "tests/secondreader/JsonText.h"
 
 namespace secondreader {
 
-PlayedLine::PlayedLine(const char* call) {
-  line_ = "{\"call\":";
-  refhost::appendJsonText(line_, call);
-}
+PlayedLine::PlayedLine(const char* call) { line_ = "{\"call\":" + jsonText(call); }
 
 PlayedLine& PlayedLine::plain(const char* key, const std::string& json) {
   line_ += std::string(",\"") + key + "\":" + json;
@@ -18,9 +15,7 @@ PlayedLine& PlayedLine::plain(const char* key, const std::string& json) {
 }
 
 PlayedLine& PlayedLine::text(const char* key, const std::string& bytes) {
-  plain(key, "");
-  refhost::appendJsonText(line_, bytes);
-  return *this;
+  return plain(key, jsonText(bytes));
 }
 
 PlayedLine& PlayedLine::integer(const char* key, std::int64_t value) {
@@ -90,7 +85,7 @@ HostError PlayedCall::finish() {
   } else {
     line_.integer("error", error_);
   }
-  host_.lines.push_back(line_.ended());
+  host_.lines.push_back({line_.ended(), rounding_});
   if (throws) throwPlanned(*failure_, "rehearsed failure of " + operation_);
   return error_;
 }

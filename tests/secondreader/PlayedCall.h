@@ -8,6 +8,7 @@
 #include <vector>
 
 #include "tests/secondreader/PlayedHost.h"
+#include "tests/secondreader/TraceComparison.h"
 
 namespace secondreader {
 
@@ -48,6 +49,10 @@ class PlayedCall {
   bool demand(bool condition, HostError code);
 
   PlayedLine& line() { return line_; }
+
+  // How well the doubles of the line are known; exactly, if this is not called.
+  void rounded(Rounding rounding) { rounding_ = rounding; }
+
   // What the call hands out, null unless it went on.
   void handed(const char* key, const char* kind, Handle number) {
     line_.handle(key, kind, goesOn() ? number : 0);
@@ -63,6 +68,7 @@ class PlayedCall {
   std::optional<refhost::Failure> failure_;
   HostError error_ = HOST_ERR_NONE;
   PlayedLine line_;
+  Rounding rounding_ = Rounding::None;
 };
 
 }  // namespace secondreader

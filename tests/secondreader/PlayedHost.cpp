@@ -2,9 +2,9 @@
 
 #include <iterator>
 #include <new>
+#include <string_view>
 
-#include "hostutil/HostNumbers.h"
-#include "refhost/Host.h"
+#include "tests/secondreader/Numbers.h"
 
 namespace secondreader {
 namespace {
@@ -24,12 +24,24 @@ constexpr LocalizedEntry kTable[] = {
     {"$$$/QZ/Maya_Import/LStr/0007", "^^1 ^^2"},
 };
 
+std::string_view sentenceOf(HostError code) {
+  switch (code) {
+#define SENTENCE(name, number, sentence) \
+  case HOST_ERR_##name:                  \
+    return sentence;
+    HOST_ERROR_TABLE(SENTENCE)
+#undef SENTENCE
+    default:
+      return "";
+  }
+}
+
 }  // namespace
 
 HostError PlayedHost::translateAndReport(const std::exception& exception) {
   const bool memory = dynamic_cast<const std::bad_alloc*>(&exception) != nullptr;
   const HostError code = memory ? HOST_ERR_EXCEPTION_MEMORY : HOST_ERR_EXCEPTION_OTHER;
-  if (!silent) messages.push_back(std::string(refhost::errorSentence(code)) + ": " + exception.what());
+  if (!silent) messages.push_back(std::string(sentenceOf(code)) + ": " + exception.what());
   return code;
 }
 
@@ -55,7 +67,7 @@ double PlayedHost::scanNumber(const std::string& text) {
   HostError code = HOST_ERR_NONE;
   double value = 0.0;
   if (!serviceFails("NumberScan", &code)) {
-    code = HostNumberScan(text.data(), static_cast<std::int64_t>(text.size()), &value);
+    code = readNumber(text, &value);
   }
   check(code);
   return value;

@@ -12,6 +12,7 @@
 #include "hostapi/ErrorCodes.h"
 #include "hostapi/HostTypes.h"
 #include "tests/secondreader/FailurePlan.h"
+#include "tests/secondreader/TraceComparison.h"
 
 namespace secondreader {
 
@@ -72,7 +73,7 @@ class PlayedHost {
 
   const refhost::HostOptions options;
   FailurePlan plan;
-  std::vector<std::string> lines;
+  std::vector<PredictedLine> lines;
   std::vector<std::string> messages;
   bool silent = false;
 

@@ -80,14 +80,14 @@ PredictedCallback Callbacks::run(refhost::Callback callback, Work work) {
     folder_ = ++host_.items;
     entered.handle("folder", "item", folder_);
   }
-  host_.lines.push_back(entered.ended());
+  host_.lines.push_back({entered.ended()});
   host_.plan.begin(callback);
   const HostError code = host_.guarded(work);
   host_.plan.end();
   PlayedLine left("leave");
   left.text("callback", nameOf(callback));
   if (verifying) left.plain("canImport", canImport_ ? "true" : "false");
-  host_.lines.push_back(left.integer("error", code).ended());
+  host_.lines.push_back({left.integer("error", code).ended()});
   PredictedCallback result{code, canImport_, std::move(host_.messages),
                            static_cast<int>(host_.plan.suiteCalls()),
                            static_cast<int>(host_.plan.count("NumberScan"))};

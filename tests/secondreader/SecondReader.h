@@ -7,6 +7,7 @@
 #include <vector>
 
 #include "refhost/Host.h"
+#include "tests/secondreader/TraceComparison.h"
 
 namespace secondreader {
 
@@ -21,7 +22,7 @@ struct PredictedCallback {
 
 // The callbacks in their order: the entry, the header test, the imports, the death hook.
 struct Prediction {
-  std::vector<std::string> trace;  // without line ends
+  std::vector<PredictedLine> trace;
   PredictedCallback entry;
   PredictedCallback verify;
   std::vector<PredictedCallback> imports;

@@ -54,9 +54,9 @@ TEST(SceneGeneratorTest, TheScenesReachEveryCallOfAnImportAndEveryKindOfFailure)
     const GeneratedScene scene = SceneGenerator(seed).make();
     const Prediction prediction = predict(scene.options, "/" + scene.fileName, scene.bytes, scene.imports);
     ++codes[prediction.imports.front().code];
-    for (const std::string& line : prediction.trace) {
+    for (const PredictedLine& line : prediction.trace) {
       const std::string lead = "{\"call\":\"";
-      calls.insert(line.substr(lead.size(), line.find('"', lead.size()) - lead.size()));
+      calls.insert(line.text.substr(lead.size(), line.text.find('"', lead.size()) - lead.size()));
     }
   }
   for (std::size_t operation = 0; operation < refhost::kOperationCount; ++operation) {

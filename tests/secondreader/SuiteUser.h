@@ -5,6 +5,7 @@
 #include <cstddef>
 #include <cstdint>
 #include <string>
+#include <vector>
 
 #include "tests/secondreader/PlayedCall.h"
 #include "tests/secondreader/PlayedHost.h"
@@ -76,8 +77,14 @@ class SuiteUser {
   HostError setLayerParent(Handle layer, Handle parent);
   HostError setCameraFilmSize(Handle layer, std::int32_t direction, double filmSize);
 
-  // Streams and keys. Values are records of four.
-  using Value = std::array<double, 4>;
+  // Streams and keys. Values are records of four, of which the fourth is 0.
+  struct Value {
+    Value(double x = 0.0, double y = 0.0, double z = 0.0, Rounding how = Rounding::None)
+        : numbers{x, y, z, 0.0}, rounding(how) {}
+
+    std::vector<double> numbers;
+    Rounding rounding;
+  };
   HostError acquireLayerStream(Handle layer, std::int32_t id, Handle* stream);
   HostError releaseStream(Handle stream);
   HostError setStreamValue(Handle stream, const Value& value);

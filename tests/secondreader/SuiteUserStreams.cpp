@@ -29,11 +29,9 @@ Object* find(std::vector<Object>& objects, Handle number) {
 
 bool areFinite(const SuiteUser::Value& value, std::int32_t id) {
   const std::ptrdiff_t used = isOneOf(kThreeDimensional, id) ? 3 : 1;
-  return std::all_of(value.begin(), value.begin() + used,
+  return std::all_of(value.numbers.begin(), value.numbers.begin() + used,
                      [](double number) { return std::isfinite(number); });
 }
-
-std::vector<double> all(const SuiteUser::Value& value) { return {value.begin(), value.end()}; }
 
 }  // namespace
 
@@ -71,7 +69,8 @@ HostError SuiteUser::setStreamValue(Handle stream, const Value& value) {
     }
   }
   call.line().integer("pluginId", host_.options.pluginId).handle("stream", "stream", stream);
-  call.line().numbers("value", all(value));
+  call.line().numbers("value", value.numbers);
+  call.rounded(value.rounding);
   return call.finish();
 }
 
@@ -133,7 +132,8 @@ HostError SuiteUser::setBatchKeyframeValue(Handle batch, std::int32_t index, Han
     }
   }
   call.line().handle("batch", "batch", batch).integer("index", index).handle("stream", "stream", stream);
-  call.line().numbers("value", all(value));
+  call.line().numbers("value", value.numbers);
+  call.rounded(value.rounding);
   return call.finish();
 }
 

@@ -1,4 +1,4 @@
-// Two traces of the same run, line by line.
+// A trace that was predicted and the one that was written, line by line.
 #pragma once
 
 #include <cstddef>
@@ -9,17 +9,31 @@
 
 namespace secondreader {
 
+// How well the doubles of a line can be known by who works them out in another way.
+enum class Rounding {
+  None,      // bit for bit
+  Last,      // they went through a sine or a cosine: to 1e-12 of their size
+  Angle,     // degrees that went through an arc tangent: to 1e-12 of half a turn, where they are smaller
+  HalfTurn,  // the same, and what lies half a turn away in both directions may lie on either side: whole
+             // turns more or less are the same
+};
+
+// A line without its end.
+struct PredictedLine {
+  std::string text;
+  Rounding rounding = Rounding::None;
+};
+
 struct TraceDifference {
   std::size_t line = 0;   // from 1
   std::string predicted;  // "(nothing)" where one of them has ended
   std::string traced;
 };
 
-// Whether two lines say the same: the doubles of values, centres and film sizes to 1e-9 relative, everything
-// else exactly.
-bool linesAgree(std::string_view predicted, std::string_view traced);
+// Whether two lines say the same: the doubles of values as well as they are known, everything else exactly.
+bool linesAgree(const PredictedLine& predicted, std::string_view traced);
 
-std::optional<TraceDifference> firstDifference(const std::vector<std::string>& predicted,
+std::optional<TraceDifference> firstDifference(const std::vector<PredictedLine>& predicted,
                                                const std::vector<std::string>& traced);
 
 // The lines of a text, without their ends.
