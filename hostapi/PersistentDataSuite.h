@@ -20,8 +20,8 @@ typedef struct QZGP_PersistentDataSuite3 {
 
   void (*reserved1[8])(void);
 
-  /* Slot 9. Reads a 32-bit integer into *value. An entry that is missing is made with the default. On
-   * failure *value is unchanged. */
+  /* Slot 9. Reads a 32-bit integer into *value. An entry that is missing is made with the default. A null
+   * store has no entries: *value is the default, and none is made. On failure *value is unchanged. */
   HostError (*GetPrefLong)(HostPrefsStore* store, const char* section, const char* key, int32_t defaultValue,
                            int32_t* value);
 } QZGP_PersistentDataSuite3;

@@ -232,11 +232,11 @@ class MAYA_Parse : public MAYA_Lex {
   // maya/MAYA_Parse_Attributes.cpp
   template <typename Record>
   void WriteBack(RecordList* list, const Record& record);
-  void ReadOrthographic();
+  bool ReadOrthographic();
   int ReadPlainPair(double* values, int capacity);
   int ReadNumbers(double* values, int capacity);
   template <std::size_t Count>
-  void ReadComponents(double (&field)[Count]);
+  bool ReadComponents(double (&field)[Count]);
   bool ReadLastNumber(double* value);
 
   // maya/MAYA_Parse_Keys.cpp

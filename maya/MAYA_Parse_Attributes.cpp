@@ -108,36 +108,44 @@ void MAYA_Parse::ParseCameraSetAttr() {
   if (kind != String) return;
   MAYA_Camera& camera = current.camera;
   double value = 0.0;
+  bool given = false;
   switch (FindCameraAttribute(QuotedText(first, last))) {
     case CameraAttribute::Orthographic:
-      ReadOrthographic();
+      given = ReadOrthographic();
+      if (given) camera.orthographic = 1;
       break;
     case CameraAttribute::CenterOfInterest:
-      ReadComponents(camera.worldCenterOfInterest);
+      given = ReadComponents(camera.worldCenterOfInterest);
       break;
     case CameraAttribute::FilmFit:
-      if (ReadLastNumber(&value)) camera.filmFit = FilmFitOf(value);
+      given = ReadLastNumber(&value);
+      if (given) camera.filmFit = FilmFitOf(value);
       break;
     case CameraAttribute::FocalLength:
-      if (ReadLastNumber(&value)) camera.focalLength = value;
+      given = ReadLastNumber(&value);
+      if (given) camera.focalLength = value;
       break;
     case CameraAttribute::Aperture:
-      ReadComponents(camera.cameraAperture);
+      given = ReadComponents(camera.cameraAperture);
       break;
     case CameraAttribute::None:
       return;
   }
-  WriteBack(cameras, camera);
+  // A command without a value writes nothing: the record may have got a connection or a parent since.
+  if (given) WriteBack(cameras, camera);
 }
 
-// Deliberate: only "yes" is looked at, so that a camera once set orthographic stays so.
-void MAYA_Parse::ReadOrthographic() {
+// Reads on to the ";". Whether a word is "yes". Deliberate: only "yes" is looked at, so that a camera once
+// set orthographic stays so.
+bool MAYA_Parse::ReadOrthographic() {
   const char* first = nullptr;
   const char* last = nullptr;
+  bool found = false;
   for (MayaToken kind = Unknown; kind != Semicolon;) {
     kind = NextInCommand(&first, &last);
-    if (kind == Identifier && SameWord(WordText(first, last), "yes")) current.camera.orthographic = 1;
+    if (kind == Identifier && SameWord(WordText(first, last), "yes")) found = true;
   }
+  return found;
 }
 
 // Reads two numbers that stand here in plain form, where there is room for them. Returns how many it read.
@@ -166,11 +174,14 @@ int MAYA_Parse::ReadNumbers(double* values, int capacity) {
   return count;
 }
 
-// The same for fields that are replaced as a whole, once there is a number: what is missing is 0.
+// The same for fields that are replaced as a whole, once there is a number: what is missing is 0. False when
+// there was none.
 template <std::size_t Count>
-void MAYA_Parse::ReadComponents(double (&field)[Count]) {
+bool MAYA_Parse::ReadComponents(double (&field)[Count]) {
   double values[Count] = {};
-  if (ReadNumbers(values, Count) > 0) std::copy(std::begin(values), std::end(values), field);
+  if (ReadNumbers(values, Count) == 0) return false;
+  std::copy(std::begin(values), std::end(values), field);
+  return true;
 }
 
 // Reads on to the ";". Every number is read and the last one stays. False when there was none.

@@ -27,8 +27,12 @@ HostError GetAppPrefsBlob(HostPrefsStore** store) {
 
 void getPrefLong(Call& call, HostPrefsStore* store, const char* section, const char* key,
                  std::int32_t defaultValue, std::int32_t* value) {
-  if (!call.isStore(store) || !call.given(section, "the section") || !call.given(key, "the key") ||
-      !call.given(value, "the place for the value")) {
+  if ((store != nullptr && !call.isStore(store)) || !call.given(section, "the section") ||
+      !call.given(key, "the key") || !call.given(value, "the place for the value")) {
+    return;
+  }
+  if (store == nullptr) {
+    *value = defaultValue;
     return;
   }
   Preferences& preferences = call.host().preferences;

@@ -55,6 +55,14 @@ TEST_F(CameraAnimationTest, AFocalLengthOfThirtyFiveHasTheZoomOfTheDefaultFilm) 
   EXPECT_NEAR(zooms[1], 2.0 * expected, kNear);
 }
 
+// The bits are those of the still lens; every other order of the factors gives others.
+TEST_F(CameraAnimationTest, AZoomKeyIsTheImageSizeTimesTheFocalLengthByTheFilmSizeToTheBit) {
+  Begin(SceneHead() + RenderSize(1280, 720, 1.0667) + CameraText("lens", "rig") +
+        "\tsetAttr \".cap\" 1.6735 1;\n" + Animation("lens.fl", {{1, 34.7}}));
+  Apply();
+  EXPECT_THAT(KeyValues(kZoom), ElementsAre(0x1.16a6efcb8d015p+10));
+}
+
 TEST_F(CameraAnimationTest, AVerticalFitMeasuresTheHeight) {
   Begin(SceneHead() + CameraText("lens", "rig") + "\tsetAttr \".ff\" 2;\n" + Animation("lens.fl", {{1, 50}}));
   Apply();

@@ -77,6 +77,25 @@ TEST_F(CameraTest, ThePixelAspectWidensAHorizontalFitAndNotAVerticalOne) {
   EXPECT_NEAR(parser().CalculateZoom(&camera, 100.0, nullptr), 480.0 * (35.0 * 72.0 / 25.4) / 100.0, kNear);
 }
 
+// Of each of these every other order of the factors gives other bits.
+TEST_F(CameraTest, TheZoomIsTheImageSizeTimesTheFocalLengthByTheFilmSizeToTheBit) {
+  MAYA_Camera camera = Camera();
+  camera.focalLength = 34.7;
+  camera.cameraAperture[0] = 1.6735;
+  parser().resolutionWidth = 1280;
+  parser().pixelAspect = 1.0667;
+  EXPECT_EQ(parser().CalculateZoom(&camera, parser().CalculatePixelFit(&camera), nullptr),
+            0x1.16a6efcb8d015p+10);
+  parser().SetCamera(NewCamera(), &camera);
+  EXPECT_EQ(StreamOf(kZoom).value[0], 0x1.16a6efcb8d015p+10);
+  camera.filmFit = 1;
+  camera.focalLength = 96.4;
+  camera.cameraAperture[1] = 0.9559;
+  parser().resolutionHeight = 486;
+  EXPECT_EQ(parser().CalculateZoom(&camera, parser().CalculatePixelFit(&camera), nullptr),
+            0x1.e2665a59ce874p+10);
+}
+
 TEST_F(CameraTest, AFocalLengthThatIsGivenStandsForTheCamerasOwn) {
   const MAYA_Camera camera = Camera();
   const double focal = 70.0;

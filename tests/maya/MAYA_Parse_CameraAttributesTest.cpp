@@ -137,6 +137,43 @@ TEST_F(CameraAttributesTest, ApertureAndCentreAreWrittenOnlyWithANumber) {
   EXPECT_THAT(Values(camera.worldCenterOfInterest), ElementsAre(4, 5, 6));
 }
 
+constexpr const char* kWithoutValue[] = {
+    "setAttr \".fl\";",  "setAttr \".fl\" \"x\";",
+    "setAttr \".ff\";",  "setAttr \".ff\" off;",
+    "setAttr \".cap\";", "setAttr \".cap\" -type \"double2\";",
+    "setAttr \".wci\";", "setAttr \".wci\" -type \"double3\";",
+    "setAttr \".o\";",   "setAttr \".o\" no;",
+    "setAttr \".o\" 1;", "setAttr -k off \".o\" \"yes\";",
+};
+
+constexpr const char* kWithValue[] = {
+    "setAttr \".fl\" 50;", "setAttr \".ff\" 0;",  "setAttr \".cap\" 1;",
+    "setAttr \".wci\" 0;", "setAttr \".o\" yes;",
+};
+
+TEST_F(CameraAttributesTest, ACommandWithoutAValueKeepsAConnectionMadeMeanwhile) {
+  const auto curveAfter = [this](const char* command) {
+    EXPECT_EQ(Read("createNode animCurveTU -n \"focal\";\ncreateNode camera -n \"c\";\n"
+                   "connectAttr \"focal.o\" \"c.fl\";\n" +
+                   std::string(command)),
+              0);
+    return CameraAt(0).focalLengthCurve;
+  };
+  for (const char* const command : kWithoutValue) EXPECT_EQ(curveAfter(command), 0) << command;
+  for (const char* const command : kWithValue) EXPECT_EQ(curveAfter(command), -1) << command;
+}
+
+TEST_F(CameraAttributesTest, OfTwoCamerasOfANameTheFirstKeepsItsParentWithoutAValue) {
+  const auto parentAfter = [this](const char* command) {
+    EXPECT_EQ(Read("createNode camera -n \"c\" -p \"one\";\ncreateNode camera -n \"c\" -p \"two\";\n" +
+                   std::string(command)),
+              0);
+    return std::string(CameraAt(0).parent);
+  };
+  for (const char* const command : kWithoutValue) EXPECT_EQ(parentAfter(command), "one") << command;
+  for (const char* const command : kWithValue) EXPECT_EQ(parentAfter(command), "two") << command;
+}
+
 TEST_F(CameraAttributesTest, AFailedScanThrowsItsCode) {
   for (const char* const name : {".fl", ".ff", ".cap", ".wci"}) {
     SCOPED_TRACE(name);

@@ -14,11 +14,13 @@ std::string WithError(const std::string& line, const std::string& error) {
   return WithoutError(line) + ",\"error\":" + error + "}";
 }
 
-std::string WithNull(std::string line, std::string_view key) {
+std::string With(std::string line, std::string_view key, std::string_view replacement) {
   const std::string_view value = Field(line, key);
   if (value.empty()) return line;
-  return line.replace(static_cast<std::size_t>(value.data() - line.data()), value.size(), "null");
+  return line.replace(static_cast<std::size_t>(value.data() - line.data()), value.size(), replacement);
 }
+
+std::string WithNull(const std::string& line, std::string_view key) { return With(line, key, "null"); }
 
 // The line of a call that fails: it hands nothing out.
 std::string Failed(const std::string& line, const std::string& error) {
@@ -30,14 +32,14 @@ std::string Failed(const std::string& line, const std::string& error) {
   return failed;
 }
 
-// Without a store the host refuses to look a preference up.
+// Without a store the host answers with the default.
 void LoseTheStore(std::vector<std::string>* calls) {
   bool lost = false;
   for (std::string& line : *calls) {
     const std::string call = CallName(line);
     if (call == "GetAppPrefsBlob") lost = !Succeeded(line);
     if (call != "GetPrefLong" || !lost) continue;
-    if (Succeeded(line)) line = Failed(line, std::to_string(HOST_ERR_BAD_HANDLE));
+    if (Succeeded(line)) line = With(line, "value", Field(line, "default"));
     line = WithNull(line, "store");
   }
 }

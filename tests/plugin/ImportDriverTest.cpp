@@ -96,6 +96,32 @@ TEST_F(ImportTest, TheMessageIsShownUpTo1023Bytes) {
   EXPECT_EQ(Import(path, {FailCall("ShowMessage", 1)}).code, 0);
 }
 
+TEST_F(ImportTest, TheReadersMessagesAreShownWholeWhateverTheirLength) {
+  constexpr const char* kUnequalKeys =
+      "createNode camera -n \"lens\" -p \"rig\";\ncreateNode transform -n \"rig\";\n"
+      "createNode animCurveTL -n \"x\";\nsetAttr \".ktv[0:1]\" 1 0 2 0;\n"
+      "createNode animCurveTL -n \"y\";\nsetAttr \".ktv[0:2]\" 1 0 2 0 3 0;\n"
+      "connectAttr \"x.o\" \"rig.tx\";\nconnectAttr \"y.o\" \"rig.ty\";\n";
+  const struct {
+    const char* key;
+    const char* commands;
+    HostError code;
+  } rows[] = {{"$$$/QZ/Maya_Import/LStr/0003", "_name\n", HOST_ERR_MAYA_SYNTAX},
+              {"$$$/QZ/Maya_Import/LStr/0004", "createNode \"", HOST_ERR_MAYA_UNEXPECTED_END},
+              {"$$$/QZ/Maya_Import/LStr/0005", kUnequalKeys, HOST_ERR_MAYA_KEY_COUNTS}};
+  for (const auto& row : rows) {
+    for (const std::size_t size : {1023u, 1024u, 70000u}) {
+      refhost::HostOptions options;
+      options.translations = {{row.key, std::string(size, 'm')}};
+      Load(options);
+      const refhost::CallbackResult result =
+          host_->importScene(Write("scene.ma", std::string("//Maya ASCII\n") + row.commands));
+      EXPECT_EQ(result.code, row.code);
+      EXPECT_THAT(result.messages, ElementsAre(std::string(size, 'm')));
+    }
+  }
+}
+
 TEST_F(ImportTest, AShortFileIsAReadErrorWithoutAMessage) {
   ExpectNothingBuilt(Import(Write("scene.ma", "//Maya AS")), HOST_ERR_FILE_SHORT_READ);
   EXPECT_EQ(CallsNamed("NewMemHandle"), 0u);

@@ -100,10 +100,10 @@ const std::vector<Refusal> kHandleRefusals = {
      }},
     {3001, "UnlockMemHandle: the memory handle is no handle of this host",
      [](Scene&) { return kMemorySuite1.UnlockMemHandle(foreign<HostMemHandle>()); }},
-    {3001, "GetPrefLong: the preference store is a null handle",
+    {3001, "GetPrefLong: the preference store is no handle of this host",
      [](Scene&) {
        std::int32_t value = 0;
-       return kPersistentDataSuite3.GetPrefLong(nullptr, "S", "k", 0, &value);
+       return kPersistentDataSuite3.GetPrefLong(foreign<HostPrefsStore>(), "S", "k", 0, &value);
      }},
     {3001, "GetPrefLong: the preference store is mem:1, which is no store handle",
      [](Scene& s) {

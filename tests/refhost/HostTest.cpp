@@ -303,6 +303,24 @@ TEST_F(HostCalls, LinearUnitsAreZeroWhereTheCallFailed) {
   EXPECT_EQ(host.linearUnits(), 0);
 }
 
+TEST_F(HostCalls, WithoutAStoreTheDefaultIsTheAnswerAndNoEntryIsMade) {
+  const TemporaryFolder folder;
+  HostOptions given = options();
+  given.preferences = folder.path() / "store";
+  given.linearUnits = 6;
+  Host host(given);
+  host.load(entry, &loaded);
+  host.beginCallback(Callback::Entry, {});
+  std::int32_t value = 0;
+  EXPECT_EQ(kPersistentDataSuite3.GetPrefLong(nullptr, "Maya Camera", "Another", 9, &value), 0);
+  EXPECT_EQ(value, 9);
+  EXPECT_EQ(kPersistentDataSuite3.GetPrefLong(nullptr, "Maya Camera", "Use Linear Units", 8, &value), 0);
+  EXPECT_EQ(value, 8);
+  EXPECT_THAT(host.endCallback(0).refusals, IsEmpty());
+  EXPECT_EQ(host.linearUnits(), 8);
+  EXPECT_EQ(folder.read("store"), "[Maya Camera]\nUse Linear Units=0\n");
+}
+
 TEST_F(HostCalls, PreferenceFileThatCannotBeWrittenChangesNothing) {
   const TemporaryFolder folder;
   folder.write("file", "");

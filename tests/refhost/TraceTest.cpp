@@ -107,6 +107,16 @@ TEST(Trace, RegistrationCalls) {
           R"({"call":"RegisterImporterCallbacks","suite":"QZGP File Import Manager Suite","version":3,"importer":"importer:1","count":2,"error":0})"));
 }
 
+TEST(Trace, APreferenceWithoutAStoreIsTheDefault) {
+  StandIn plugin({}, Callback::Entry);
+  std::int32_t value = -1;
+  kPersistentDataSuite3.GetPrefLong(nullptr, "S", "k", 4, &value);
+  EXPECT_THAT(
+      plugin.lines(),
+      ElementsAre(
+          R"({"call":"GetPrefLong","suite":"QZGP Persistent Data Suite","version":3,"store":null,"section":"S","key":"k","default":4,"value":4,"error":0})"));
+}
+
 TEST(Trace, CompositionAndLayerCalls) {
   StandIn plugin;
   const HostUTF16Unit name[] = {'S', 0xE9, 0xDC80, 0};

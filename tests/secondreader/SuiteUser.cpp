@@ -102,9 +102,7 @@ HostError SuiteUser::getPrefLong(bool store) {
   PlayedCall call(host_, "GetPrefLong", use(kPersistentData3));
   const std::int32_t standard = host_.linearUnits;
   const bool rehearsed = !call.goesOn();
-  if (!rehearsed && call.demand(store, HOST_ERR_BAD_HANDLE)) {
-    host_.linearUnits = host_.options.linearUnits.value_or(standard);
-  }
+  if (!rehearsed && store) host_.linearUnits = host_.options.linearUnits.value_or(standard);
   call.line().handle("store", "store", store ? 1 : 0);
   call.line().text("section", "Maya Camera").text("key", "Use Linear Units").integer("default", standard);
   call.handedInteger("value", host_.linearUnits);

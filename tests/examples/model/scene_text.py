@@ -163,28 +163,27 @@ class SceneText:
             self.tokens.next()
             kind, text = self.tokens.next()
         name = unquoted(text).lower() if kind == "string" else b""
-        camera = self.current
+        camera, given = self.current, 0
         if name in (b".o", b".orthographic"):
             for kind, text in self.to_semicolon():
                 if kind == "identifier" and copied(text).lower() == b"yes":
-                    camera.orthographic = True
+                    camera.orthographic, given = True, 1
         elif name in (b".ff", b".filmfit"):
             for kind, text in self.to_semicolon():
                 if kind == "number":
-                    camera.vertical_fit = abs(scanned(text) - 2.0) < 2e-12
+                    camera.vertical_fit, given = abs(scanned(text) - 2.0) < 2e-12, 1
         elif name in (b".fl", b".focallength"):
             for kind, text in self.to_semicolon():
                 if kind == "number":
-                    camera.focal_length = scanned(text)
+                    camera.focal_length, given = scanned(text), 1
         elif name in (b".cap", b".cameraaperture"):
-            found, values = self.numbers(2, 0.0)
-            if found:
+            given, values = self.numbers(2, 0.0)
+            if given:
                 camera.aperture = values
         elif name in (b".wci", b".worldcenterofinterest"):
-            self.numbers(3, 0.0)
-        else:
-            return
-        self.write_back()
+            given, _ = self.numbers(3, 0.0)
+        if given:
+            self.write_back()
 
     def set_keys(self):
         for kind, text in self.to_semicolon():
