@@ -65,6 +65,25 @@ TEST_F(LookAtTest, ATargetThatMovesKeysThePointOfInterestFromItsTranslateAlone) 
   }
 }
 
+TEST_F(LookAtTest, EveryAxisOfAMovingTargetIsKeyedInItsOwnDirection) {
+  Use(Animation("target.tx", KeysFrom(1, {5, 6})) + Animation("target.ty", KeysFrom(1, {7, 8})) +
+      Animation("target.tz", KeysFrom(1, {9, 11})));
+  EXPECT_TRUE(LookAt());
+  EXPECT_THAT(KeyValues(kAnchor, 0), ElementsAre(5.0, 6.0));
+  EXPECT_THAT(KeyValues(kAnchor, 1), ElementsAre(-7.0, -8.0));
+  EXPECT_THAT(KeyValues(kAnchor, 2), ElementsAre(-9.0, -11.0));
+}
+
+TEST_F(LookAtTest, AChannelOfOneKeyGivesThatToEveryKeyOfThePoint) {
+  Use(Animation("target.tx", {{1, 55}}) + Animation("target.ty", KeysFrom(1, {7, 8})) +
+      Animation("target.tz", {{1, 66}}));
+  EXPECT_TRUE(LookAt());
+  EXPECT_THAT(StreamOf(kAnchor).value, ElementsAre(1.0, -2.0, -3.0));
+  EXPECT_THAT(KeyValues(kAnchor, 0), ElementsAre(55.0, 55.0));
+  EXPECT_THAT(KeyValues(kAnchor, 1), ElementsAre(-7.0, -8.0));
+  EXPECT_THAT(KeyValues(kAnchor, 2), ElementsAre(-66.0, -66.0));
+}
+
 TEST_F(LookAtTest, ATargetThatOnlyTurnsStillKeysThePointWhereItStands) {
   Use(Animation("target.ry", KeysFrom(1, {0, 45})));
   EXPECT_TRUE(LookAt());

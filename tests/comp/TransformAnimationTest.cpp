@@ -71,6 +71,22 @@ TEST_F(TransformAnimationTest, OneAnimatedChannelKeysAllFiveStreams) {
   }
 }
 
+TEST_F(TransformAnimationTest, AChannelOfOneKeyGivesThatToEveryKeyOfTheNode) {
+  Use(Triple(".t", 1, 2, 3) + Triple(".r", 10, 20, 30) + Triple(".s", 2, 3, 4) +
+      Animation("n.tx", KeysFrom(5, {0, 1, 2})) + Animation("n.ty", {{5, 44}}) +
+      Animation("n.ry", {{5, 25}}) + Animation("n.sz", {{5, 6}}));
+  Apply();
+  ExpectValues(kPosition, {0, 1, 2});
+  ExpectValues(kPosition, {-44, -44, -44}, 1);
+  ExpectValues(kPosition, {-3, -3, -3}, 2);
+  ExpectValues(kXRotation, {10, 10, 10});
+  ExpectValues(kYRotation, {-25, -25, -25});
+  ExpectValues(kZRotation, {-30, -30, -30});
+  ExpectValues(kScale, {200, 200, 200}, 0);
+  ExpectValues(kScale, {300, 300, 300}, 1);
+  ExpectValues(kScale, {600, 600, 600}, 2);
+}
+
 TEST_F(TransformAnimationTest, BatchesAreOpenedFilledAndClosedInTheOrderScaleXYZPosition) {
   Use(Animation("n.tx", KeysFrom(1, {1, 2})));
   Apply();

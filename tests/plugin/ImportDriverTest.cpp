@@ -4,6 +4,7 @@
 #include <sys/stat.h>
 
 #include "tests/plugin/PluginRun.h"
+#include "tests/support/UtilityCalls.h"
 
 namespace testsupport {
 namespace {
@@ -40,6 +41,12 @@ TEST_F(ImportTest, TheNameLosesItsLastExtensionOnly) {
   EXPECT_THAT(CompositionNames(Import(Write("noextension", square))), ElementsAre("noextension"));
   EXPECT_THAT(CompositionNames(Import(Write(".ma", square))), ElementsAre(""));
   EXPECT_THAT(CompositionNames(Import(Write("K\xc3\xa4mera 1.MA", square))), ElementsAre("K\xc3\xa4mera 1"));
+}
+
+TEST_F(ImportTest, TheExtensionIsRemovedOnceWithFlag1) {
+  TakeUtilityCalls();
+  Import(Write("scene.ma", kScene));
+  EXPECT_THAT(TakeUtilityCalls().stripFlags, ElementsAre(1));
 }
 
 TEST_F(ImportTest, TheBufferIsTwoBytesLargerThanTheFileAndFreedAtTheEnd) {
