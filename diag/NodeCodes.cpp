@@ -46,9 +46,9 @@ constexpr Entry kNodeCodes[] = {
      .example = "createNode camera -n \"shotCamShape\" -p \"shotCam\";",
      .help = "Export the camera together with everything above it."},
     {.code = Code::ParentInReference,
-     .severity = Severity::Warning,
+     .severity = Severity::Note,
      .symbol = "ParentInReference",
-     .sentence = "\"{1}\" stands under \"{0}\", which is in the referenced file \"{2}\"",
+     .sentence = "\"{1}\" stands under \"{0}\", which belongs to the referenced file \"{2}\"",
      .meaning = "A node above this one is in another file, which is not read. Its place in the world is not "
                 "known; it is taken as if the referenced node had the identity transform.",
      .example = "file -r -ns \"hero\" -rfn \"heroRN\" \"hero.ma\";\n"

@@ -1,0 +1,84 @@
+// A position in the text of a scene, and the ways in which it moves on. Nothing beyond the end is read.
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+#include <string_view>
+
+namespace scene {
+
+// Where looking for the end of a command stopped.
+enum class StopKind {
+  End,           // at its ";"
+  NextCommand,   // at a command on a line of its own: this one has no ";"
+  ConflictMark,  // at a line with the mark of a merge conflict
+  StrangeByte,   // at a byte that means nothing here, or at the "{{" of a template field
+  OpenString,    // a string is never closed
+  TextEnd,
+};
+
+struct CommandStop {
+  StopKind kind;
+  std::uint32_t offset;  // of what is named above; for an open string, of its quote
+};
+
+class Cursor {
+ public:
+  explicit Cursor(std::string_view text)
+      : begin_(text.data()), end_(text.data() + text.size()), at_(text.data()) {}
+
+  bool atEnd() const { return at_ == end_; }
+  char Peek(std::size_t ahead = 0) const {
+    return ahead < static_cast<std::size_t>(end_ - at_) ? at_[ahead] : '\0';
+  }
+  std::uint32_t offset() const { return static_cast<std::uint32_t>(at_ - begin_); }
+  void Advance(std::size_t bytes) { at_ += bytes; }
+  void MoveTo(std::uint32_t offset) { at_ = begin_ + offset; }
+  std::string_view From(std::uint32_t start) const {
+    return {begin_ + start, static_cast<std::size_t>(at_ - begin_) - start};
+  }
+  std::string_view rest() const { return {at_, static_cast<std::size_t>(end_ - at_)}; }
+  bool StartsWith(std::string_view start) const { return rest().substr(0, start.size()) == start; }
+  bool atLineStart() const { return at_ == begin_ || at_[-1] == '\n'; }
+
+  // Over white space and comments. A "/*" without an end is passed over to the end of its line, and its
+  // offset is put into *openComment.
+  static constexpr std::uint32_t kNone = 0xffffffff;
+  void SkipBlank(std::uint32_t* openComment);
+
+  // Over a word; what was passed.
+  std::string_view TakeWord();
+
+  // Over a string, from its opening quote; what stands between the quotes, escapes as they are. *closed is
+  // false when the string has no end: then the cursor stands where reading can go on, which is the next
+  // command or the end of the text. *escaped: whether there is a backslash in it.
+  std::string_view TakeString(bool* closed, bool* escaped);
+
+  static constexpr std::uint32_t kMarkLength = 7;  // of "<<<<<<<"
+
+  void SkipLine();  // over the rest of the line and its line feed
+
+  bool AtConflictMark() const;  // at the start of a line that is one
+
+  // Whether a command that is known begins here, with nothing but blanks before it on its line.
+  bool AtCommandOnItsOwnLine() const;
+
+  // To where the command ends, or where it turns out not to. Strings and comments are passed over. With
+  // `strange`, stops at strange bytes too. After an open string the cursor stands where reading can go on.
+  CommandStop FindCommandEnd(bool strange);
+
+ private:
+  bool AtComment() const { return *at_ == '/' && (Peek(1) == '/' || Peek(1) == '*'); }
+  bool CommandAt(const char* at) const;
+  bool ClosesString(const char* quote) const;
+  const char* FindQuote(const char* at) const;
+  bool SkipComment(std::uint32_t* openComment);
+  const char* FindPause(bool strange) const;
+
+  const char* begin_;
+  const char* end_;
+  const char* at_;
+  bool noCommentEnd_ = false;  // no "*/" follows
+};
+
+}  // namespace scene

@@ -1,0 +1,251 @@
+#include "scene/Reader.h"
+
+#include <algorithm>
+#include <cstddef>
+#include <iterator>
+#include <limits>
+#include <string>
+
+#include "scene/ByteClasses.h"
+#include "scene/Text.h"
+
+namespace scene {
+namespace {
+
+using diag::Code;
+
+// More arguments of one command are not kept: no command that is read in this way has as many.
+constexpr std::size_t kMostArguments = 10000;
+
+// What is shown of a template field.
+constexpr std::size_t kLongestField = 60;
+
+// The length of the template field at the front of the text; 0 where none stands there.
+std::size_t FieldLength(std::string_view text) {
+  const auto closed = [text](std::size_t open, std::string_view close) -> std::size_t {
+    const std::size_t end = text.find(close, open);
+    if (end == std::string_view::npos || end == open) return 0;
+    const std::string_view inside = text.substr(open, end - open);
+    const bool plain =
+        std::all_of(inside.begin(), inside.end(), [](char c) { return IsByte(c, kWordByte) || c == ' '; });
+    return plain ? end + close.size() : 0;
+  };
+  text = text.substr(0, kLongestField);
+  if (text.substr(0, 2) == "{{") return closed(2, "}}");
+  if (text.substr(0, 2) == "${") return closed(2, "}");
+  if (text[0] == '<') return closed(1, ">");
+  if (text[0] == '%' || text[0] == '@') return closed(1, text.substr(0, 1));
+  if (text[0] != '$' || text.size() < 2 || !IsByte(text[1], kLetterByte)) return 0;
+  std::size_t end = 1;
+  while (end < text.size() && IsByte(text[end], kLetterByte | kDigitByte)) ++end;
+  return end;
+}
+
+// The bytes of the character at the front of the text, which may be no valid UTF-8.
+std::size_t CharacterLength(std::string_view text) {
+  std::size_t length = 1;
+  if ((static_cast<unsigned char>(text[0]) & 0xc0) != 0xc0) return length;
+  while (length < std::min<std::size_t>(4, text.size()) &&
+         (static_cast<unsigned char>(text[length]) & 0xc0) == 0x80) {
+    ++length;
+  }
+  return length;
+}
+
+}  // namespace
+
+const Reader::CommandReader Reader::kReaders[] = {
+    {"setAttr", &Reader::ReadSetAttr},
+    {"createNode", &Reader::ReadCreateNode},
+    {"connectAttr", &Reader::ReadConnectAttr},
+    {"rename", &Reader::ReadRename},
+    {"addAttr", &Reader::ReadAddAttr},
+    {"select", &Reader::ReadSelect},
+    {"parent", &Reader::ReadParent},
+    {"disconnectAttr", &Reader::ReadDisconnectAttr},
+    {"requires", &Reader::ReadRequires},
+    {"fileInfo", &Reader::ReadFileInfo},
+    {"file", &Reader::ReadFile},
+    {"currentUnit", &Reader::ReadCurrentUnit},
+    {"namespace", &Reader::ReadNamespace},
+};
+
+const Reader::CommandReader* Reader::FindReader(std::string_view name) {
+  const auto* const found = std::find_if(std::begin(kReaders), std::end(kReaders),
+                                         [name](const auto& entry) { return entry.name == name; });
+  return found == std::end(kReaders) ? nullptr : found;
+}
+
+Reader::Reader(std::string_view text, diag::Collector* diagnostics)
+    : diagnostics_(diagnostics), cursor_(text), builder_(text, diagnostics) {}
+
+Scene Reader::Read() {
+  constexpr std::string_view kByteOrderMark = "\xef\xbb\xbf";
+  if (cursor_.StartsWith(kByteOrderMark)) cursor_.Advance(kByteOrderMark.size());
+  while (!cursor_.atEnd()) ReadCommand();
+  return builder_.Finish();
+}
+
+void Reader::ReadCommand() {
+  std::uint32_t openComment = 0;
+  cursor_.SkipBlank(&openComment);
+  if (openComment != Cursor::kNone) diagnostics_->Report(Code::OpenComment, {openComment, 2});
+  if (cursor_.atEnd()) return;
+  commandOffset_ = cursor_.offset();
+  command_ = {};
+  if (cursor_.AtConflictMark()) {
+    cursor_.SkipLine();
+    const std::string_view line = cursor_.From(commandOffset_);
+    diagnostics_->Report(Code::ConflictMark, {commandOffset_, line.find_last_not_of("\r\n") + 1});
+    return;
+  }
+  if (cursor_.Peek() == ';') return cursor_.Advance(1);
+  if (!IsByte(cursor_.Peek(), kLetterByte)) {
+    (void)StrangeByte();
+    return;
+  }
+  command_ = cursor_.TakeWord();
+  if (const CommandReader* const reader = FindReader(command_)) return (this->*reader->read)();
+  std::uint32_t end = 0;
+  (void)FindEnd(false, &end);
+}
+
+// ---- tokens ----
+
+// Reports, and passes over the rest of the command.
+Reader::Token Reader::Broken(Code code, std::uint32_t offset, std::uint32_t end) {
+  diagnostics_->Report(code, {offset, end - offset});
+  PassOver();
+  return {};
+}
+
+Reader::Token Reader::StrangeByte() {
+  const std::string_view rest = cursor_.rest();
+  const std::size_t field = FieldLength(rest);
+  const std::size_t length = field != 0 ? field : CharacterLength(rest);
+  const Code code = field != 0 ? Code::TemplateField : Code::UnexpectedByte;
+  diagnostics_->Report(code, {cursor_.offset(), length}, {rest.substr(0, length)});
+  cursor_.Advance(length);
+  PassOver();
+  return {};
+}
+
+Reader::Token Reader::StringToken() {
+  const std::uint32_t quote = cursor_.offset();
+  bool closed = false;
+  bool escaped = false;
+  const std::string_view inside = cursor_.TakeString(&closed, &escaped);
+  if (!closed) {
+    diagnostics_->Report(Code::OpenString, {quote, 1});
+    return {};
+  }
+  const std::string_view text = escaped ? builder_.Keep(Unescaped(inside)) : inside;
+  return {TokenKind::String, text, quote + 1, cursor_.offset() - 1};
+}
+
+Reader::Token Reader::NextToken() {
+  std::uint32_t openComment = 0;
+  cursor_.SkipBlank(&openComment);
+  if (openComment != Cursor::kNone) diagnostics_->Report(Code::OpenComment, {openComment, 2});
+  const std::uint32_t offset = cursor_.offset();
+  if (cursor_.atEnd()) {
+    diagnostics_->Report(Code::CommandCutOff, {commandOffset_, command_.size()}, {command_});
+    return {};
+  }
+  if (cursor_.AtConflictMark()) return Broken(Code::ConflictMark, offset, offset + Cursor::kMarkLength);
+  const char first = cursor_.Peek();
+  if (first == ';') {
+    cursor_.Advance(1);
+    return {TokenKind::End, {}, offset, offset + 1};
+  }
+  if (first == '"') return StringToken();
+  if (IsByte(first, kPunctuationByte) || (first == '{' && cursor_.Peek(1) != '{')) {
+    cursor_.Advance(1);
+    return {TokenKind::Punctuation, cursor_.From(offset), offset, offset + 1};
+  }
+  if (!IsByte(first, kWordByte)) return StrangeByte();
+  if (cursor_.AtCommandOnItsOwnLine()) {
+    diagnostics_->Report(Code::CommandWithoutEnd, {commandOffset_, command_.size()}, {command_});
+    return {};
+  }
+  const bool option = first == '-' && IsByte(cursor_.Peek(1), kLetterByte);
+  const std::string_view word = cursor_.TakeWord();
+  return {option ? TokenKind::Option : TokenKind::Word, word, offset, cursor_.offset()};
+}
+
+bool Reader::ReadArguments() {
+  arguments_.clear();
+  for (;;) {
+    const Token token = NextToken();
+    if (token.kind == TokenKind::End) return true;
+    if (token.kind == TokenKind::Broken) return false;
+    if (arguments_.size() < kMostArguments) arguments_.push_back(token);
+  }
+}
+
+bool Reader::FindEnd(bool strange, std::uint32_t* end) {
+  const CommandStop stop = cursor_.FindCommandEnd(strange);
+  switch (stop.kind) {
+    case StopKind::End:
+      *end = stop.offset;
+      cursor_.Advance(1);
+      return true;
+    case StopKind::NextCommand:
+      diagnostics_->Report(Code::CommandWithoutEnd, {commandOffset_, command_.size()}, {command_});
+      return false;
+    case StopKind::ConflictMark:
+      (void)Broken(Code::ConflictMark, stop.offset, stop.offset + Cursor::kMarkLength);
+      return false;
+    case StopKind::StrangeByte:
+      (void)StrangeByte();
+      return false;
+    case StopKind::OpenString:
+      diagnostics_->Report(Code::OpenString, {stop.offset, 1});
+      return false;
+    default:
+      diagnostics_->Report(Code::CommandCutOff, {commandOffset_, command_.size()}, {command_});
+      return false;
+  }
+}
+
+void Reader::PassOver() {
+  for (;;) {
+    switch (cursor_.FindCommandEnd(false).kind) {
+      case StopKind::End:
+        return cursor_.Advance(1);
+      case StopKind::ConflictMark:
+        cursor_.SkipLine();
+        break;
+      default:
+        return;
+    }
+  }
+}
+
+void Reader::Lacks(std::string_view what) {
+  diagnostics_->Report(Code::IncompleteCommand, {commandOffset_, command_.size()}, {command_, what});
+}
+
+bool Reader::Is(const Token& token, std::string_view shortName, std::string_view longName) {
+  if (token.kind != TokenKind::Option) return false;
+  const std::string_view name = token.text.substr(1);
+  return name == shortName || name == longName;
+}
+
+bool Reader::IsValue(const Token& token) {
+  return token.kind == TokenKind::String || token.kind == TokenKind::Word;
+}
+
+Reader::Named Reader::NameOf(const Token& token) {
+  return {token.text, {token.offset, token.end - token.offset}};
+}
+
+Scene Read(std::string_view text, diag::Collector& diagnostics) {
+  if (text.size() >= std::numeric_limits<std::uint32_t>::max()) {
+    diagnostics.Report(Code::TextTooLong, {}, {std::to_string(text.size())});
+    text = {};
+  }
+  return Reader(text, &diagnostics).Read();
+}
+
+}  // namespace scene

@@ -1,0 +1,155 @@
+#include "scene/Scene.h"
+
+#include <algorithm>
+
+namespace scene {
+namespace {
+
+std::uint64_t KeyOf(NodeId node, std::int32_t index) {
+  return std::uint64_t{node} << 32 | static_cast<std::uint32_t>(index);
+}
+
+}  // namespace
+
+std::string Scene::PathOf(NodeId id) const {
+  std::vector<NodeId> chain;
+  for (; id != kNoNode; id = nodes_[id].parent) chain.push_back(id);
+  std::string path;
+  for (auto at = chain.rbegin(); at != chain.rend(); ++at) {
+    const Node& node = nodes_[*at];
+    if (!path.empty() || node.origin == Origin::Created) path += '|';
+    path += node.name;
+  }
+  return path;
+}
+
+const AddedAttribute* Scene::FindAdded(NodeId node, std::string_view name) const {
+  const IndexOfOne* const found = addedByName_.Find(node, name);
+  return found == nullptr || found->plusOne == 0 ? nullptr : &added_[found->plusOne - 1];
+}
+
+Plug Scene::PlugOf(NodeId node, std::string_view attribute) const {
+  const AttributePath path = ParseAttributePath(attribute);
+  return PlugOf(node, path.name, path.first);
+}
+
+Plug Scene::PlugOf(NodeId node, std::string_view attribute, std::int32_t index) const {
+  if (const AttributeInfo* const info = FindAttribute(nodes_[node].type, attribute)) {
+    return {node, info->longName, index};
+  }
+  if (const AddedAttribute* const added = FindAdded(node, attribute)) return {node, added->longName, index};
+  return {node, attribute, index};
+}
+
+// ---- values ----
+
+Value Scene::ValueOf(const Setting& setting, std::size_t component) const {
+  return {text_.substr(setting.value, setting.valueLength), setting.value, component};
+}
+
+std::optional<Value> Scene::Written(NodeId node, std::string_view attribute, std::int32_t index) const {
+  const Plug plug = PlugOf(node, attribute, index);
+  const AttributeInfo* const info = FindAttribute(nodes_[node].type, plug.attribute);
+  const AttributeInfo* const compound = info == nullptr ? nullptr : info->compound;
+  std::optional<Value> value;
+  for (std::uint32_t at = lists_[node].firstSetting; at != kNone; at = settings_[at].next) {
+    const Setting& setting = settings_[at];
+    const bool own = setting.attribute == plug.attribute;
+    if (!own && (compound == nullptr || setting.attribute != compound->longName)) continue;
+    if (index < setting.first || index > setting.last) continue;
+    // How many numbers an element has, and which of them is asked for.
+    const AttributeInfo* const whole = own ? info : compound;
+    const std::size_t width = whole == nullptr ? 1 : std::max<std::size_t>(1, whole->components.size());
+    const auto element = static_cast<std::size_t>(index - setting.first);
+    value = ValueOf(setting, element * width + static_cast<std::size_t>(own ? 0 : info->component));
+  }
+  return value;
+}
+
+std::optional<double> Scene::Default(NodeId node, std::string_view attribute) const {
+  if (const AttributeInfo* const info = FindAttribute(nodes_[node].type, attribute)) return info->fallback;
+  const AddedAttribute* const added = FindAdded(node, attribute);
+  return added == nullptr ? std::nullopt : added->fallback;
+}
+
+std::optional<double> Scene::Number(NodeId node, std::string_view attribute, std::int32_t index) const {
+  const std::optional<Value> written = Written(node, attribute, index);
+  return written ? written->Number() : Default(node, attribute);
+}
+
+std::vector<Piece> Scene::Pieces(NodeId node, std::string_view attribute) const {
+  const Plug plug = PlugOf(node, attribute, kNoIndex);
+  std::vector<Piece> pieces;
+  for (std::uint32_t at = lists_[node].firstSetting; at != kNone; at = settings_[at].next) {
+    const Setting& setting = settings_[at];
+    if (setting.attribute != plug.attribute || setting.first == kNoIndex) continue;
+    pieces.push_back({setting.first, setting.last, ValueOf(setting, 0)});
+  }
+  return pieces;
+}
+
+// ---- connections ----
+
+const Connection* Scene::ConnectionTo(const Plug& plug) const {
+  const IndexOfOne* const found = connectionByName_.Find(KeyOf(plug.node, plug.index), plug.attribute);
+  if (found == nullptr || found->plusOne == 0) return nullptr;
+  return &connections_[found->plusOne - 1];
+}
+
+std::optional<Driver> Scene::SourceOf(const Plug& plug) const {
+  if (const Connection* const own = ConnectionTo(plug)) return Driver{own->source, -1, own};
+  const AttributeInfo* const info = FindAttribute(nodes_[plug.node].type, plug.attribute);
+  if (info == nullptr || info->compound == nullptr) return std::nullopt;
+  const Connection* const whole = ConnectionTo({plug.node, info->compound->longName, plug.index});
+  if (whole == nullptr) return std::nullopt;
+  Driver driver{whole->source, info->component, whole};
+  const AttributeInfo* const source = FindAttribute(nodes_[driver.plug.node].type, driver.plug.attribute);
+  const auto component = static_cast<std::size_t>(info->component);
+  if (source != nullptr && component < source->components.size()) {
+    driver.plug.attribute = source->components[component]->longName;
+    driver.component = -1;
+  }
+  return driver;
+}
+
+std::vector<Plug> Scene::DestinationsOf(const Plug& plug) const {
+  const AttributeInfo* const info = FindAttribute(nodes_[plug.node].type, plug.attribute);
+  std::vector<Plug> destinations;
+  for (const Connection* const connection : ConnectionsFrom(plug.node)) {
+    if (connection->source.index != plug.index) continue;
+    const AttributeInfo* const source = FindAttribute(nodes_[plug.node].type, connection->source.attribute);
+    Plug destination = connection->destination;
+    if (connection->source.attribute != plug.attribute) {
+      if (info == nullptr || source == nullptr) continue;
+      if (info->compound == source) {
+        const AttributeInfo* const whole =
+            FindAttribute(nodes_[destination.node].type, destination.attribute);
+        const auto component = static_cast<std::size_t>(info->component);
+        if (whole == nullptr || component >= whole->components.size()) continue;
+        destination.attribute = whole->components[component]->longName;
+      } else if (source->compound != info) {
+        continue;
+      }
+    }
+    destinations.push_back(destination);
+  }
+  return destinations;
+}
+
+std::vector<const Connection*> Scene::ConnectionsInto(NodeId node) const {
+  std::vector<const Connection*> into;
+  for (std::uint32_t at = lists_[node].firstInto; at != kNone; at = connectionLinks_[at].nextInto) {
+    into.push_back(&connections_[at]);
+  }
+  return into;
+}
+
+std::vector<const Connection*> Scene::ConnectionsFrom(NodeId node) const {
+  std::vector<const Connection*> from;
+  for (std::uint32_t at = lists_[node].firstFrom; at != kNone; at = connectionLinks_[at].nextFrom) {
+    from.push_back(&connections_[at]);
+  }
+  return from;
+}
+
+}  // namespace scene

@@ -1,0 +1,214 @@
+// A whole scene, as its author wrote it: nodes, attributes, connections, references, each with its place in
+// the file.
+//
+// Nothing is evaluated and no other file is read. The text stays where it is: names and values refer to it,
+// and it must outlive the scene. A scene does not change once it is read; its const members may be called
+// from several threads.
+#pragma once
+
+#include <cstdint>
+#include <deque>
+#include <optional>
+#include <span>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "diag/Collector.h"
+#include "scene/Attributes.h"
+#include "scene/FlatMap.h"
+#include "scene/Names.h"
+#include "scene/Plug.h"
+#include "scene/Value.h"
+
+namespace scene {
+
+enum class Origin : std::uint8_t {
+  Created,    // by createNode
+  Program,    // one that every scene has (":time1"), named here
+  Elsewhere,  // named, but not created: in a referenced file, or nowhere
+  Forward,    // named before it was created: all that is said of it is with the created node
+};
+
+struct Node {
+  std::string_view type;  // as it is written; may be empty where the node was not created here
+  std::string_view name;  // its own, with its namespace; of a node from elsewhere, what it is called here
+  NodeId parent = kNoNode;
+  NodeId firstChild = kNoNode;  // children in the order of the file
+  NodeId nextSibling = kNoNode;
+  diag::Range place;  // of its name, or of its type where it has none
+  Origin origin = Origin::Created;
+  bool shared = false;  // created with -s: one of those that every scene begins with
+};
+
+struct Connection {
+  Plug source;
+  Plug destination;
+  diag::Range sourcePlace;
+  diag::Range destinationPlace;
+};
+
+// What drives a plug.
+struct Driver {
+  Plug plug;           // the source, or its component that fits
+  int component = -1;  // which one of the source it is, where the source's components are not known; else -1
+  const Connection* connection = nullptr;
+};
+
+// An attribute that addAttr made.
+struct AddedAttribute {
+  NodeId node = kNoNode;
+  std::string_view longName;
+  std::string_view shortName;
+  std::optional<double> fallback;  // -dv
+  diag::Range place;
+};
+
+// A piece of an array: the values of the elements first to last.
+struct Piece {
+  std::int32_t first;
+  std::int32_t last;
+  Value value;
+};
+
+struct Reference {
+  std::string_view node;       // -rfn: the reference's name
+  std::string_view nameSpace;  // -ns: what its names begin with
+  std::string_view file;
+  diag::Range place;
+};
+
+struct Requirement {
+  std::string_view name;  // "maya", or a plug-in's
+  std::string_view version;
+  diag::Range place;
+};
+
+struct FileInfo {
+  std::string_view key;
+  std::string_view value;
+  diag::Range place;
+};
+
+// A word of currentUnit; empty where the scene does not say it.
+struct UnitWord {
+  std::string_view word;
+  diag::Range place;
+};
+
+class Scene {
+ public:
+  Scene() = default;
+  Scene(Scene&&) = default;
+  Scene& operator=(Scene&&) = default;
+
+  std::string_view text() const { return text_; }
+
+  // In the order in which the file names them.
+  std::span<const Node> nodes() const { return nodes_; }
+  const Node& node(NodeId id) const { return nodes_[id]; }
+
+  // By name or path; kNoNode where there is none. Of several the first is found.
+  NodeId Find(std::string_view nameOrPath) const { return names_.Find(nameOrPath).node; }
+
+  // "|rig|cam". Without the first "|" where the topmost node is from elsewhere.
+  std::string PathOf(NodeId id) const;
+
+  // A plug by a long or a short name, or a path of attributes ("tg[0].tt").
+  Plug PlugOf(NodeId node, std::string_view attribute) const;
+  Plug PlugOf(NodeId node, std::string_view attribute, std::int32_t index) const;
+
+  // What the file sets: the last value for the attribute, its compound included. With an index, that
+  // element's. Looks at everything that is set on the node.
+  std::optional<Value> Written(NodeId node, std::string_view attribute, std::int32_t index = kNoIndex) const;
+
+  // The number that is written, or the attribute's default. None where what is written cannot be read, and
+  // where nothing is written and there is no default.
+  std::optional<double> Number(NodeId node, std::string_view attribute, std::int32_t index = kNoIndex) const;
+
+  // The default alone: that of addAttr, or that of the node's type.
+  std::optional<double> Default(NodeId node, std::string_view attribute) const;
+
+  // All pieces of an array, in the order of the file.
+  std::vector<Piece> Pieces(NodeId node, std::string_view attribute) const;
+
+  // What drives the plug: itself, or its compound, of which it is then the component.
+  std::optional<Driver> SourceOf(const Plug& plug) const;
+
+  // What the plug drives: itself, its compound or, of a compound, its components.
+  std::vector<Plug> DestinationsOf(const Plug& plug) const;
+
+  // All connections into a node, or out of it, in the order of the file.
+  std::vector<const Connection*> ConnectionsInto(NodeId node) const;
+  std::vector<const Connection*> ConnectionsFrom(NodeId node) const;
+
+  std::span<const AddedAttribute> addedAttributes() const { return added_; }
+  std::span<const Reference> references() const { return references_; }
+  std::span<const Requirement> requirements() const { return requirements_; }
+  std::span<const FileInfo> fileInfo() const { return fileInfo_; }
+  const UnitWord& linearUnit() const { return linearUnit_; }
+  const UnitWord& angularUnit() const { return angularUnit_; }
+  const UnitWord& timeUnit() const { return timeUnit_; }
+
+ private:
+  friend class SceneBuilder;
+
+  static constexpr std::uint32_t kNone = 0xffffffff;
+
+  // What one setAttr says.
+  struct Setting {
+    std::string_view attribute;
+    NodeId node;
+    std::uint32_t value;
+    std::uint32_t valueLength;
+    std::int32_t first;
+    std::int32_t last;
+    std::uint32_t next = kNone;  // of the same node
+  };
+  // The ends of a node's lists.
+  struct Lists {
+    std::uint32_t firstSetting = kNone;
+    std::uint32_t lastSetting = kNone;
+    std::uint32_t firstInto = kNone;
+    std::uint32_t lastInto = kNone;
+    std::uint32_t firstFrom = kNone;
+    std::uint32_t lastFrom = kNone;
+  };
+  struct ConnectionLinks {
+    std::uint32_t nextInto = kNone;
+    std::uint32_t nextFrom = kNone;
+    bool cut = false;  // by disconnectAttr, or by a later connection with -f
+  };
+  struct IndexOfOne {
+    std::uint32_t plusOne = 0;  // 0: none
+  };
+
+  const AddedAttribute* FindAdded(NodeId node, std::string_view name) const;
+  Value ValueOf(const Setting& setting, std::size_t component) const;
+  const Connection* ConnectionTo(const Plug& plug) const;
+
+  std::string_view text_;
+  std::vector<Node> nodes_;
+  std::vector<Lists> lists_;  // by node
+  std::vector<Setting> settings_;
+  std::vector<Connection> connections_;
+  std::vector<ConnectionLinks> connectionLinks_;
+  std::vector<AddedAttribute> added_;
+  FlatMap<IndexOfOne> addedByName_;       // node and name, long or short
+  FlatMap<IndexOfOne> connectionByName_;  // destination node and attribute with index
+  Names names_;
+  std::vector<Reference> references_;
+  std::vector<Requirement> requirements_;
+  std::vector<FileInfo> fileInfo_;
+  UnitWord linearUnit_;
+  UnitWord angularUnit_;
+  UnitWord timeUnit_;
+  std::deque<std::string> made_;  // names that do not stand in the text as they are
+};
+
+// Reads all of the text, whatever its bytes are. What cannot be read is passed over to the end of its command
+// and reported; it costs nothing else. Time and memory grow in proportion to the text. A text of 4 GiB or
+// more is not read: the scene is then empty.
+Scene Read(std::string_view text, diag::Collector& diagnostics);
+
+}  // namespace scene

@@ -1,0 +1,101 @@
+// Makes a scene out of commands. What a command names is looked up when the command comes; what is not there
+// yet is looked up once more at the end.
+#pragma once
+
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "diag/Collector.h"
+#include "scene/Scene.h"
+
+namespace scene {
+
+class SceneBuilder {
+ public:
+  // Both must outlive the builder.
+  SceneBuilder(std::string_view text, diag::Collector* diagnostics);
+
+  // A name as a command gives it, and where.
+  struct Named {
+    std::string_view text = {};
+    diag::Range place = {};
+  };
+
+  // ---- nodes: SceneBuilderNodes.cpp ----
+
+  // Makes the node, or finds it where it is shared and there already. Empty texts: no name, no parent.
+  NodeId CreateNode(Named type, Named name, Named parent, bool shared);
+
+  // The node of the name or path; where there is none, one from elsewhere that stands for it.
+  NodeId Resolve(Named name);
+
+  // The same for commands that change a node: kNoNode, and a note, where there is none.
+  NodeId FindCreated(Named name, std::string_view command);
+
+  void Rename(NodeId node, Named name);
+  void MoveUnder(NodeId node, NodeId parent);  // kNoNode: to the top
+  void AddInstance(NodeId node, NodeId parent);
+  void SetNameSpace(std::string_view nameSpace);  // of names to come; without ":"
+
+  // ---- attributes ----
+
+  // Whether a value for the attribute is kept.
+  bool Keeps(NodeId node, std::string_view attribute) const;
+  void Set(NodeId node, const AttributePath& path, std::uint32_t value, std::uint32_t valueLength);
+  void AddAttribute(AddedAttribute attribute, NodeId node);  // where the node's attributes are kept
+
+  // ---- connections ----
+
+  enum class ConnectHow { Plain, Force, NextAvailable };
+  void Connect(Named source, Named destination, ConnectHow how);
+  void Disconnect(Named source, Named destination);
+
+  // ---- the head of the file ----
+
+  void AddReference(const Reference& reference, bool read);
+  void AddRequirement(const Requirement& requirement) { scene_.requirements_.push_back(requirement); }
+  void AddFileInfo(const FileInfo& info) { scene_.fileInfo_.push_back(info); }
+  UnitWord& linearUnit() { return scene_.linearUnit_; }
+  UnitWord& angularUnit() { return scene_.angularUnit_; }
+  UnitWord& timeUnit() { return scene_.timeUnit_; }
+
+  // Keeps a text that does not stand in the file as it is, as long as the scene lives.
+  std::string_view Keep(std::string text);
+
+  // The scene: parents and connections found as far as they can be. The builder is empty afterwards.
+  Scene Finish();
+
+ private:
+  struct Counter {
+    std::uint32_t next = 0;
+  };
+
+  NodeId AddNode(const Node& node);
+  std::string_view OwnName(Named name);
+  std::string_view FreeName(NodeId parent, std::string_view name);
+  NodeId NodeFromElsewhere(Named name);
+  Plug PlugOf(Named plug);
+  void Index(std::uint32_t connection);
+
+  // ---- the end: SceneBuilderFinish.cpp ----
+
+  std::vector<NodeId> FindForward();
+  void ReplaceForward(const std::vector<NodeId>& replacement);
+  void CutCircles();
+  void LinkChildren();
+  void LinkSettings();
+  void LinkConnections();
+  void ReportParents();
+  std::string_view ReferencedFileOf(NodeId parent) const;
+
+  diag::Collector* diagnostics_;
+  Scene scene_;
+  std::string_view nameSpace_;
+  FlatMap<Scene::IndexOfOne> fromElsewhere_;  // nodes by the name they are called
+  FlatMap<Counter> counters_;                 // by parent and name without its number
+  FlatMap<Scene::IndexOfOne> referenceByName_;
+  FlatMap<Scene::IndexOfOne> referenceBySpace_;
+};
+
+}  // namespace scene
