@@ -21,7 +21,7 @@ namespace {
 namespace fs = std::filesystem;
 using Json = nlohmann::ordered_json;
 
-constexpr double kTolerance = 1e-9;  // times the larger of 1 and the magnitude
+constexpr double kTolerance = 1e-12;  // times the larger of 1 and the magnitude
 constexpr char kLinearUnits[] = "--linear-units 1";
 
 fs::path sourceDir() { return MAYASCENE_SOURCE_DIR; }
@@ -153,9 +153,9 @@ TEST(Examples, AreSmallAndEndWithALineEnd) {
 TEST(TraceComparison, TakesDoublesWithinTheToleranceAndNothingElse) {
   const std::string line = R"({"call":"SetStreamValue","pluginId":1,"value":[100,0,0,0],"error":0})";
   EXPECT_TRUE(
-      sameLine(line, R"({"call":"SetStreamValue","pluginId":1,"value":[100.00000009,0,0,0],"error":0})"));
+      sameLine(line, R"({"call":"SetStreamValue","pluginId":1,"value":[100.00000000009,0,0,0],"error":0})"));
   EXPECT_FALSE(
-      sameLine(line, R"({"call":"SetStreamValue","pluginId":1,"value":[100.00000011,0,0,0],"error":0})"));
+      sameLine(line, R"({"call":"SetStreamValue","pluginId":1,"value":[100.00000000011,0,0,0],"error":0})"));
   EXPECT_FALSE(sameLine(line, R"({"call":"SetStreamValue","pluginId":2,"value":[100,0,0,0],"error":0})"));
   EXPECT_FALSE(sameLine(line, R"({"call":"SetStreamValue","value":[100,0,0,0],"pluginId":1,"error":0})"));
   EXPECT_FALSE(sameLine(line, R"({"call":"SetStreamValue","pluginId":1,"value":[100,0,0,0],"error":null})"));

@@ -106,7 +106,5 @@ TEST_F(LargeListsTest, AListThatTheSystemDoesNotMoveStaysAsItIs) {
   EXPECT_EQ(std::memcmp(RecordListPeek(list_, kRecords), records.data(), 3 * kMegabyte), 0);
 }
 
-TEST_F(LargeListsTest, AdviceAboutNoMemoryIsIgnored) { HostAdviseLargePages(nullptr, 8 * kMegabyte); }
-
 }  // namespace
 }  // namespace hostutil_tests

@@ -161,7 +161,8 @@ FAULTS = (
     Fault("the status of several scenes is that of the last", "tools/mayascene/ImportCommand.cpp",
           "status = worse(status, report.status);", "status = report.status;"),
     Fault("an output replaces the link that leads to it", "tools/mayascene/OutputFile.cpp",
-          "place = placeOf(target).string();", "place = target;"),
+          "place = placeOf(target).string();",
+          "place = placeOf(target).empty() ? std::string() : target;"),
     Fault("characters that turn the direction of text reach the terminal", "tools/mayascene/TerminalText.cpp",
           "(point >= 0x2028 && point <= 0x202e)", "(point >= 0x2028 && point <= 0x2029)"),
 )

@@ -3,7 +3,7 @@ keys in order."""
 
 import json
 
-TOLERANCE = 1e-9
+TOLERANCE = 1e-12
 # Where the trace holds doubles; every other number is an integer.
 DOUBLES = {("NewCameraLayer", "center"), ("SetCameraFilmSize", "filmSize"), ("SetStreamValue", "value"),
            ("SetBatchKeyframeValue", "value")}
