@@ -1,5 +1,5 @@
-// A crowd: many nodes and connections, few keys. Every third chain of groups carries a marked locator at its
-// end, and one carries the camera, so that these chains become layers.
+// A crowd: many nodes and connections, few keys. Every other chain of groups that has locators ends in a
+// marked one, and one chain ends in the camera, so that these chains become layers.
 #include <vector>
 
 #include "bench/SceneParts.h"
@@ -9,7 +9,7 @@ namespace bench {
 namespace {
 
 constexpr std::int64_t kGroupsInChain = 8;
-constexpr std::int64_t kMarkedOneIn = 3;
+constexpr std::int64_t kMarkedOneIn = 2;
 constexpr std::int64_t kCameraChain = 1;  // not marked
 constexpr int kKeys = 4;
 

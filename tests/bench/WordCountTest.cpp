@@ -5,6 +5,8 @@
 #include <unistd.h>
 
 #include <algorithm>
+#include <cstdlib>
+#include <new>
 #include <random>
 #include <sstream>
 #include <string>
@@ -58,20 +60,33 @@ TEST(WordCountTest, EveryCounterAgreesWithTheLibrary) {
   }
 }
 
-TEST(WordCountTest, NothingIsReadBesideTheText) {
-  const auto page = static_cast<std::size_t>(sysconf(_SC_PAGESIZE));
-  char* const room =
-      static_cast<char*>(mmap(nullptr, 3 * page, PROT_READ | PROT_WRITE, MAP_PRIVATE | MAP_ANONYMOUS, -1, 0));
-  ASSERT_NE(room, MAP_FAILED);
-  ASSERT_EQ(mprotect(room, page, PROT_NONE), 0);
-  ASSERT_EQ(mprotect(room + 2 * page, page, PROT_NONE), 0);
-  char* const text = room + page;
-  std::fill_n(text, page, 'a');
-  for (std::size_t size = 1; size < 200; ++size) {
-    ExpectWords({text, size}, 1);
-    ExpectWords({text + page - size, size}, 1);
+// A page between two that nobody may read.
+class LonePage {
+ public:
+  LonePage() : size_(static_cast<std::size_t>(sysconf(_SC_PAGESIZE))) {
+    region_ = mmap(nullptr, 3 * size_, PROT_NONE, MAP_PRIVATE | MAP_ANONYMOUS, -1, 0);
+    if (region_ == MAP_FAILED) throw std::bad_alloc();
+    if (mprotect(begin(), size_, PROT_READ | PROT_WRITE) != 0) std::abort();
   }
-  munmap(room, 3 * page);
+  ~LonePage() { munmap(region_, 3 * size_); }
+  LonePage(const LonePage&) = delete;
+  LonePage& operator=(const LonePage&) = delete;
+
+  char* begin() const { return static_cast<char*>(region_) + size_; }
+  char* end() const { return begin() + size_; }
+
+ private:
+  std::size_t size_;
+  void* region_ = nullptr;
+};
+
+TEST(WordCountTest, NothingIsReadBesideTheText) {
+  const LonePage page;
+  std::fill(page.begin(), page.end(), 'a');
+  for (std::size_t size = 1; size < 200; ++size) {
+    ExpectWords({page.begin(), size}, 1);
+    ExpectWords({page.end() - size, size}, 1);
+  }
 }
 
 }  // namespace
