@@ -38,6 +38,23 @@ enum class Code : std::uint16_t {
   UnknownUnit = 209,
   SecondUnit = 210,
   ReferenceNotRead = 211,
+  // Curves: diag/CurveCodes.cpp
+  UnknownTangentType = 301,
+  StepIntoKey = 302,
+  AutoMixTangent = 303,
+  FixedWithoutTangent = 304,
+  EmptyFixedTangent = 305,
+  UnknownInfinity = 306,
+  InfinityOfOneKey = 307,
+  LinearInfinityAtLinearKey = 308,
+  PlateauBesideOvershoot = 309,
+  QuaternionCurve = 310,
+  // What drives a channel: diag/DriverCodes.cpp
+  UnsupportedDriver = 401,
+  DriverWithoutAnswer = 402,
+  DriverCircle = 403,
+  SeveralTargets = 404,
+  TwistSign = 405,
 };
 
 // Ordered: a later one is worse.

@@ -13,7 +13,7 @@ namespace {
 
 std::vector<Entry> WholeTable() {
   std::vector<Entry> table;
-  for (const std::span<const Entry> part : {ReadingCodes(), NodeCodes()}) {
+  for (const std::span<const Entry> part : {ReadingCodes(), NodeCodes(), CurveCodes(), DriverCodes()}) {
     table.insert(table.end(), part.begin(), part.end());
   }
   return table;

@@ -9,5 +9,7 @@ namespace diag {
 
 std::span<const Entry> ReadingCodes();
 std::span<const Entry> NodeCodes();
+std::span<const Entry> CurveCodes();
+std::span<const Entry> DriverCodes();
 
 }  // namespace diag
