@@ -60,7 +60,7 @@ if(MAYASCENE_SANITIZE)
 endif()
 if(MAYASCENE_COVERAGE)
   # Only these are compiled with counters (see add_room); whatever they are linked into writes them down.
-  set(MAYASCENE_MEASURED_ROOMS hostutil plugin_services plugin_entry MayaImport maya comp)
+  set(MAYASCENE_MEASURED_ROOMS scan hostutil plugin_services plugin_entry MayaImport maya comp)
   target_link_options(mayascene_common_options INTERFACE --coverage)
 endif()
 if(MAYASCENE_FUZZ)

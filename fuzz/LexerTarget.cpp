@@ -9,8 +9,8 @@
 #include "fuzz/Require.h"
 #include "fuzz/Target.h"
 #include "hostapi/ErrorCodes.h"
-#include "maya/HarmlessText.h"
 #include "maya/MAYA_Lex.h"
+#include "scan/SkipText.h"
 
 namespace {
 
@@ -77,7 +77,7 @@ void CheckError(const Text& text, const MAYA_Lex& lexer, int code) {
 }
 
 // Reads all of the text, with the skipper, where there is one, before each token.
-void Read(const Text& text, Where where, SkipHarmlessText skip, std::vector<Event>* events) {
+void Read(const Text& text, Where where, scan::SkipText skip, std::vector<Event>* events) {
   events->clear();
   fuzz::ReaderHost host;
   MAYA_Lex lexer(host.basicSuite(), text.begin, text.end);
@@ -112,8 +112,8 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   const Text text{begin, begin + size};
   for (const Where where : {Where::BetweenCommands, Where::InCommand}) {
     Read(text, where, nullptr, &plain);
-    for (const HarmlessTextSkipper& skipper : HarmlessTextSkippers()) {
-      Read(text, where, where == Where::InCommand ? skipper.skipInCommand : skipper.skip, &skipped);
+    for (const scan::TextSkipper& skipper : scan::TextSkippers()) {
+      Read(text, where, where == Where::InCommand ? skipper.inCommand : skipper.betweenCommands, &skipped);
       Require(skipped == plain, "passing over harmless text changes nothing of what is found");
     }
   }

@@ -1,4 +1,4 @@
-// The number scanner, one number and pairs of them, against the C library's own conversion; and the
+// The number scanner, one number and runs of them, against the C library's own conversion; and the
 // comparison of ratios.
 #include <bit>
 #include <cmath>
@@ -88,28 +88,28 @@ void CheckTruncation(double value) {
 }
 
 // Each number that was taken stands in the text, has the value that the scanner gives it alone, and is
-// followed by white space or ";".
-void CheckPairs(fuzz::GuardedMemory& memory, std::string_view text) {
-  constexpr std::int64_t kCapacity = 8;
-  double pairs[kCapacity][2];
+// followed by white space or the terminator.
+void CheckRun(fuzz::GuardedMemory& memory, std::string_view text, char terminator) {
+  constexpr std::int64_t kCapacity = 16;
+  double numbers[kCapacity];
   const char* const begin = memory.Hold(text, 1);
   const char* const end = begin + text.size();
-  const char* behind = nullptr;
-  std::int32_t lineFeeds = 0;
-  const std::int64_t count = HostNumberScanPairs(begin, end, pairs, kCapacity, &behind, &lineFeeds);
-  Require(count >= 0 && count <= kCapacity, "no more pairs than there is room for");
+  const char* after = nullptr;
+  std::int64_t count = -1;
+  const HostError code = HostNumberScanRun(begin, end, terminator, numbers, kCapacity, &count, &after);
+  Require(code == HOST_ERR_NONE, "a run that nothing fails ends well");
+  Require(count >= 0 && count <= kCapacity, "no more numbers than there is room for");
   const char* at = begin;
-  std::int32_t lines = 0;
-  for (std::int64_t i = 0; i < 2 * count; ++i) {
-    for (; at != end && IsBlank(*at); ++at) lines += *at == '\n' ? 1 : 0;
+  for (std::int64_t i = 0; i < count; ++i) {
+    while (at != end && IsBlank(*at)) ++at;
     const char* const first = at;
-    while (at != end && !IsBlank(*at) && *at != ';') ++at;
-    Require(at != end, "a number of a pair is followed by white space or a semicolon");
+    while (at != end && !IsBlank(*at) && *at != terminator) ++at;
+    Require(at != end, "a number of a run is followed by white space or the terminator");
     const Scanned alone = Expected({first, static_cast<std::size_t>(at - first)});
-    Require(alone.code == HOST_ERR_NONE && SameBits(alone.value, pairs[i / 2][i % 2]),
-            "a number of a pair is what it is alone");
+    Require(alone.code == HOST_ERR_NONE && SameBits(alone.value, numbers[i]),
+            "a number of a run is what it is alone");
   }
-  Require(behind == at && lineFeeds == lines, "the pairs end where they end");
+  Require(after == at, "the run ends where its last number does");
 }
 
 void CheckRatios(fuzz::Bytes bytes) {
@@ -133,7 +133,8 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   const std::string_view text = fuzz::TextOf(data, size);
   CheckScan(memory, text);
   CheckScan(memory, text.substr(0, text.find_first_of(" ;\n")));
-  CheckPairs(memory, text);
+  CheckRun(memory, text, ';');
+  CheckRun(memory, text, ',');
   CheckTruncation(fuzz::Bytes(data, size).Take<double>());
   CheckRatios(fuzz::Bytes(data, size));
   return 0;

@@ -1,10 +1,8 @@
-// The reader over arbitrary bytes: that its records are whole, its errors documented, that it gives
-// everything back, and that what it reads in bulk is what it reads token by token.
+// The reader over arbitrary bytes: that its records are whole, its errors documented, and that it gives
+// everything back.
 #include <cmath>
-#include <cstddef>
 #include <cstdint>
 #include <cstring>
-#include <limits>
 #include <string_view>
 
 #include "fuzz/Bytes.h"
@@ -13,7 +11,6 @@
 #include "fuzz/Require.h"
 #include "fuzz/Target.h"
 #include "hostapi/ErrorCodes.h"
-#include "hostutil/HostSetup.h"
 #include "maya/MAYA_Parse.h"
 
 namespace {
@@ -36,24 +33,6 @@ void ForEach(const RecordList* list, Visit visit) {
   const std::int64_t count = CountOf(list);
   for (std::int64_t i = 0; i < count; ++i) visit(*RecordAt<Record>(list, i), i);
 }
-
-// A rehearsal that plans a failure of the number scanner makes the reader read token by token. This one is
-// planned for a call that never comes.
-class TokenByToken {
- public:
-  TokenByToken() {
-    const HostUtilityFailure never{HOST_UTILITY_NumberScan, std::numeric_limits<std::int64_t>::max(), 1,
-                                   HOST_THROW_NOTHING};
-    HostAddUtilityFailure(&never);
-    HostBeginRehearsal();
-  }
-  ~TokenByToken() {
-    HostEndRehearsal();
-    HostClearUtilityFailures();
-  }
-  TokenByToken(const TokenByToken&) = delete;
-  TokenByToken& operator=(const TokenByToken&) = delete;
-};
 
 int Read(MAYA_Parse& parser) {
   try {
@@ -127,47 +106,6 @@ void CheckScene(const MAYA_Parse& scene) {
   });
 }
 
-bool Same(const MAYA_Transform& a, const MAYA_Transform& b) { return std::memcmp(&a, &b, sizeof a) == 0; }
-
-bool Same(const MAYA_Locator& a, const MAYA_Locator& b) { return std::memcmp(&a, &b, sizeof a) == 0; }
-
-// The bytes that fill a camera up are nobody's.
-bool Same(const MAYA_Camera& a, const MAYA_Camera& b) {
-  return std::memcmp(&a, &b, offsetof(MAYA_Camera, orthographic)) == 0 && a.orthographic == b.orthographic &&
-         a.focalLengthCurve == b.focalLengthCurve;
-}
-
-template <typename Record>
-void CheckSameRecords(const RecordList* a, const RecordList* b) {
-  Require(CountOf(a) == CountOf(b), "bulk reading finds as many records");
-  ForEach<Record>(a, [&](const Record& record, std::int64_t index) {
-    Require(Same(record, *RecordAt<Record>(b, index)), "bulk reading finds the same records");
-  });
-}
-
-void CheckSameKeys(const MAYA_Parse& a, const MAYA_Parse& b) {
-  Require(CountOf(a.curves) == CountOf(b.curves), "bulk reading leaves the curves as they are");
-  ForEach<MAYA_AnimCurve>(a.curves, [&](const MAYA_AnimCurve& curve, std::int64_t index) {
-    const auto* const other = RecordAt<MAYA_AnimCurve>(b.curves, index);
-    Require(CountOf(curve.keys) == CountOf(other->keys), "bulk reading finds as many keys");
-    ForEach<MAYA_Key>(curve.keys, [&](const MAYA_Key& key, std::int64_t at) {
-      const auto* const same = RecordAt<MAYA_Key>(other->keys, at);
-      Require(std::memcmp(&key, same, sizeof key) == 0, "bulk reading finds the same keys");
-    });
-  });
-}
-
-void CheckAgainstTokens(const MAYA_Parse& read, int code, const fuzz::ReaderHost& host, const char* end) {
-  const TokenByToken slowly;
-  MAYA_Parse again(host.basicSuite(), read.buffer, end);
-  Require(Read(again) == code, "bulk reading ends as reading token by token does");
-  Require(again.line == read.line && again.position == read.position, "bulk reading ends in the same place");
-  CheckSameRecords<MAYA_Transform>(read.transforms, again.transforms);
-  CheckSameRecords<MAYA_Camera>(read.cameras, again.cameras);
-  CheckSameRecords<MAYA_Locator>(read.locators, again.locators);
-  CheckSameKeys(read, again);
-}
-
 }  // namespace
 
 int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
@@ -179,6 +117,5 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   CheckOutcome(code, host.messages());
   Require(scene.line >= 0 && scene.line <= static_cast<std::int64_t>(size), "the line is one of the text");
   CheckScene(scene);
-  CheckAgainstTokens(scene, code, host, text + size);
   return 0;
 }

@@ -17,14 +17,19 @@ extern "C" {
  * the number is too large; *value is then unchanged. Neither an infinity nor a NaN comes out. */
 HOSTUTIL_API HostError HostNumberScan(const char* text, int64_t length, double* value);
 
-/* Reads pairs of numbers that stand one behind the other, apart by white space (space, tab, carriage return,
- * line feed), each in plain decimal form (digits with an optional "-", fraction and exponent) and followed by
- * white space or ";". Reads up to `capacity` pairs and returns how many; *behind is right behind the last
- * number read, and the line feeds before it are added to *lineFeeds. What does not fit this form is left for
- * HostNumberScan, which gives the same values. Counts as one call of it for each number; reads nothing where
- * a rehearsal plans a failure. `end` is readable and holds a NUL; nothing behind it is read. */
-HOSTUTIL_API int64_t HostNumberScanPairs(const char* text, const char* end, double (*pairs)[2],
-                                         int64_t capacity, const char** behind, int32_t* lineFeeds);
+/* Reads numbers that stand one after another, apart by white space (space, tab, carriage return, line feed).
+ * Each is in plain decimal form: digits with an optional "-", fraction and exponent, followed by white space
+ * or by the byte `terminator`. Stops before everything else: a word of another form or longer than 64 bytes,
+ * a number that another byte follows, the end of the text. What it leaves is for HostNumberScan, which gives
+ * each number the same value; "1#2" and "23.976fps" are left whole.
+ *
+ * Writes up to `capacity` numbers, how many to *count, and to *after the place right after the last one,
+ * which is `text` when there is none. Each number counts and fails as one call of HostNumberScan: a planned
+ * failure hands out the numbers before it and returns its code, or throws; with code 0 its number is 0 and
+ * the reading goes on. HOST_ERR_NONE otherwise, however few numbers there are. `end` is the text's
+ * terminating NUL, after which nothing is read. No pointer is null. */
+HOSTUTIL_API HostError HostNumberScanRun(const char* text, const char* end, char terminator, double* numbers,
+                                         int64_t capacity, int64_t* count, const char** after);
 
 /* Compares two ratios: *order becomes -1, 0 or 1 as a is less than, equal to or greater than b. Exact for
  * all values; HOST_ERR_NUMBER_RANGE when a denominator is 0, and *order is then unchanged. */

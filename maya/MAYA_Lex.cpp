@@ -8,12 +8,12 @@
 #include <string_view>
 
 #include "hostutil/HostUtilities.h"
-#include "maya/ByteScan.h"
-#include "maya/CharacterClasses.h"
-#include "maya/HarmlessText.h"
 #include "maya/Words.h"
 #include "plugin/ErrorCodes.h"
 #include "plugin/Globals.h"
+#include "scan/ByteClasses.h"
+#include "scan/FindEnd.h"
+#include "scan/SkipText.h"
 
 namespace {
 
@@ -106,9 +106,9 @@ MayaToken MAYA_Lex::GetNextToken(const char** start, const char** last) {
       kind = Colon;
       break;
     case '-':
-      if (IsLetter(position[1])) {
+      if (scan::IsLetter(position[1])) {
         kind = ParseOption();
-      } else if (IsNumberStart(position[1])) {
+      } else if (scan::IsNumberStart(position[1])) {
         kind = ParseID();
       }
       break;
@@ -128,20 +128,21 @@ void MAYA_Lex::SkipWhiteSpace() {
 
 void MAYA_Lex::PassWhiteSpace() {
   const char* at = position;
-  for (; IsWhiteSpace(*at); ++at) line += *at == '\n' ? 1 : 0;
+  for (; scan::IsWhiteSpace(*at); ++at) line += *at == '\n' ? 1 : 0;
   tokenStart = position = at;
 }
 
 void MAYA_Lex::SkipHarmless() {
   if (position > end_) return;
   PassWhiteSpace();
-  if (IsAny(*position, kKeywordStartClass | kQuoteClass)) return;  // as a rule the next command begins here
-  static const SkipHarmlessText skip = HarmlessTextSkippers().back().skip;
+  if (scan::IsAny(*position, scan::kKeywordStart | scan::kQuote))
+    return;  // as a rule the next command begins here
+  static const scan::SkipText skip = scan::TextSkippers().back().betweenCommands;
   tokenStart = position = skip(position, end_, &line);
 }
 
 void MAYA_Lex::SkipHarmlessInCommand() {
-  static const SkipHarmlessText skip = HarmlessTextSkippers().back().skipInCommand;
+  static const scan::SkipText skip = scan::TextSkippers().back().inCommand;
   tokenStart = position = skip(position, end_, &line);
 }
 
@@ -160,7 +161,7 @@ MayaToken MAYA_Lex::ParseQuote() {
   // a quote keeps the string open. Reading escapes in pairs would end such a string earlier.
   const char* at = position;
   do {
-    at = FindQuote(at + 1, end_);
+    at = scan::FindQuote(at + 1, end_);
   } while (*at == '"' && at[-1] == '\\');
   position = at;
   if (*at == '\0') FailAtEnd();
@@ -208,8 +209,8 @@ MayaToken MAYA_Lex::ParseOption() {
 
 MayaToken MAYA_Lex::ParseID() {
   const char first = *position;
-  const bool number = IsNumberStart(first);
-  if (!number && !IsLetter(first)) FailReading();
+  const bool number = scan::IsNumberStart(first);
+  if (!number && !scan::IsLetter(first)) FailReading();
   const char* const start = position;
   ScanWord();
   if (number) return Number;
@@ -219,7 +220,7 @@ MayaToken MAYA_Lex::ParseID() {
 void MAYA_Lex::ScanWord() {
   const char* at = position;
   for (;;) {
-    at = FindWordEnd(at, end_);
+    at = scan::FindWordEnd(at, end_);
     // An embedded NUL is part of the word; only the end of the text is not.
     if (*at != '\0') break;
     position = at;
@@ -249,7 +250,7 @@ void MAYA_Lex::FailAtEnd() {
 void MAYA_Lex::NoteLine(std::int32_t code, const char* at) const {
   const char* place = std::min(at, end_);
   if (place == end_) {  // behind the last line that holds something
-    while (place != buffer && IsWhiteSpace(place[-1])) --place;
+    while (place != buffer && scan::IsWhiteSpace(place[-1])) --place;
   }
   std::int64_t number = 1;
   for (const char* byte = buffer; byte != place; ++byte) {

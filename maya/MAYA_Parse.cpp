@@ -6,6 +6,7 @@
 
 #include "maya/ListAccess.h"
 #include "maya/TokenText.h"
+#include "scan/LineFeeds.h"
 
 MAYA_Parse::MAYA_Parse(const WNBasicSuite* basicSuite, const char* text, const char* end)
     : MAYA_Lex(basicSuite, text, end) {
@@ -107,10 +108,29 @@ double MAYA_Parse::ScanNumber(const char* first, const char* last) const {
   const std::ptrdiff_t size = last - first + 1;
   const bool isTaken = size <= static_cast<std::ptrdiff_t>(kLongestToken);
   double value = 0.0;
-  const HostError code = HostNumberScan(first, isTaken ? size : 0, &value);
-  if (code != kNoError) NoteLine(code, first);
-  ThrowOnError(code);
+  ThrowOnNumberError(HostNumberScan(first, isTaken ? size : 0, &value), first);
   return value;
+}
+
+// Reads the plain numbers that stand here one after another, while there is room for them. Returns how many;
+// what is left is for GetNextToken and ScanNumber, which would have read the same numbers.
+std::int64_t MAYA_Parse::ReadPlainNumbers(double* numbers, std::int64_t capacity) {
+  constexpr char kCommandEnd = ';';
+  std::int64_t count = 0;
+  const char* after = position;
+  const HostError code = HostNumberScanRun(position, end(), kCommandEnd, numbers, capacity, &count, &after);
+  line += scan::CountLineFeeds(position, after);
+  tokenStart = position = after;
+  if (code != kNoError) {
+    SkipWhiteSpace();
+    ThrowOnNumberError(code, position);
+  }
+  return count;
+}
+
+void MAYA_Parse::ThrowOnNumberError(HostError code, const char* number) const {
+  if (code != kNoError) NoteLine(code, number);
+  ThrowOnError(code);
 }
 
 // Keys that only `current` holds: a failure kept them from their record, or there is no record to write back

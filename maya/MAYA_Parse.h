@@ -221,6 +221,8 @@ class MAYA_Parse : public MAYA_Lex {
   // maya/MAYA_Parse.cpp
   MayaToken NextInCommand(const char** first, const char** last);
   double ScanNumber(const char* first, const char* last) const;
+  std::int64_t ReadPlainNumbers(double* numbers, std::int64_t capacity);
+  void ThrowOnNumberError(HostError code, const char* number) const;
   void ClearCurrent();
   void DisposeLooseKeys();
 
@@ -233,8 +235,7 @@ class MAYA_Parse : public MAYA_Lex {
   template <typename Record>
   void WriteBack(RecordList* list, const Record& record);
   bool ReadOrthographic();
-  int ReadPlainPair(double* values, int capacity);
-  int ReadNumbers(double* values, int capacity);
+  std::int64_t ReadNumbers(double* values, std::int64_t capacity);
   template <std::size_t Count>
   bool ReadComponents(double (&field)[Count]);
   bool ReadLastNumber(double* value);
@@ -242,7 +243,7 @@ class MAYA_Parse : public MAYA_Lex {
   // maya/MAYA_Parse_Keys.cpp
   bool FindKeyAttribute(std::string_view* lastNumber);
   void ReadKeys(std::string_view keyCount);
-  void ReadPlainKeys(std::string_view keyCount);
+  bool ReadPlainKeys(std::string_view keyCount, double* time);
   void AppendKeys(const void* keys, std::int64_t count, std::int64_t room);
   void WriteBackCurve();
 

@@ -148,26 +148,15 @@ bool MAYA_Parse::ReadOrthographic() {
   return found;
 }
 
-// Reads two numbers that stand here in plain form, where there is room for them. Returns how many it read.
-int MAYA_Parse::ReadPlainPair(double* values, int capacity) {
-  if (capacity < 2) return 0;
-  double pair[1][2];
-  const char* behind = position;
-  if (HostNumberScanPairs(position, end(), pair, 1, &behind, &line) == 0) return 0;
-  std::copy(std::begin(pair[0]), std::end(pair[0]), values);
-  tokenStart = position = behind;
-  return 2;
-}
-
 // Reads on to the ";". The first numbers go to `values`; later ones are not looked at, so that they cannot
 // fail. Returns how many were taken.
-int MAYA_Parse::ReadNumbers(double* values, int capacity) {
+std::int64_t MAYA_Parse::ReadNumbers(double* values, std::int64_t capacity) {
   const char* first = nullptr;
   const char* last = nullptr;
-  int count = 0;
+  std::int64_t count = 0;
   for (MayaToken kind = String; kind != Semicolon;) {
-    // Numbers begin behind the attribute's name or its type.
-    if (kind == String) count += ReadPlainPair(values + count, capacity - count);
+    // Numbers begin after the attribute's name or its type.
+    if (kind == String) count += ReadPlainNumbers(values + count, capacity - count);
     kind = NextInCommand(&first, &last);
     if (kind == Number && count < capacity) values[count++] = ScanNumber(first, last);
   }

@@ -77,18 +77,19 @@ bool MAYA_Parse::FindKeyAttribute(std::string_view* lastNumber) {
   }
 }
 
-// Reads on to the ";". Every number begins a key; the number behind it is its value, anything else is dropped
+// Reads on to the ";". Every number begins a key; the number after it is its value, anything else is dropped
 // and makes the value 0.
 void MAYA_Parse::ReadKeys(std::string_view keyCount) {
   for (bool ended = false; !ended;) {
-    ReadPlainKeys(keyCount);
+    MAYA_Key key{};
     const char* first = nullptr;
     const char* last = nullptr;
-    const MayaToken kind = NextInCommand(&first, &last);
-    ended = kind == Semicolon;
-    if (kind != Number) continue;
-    MAYA_Key key{};
-    key.time = ScanNumber(first, last);
+    if (!ReadPlainKeys(keyCount, &key.time)) {
+      const MayaToken kind = NextInCommand(&first, &last);
+      ended = kind == Semicolon;
+      if (kind != Number) continue;
+      key.time = ScanNumber(first, last);
+    }
     const MayaToken next = NextInCommand(&first, &last);
     if (next == Number) key.value = ScanNumber(first, last);
     ended = next == Semicolon;
@@ -96,21 +97,26 @@ void MAYA_Parse::ReadKeys(std::string_view keyCount) {
   }
 }
 
-// Reads the keys that stand there as pairs of plain numbers, many at a time. What it leaves is read token by
-// token. Most curves end within the first run, whose keys then are all that there will be; the text behind it
-// is not looked through for the end of the command before it is read.
-void MAYA_Parse::ReadPlainKeys(std::string_view keyCount) {
+// Reads the keys that stand here as plain numbers, many at a time; the rest is read token by token. True when
+// a time is left over, whose value is no plain number. Most curves end within the first run, whose keys then
+// are all that there will be; the text after it is not looked through for the end of the command before it is
+// read.
+bool MAYA_Parse::ReadPlainKeys(std::string_view keyCount, double* time) {
   constexpr std::int64_t kRun = 256;
-  static_assert(sizeof(MAYA_Key) == sizeof(double[2]) && offsetof(MAYA_Key, value) == sizeof(double));
-  double pairs[kRun][2];
-  for (std::int64_t count = kRun; count == kRun;) {
-    const char* behind = position;
-    count = HostNumberScanPairs(position, end(), pairs, kRun, &behind, &line);
-    tokenStart = position = behind;
+  static_assert(sizeof(MAYA_Key) == 2 * sizeof(double) && offsetof(MAYA_Key, time) == 0 &&
+                offsetof(MAYA_Key, value) == sizeof(double));
+  double numbers[2 * kRun];
+  std::int64_t read = 2 * kRun;
+  while (read == 2 * kRun) {
+    read = ReadPlainNumbers(numbers, 2 * kRun);
+    const std::int64_t count = read / 2;
     std::int64_t room = count;
     if (count == kRun && current.curve.keys == nullptr) room += MoreKeys(keyCount, kRun, position, end());
-    if (count > 0) AppendKeys(pairs, count, room);
+    if (count > 0) AppendKeys(numbers, count, room);
   }
+  if (read % 2 == 0) return false;
+  *time = numbers[read - 1];
+  return true;
 }
 
 // Appends records of MAYA_Key to the current curve, whose list is made on first use, with room for so many.

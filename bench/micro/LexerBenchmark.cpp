@@ -1,9 +1,9 @@
 // The lexer over the text of meshes and of nodes: token by token, and in bulk as the main loop does it. The
 // items are tokens; in bulk, those that are still handed out.
 #include "bench/micro/MicroBenchmark.h"
-#include "maya/HarmlessText.h"
 #include "maya/MAYA_Lex.h"
 #include "refhost/Host.h"
+#include "scan/SkipText.h"
 
 namespace bench {
 namespace {
@@ -42,7 +42,7 @@ void lex(benchmark::State& state, std::string_view workload) {
   countWork(state, count, static_cast<std::int64_t>(text.size()));
 }
 
-void lexInBulk(benchmark::State& state, std::string_view workload, SkipHarmlessText skip) {
+void lexInBulk(benchmark::State& state, std::string_view workload, scan::SkipText skip) {
   const refhost::Host host({});
   const std::string& text = textOf(workload);
   const char* const end = text.data() + text.size();
@@ -60,9 +60,9 @@ const bool registered = [] {
   for (const char* const workload : {"mesh", "nodes"}) {
     const std::string name = "lexer/" + std::string(workload);
     benchmark::RegisterBenchmark((name + "/tokens").c_str(), lex, workload);
-    for (const HarmlessTextSkipper& skipper : HarmlessTextSkippers()) {
+    for (const scan::TextSkipper& skipper : scan::TextSkippers()) {
       benchmark::RegisterBenchmark((name + "/bulk/" + skipper.name).c_str(), lexInBulk, workload,
-                                   skipper.skip);
+                                   skipper.betweenCommands);
     }
   }
   return true;

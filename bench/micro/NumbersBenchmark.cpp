@@ -1,4 +1,4 @@
-// The number scanner, one by one and in runs of pairs, beside std::from_chars. The items are numbers.
+// The number scanner, one by one and in runs, beside std::from_chars. The items are numbers.
 #include <charconv>
 #include <random>
 #include <vector>
@@ -12,7 +12,7 @@ namespace {
 constexpr std::size_t kNumbers = 4096;
 
 struct Texts {
-  std::string run;  // apart by blanks, a ";" behind
+  std::string run;  // apart by blanks, a ";" at the end
   std::vector<std::string_view> each;
 };
 
@@ -52,15 +52,14 @@ void oneByOne(benchmark::State& state, const Texts& texts) {
   countWork(state, kNumbers, static_cast<std::int64_t>(texts.run.size()));
 }
 
-void inPairs(benchmark::State& state, const Texts& texts) {
-  std::vector<double> room(kNumbers);
-  auto* const pairs = reinterpret_cast<double(*)[2]>(room.data());
+void inRuns(benchmark::State& state, const Texts& texts) {
+  std::vector<double> numbers(kNumbers);
   const char* const end = texts.run.data() + texts.run.size();
   for (auto _ : state) {
-    const char* behind = nullptr;
-    std::int32_t lineFeeds = 0;
-    require(HostNumberScanPairs(texts.run.data(), end, pairs, kNumbers / 2, &behind, &lineFeeds) ==
-            kNumbers / 2);
+    const char* after = nullptr;
+    std::int64_t count = 0;
+    require(HostNumberScanRun(texts.run.data(), end, ';', numbers.data(), kNumbers, &count, &after) == 0);
+    require(count == kNumbers);
     benchmark::ClobberMemory();
   }
   countWork(state, kNumbers, static_cast<std::int64_t>(texts.run.size()));
@@ -90,7 +89,7 @@ const bool registered = [] {
   for (const auto& form : forms) {
     const std::string name = "numbers/" + std::string(form.name);
     benchmark::RegisterBenchmark((name + "/one_by_one").c_str(), oneByOne, form.texts);
-    benchmark::RegisterBenchmark((name + "/pairs").c_str(), inPairs, form.texts);
+    benchmark::RegisterBenchmark((name + "/run").c_str(), inRuns, form.texts);
     benchmark::RegisterBenchmark((name + "/from_chars").c_str(), byLibrary, form.texts);
   }
   return true;

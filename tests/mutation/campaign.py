@@ -3,7 +3,7 @@
 usage: scripts/mutate [--count N] [--seed N] [--only FOLDER] [--headers] [--quick | --own] [--jobs N] [--again]
        scripts/mutate --named [WORD...]
 
-Chooses mutants of the sources of plugin, maya, comp and hostutil, as many of each: comparisons that take in their
+Chooses mutants of the sources of plugin, maya, comp, hostutil and scan, as many of each: comparisons that take in their
 limit or lose it, arithmetic and logic turned round, constants replaced by their neighbours, conditions negated. Each
 is built and tested by itself, in a copy of the sources below build/mutate: by the folder's own tests, then by whole
 imports; and what both let by, by everything. It is caught when a test fails, crashes or does not come back; what does
@@ -36,7 +36,7 @@ from workspace import FIRST_STAGE, LAST_STAGE, QUICK_STAGES, STAGES, Workspace, 
 ROOT = Path(__file__).resolve().parents[2]
 PLACE = ROOT / "build" / "mutate"
 RESULTS = PLACE / "survivors.json"
-FOLDERS = ("plugin", "maya", "comp", "hostutil")
+FOLDERS = ("plugin", "maya", "comp", "hostutil", "scan")
 LEAST_CAUGHT = 95  # percent
 SETUP_FAILED = 10
 

@@ -1,9 +1,9 @@
-#include "ExactDecimal.h"
+#include "tests/scan/ExactDecimal.h"
 
 #include <algorithm>
 #include <vector>
 
-namespace hostutil_tests {
+namespace scan_tests {
 namespace {
 
 // Nine decimal digits a limb, the lowest first.
@@ -64,4 +64,4 @@ std::string ExactDecimal(std::uint64_t significand, int exponent) {
   return digits.insert(digits.size() - fraction, ".");
 }
 
-}  // namespace hostutil_tests
+}  // namespace scan_tests

@@ -9,9 +9,10 @@
 #include <cstdint>
 #include <cstring>
 
-#include "maya/CharacterClasses.h"
+#include "scan/ByteClasses.h"
 
-namespace byte_scan {
+namespace scan {
+namespace eight_bytes {
 
 inline constexpr std::ptrdiff_t kWordSize = sizeof(std::uint64_t);
 inline constexpr std::uint64_t kEach = 0x0101010101010101u;
@@ -28,7 +29,7 @@ inline constexpr std::uint64_t MarkEqual(std::uint64_t bytes, char c) {
 }
 
 // The first byte of one of the classes. `mark` marks all of them among eight bytes, and perhaps others.
-// Somewhere from `at` to `end`, which is readable, there is one; nothing behind `end` is read.
+// Somewhere from `at` to `end`, which is readable, there is one; nothing after `end` is read.
 template <typename Mark>
 [[gnu::always_inline]] inline const char* FindAny(const char* at, const char* end, unsigned classes,
                                                   Mark mark) {
@@ -50,19 +51,21 @@ template <typename Mark>
   return at;
 }
 
-}  // namespace byte_scan
+}  // namespace eight_bytes
 
 // The first white space, ";" or NUL. `end` is the text's terminating NUL, and not before `at`.
 inline const char* FindWordEnd(const char* at, const char* end) {
-  constexpr unsigned char kBehindSpace = ' ' + 1;
-  return byte_scan::FindAny(at, end, kTerminatorClass | kNulClass, [](std::uint64_t bytes) {
-    return byte_scan::MarkBelow(bytes, kBehindSpace) | byte_scan::MarkEqual(bytes, ';');
+  constexpr unsigned char kAfterSpace = ' ' + 1;
+  return eight_bytes::FindAny(at, end, kWordEnd | kNul, [](std::uint64_t bytes) {
+    return eight_bytes::MarkBelow(bytes, kAfterSpace) | eight_bytes::MarkEqual(bytes, ';');
   });
 }
 
 // The first quote or NUL, likewise.
 inline const char* FindQuote(const char* at, const char* end) {
-  return byte_scan::FindAny(at, end, kQuoteClass | kNulClass, [](std::uint64_t bytes) {
-    return byte_scan::MarkEqual(bytes, '"') | byte_scan::MarkEqual(bytes, '\0');
+  return eight_bytes::FindAny(at, end, kQuote | kNul, [](std::uint64_t bytes) {
+    return eight_bytes::MarkEqual(bytes, '"') | eight_bytes::MarkEqual(bytes, '\0');
   });
 }
+
+}  // namespace scan

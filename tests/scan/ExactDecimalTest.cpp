@@ -1,11 +1,11 @@
-#include "ExactDecimal.h"
+#include "tests/scan/ExactDecimal.h"
 
 #include <gtest/gtest.h>
 
 #include <cmath>
 #include <cstdlib>
 
-namespace hostutil_tests {
+namespace scan_tests {
 namespace {
 
 TEST(ExactDecimalTest, IntegersAreWrittenWhole) {
@@ -32,4 +32,4 @@ TEST(ExactDecimalTest, EveryDoubleComesBackFromItsDigits) {
 }
 
 }  // namespace
-}  // namespace hostutil_tests
+}  // namespace scan_tests

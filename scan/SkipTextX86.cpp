@@ -1,12 +1,13 @@
 // The classification of 64 bytes with SSE2, which every x86-64 processor has, and with AVX2.
-#include "maya/HarmlessTextX86.h"
+#include "scan/SkipTextX86.h"
 
 #if defined(__x86_64__)
 
 #include <immintrin.h>
 
-#include "maya/HarmlessTextLoop.h"
+#include "scan/SkipTextBlocks.h"
 
+namespace scan {
 namespace {
 
 // ---- SSE2: ranges of bytes, sixteen at a time ----
@@ -142,7 +143,7 @@ TARGET_AVX2 inline BlockMasks ClassifyAvx2(const char* block) {
 
 }  // namespace
 
-const char* SkipHarmlessTextSse2(const char* position, const char* end, std::int32_t* lines) {
+const char* SkipBetweenCommandsSse2(const char* position, const char* end, std::int32_t* lines) {
   return SkipBlocks<SkipWhere::BetweenCommands>(position, end, lines, ClassifySse2);
 }
 
@@ -154,12 +155,14 @@ bool HasAvx2() {
   return __builtin_cpu_supports("avx2") && __builtin_cpu_supports("bmi") && __builtin_cpu_supports("popcnt");
 }
 
-TARGET_AVX2 const char* SkipHarmlessTextAvx2(const char* position, const char* end, std::int32_t* lines) {
+TARGET_AVX2 const char* SkipBetweenCommandsAvx2(const char* position, const char* end, std::int32_t* lines) {
   return SkipBlocks<SkipWhere::BetweenCommands>(position, end, lines, ClassifyAvx2);
 }
 
 TARGET_AVX2 const char* SkipInCommandAvx2(const char* position, const char* end, std::int32_t* lines) {
   return SkipBlocks<SkipWhere::InCommand>(position, end, lines, ClassifyAvx2);
 }
+
+}  // namespace scan
 
 #endif

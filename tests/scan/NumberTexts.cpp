@@ -1,12 +1,12 @@
-#include "NumberTexts.h"
+#include "tests/scan/NumberTexts.h"
 
 #include <bit>
 #include <charconv>
 #include <cmath>
 
-#include "ExactDecimal.h"
+#include "tests/scan/ExactDecimal.h"
 
-namespace hostutil_tests {
+namespace scan_tests {
 namespace {
 
 constexpr int kSignificandBits = 53;
@@ -238,4 +238,4 @@ void NumberTexts::WithSuffix(std::string* text) {
   *text += kSuffixes[random_.Pick(0, 7)];
 }
 
-}  // namespace hostutil_tests
+}  // namespace scan_tests

@@ -1,11 +1,28 @@
-// The loop that every HarmlessTextSkipper runs around its own classification of 64 bytes.
+// The loop that every TextSkipper in blocks runs around its own classification of 64 bytes.
+//
+// A block becomes masks with a bit for each byte, the first byte in the lowest bit. With sixteen bytes, the
+// lowest bit on the left, a "." for a 0, and "_" for a blank:
+//
+//   bytes                 2 . 5 _ - 1 ; _ s e t A t t r _
+//   terminator            . . . 1 . . 1 1 . . . . . . . 1   white space and ";"
+//   terminator << 1 | 1   1 . . . 1 . . 1 1 . . . . . . .   comes after one, or is the first byte
+//   starts                1 . . . 1 . . . 1 . . . . . . .   of words: the above without terminators
+//   harmless              1 1 1 . . 1 . . . 1 1 1 1 1 1 .   letters but c and s, digits, "."
+//   dash                  . . . . 1 . . . . . . . . . . .
+//   wordByte >> 1         1 1 . 1 1 . . 1 1 1 1 1 1 1 . .   a letter, digit, "-" or "." is next
+//   stops                 . . . . . . . . 1 . . . . . . .   starts & ~(harmless | dash & wordByte >> 1)
+//
+// So "2.5" and "-1;" are passed over, and the reader goes on at "setAttr". Where the highest bit of
+// `terminator` is set, as here, a word may start at the next block's first byte.
 #pragma once
 
 #include <bit>
 #include <cstddef>
 #include <cstdint>
 
-#include "maya/CharacterClasses.h"
+#include "scan/ByteClasses.h"
+
+namespace scan {
 
 inline constexpr std::ptrdiff_t kSkipBlock = 64;
 
@@ -44,7 +61,9 @@ template <SkipWhere kWhere, typename Classify>
   }
   // A word that the last block cuts is left to be read whole.
   if (boundary == 0) {
-    while (block != position && !IsWordTerminator(block[-1])) --block;
+    while (block != position && !IsWordEnd(block[-1])) --block;
   }
   return block;
 }
+
+}  // namespace scan

@@ -4,9 +4,9 @@
 #include <cstdint>
 #include <string>
 
-namespace hostutil_tests {
+namespace scan_tests {
 
 // significand * 2^exponent without an exponent, such as "0.375"; for exponents of doubles, down to -1075.
 std::string ExactDecimal(std::uint64_t significand, int exponent);
 
-}  // namespace hostutil_tests
+}  // namespace scan_tests

@@ -7,7 +7,7 @@
 
 #include "tests/support/SplitMix.h"
 
-namespace hostutil_tests {
+namespace scan_tests {
 
 // The same numbers from the same seed on every machine.
 class SeededBits {
@@ -68,4 +68,4 @@ class NumberTexts {
   SeededBits random_;
 };
 
-}  // namespace hostutil_tests
+}  // namespace scan_tests

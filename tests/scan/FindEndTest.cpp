@@ -1,5 +1,5 @@
 // The ends of words and strings are found where a look at every byte finds them.
-#include "maya/ByteScan.h"
+#include "scan/FindEnd.h"
 
 #include <gtest/gtest.h>
 
@@ -7,8 +7,8 @@
 #include <string>
 #include <string_view>
 
-#include "tests/maya/HostileTexts.h"
-#include "tests/maya/TextRoom.h"
+#include "tests/scan/HostileTexts.h"
+#include "tests/scan/TextRoom.h"
 
 namespace testsupport {
 namespace {
@@ -23,16 +23,16 @@ const char* PlainQuote(const char* at) {
   return at;
 }
 
-class ByteScanTest : public ::testing::Test {
+class FindEndTest : public ::testing::Test {
  protected:
-  // From every byte on, with so many bytes behind the NUL that may be read.
+  // From every byte on, with so many bytes after the NUL that may be read.
   void ExpectTheSameEnds(std::string_view text, std::size_t gap) {
     const char* const end = room_.Put(text, gap);
     for (const char* at = end - text.size(); at <= end; ++at) {
       const auto place = at - (end - text.size());
-      ASSERT_EQ(FindWordEnd(at, end) - at, PlainWordEnd(at) - at)
+      ASSERT_EQ(scan::FindWordEnd(at, end) - at, PlainWordEnd(at) - at)
           << ::testing::PrintToString(std::string(text)) << " from " << place;
-      ASSERT_EQ(FindQuote(at, end) - at, PlainQuote(at) - at)
+      ASSERT_EQ(scan::FindQuote(at, end) - at, PlainQuote(at) - at)
           << ::testing::PrintToString(std::string(text)) << " from " << place;
     }
   }
@@ -40,7 +40,7 @@ class ByteScanTest : public ::testing::Test {
   TextRoom room_;
 };
 
-TEST_F(ByteScanTest, EveryPairOfNeighboursIsToldApart) {
+TEST_F(FindEndTest, EveryPairOfNeighboursIsToldApart) {
   for (int first = 0; first < 256; ++first) {
     for (int second = 0; second < 256; ++second) {
       std::string text(10, 'w');
@@ -51,7 +51,7 @@ TEST_F(ByteScanTest, EveryPairOfNeighboursIsToldApart) {
   }
 }
 
-TEST_F(ByteScanTest, EveryByteIsFoundAtEveryPlace) {
+TEST_F(FindEndTest, EveryByteIsFoundAtEveryPlace) {
   for (int byte = 0; byte < 256; ++byte) {
     for (std::size_t place = 0; place < 24; ++place) {
       std::string text(24, 'w');
@@ -61,7 +61,7 @@ TEST_F(ByteScanTest, EveryByteIsFoundAtEveryPlace) {
   }
 }
 
-TEST_F(ByteScanTest, RandomHostileTextsEndAlike) {
+TEST_F(FindEndTest, RandomHostileTextsEndAlike) {
   constexpr int kTexts = 20'000;
   HostileTexts texts(20261121);
   for (int i = 0; i < kTexts; ++i) {

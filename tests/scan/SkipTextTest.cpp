@@ -1,17 +1,17 @@
 // Passing over what the main loop ignores in bulk changes nothing of what the loop sees.
-#include "maya/HarmlessText.h"
+#include "scan/SkipText.h"
 
 #include <map>
 
-#include "tests/maya/HostileTexts.h"
 #include "tests/maya/RichScene.h"
-#include "tests/maya/TextRoom.h"
+#include "tests/scan/HostileTexts.h"
+#include "tests/scan/TextRoom.h"
 #include "tests/support/ReaderFixture.h"
 
 namespace testsupport {
 namespace {
 
-class HarmlessTextTest : public ReaderTest {
+class SkipTextTest : public ReaderTest {
  protected:
   struct ActingToken {
     MayaToken kind;
@@ -32,7 +32,7 @@ class HarmlessTextTest : public ReaderTest {
   enum class Where { BetweenCommands, InCommand };
 
   // What a loop that skips before every token sees; without a skipper, one that does not.
-  void See(const char* begin, const char* end, Where where, SkipHarmlessText skip, Seen* seen) {
+  void See(const char* begin, const char* end, Where where, scan::SkipText skip, Seen* seen) {
     seen->acting.clear();
     seen->code = 0;
     host_.messages.clear();
@@ -79,9 +79,9 @@ class HarmlessTextTest : public ReaderTest {
   void ExpectNoDifference(const char* begin, const char* end, Where where, std::size_t gap) {
     const std::string_view text(begin, static_cast<std::size_t>(end - begin));
     See(begin, end, where, nullptr, &plain_);
-    for (const HarmlessTextSkipper& skipper : HarmlessTextSkippers()) {
+    for (const scan::TextSkipper& skipper : scan::TextSkippers()) {
       const bool between = where == Where::BetweenCommands;
-      See(begin, end, where, between ? skipper.skip : skipper.skipInCommand, &skipped_);
+      See(begin, end, where, between ? skipper.betweenCommands : skipper.inCommand, &skipped_);
       ASSERT_TRUE(skipped_ == plain_)
           << skipper.name << (between ? " between commands" : " in a command") << " over "
           << ::testing::PrintToString(std::string(text)) << ", gap " << gap << ": tokens "
@@ -97,13 +97,13 @@ class HarmlessTextTest : public ReaderTest {
   std::int64_t bytesSkipped_ = 0;
 };
 
-TEST_F(HarmlessTextTest, ThereIsOneForEveryProcessor) {
-  ASSERT_FALSE(HarmlessTextSkippers().empty());
-  for (const HarmlessTextSkipper& skipper : HarmlessTextSkippers())
-    EXPECT_TRUE(skipper.skip != nullptr && skipper.skipInCommand != nullptr) << skipper.name;
+TEST_F(SkipTextTest, ThereIsOneForEveryProcessor) {
+  ASSERT_FALSE(scan::TextSkippers().empty());
+  for (const scan::TextSkipper& skipper : scan::TextSkippers())
+    EXPECT_TRUE(skipper.betweenCommands != nullptr && skipper.inCommand != nullptr) << skipper.name;
 }
 
-TEST_F(HarmlessTextTest, EveryByteAtEveryPlaceOfABlockIsSeenAlike) {
+TEST_F(SkipTextTest, EveryByteAtEveryPlaceOfABlockIsSeenAlike) {
   for (int byte = 0; byte < 256; ++byte) {
     for (const std::size_t place : {0u, 1u, 15u, 16u, 31u, 32u, 62u, 63u, 64u, 65u, 127u, 128u, 199u}) {
       std::string spread(200, ' ');
@@ -117,7 +117,7 @@ TEST_F(HarmlessTextTest, EveryByteAtEveryPlaceOfABlockIsSeenAlike) {
 }
 
 // Whoever stops where he need not is right all the same, but slow.
-TEST_F(HarmlessTextTest, EveryOneGoesAsFarAsItMay) {
+TEST_F(SkipTextTest, EveryOneGoesAsFarAsItMay) {
   constexpr std::string_view kWhiteSpace = " \t\r\n;";
   constexpr std::string_view kNumeral = "0123456789.";
   for (int value = 1; value < 256; ++value) {
@@ -132,22 +132,23 @@ TEST_F(HarmlessTextTest, EveryOneGoesAsFarAsItMay) {
       std::string option = text;
       option[place] = '-';
       option[place + 1] = byte;
-      for (const HarmlessTextSkipper& skipper : HarmlessTextSkippers()) {
+      for (const scan::TextSkipper& skipper : scan::TextSkippers()) {
         const auto stop = [](const auto skip, const std::string& in) {
           std::int32_t lines = 0;
           return static_cast<std::size_t>(skip(in.data(), in.data() + in.size(), &lines) - in.data());
         };
         const bool harmless = white || numeral || (letter && !keyword);
-        EXPECT_EQ(stop(skipper.skip, text) > 64, harmless) << skipper.name << " " << value << " at " << place;
-        EXPECT_EQ(stop(skipper.skipInCommand, text) > 64, harmless && byte != ';') << skipper.name << value;
-        EXPECT_EQ(stop(skipper.skip, option) > 64, letter || numeral || byte == '-')
+        EXPECT_EQ(stop(skipper.betweenCommands, text) > 64, harmless)
+            << skipper.name << " " << value << " at " << place;
+        EXPECT_EQ(stop(skipper.inCommand, text) > 64, harmless && byte != ';') << skipper.name << value;
+        EXPECT_EQ(stop(skipper.betweenCommands, option) > 64, letter || numeral || byte == '-')
             << skipper.name << " -" << value << " at " << place;
       }
     }
   }
 }
 
-TEST_F(HarmlessTextTest, PairsOfBytesAcrossTheEdgeOfABlockAreSeenAlike) {
+TEST_F(SkipTextTest, PairsOfBytesAcrossTheEdgeOfABlockAreSeenAlike) {
   for (const char first : std::string_view(" \n;\"/(:+-.09@AZ[`aczCS{\v\x80\0", 26)) {
     for (int second = 0; second < 256; ++second) {
       std::string text(140, ' ');
@@ -158,7 +159,7 @@ TEST_F(HarmlessTextTest, PairsOfBytesAcrossTheEdgeOfABlockAreSeenAlike) {
   }
 }
 
-TEST_F(HarmlessTextTest, TextsOfEveryLengthAreSeenAlike) {
+TEST_F(SkipTextTest, TextsOfEveryLengthAreSeenAlike) {
   for (const char fill : {' ', '\n', 'a', 'c', '1', '-', ';'})
     for (std::size_t size = 0; size < 200; ++size) {
       ExpectNoDifference(std::string(size, fill));
@@ -167,20 +168,20 @@ TEST_F(HarmlessTextTest, TextsOfEveryLengthAreSeenAlike) {
     }
 }
 
-TEST_F(HarmlessTextTest, ASceneIsSeenAlikeFromEveryByteOn) {
+TEST_F(SkipTextTest, ASceneIsSeenAlikeFromEveryByteOn) {
   const std::string scene = RichScene();
   for (std::size_t from = 0; from < scene.size(); ++from)
     ExpectNoDifference(std::string_view(scene).substr(from));
 }
 
-TEST_F(HarmlessTextTest, ASceneIsSeenAlikeAtEveryAlignment) {
+TEST_F(SkipTextTest, ASceneIsSeenAlikeAtEveryAlignment) {
   const std::string scene = RichScene();
   for (std::size_t gap = 0; gap < 128; ++gap) ExpectNoDifference(scene, gap);
 }
 
 constexpr int kRandomTexts = MAYASCENE_SANITIZED ? 100'000 : 300'000;
 
-TEST_F(HarmlessTextTest, RandomHostileTextsAreSeenAlike) {
+TEST_F(SkipTextTest, RandomHostileTextsAreSeenAlike) {
   HostileTexts texts(20240229);
   std::int64_t bytes = 0;
   std::int64_t acting = 0;

@@ -1,0 +1,53 @@
+#include "scan/SkipText.h"
+
+#include <array>
+
+#include "scan/SkipTextBlocks.h"
+#include "scan/SkipTextX86.h"
+
+namespace scan {
+namespace {
+
+constexpr bool BeginsHarmlessWord(const char* at) {
+  return *at == '-' ? IsWordByte(at[1]) : IsWordByte(*at) && !IsAny(*at, kKeywordStart);
+}
+
+// A byte at a time. Ends a block before the end, as the others do, so that no word is scanned over it.
+template <SkipWhere kWhere>
+const char* SkipPlain(const char* position, const char* end, std::int32_t* lines) {
+  constexpr bool inCommand = kWhere == SkipWhere::InCommand;
+  while (end - position >= kSkipBlock) {
+    if (IsWordEnd(*position) && !(inCommand && *position == ';')) {
+      *lines += *position == '\n' ? 1 : 0;
+      ++position;
+      continue;
+    }
+    if (!BeginsHarmlessWord(position) || (inCommand && *position == '-')) return position;
+    const char* after = position;
+    while (after != end && !IsWordEnd(*after)) ++after;
+    if (after == end) return position;
+    position = after;
+  }
+  return position;
+}
+
+constexpr TextSkipper kPlain = {"plain", SkipPlain<SkipWhere::BetweenCommands>,
+                                SkipPlain<SkipWhere::InCommand>};
+
+}  // namespace
+
+std::span<const TextSkipper> TextSkippers() {
+#if defined(__x86_64__)
+  static constexpr std::array<TextSkipper, 3> kSkippers = {
+      {kPlain,
+       {"SSE2", SkipBetweenCommandsSse2, SkipInCommandSse2},
+       {"AVX2", SkipBetweenCommandsAvx2, SkipInCommandAvx2}}};
+  const std::size_t count = HasAvx2() ? 3 : 2;
+  return std::span(kSkippers).first(count);
+#else
+  static constexpr std::array<TextSkipper, 1> kSkippers = {kPlain};
+  return kSkippers;
+#endif
+}
+
+}  // namespace scan
