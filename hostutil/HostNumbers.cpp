@@ -6,6 +6,21 @@
 #include "hostutil/RehearsalInternal.h"
 #include "scan/Decimal.h"
 
+namespace {
+
+// Reads up to `capacity` plain numbers and moves *at to right after the last one. Returns how many.
+int64_t ReadRun(const char** at, const char* end, char terminator, double* numbers, int64_t capacity) {
+  int64_t count = 0;
+  for (; count < capacity; ++count) {
+    const char* const next = scan::ReadPlainNumber(*at, end, terminator, &numbers[count]);
+    if (next == nullptr) break;
+    *at = next;
+  }
+  return count;
+}
+
+}  // namespace
+
 HostError HostNumberScan(const char* text, int64_t length, double* value) {
   if (HostError code; hostutil::Rehearsed(HOST_UTILITY_NumberScan, &code)) {
     hostutil::HandOutNothing(value);
@@ -27,18 +42,22 @@ HostError HostNumberScanRun(const char* text, const char* end, char terminator, 
                             int64_t capacity, int64_t* count, const char** after) {
   *count = 0;
   *after = text;
-  while (*count < capacity) {
-    double value = 0.0;
-    const char* const next = scan::ReadPlainNumber(*after, end, terminator, &value);
-    if (next == nullptr) break;
-    if (HostError code; hostutil::Rehearsed(HOST_UTILITY_NumberScan, &code)) {
-      if (code != HOST_ERR_NONE) return code;
-      value = 0.0;
-    }
-    numbers[(*count)++] = value;
+  for (;;) {
+    const int64_t sound = hostutil::CallsBeforeFailure(HOST_UTILITY_NumberScan, capacity - *count);
+    const int64_t read = ReadRun(after, end, terminator, numbers + *count, sound);
+    hostutil::CountCalls(HOST_UTILITY_NumberScan, read);
+    *count += read;
+    if (read < sound || *count == capacity) return HOST_ERR_NONE;
+    // The next number, if there is one, is planned to fail.
+    double number = 0.0;
+    const char* next = *after;
+    if (ReadRun(&next, end, terminator, &number, 1) == 0) return HOST_ERR_NONE;
+    HostError code = HOST_ERR_NONE;
+    if (hostutil::Rehearsed(HOST_UTILITY_NumberScan, &code)) number = 0.0;
+    if (code != HOST_ERR_NONE) return code;
+    numbers[(*count)++] = number;
     *after = next;
   }
-  return HOST_ERR_NONE;
 }
 
 HostError HostRatioCompare(const HostRatio* a, const HostRatio* b, int32_t* order) {

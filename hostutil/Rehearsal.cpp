@@ -1,4 +1,5 @@
 // Rehearsal of failures: which call of which service is to fail, and how often each was called.
+#include <algorithm>
 #include <array>
 #include <new>
 #include <stdexcept>
@@ -39,6 +40,16 @@ bool IsPlannedToFail(int32_t service, HostError* code) {
     return true;
   }
   return false;
+}
+
+int64_t CallsBeforePlanned(int32_t service, int64_t calls) {
+  const auto slot = static_cast<std::size_t>(service);
+  for (const HostUtilityFailure& failure : failures[slot]) {
+    if (failure.nth == kEveryCall) return 0;
+    const int64_t before = failure.nth - callCounts[slot] - 1;
+    if (before >= 0) calls = std::min(calls, before);
+  }
+  return calls;
 }
 
 }  // namespace hostutil

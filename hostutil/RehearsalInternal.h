@@ -39,6 +39,13 @@ inline void CountCalls(int32_t service, int64_t calls) {
   if (rehearsalRunning) callCounts[static_cast<std::size_t>(service)] += calls;
 }
 
+// For a service that stands for many calls: how many of the next ones nothing is planned for, at most `calls`.
+// It makes so many at once and counts them with CountCalls; the one after them asks Rehearsed.
+int64_t CallsBeforePlanned(int32_t service, int64_t calls);
+inline int64_t CallsBeforeFailure(int32_t service, int64_t calls) {
+  return rehearsalRunning && failuresPlanned ? CallsBeforePlanned(service, calls) : calls;
+}
+
 // Hands out null or zero, where the caller gave a place for it.
 template <typename Value>
 inline void HandOutNothing(Value* place) {
