@@ -12,15 +12,18 @@ constexpr Entry kReadingCodes[] = {
      .meaning =
          "A quote opens a string that the file never closes, or that a new command follows. The command "
          "with the string is passed over. Reading goes on with the next command.",
-     .example = "setAttr \".n\" -type \"string\" \"closing quote forgotten;\n"
-                "createNode camera -n \"shotCamShape\";",
+     .example =
+         "createNode script -n \"notes\";\n  setAttr \".b\" -type \"string\" \"closing quote forgotten;\n"
+         "createNode camera -n \"shotCamShape\";",
      .help = "Close the string, or export the scene again. A file that ends inside a string was cut off: "
              "copy it again."},
     {.code = Code::OpenComment,
      .severity = Severity::Warning,
      .symbol = "OpenComment",
      .sentence = "this comment has no end",
-     .meaning = "\"/*\" opens a comment, and no \"*/\" follows. Only the rest of the line is passed over.",
+     .meaning =
+         "\"/*\" opens a comment, and no \"*/\" follows. Everything up to the next line that begins with a "
+         "command is passed over.",
      .example = "/* exported by hand\ncreateNode camera -n \"shotCamShape\";",
      .help = "End the comment with \"*/\", or take it out."},
     {.code = Code::CommandCutOff,

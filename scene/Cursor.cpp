@@ -70,7 +70,9 @@ bool Cursor::SkipComment(std::uint32_t* openComment) {
   }
   noCommentEnd_ = true;
   if (openComment != nullptr && *openComment == kNone) *openComment = offset();
-  at_ = FindAnyOf<'\n', '\r'>(at_, end_);
+  do {
+    SkipLine();
+  } while (at_ != end_ && !CommandAt(at_));
   return true;
 }
 

@@ -41,8 +41,8 @@ class Cursor {
   bool StartsWith(std::string_view start) const { return rest().substr(0, start.size()) == start; }
   bool atLineStart() const { return at_ == begin_ || at_[-1] == '\n'; }
 
-  // Over white space and comments. A "/*" without an end is passed over to the end of its line, and its
-  // offset is put into *openComment.
+  // Over white space and comments. From a "/*" without an end it goes to the next line that begins with a
+  // command; its offset is put into *openComment.
   static constexpr std::uint32_t kNone = 0xffffffff;
   void SkipBlank(std::uint32_t* openComment);
 

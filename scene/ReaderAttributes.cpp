@@ -49,13 +49,12 @@ void Reader::ReadSetAttr() {
   const Named plug = NameOf(token);
   const PlugText parts = SplitPlug(plug.text);
   const AttributePath path = ParseAttributePath(parts.attribute);
-  NodeId node = kNoNode;
-  if (path.name.empty()) {
-    Lacks("an attribute");
-  } else {
-    node = parts.node.empty() ? Current(plug) : builder_.Resolve({parts.node, plug.place});
-  }
   std::uint32_t end = 0;
+  if (path.name.empty()) {
+    if (FindEnd(false, &end)) Lacks("an attribute");
+    return;
+  }
+  const NodeId node = parts.node.empty() ? Current(plug) : builder_.Resolve({parts.node, plug.place});
   if (node == kNoNode || !builder_.Keeps(node, path.name)) {
     (void)FindEnd(false, &end);
     return;

@@ -33,7 +33,7 @@ void SkipBetween(Cursor& cursor) {
 }  // namespace
 
 std::optional<double> NumberOf(std::string_view word) {
-  if (!word.empty() && word[0] == '+') word.remove_prefix(1);
+  if (word.size() > 1 && word[0] == '+' && word[1] != '-') word.remove_prefix(1);
   if (word.empty() || !(IsByte(word.back(), kDigitByte) || word.back() == '.')) return std::nullopt;
   double value = 0.0;
   const auto [end, error] = std::from_chars(word.data(), word.data() + word.size(), value);
