@@ -14,7 +14,7 @@ struct ShotSize {
   std::int64_t controls = 650;    // animated controls of each
   std::int64_t rigs = 12;         // of the scene's own
   std::int64_t joints = 40;       // of each
-  std::int64_t skinPoints = 900;  // of each joint's chain, weighed
+  std::int64_t skinPoints = 900;  // of each rig, weighed by two joints
   std::int64_t meshes = 20;
   std::int64_t vertices = 1500;  // of each
   std::int64_t trackers = 400;   // points that the camera was solved from

@@ -64,10 +64,21 @@ void constrain(SceneText& scene, std::int64_t reference, const std::string& path
   }
 }
 
+bool hasAddedAttribute(std::int64_t control) { return control % 4 == 0; }
+
+bool isConstrained(std::int64_t control) { return control % 20 == 7; }
+
+// How many edits editControl writes.
+std::int64_t editsOf(std::int64_t control) {
+  constexpr std::int64_t kChannelEdits = kDriven;
+  return 6 + kChannelEdits + (hasAddedAttribute(control) ? 1 : 0) +
+         (isConstrained(control) ? 1 + kChannelEdits : 0);
+}
+
 void editControl(SceneText& scene, std::int64_t reference, std::int64_t control, EditPaths paths) {
   const std::string path = controlPath(reference, control);
-  if (control % 4 == 0) addAttribute(scene, path, paths);
-  if (control % 20 == 7) constrain(scene, reference, path);
+  if (hasAddedAttribute(control)) addAttribute(scene, path, paths);
+  if (isConstrained(control)) constrain(scene, reference, path);
   change(scene, path, "visibility").text("\" -k 1 1\"");
   changeTriple(scene, path, "translate");
   changeTriple(scene, path, "rotate");
@@ -105,12 +116,14 @@ void referenceFiles(SceneText& scene, const ShotSize& size) {
 void referenceNodes(SceneText& scene, const ShotSize& size, EditPaths paths) {
   for (std::int64_t r = 0; r < size.references; ++r) {
     const std::string name = referenceNode(r);
+    std::int64_t edits = 0;
+    for (std::int64_t k = 0; k < size.controls; ++k) edits += editsOf(k);
     const std::int64_t holders = size.controls * static_cast<std::int64_t>(kDriven);
     scene.node("fosterParent", name + "fosterParent1");
     scene.node("reference", name).text("\tsetAttr -s ").integer(holders).text(" \".phl\";\n");
     for (std::int64_t h = 1; h <= holders; ++h) scene.text("\tsetAttr \".phl[").integer(h).text("]\" 0;\n");
     scene.text("\tsetAttr \".ed\" -type \"dataReferenceEdits\" \n\t\t\"").text(name).text("\"\n\t\t\"");
-    scene.text(name).text("\" 0\n\t\t\"").text(name).text("\" ").integer(size.controls * 12);
+    scene.text(name).text("\" 0\n\t\t\"").text(name).text("\" ").integer(edits);
     for (std::int64_t k = 0; k < size.controls; ++k) editControl(scene, r, k, paths);
     scene.text(";\n\tsetAttr \".ptag\" -type \"string\" \"\";\nlockNode -l 1 ;\n");
   }

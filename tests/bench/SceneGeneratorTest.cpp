@@ -3,7 +3,7 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include <regex>
+#include <cctype>
 #include <set>
 #include <sstream>
 #include <string>
@@ -134,12 +134,18 @@ TEST(SceneGeneratorTest, ShotHoldsReferencesRigsMeshesAndATrackedCamera) {
 TEST(SceneGeneratorTest, EveryNodeHasAnIdentifierOfItsOwn) {
   for (const Workload& workload : Workloads()) {
     const std::string scene = Scene(workload.name, 0.002);
-    const std::regex form(
-        "createNode [^\n]*;\n\trename -uid "
-        "\"([0-9A-F]{8}-[0-9A-F]{4}-[0-9A-F]{4}-[0-9A-F]{4}-[0-9A-F]{12})\";\n");
+    constexpr std::string_view kAfterNode = "\";\n\trename -uid \"";
+    constexpr std::string_view kForm = "XXXXXXXX-XXXX-XXXX-XXXX-XXXXXXXXXXXX";
     std::set<std::string> identifiers;
-    for (std::sregex_iterator at(scene.begin(), scene.end(), form), end; at != end; ++at) {
-      identifiers.insert((*at)[1]);
+    for (std::size_t at = 0; (at = scene.find("createNode ", at)) != std::string::npos; ++at) {
+      const std::size_t line = scene.find("\";\n", at);
+      ASSERT_EQ(scene.compare(line, kAfterNode.size(), kAfterNode), 0) << workload.name;
+      std::string identifier = scene.substr(line + kAfterNode.size(), kForm.size());
+      identifiers.insert(identifier);
+      for (char& c : identifier)
+        c = std::isxdigit(static_cast<unsigned char>(c)) && !std::islower(static_cast<unsigned char>(c)) ? 'X'
+                                                                                                         : c;
+      ASSERT_EQ(identifier, kForm) << workload.name;
     }
     EXPECT_EQ(static_cast<int>(identifiers.size()), Count(scene, "createNode ")) << workload.name;
   }
