@@ -3,7 +3,7 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include <cctype>
+#include <algorithm>
 #include <set>
 #include <sstream>
 #include <string>
@@ -142,9 +142,8 @@ TEST(SceneGeneratorTest, EveryNodeHasAnIdentifierOfItsOwn) {
       ASSERT_EQ(scene.compare(line, kAfterNode.size(), kAfterNode), 0) << workload.name;
       std::string identifier = scene.substr(line + kAfterNode.size(), kForm.size());
       identifiers.insert(identifier);
-      for (char& c : identifier)
-        c = std::isxdigit(static_cast<unsigned char>(c)) && !std::islower(static_cast<unsigned char>(c)) ? 'X'
-                                                                                                         : c;
+      const auto isDigit = [](char c) { return (c >= '0' && c <= '9') || (c >= 'A' && c <= 'F'); };
+      std::replace_if(identifier.begin(), identifier.end(), isDigit, 'X');
       ASSERT_EQ(identifier, kForm) << workload.name;
     }
     EXPECT_EQ(static_cast<int>(identifiers.size()), Count(scene, "createNode ")) << workload.name;
