@@ -163,6 +163,7 @@ TEST_F(AimPassTest, EachOfTheThreeLinksIsNeeded) {
       if (i != left) scene += links[i];
     }
     const ImportRun run = ImportText(scene);
+    EXPECT_EQ(run.result.code, 0) << "without link " << left;
     EXPECT_FALSE(FindLayer(*run.host, "lens")->aimed) << "without link " << left;
   }
 }
