@@ -3,18 +3,18 @@
 #include <gmock/gmock.h>
 
 #include <algorithm>
-#include <cstdlib>
 #include <set>
 #include <stdexcept>
 #include <utility>
 
 #include "tests/support/BuilderRun.h"
+#include "tests/support/WideTests.h"
 
 namespace testsupport {
 namespace {
 
-// A sanitizer makes an import some ten times as long.
-constexpr std::size_t kShareDivisor = MAYASCENE_SANITIZED ? 10 : 1;
+// A share is divided by it.
+constexpr Share kDivisor = {.quick = 10, .wide = 1, .sanitized = 10};
 
 }  // namespace
 
@@ -32,9 +32,8 @@ std::filesystem::path ExampleScene(const std::string& name) {
 }
 
 std::size_t SweepStride(std::size_t calls, std::size_t share) {
-  const char* const wanted = std::getenv("MAYASCENE_SWEEP");
-  if (wanted != nullptr && std::string_view(wanted) == "all") return 1;
-  share /= kShareDivisor;
+  if (AllTestsWanted()) return 1;
+  share /= HowMany(kDivisor);
   return ((calls + share - 1) / share) | 1;
 }
 

@@ -21,9 +21,9 @@ namespace testsupport {
 std::vector<std::string> ExampleNames();
 std::filesystem::path ExampleScene(const std::string& name);
 
-// Of so many calls every such one is walked: each of them where the environment says MAYASCENE_SWEEP=all,
-// else so many that no more than `share` are walked, under a sanitizer a tenth of that. Odd, so that of calls
-// that come in pairs both are met.
+// Of so many calls every such one is walked: each of them where all tests are wanted, where wide ones are so
+// many that no more than `share` are walked, and a tenth of that in a quick run and under a sanitizer
+// (WideTests.h). Odd, so that of calls that come in pairs both are met.
 inline constexpr std::size_t kShareOfCalls = 700;
 inline constexpr std::size_t kSmallShare = 60;
 std::size_t SweepStride(std::size_t calls, std::size_t share);

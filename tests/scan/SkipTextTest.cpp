@@ -7,6 +7,7 @@
 #include "tests/scan/HostileTexts.h"
 #include "tests/scan/TextRoom.h"
 #include "tests/support/ReaderFixture.h"
+#include "tests/support/WideTests.h"
 
 namespace testsupport {
 namespace {
@@ -179,7 +180,7 @@ TEST_F(SkipTextTest, ASceneIsSeenAlikeAtEveryAlignment) {
   for (std::size_t gap = 0; gap < 128; ++gap) ExpectNoDifference(scene, gap);
 }
 
-constexpr int kRandomTexts = MAYASCENE_SANITIZED ? 100'000 : 300'000;
+const int kRandomTexts = static_cast<int>(HowMany({.quick = 30'000, .wide = 300'000, .sanitized = 100'000}));
 
 TEST_F(SkipTextTest, RandomHostileTextsAreSeenAlike) {
   HostileTexts texts(20240229);

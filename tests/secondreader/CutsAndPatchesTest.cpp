@@ -11,13 +11,14 @@
 
 #include "tests/secondreader/SceneRun.h"
 #include "tests/secondreader/SmallScenes.h"
+#include "tests/support/WideTests.h"
 
 namespace secondreader {
 namespace {
 
 // Of the replaced bytes every such one is tried, and of the cuts of the examples. Eleven bytes stand in the
 // place of each, so each of these is tried at some places.
-constexpr std::size_t kStride = MAYASCENE_SANITIZED ? 5 : 1;
+const std::size_t kStride = testsupport::HowMany({.quick = 5, .wide = 1, .sanitized = 5});
 constexpr std::size_t kSmallExamples = 2;  // so many of the examples are cut too, the smallest
 
 refhost::HostOptions options() {

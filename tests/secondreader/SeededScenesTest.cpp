@@ -10,32 +10,38 @@
 #include "refhost/Operations.h"
 #include "tests/secondreader/SceneGenerator.h"
 #include "tests/secondreader/SceneRun.h"
+#include "tests/support/WideTests.h"
 
 namespace secondreader {
 namespace {
 
-constexpr std::uint64_t kShares = 4;  // of which several can run at once
-constexpr std::uint64_t kScenesPerShare = MAYASCENE_SANITIZED ? 125 : 500;
+constexpr std::uint64_t kShares = 4;     // of which several can run at once
+constexpr std::uint64_t kScenes = 2000;  // the wide test's
+
+std::uint64_t scenesPerShare() {
+  return testsupport::HowMany({.quick = 125, .wide = kScenes / kShares, .sanitized = 125});
+}
 
 class SeededScenesTest : public ::testing::TestWithParam<std::uint64_t> {};
 
 TEST_P(SeededScenesTest, EachSceneGivesThePredictedTracesWithoutAndWithFailures) {
+  const std::uint64_t scenes = scenesPerShare();
   SceneRunner runner;
   int runs = 0;
   int ended = 0;
   int imported = 0;
-  for (std::uint64_t seed = GetParam() * kScenesPerShare; seed < (GetParam() + 1) * kScenesPerShare; ++seed) {
+  for (std::uint64_t seed = GetParam() * scenes; seed < (GetParam() + 1) * scenes; ++seed) {
     const SeedReport report = runSeed(runner, seed, true);
     runs += report.runs;
     ended += report.ended;
     imported += report.imported;
     ASSERT_EQ(report.disagreement, std::nullopt);
   }
-  EXPECT_EQ(runs, static_cast<int>(2 * kScenesPerShare));
+  EXPECT_EQ(runs, static_cast<int>(2 * scenes));
   // Some end the process, but few, and a good share is imported whole.
   EXPECT_GT(ended, runs / 100);
   EXPECT_LT(ended, runs / 10);
-  EXPECT_GT(imported, static_cast<int>(2 * kScenesPerShare / 3));
+  EXPECT_GT(imported, static_cast<int>(2 * scenes / 3));
 }
 
 INSTANTIATE_TEST_SUITE_P(Shares, SeededScenesTest, ::testing::Range(std::uint64_t{0}, kShares));
@@ -50,7 +56,7 @@ TEST(SceneGeneratorTest, ASeedAlwaysGivesTheSameScene) {
 TEST(SceneGeneratorTest, TheScenesReachEveryCallOfAnImportAndEveryKindOfFailure) {
   std::set<std::string> calls;
   std::map<HostError, int> codes;
-  for (std::uint64_t seed = 0; seed < kShares * kScenesPerShare; ++seed) {
+  for (std::uint64_t seed = 0; seed < kScenes; ++seed) {
     const GeneratedScene scene = SceneGenerator(seed).make();
     const Prediction prediction = predict(scene.options, "/" + scene.fileName, scene.bytes, scene.imports);
     ++codes[prediction.imports.front().code];

@@ -52,7 +52,8 @@ complain() {
 expect() { grep -qxF -- "$2" "$folder/$1" || complain "\"$2\" is missing in: $(cat "$folder/$1")"; }
 expect_none() { ! grep -q -- "$2" "$folder/$1" || complain "\"$2\" stands in: $(cat "$folder/$1")"; }
 
-ctest_call() { printf 'ctest --preset %s -j %s --no-tests=error%s' "$1" "$(nproc)" "${2-}"; }
+quick_call() { printf 'ctest --preset test -j %s --no-tests=error -LE ^wide$%s' "$(nproc)" "${1-}"; }
+wide_call() { printf 'ctest --preset %s -j %s --no-tests=error%s' "$1" "$(nproc)" "${2-}"; }
 
 all_well
 
@@ -65,7 +66,7 @@ done
 
 name='the quick form checks the formatting and runs the optimised tests alone'
 run 0
-expect log "$(ctest_call test)"
+expect log "$(quick_call)"
 expect log 'clang-format --dry-run -Werror ./a.cpp'
 expect forms 'test quick'
 expect_none log 'asan\|fuzz\|analyse\|determinism\|coverage\|mutate'
@@ -79,8 +80,8 @@ expect out 'left out of build/test: two things'
 
 name='the long form runs wide tests of both builds, and a share of each campaign'
 run 0 --all
-expect log "$(ctest_call test)"
-expect log "$(ctest_call asan)"
+expect log "$(wide_call test)"
+expect log "$(wide_call asan)"
 expect forms 'test wide'
 expect forms 'asan wide'
 for call in 'fuzz all 10' 'analyse --quick' 'determinism --quick' 'coverage --quick' 'mutate --own --only hostutil --count 4'; do
@@ -90,19 +91,19 @@ done
 
 name='options of ctest reach it in both forms'
 run 0 -R Lexer
-expect log "$(ctest_call test ' -R Lexer')"
+expect log "$(quick_call ' -R Lexer')"
 run 0 --all -R Lexer
-expect log "$(ctest_call test ' -R Lexer')"
-expect log "$(ctest_call asan ' -R Lexer')"
+expect log "$(wide_call test ' -R Lexer')"
+expect log "$(wide_call asan ' -R Lexer')"
 run 0 --rerun-failed --all
-expect log "$(ctest_call asan ' --rerun-failed')"
+expect log "$(wide_call asan ' --rerun-failed')"
 
 name='a failed test is a failure, and the rest runs nevertheless'
 stand_in bin/ctest '[ "$2" != test ]'
 run 1 --all
 expect out 'FAILED: the tests of build/test'
 expect out 'PASSED: the tests of build/asan'
-expect log "$(ctest_call asan)"
+expect log "$(wide_call asan)"
 all_well
 
 name='each campaign that finds something is a failure'

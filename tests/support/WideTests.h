@@ -1,0 +1,35 @@
+// How much is done by the tests that could go on for minutes. MAYASCENE_TESTS in the environment chooses:
+//   (not set)  a quick share, so that all tests together take about a minute
+//   wide       what scripts/test --all runs; under the sanitizers a part of it, because they take ten times
+//   as long all        everything, where there is an end to it; else as wide
+#pragma once
+
+#include <cstddef>
+#include <cstdlib>
+#include <string_view>
+
+namespace testsupport {
+
+inline bool AllTestsWanted() {
+  const char* const wanted = std::getenv("MAYASCENE_TESTS");
+  return wanted != nullptr && std::string_view(wanted) == "all";
+}
+
+inline bool WideTestsWanted() {
+  const char* const wanted = std::getenv("MAYASCENE_TESTS");
+  return AllTestsWanted() || (wanted != nullptr && std::string_view(wanted) == "wide");
+}
+
+// Of something that has no end, or that ends too late.
+struct Share {
+  std::size_t quick;
+  std::size_t wide;
+  std::size_t sanitized = wide;  // wide, under the sanitizers
+};
+
+inline std::size_t HowMany(const Share& share) {
+  if (!WideTestsWanted()) return share.quick;
+  return MAYASCENE_SANITIZED ? share.sanitized : share.wide;
+}
+
+}  // namespace testsupport
