@@ -1,0 +1,128 @@
+// The scout reads ahead in a text that nobody has checked yet: it stays within the text, and within a bound.
+#include "maya/ConnectionScout.h"
+
+#include <gtest/gtest.h>
+#include <sys/mman.h>
+#include <unistd.h>
+
+#include <cstdlib>
+#include <cstring>
+#include <string>
+#include <string_view>
+
+#include "maya/SceneRecords.h"
+#include "tests/scan/HostileTexts.h"
+#include "tests/scan/TextRoom.h"
+
+namespace testsupport {
+namespace {
+
+constexpr std::string_view kCommand = "connectAttr \"curve.o\" \"node.tx\";\n";
+
+class ConnectionScoutTest : public ::testing::Test {
+ protected:
+  ConnectionScoutTest() {
+    curves_.Append(0, "curve");
+    transforms_.Append(0, "node");
+  }
+
+  // Looks ahead from every place of the text on, as if a command stood there. The text's NUL is the last byte
+  // that may be read.
+  void LookAheadEverywhere(std::string_view text) {
+    const char* const end = room_.Put(text, 0);
+    ConnectionScout scout;
+    for (const char* at = end - text.size(); at <= end; ++at) {
+      scout.LookAhead(at, end, curves_, transforms_);
+      ConnectionScout().LookAhead(at, end, curves_, transforms_);
+    }
+  }
+
+  NameIndex curves_;
+  NameIndex transforms_;
+  TextRoom room_;
+};
+
+TEST_F(ConnectionScoutTest, ACommandCutAtAnyByteIsReadNoFurther) {
+  std::string text;
+  for (int i = 0; i < 3; ++i) text += kCommand;
+  for (std::size_t size = 0; size <= text.size(); ++size) {
+    LookAheadEverywhere(std::string_view(text).substr(0, size));
+  }
+}
+
+TEST_F(ConnectionScoutTest, CommandsThatAreNotWholeAreReadNoFurther) {
+  const std::string longName(kNameCapacity * 3, 'n');
+  for (const std::string& command :
+       {std::string("connectAttr \""), std::string("connectAttr \"\" \"\";"),
+        std::string("connectAttr \".\" \"."),
+        "connectAttr \"" + longName + "." + longName + "\" \"" + longName,
+        std::string("connectAttr \"a.b\" \""), std::string("connectAttr \"a\\\".b\" \"c.d\";"),
+        std::string(5000, '\n'), std::string(5000, '"')}) {
+    LookAheadEverywhere("\n" + command);
+    LookAheadEverywhere("\n" + command + "\n" + command + "\n");
+  }
+}
+
+TEST_F(ConnectionScoutTest, RandomHostileTextsAreReadNoFurtherThanTheirEnd) {
+  constexpr int kTexts = 5'000;
+  HostileTexts texts(20261122);
+  for (int i = 0; i < kTexts; ++i) {
+    std::string text(texts.Next());
+    for (int commands = texts.Pick(0, 4); commands > 0; --commands) {
+      const auto place = static_cast<std::size_t>(texts.Pick(0, static_cast<int>(text.size())));
+      text.insert(place, kCommand.substr(0, static_cast<std::size_t>(texts.Pick(1, 33))));
+    }
+    LookAheadEverywhere(text);
+  }
+}
+
+// A text whose middle may not be read. Only a reader that keeps its bound never gets there.
+class Chasm {
+ public:
+  explicit Chasm(std::string_view before) {
+    const auto page = static_cast<std::size_t>(sysconf(_SC_PAGESIZE));
+    size_ = 3 * page;
+    void* const region = mmap(nullptr, size_, PROT_READ | PROT_WRITE, MAP_PRIVATE | MAP_ANONYMOUS, -1, 0);
+    if (region == MAP_FAILED) std::abort();
+    begin_ = static_cast<char*>(region);
+    text_ = begin_ + page - before.size();
+    std::memcpy(text_, before.data(), before.size());
+    if (mprotect(begin_ + page, page, PROT_NONE) != 0) std::abort();
+  }
+  ~Chasm() { munmap(begin_, size_); }
+  Chasm(const Chasm&) = delete;
+  Chasm& operator=(const Chasm&) = delete;
+
+  const char* text() const { return text_; }
+  const char* end() const { return begin_ + size_ - 1; }
+
+ private:
+  std::size_t size_ = 0;
+  char* begin_ = nullptr;
+  char* text_ = nullptr;
+};
+
+TEST_F(ConnectionScoutTest, OneCommandIsLookedForInTwoThousandBytesHoweverLongTheTextIs) {
+  constexpr std::size_t kBound = 2100;
+  const std::string longName(kBound, 'n');
+  for (const std::string& head :
+       {std::string(), std::string("\n"), std::string("\nconnectAttr \""), std::string("\nconnectAttr \"a."),
+        std::string("\nconnectAttr \"a.b\" \""), std::string("\nconnectAttr \"a.b\" \"c.")}) {
+    for (const char fill : {' ', 'n', ';'}) {
+      std::string text = head;
+      text.resize(kBound, fill);
+      const Chasm chasm(text);
+      ConnectionScout().LookAhead(chasm.text(), chasm.end(), curves_, transforms_);
+    }
+  }
+}
+
+TEST_F(ConnectionScoutTest, NoMoreThanEightCommandsAreLookedAtAhead) {
+  std::string text = "\n";
+  for (int i = 0; i < 8; ++i) text += kCommand;
+  const Chasm chasm(text + std::string(1, 'c'));
+  ConnectionScout().LookAhead(chasm.text(), chasm.end(), curves_, transforms_);
+}
+
+}  // namespace
+}  // namespace testsupport
