@@ -116,6 +116,15 @@ function(set_test_options name)
             MAYASCENE_MODULE="$<TARGET_FILE:MayaImport>")
 endfunction()
 
+# share_test_headers(NAME): has a library of tests begin with the precompiled headers of the test programs, and compiles
+# it as these are, for a program and not for a shared library.
+function(share_test_headers name)
+  set_test_options(${name})
+  set_target_properties(${name} PROPERTIES POSITION_INDEPENDENT_CODE OFF)
+  target_compile_options(${name} PRIVATE -fPIE)
+  target_precompile_headers(${name} REUSE_FROM test_headers)
+endfunction()
+
 # add_room_test(NAME [ALONE] SOURCES ... [LINKS ...]): one GoogleTest program; each of its tests is a test of ctest. The
 # headers that all test sources include are compiled once, for all programs. ALONE: it runs neither tool nor module.
 function(add_room_test name)
