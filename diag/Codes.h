@@ -55,6 +55,7 @@ enum class Code : std::uint16_t {
   DriverCircle = 403,
   SeveralTargets = 404,
   TwistSign = 405,
+  StereoRig = 406,
 };
 
 // Ordered: a later one is worse.

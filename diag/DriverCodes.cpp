@@ -54,6 +54,18 @@ constexpr Entry kDriverCodes[] = {
      .example = "createNode lookAt -n \"aim\";\n  setAttr \".tws\" 10;\ncreateNode transform -n \"shotCam\" "
                 "-p \"aim\";\nconnectAttr \"aim.crx\" \"shotCam.rx\";",
      .help = "Look at the roll of the camera in the result."},
+    {.code = Code::StereoRig,
+     .severity = Severity::Note,
+     .symbol = "StereoRig",
+     .sentence = "the two eyes of \"{0}\" are computed by a rule that is not certain",
+     .meaning = "Each eye of a stereo rig stands half of the separation beside the centre. Converged eyes "
+                "are turned to "
+                "the point of zero parallax; those off the axis have their film moved. Adjustments of the "
+                "rig are not "
+                "looked at.",
+     .example = "createNode stereoRigTransform -n \"rig\";\ncreateNode transform -n \"left\" -p \"rig\";\n"
+                "connectAttr \"rig.slo\" \"left.tx\";",
+     .help = "Look at the distance of the two eyes in the result."},
 };
 
 }  // namespace

@@ -34,8 +34,14 @@ constexpr AttributeRow kUnitConversion[] = {
 };
 
 constexpr AttributeRow kPairBlend[] = {
-    Triple("it1", "inTranslate1", 0),   Triple("it2", "inTranslate2", 0),
-    Triple("ir1", "inRotate1", 0),      Triple("ir2", "inRotate2", 0),
+    Compound("it1", "inTranslate1", 3), Single("itx1", "inTranslateX1", 0),
+    Single("ity1", "inTranslateY1", 0), Single("itz1", "inTranslateZ1", 0),
+    Compound("it2", "inTranslate2", 3), Single("itx2", "inTranslateX2", 0),
+    Single("ity2", "inTranslateY2", 0), Single("itz2", "inTranslateZ2", 0),
+    Compound("ir1", "inRotate1", 3),    Single("irx1", "inRotateX1", 0),
+    Single("iry1", "inRotateY1", 0),    Single("irz1", "inRotateZ1", 0),
+    Compound("ir2", "inRotate2", 3),    Single("irx2", "inRotateX2", 0),
+    Single("iry2", "inRotateY2", 0),    Single("irz2", "inRotateZ2", 0),
     Single("w", "weight", 1),           Single("txm", "translateXMode", 0),
     Single("tym", "translateYMode", 0), Single("tzm", "translateZMode", 0),
     Single("rm", "rotateMode", 0),      Single("ri", "rotInterpolation", 0),

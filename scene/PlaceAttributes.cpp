@@ -139,9 +139,16 @@ constexpr AttributeRow kStereoCamera[] = {
 };
 
 constexpr AttributeRow kStereoTransform[] = {
-    Single("slo", "stereoLeftOffset", 0),    Single("sla", "stereoLeftAngle", 0),
-    Single("fbol", "filmBackOutputLeft", 0), Single("sro", "stereoRightOffset", 0),
-    Single("sra", "stereoRightAngle", 0),    Single("fbor", "filmBackOutputRight", 0),
+    Single("sm", "stereo", 2),
+    Single("isep", "interaxialSeparation", 6.35),
+    Single("zp", "zeroParallax", 254),
+    Single("fli", "focalLengthInput", 35),
+    Single("slo", "stereoLeftOffset"),
+    Single("sla", "stereoLeftAngle"),
+    Single("fbol", "filmBackOutputLeft"),
+    Single("sro", "stereoRightOffset"),
+    Single("sra", "stereoRightAngle"),
+    Single("fbor", "filmBackOutputRight"),
 };
 
 constexpr AttributeRow kLocator[] = {

@@ -66,6 +66,17 @@ std::optional<Value> Scene::Written(NodeId node, std::string_view attribute, std
   return value;
 }
 
+std::vector<std::string_view> Scene::TouchedAttributes(NodeId node) const {
+  std::vector<std::string_view> touched;
+  for (std::uint32_t at = lists_[node].firstSetting; at != kNone; at = settings_[at].next) {
+    touched.push_back(settings_[at].attribute);
+  }
+  for (const Connection* const connection : ConnectionsInto(node)) {
+    touched.push_back(connection->destination.attribute);
+  }
+  return touched;
+}
+
 std::optional<double> Scene::Default(NodeId node, std::string_view attribute) const {
   if (const AttributeInfo* const info = FindAttribute(nodes_[node].type, attribute)) return info->fallback;
   const AddedAttribute* const added = FindAdded(node, attribute);

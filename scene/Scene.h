@@ -126,6 +126,10 @@ class Scene {
   // where nothing is written and there is no default.
   std::optional<double> Number(NodeId node, std::string_view attribute, std::int32_t index = kNoIndex) const;
 
+  // The attributes of which something is set or driven, by their long names as they stand in Plug; each as
+  // often as it is said.
+  std::vector<std::string_view> TouchedAttributes(NodeId node) const;
+
   // The default alone: that of addAttr, or that of the node's type.
   std::optional<double> Default(NodeId node, std::string_view attribute) const;
 

@@ -1,0 +1,103 @@
+#include "motion/Evaluator.h"
+
+#include <optional>
+#include <unordered_set>
+
+#include "motion/NodeTypes.h"
+#include "motion/PlaceSteps.h"
+
+namespace motion {
+
+Evaluator::Evaluator(const scene::Scene& scene, diag::Collector* diagnostics)
+    : scene_(scene), diagnostics_(diagnostics), measures_(MeasuresOf(scene)) {}
+
+Evaluator::~Evaluator() = default;
+
+NumberId Evaluator::Number(scene::NodeId node, std::string_view attribute, std::int32_t index) {
+  const NumberId id = Reserve(scene_.PlugOf(node, attribute, index));
+  Settle();
+  return id;
+}
+
+MatrixId Evaluator::Local(scene::NodeId node) {
+  const MatrixId id = ReserveMatrix(scene_.PlugOf(node, kMatrix));
+  Settle();
+  return id;
+}
+
+MatrixId Evaluator::World(scene::NodeId node) {
+  const MatrixId id = ReserveMatrix(scene_.PlugOf(node, kWorldMatrix));
+  Settle();
+  return id;
+}
+
+bool Evaluator::Moves(NumberId number) const {
+  const std::uint32_t step = numbers_[static_cast<std::size_t>(number)].step;
+  return step != kNone && moves_[step];
+}
+
+bool Evaluator::Moves(MatrixId matrix) const {
+  const std::uint32_t step = matrices_[static_cast<std::size_t>(matrix)].step;
+  return step != kNone && moves_[step];
+}
+
+const Transform& Evaluator::TransformOf(MatrixId local) const {
+  return locals_[static_cast<std::size_t>(local)]->transform;
+}
+
+double Evaluator::DefaultOf(NumberId number) const {
+  const scene::Plug& plug = numbers_[static_cast<std::size_t>(number)].plug;
+  return scene_.Default(plug.node, plug.attribute).value_or(0.0);
+}
+
+void Evaluator::MoveTo(double frame) {
+  values_.frame = frame;
+  for (const std::uint32_t step : moving_) steps_[step]->Run(&values_);
+  if (!values_.failed.empty()) ReportFailures();
+}
+
+void Evaluator::ReportFailures() {
+  for (const NumberId number : values_.failed) {
+    NumberCell& cell = numbers_[static_cast<std::size_t>(number)];
+    if (IsInput(cell.plug)) continue;
+    cell.standing = Standing::kFailed;
+    const std::optional<scene::Driver> driver = scene_.SourceOf(cell.plug);
+    if (!driver) continue;
+    diagnostics_->Report(diag::Code::DriverWithoutAnswer, driver->connection->destinationPlace,
+                         {NameOf(cell.plug), NameOf(driver->plug)});
+  }
+  values_.failed.clear();
+}
+
+// Whether the plug is what a node computes from, and no channel with a value to be kept: what is not known
+// there goes on to what the node drives.
+bool Evaluator::IsInput(const scene::Plug& plug) const {
+  const bool channel = scene::FindAttribute("transform", plug.attribute) != nullptr;
+  return !channel && FindNodeType(scene_.node(plug.node).type) != nullptr && std::isnan(StoredNumber(plug));
+}
+
+std::vector<Kept> Evaluator::KeptBelow(const std::vector<NumberId>& numbers,
+                                       const std::vector<MatrixId>& matrices) const {
+  std::vector<Kept> kept;
+  std::unordered_set<const void*> seen;  // cells and steps
+  std::vector<std::uint32_t> open;
+  const auto visit = [&](const auto& cell) {
+    if (!seen.insert(&cell).second) return;
+    const bool asDriven = cell.standing == Standing::kStored || cell.standing == Standing::kDriven;
+    if (!asDriven) kept.push_back({cell.plug, cell.standing});
+    if (cell.step != kNone && seen.insert(steps_[cell.step].get()).second) open.push_back(cell.step);
+  };
+  const auto visitNumber = [&](NumberId id) { visit(numbers_[static_cast<std::size_t>(id)]); };
+  const auto visitMatrix = [&](MatrixId id) { visit(matrices_[static_cast<std::size_t>(id)]); };
+  for (const NumberId id : numbers) visitNumber(id);
+  for (const MatrixId id : matrices) visitMatrix(id);
+  while (!open.empty()) {
+    const Step& step = *steps_[open.back()];
+    open.pop_back();
+    for (const NumberInput& input : step.numberInputs) visitNumber(input.cell);
+    for (const MatrixInput& input : step.matrixInputs) visitMatrix(input.cell);
+  }
+  return kept;
+}
+
+}  // namespace motion

@@ -1,0 +1,161 @@
+// The values of a scene at its frames.
+//
+// First say which values are wanted, then go from frame to frame:
+//
+//   Evaluator evaluator(scene, &diagnostics);
+//   const NumberId focal = evaluator.Number(camera, "focalLength");
+//   const MatrixId world = evaluator.World(transform);
+//   for (double frame : frames) {
+//     evaluator.MoveTo(frame);
+//     ... evaluator.Value(focal), evaluator.Value(world) ...
+//   }
+//
+// What a value depends on is found once and computed in that order at every frame; what does not move is
+// computed once. Time and memory grow with what is asked for and what that depends on; nothing is recursive.
+#pragma once
+
+#include <cmath>
+#include <cstdint>
+#include <memory>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "diag/Collector.h"
+#include "motion/Graph.h"
+#include "motion/Measures.h"
+#include "motion/Transform.h"
+#include "scene/FlatMap.h"
+#include "scene/Scene.h"
+
+namespace motion {
+
+class LocalStep;
+struct NodeType;
+
+// Why a value is what it is.
+enum class Standing : std::uint8_t {
+  kStored,       // nothing drives it
+  kDriven,       // computed
+  kUnsupported,  // what drives it cannot be computed: the stored value is kept
+  kCircle,       // it would drive itself: the stored value is kept
+  kFailed,       // what drives it has no answer at some frame: the stored value is kept there
+};
+
+// A channel that does not have the value that drives it.
+struct Kept {
+  scene::Plug plug;
+  Standing standing;
+};
+
+class Evaluator {
+ public:
+  // Both must outlive the evaluator. Diagnostics are given for what is asked for and what that depends on.
+  Evaluator(const scene::Scene& scene, diag::Collector* diagnostics);
+  ~Evaluator();
+  Evaluator(const Evaluator&) = delete;
+  Evaluator& operator=(const Evaluator&) = delete;
+
+  // ---- asking; values are there after the next MoveTo ----
+
+  // A number in the scene's units, to the bit as it is written where nothing drives it.
+  NumberId Number(scene::NodeId node, std::string_view attribute, std::int32_t index = scene::kNoIndex);
+
+  // From the node's space to its parent's, and to the world. Lengths in the scene's unit.
+  MatrixId Local(scene::NodeId node);
+  MatrixId World(scene::NodeId node);
+
+  // Whether the value can change from frame to frame.
+  bool Moves(NumberId number) const;
+  bool Moves(MatrixId matrix) const;
+
+  // What of all that these values depend on is not as it is driven, each once.
+  std::vector<Kept> KeptBelow(const std::vector<NumberId>& numbers,
+                              const std::vector<MatrixId>& matrices) const;
+
+  // ---- frames ----
+
+  // Any frame after any other; ascending ones are fastest.
+  void MoveTo(double frame);
+  // Of a number that is not known, the attribute's default, and 0 where it has none.
+  double Value(NumberId number) const {
+    const double value = values_[number];
+    return std::isnan(value) ? DefaultOf(number) : value;
+  }
+  const Matrix& Value(MatrixId matrix) const { return values_[matrix]; }
+
+  // What the local matrix of a node was made from, with the node's own lengths and radians.
+  const Transform& TransformOf(MatrixId local) const;
+
+  const Measures& measures() const { return measures_; }
+  const scene::Scene& scene() const { return scene_; }
+
+ private:
+  friend class Binder;
+  static constexpr std::uint32_t kNone = 0xffffffff;
+
+  struct NumberCell {
+    scene::Plug plug;
+    std::uint32_t step = kNone;  // that writes it
+    Standing standing = Standing::kStored;
+  };
+  struct MatrixCell {
+    scene::Plug plug;
+    std::uint32_t step = kNone;
+    Standing standing = Standing::kStored;
+  };
+  struct CellOfPlug {
+    std::uint32_t plusOne = 0;  // 0: none
+  };
+
+  // ---- cells and what writes them: EvaluatorCells.cpp ----
+
+  NumberId Reserve(const scene::Plug& plug);
+  const NodeType* TypeOfOutput(const scene::Plug& plug) const;
+  MatrixId ReserveMatrix(scene::Plug plug);
+  void Settle();
+  void Expand(NumberId number);
+  void ExpandMatrix(MatrixId matrix);
+  void MakeNode(const NodeType& type, scene::NodeId node);
+  bool CanGive(const scene::Driver& driver) const;
+  bool CanGiveMatrix(const scene::Plug& plug) const;
+  bool IsPlaced(scene::NodeId node) const;
+  bool IsInput(const scene::Plug& plug) const;
+  double DefaultOf(NumberId number) const;
+  double StoredNumber(const scene::Plug& plug) const;
+  Matrix StoredMatrix(const scene::Plug& plug) const;
+  void ReportUnsupported(const scene::Plug& plug, const scene::Driver& driver);
+  std::uint32_t AddStep(std::unique_ptr<Step> step);
+  NumberId AddNumber(const scene::Plug& plug);
+  std::string NameOf(const scene::Plug& plug) const;
+
+  // ---- the order of the steps: EvaluatorOrder.cpp ----
+
+  enum class State : std::uint8_t { kNew, kOpen, kPlaced };
+
+  void Order();
+  void OrderFrom(std::uint32_t root);
+  std::uint32_t StepOfInput(const Step& step, std::size_t input) const;
+  void CutCircle(Step* step, std::size_t input);
+  void Place(std::uint32_t step);
+  void ReportFailures();
+
+  const scene::Scene& scene_;
+  diag::Collector* diagnostics_;
+  Measures measures_;
+  std::vector<NumberCell> numbers_;
+  std::vector<MatrixCell> matrices_;
+  scene::FlatMap<CellOfPlug> numberOfPlug_;
+  scene::FlatMap<CellOfPlug> matrixOfPlug_;
+  std::vector<std::unique_ptr<Step>> steps_;
+  std::vector<State> states_;             // by step
+  std::vector<bool> moves_;               // by step
+  std::vector<const LocalStep*> locals_;  // by matrix; null where it is no local one
+  std::vector<std::uint32_t> moving_;     // in the order in which they are run
+  std::vector<NumberId> pendingNumbers_;
+  std::vector<MatrixId> pendingMatrices_;
+  std::size_t ordered_ = 0;  // the steps before it are in order
+  Values values_;
+};
+
+}  // namespace motion

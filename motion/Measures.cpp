@@ -1,0 +1,160 @@
+#include "motion/Measures.h"
+
+#include <algorithm>
+#include <iterator>
+
+#include "scene/Units.h"
+
+namespace motion {
+namespace {
+
+constexpr double kTicksPerSecond = 6000.0;
+
+// Without the X, Y or Z at the end.
+constexpr std::string_view kLengths[] = {
+    "translate",
+    "rotatePivot",
+    "rotatePivotTranslate",
+    "scalePivot",
+    "scalePivotTranslate",
+    "targetTranslate",
+    "targetRotatePivot",
+    "targetRotateTranslate",
+    "targetOffsetTranslate",
+    "constraintTranslate",
+    "constraintRotatePivot",
+    "constraintRotateTranslate",
+    "inTranslateX1",
+    "inTranslateY1",
+    "inTranslateZ1",
+    "inTranslateX2",
+    "inTranslateY2",
+    "inTranslateZ2",
+    "outTranslate",
+    "restTranslate",
+    "localPosition",
+    "orthographicWidth",
+    "centerOfInterest",
+    "focusDistance",
+    "nearClipPlane",
+    "farClipPlane",
+    "distanceBetween",
+    "interaxialSeparation",
+    "zeroParallax",
+    "stereoLeftOffset",
+    "stereoRightOffset",
+};
+constexpr std::string_view kAngles[] = {
+    "rotate",
+    "rotateAxis",
+    "jointOrient",
+    "targetRotate",
+    "targetJointOrient",
+    "targetOffsetRotate",
+    "constraintRotate",
+    "constraintJointOrient",
+    "twist",
+    "inRotateX1",
+    "inRotateY1",
+    "inRotateZ1",
+    "inRotateX2",
+    "inRotateY2",
+    "inRotateZ2",
+    "outRotate",
+    "restRotate",
+    "shutterAngle",
+    "stereoLeftAngle",
+    "stereoRightAngle",
+};
+
+bool IsOneOf(std::string_view name, const auto& names) {
+  return std::find(std::begin(names), std::end(names), name) != std::end(names);
+}
+
+std::string_view WithoutAxis(std::string_view name) {
+  const bool axis = !name.empty() && name.back() >= 'X' && name.back() <= 'Z';
+  return axis ? name.substr(0, name.size() - 1) : name;
+}
+
+bool EndsWith(std::string_view text, std::string_view end) {
+  return text.size() >= end.size() && text.substr(text.size() - end.size()) == end;
+}
+
+// animCurveTA: what it gives is the last letter, what it takes the one before.
+Kind KindOfCurve(std::string_view type, std::string_view attribute) {
+  if (attribute == "input")
+    return EndsWith(type.substr(0, type.size() - 1), "T") ? Kind::kTime : Kind::kPlain;
+  if (attribute != "output") return Kind::kPlain;
+  switch (type.back()) {
+    case 'L':
+      return Kind::kLength;
+    case 'A':
+      return Kind::kAngle;
+    case 'T':
+      return Kind::kTime;
+    default:
+      return Kind::kPlain;
+  }
+}
+
+// The offset of a constraint measures what the constraint sets.
+Kind KindOfOffset(std::string_view type) {
+  if (type == "pointConstraint") return Kind::kLength;
+  return type == "scaleConstraint" ? Kind::kPlain : Kind::kAngle;
+}
+
+Kind KindOfBlend(std::string_view type, std::string_view attribute) {
+  const bool value = attribute == "inputA" || attribute == "inputB" || attribute == "output";
+  if (!value) return Kind::kPlain;
+  if (EndsWith(type, "DL") || EndsWith(type, "FL")) return Kind::kLength;
+  return EndsWith(type, "DA") || EndsWith(type, "FA") ? Kind::kAngle : Kind::kPlain;
+}
+
+// The inputs of these measure whatever drives them.
+bool TakesAnything(std::string_view type) { return type == "unitConversion" || type == "blendWeighted"; }
+
+Kind KindByName(const scene::Scene& scene, const scene::Plug& plug) {
+  const std::string_view type = scene.node(plug.node).type;
+  const std::string_view attribute = WithoutAxis(plug.attribute);
+  if (type.starts_with("animCurve")) return KindOfCurve(type, plug.attribute);
+  if (type.starts_with("animBlendNodeAdditive")) return KindOfBlend(type, plug.attribute);
+  if (type == "time") return plug.attribute == "outTime" ? Kind::kTime : Kind::kPlain;
+  if (attribute == "offset" && scene::FindAttribute(type, "offset") != nullptr) return KindOfOffset(type);
+  if (IsOneOf(attribute, kLengths) || IsOneOf(plug.attribute, kLengths)) return Kind::kLength;
+  return IsOneOf(attribute, kAngles) || IsOneOf(plug.attribute, kAngles) ? Kind::kAngle : Kind::kPlain;
+}
+
+}  // namespace
+
+Measures MeasuresOf(const scene::Scene& scene) {
+  Measures measures;
+  if (const auto rate = scene::TimeUnitOf(scene.timeUnit().word))
+    measures.framesPerSecond = rate->perSecond();
+  if (const auto length = scene::LinearUnitOf(scene.linearUnit().word)) measures.centimetres = *length;
+  if (scene::AngularUnitOf(scene.angularUnit().word) == scene::AngularUnit::Radian) measures.radians = 1.0;
+  return measures;
+}
+
+Kind KindOf(const scene::Scene& scene, const scene::Plug& plug) {
+  if (TakesAnything(scene.node(plug.node).type) && plug.attribute == "input") {
+    const auto driver = scene.SourceOf(plug);
+    return driver ? KindByName(scene, driver->plug) : Kind::kPlain;
+  }
+  return KindByName(scene, plug);
+}
+
+double InternalUnits(const Measures& measures, Kind kind) {
+  switch (kind) {
+    case Kind::kLength:
+      return measures.centimetres;
+    case Kind::kAngle:
+      return measures.radians;
+    case Kind::kTime:
+      return kTicksPerSecond / measures.framesPerSecond;
+    case Kind::kPlain:
+      break;
+  }
+  return 1.0;
+}
+
+}  // namespace motion

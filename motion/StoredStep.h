@@ -1,0 +1,43 @@
+// Cells that another cell drives, with the value that the scene writes for them, if any: it is taken where
+// the other one is not known.
+#pragma once
+
+#include "motion/Graph.h"
+
+namespace motion {
+
+class StoredStep final : public Step {
+ public:
+  explicit StoredStep(double stored) : stored_(stored) {}
+
+  void Run(Values* values) override {
+    const bool known = Load(*values);
+    if (!known && !failed_) {
+      failed_ = true;
+      values->failed.push_back(output);
+    }
+    (*values)[output] = known ? input : stored_;
+  }
+
+  double input = 0.0;
+  NumberId output{};
+
+ private:
+  double stored_;
+  bool failed_ = false;
+};
+
+class StoredMatrixStep final : public Step {
+ public:
+  explicit StoredMatrixStep(const Matrix& stored) : stored_(stored) {}
+
+  void Run(Values* values) override { (*values)[output] = Load(*values) ? input : stored_; }
+
+  Matrix input;
+  MatrixId output{};
+
+ private:
+  Matrix stored_;
+};
+
+}  // namespace motion
