@@ -1,13 +1,15 @@
 #include "scene/Cursor.h"
 
 #include <algorithm>
-#include <bit>
-#include <cstring>
+#include <iterator>
 
+#include "scan/FindAnyOf.h"
 #include "scene/ByteClasses.h"
 
 namespace scene {
 namespace {
+
+using scan::FindAnyOf;
 
 // Commands that a scene is made of. One of them at the start of a line begins a new command, also where the
 // last one has not ended.
@@ -17,29 +19,9 @@ constexpr std::string_view kCommands[] = {
     "rename",  "requires",      "relationship", "select",     "setAttr",
 };
 
+constexpr std::size_t kShortestCommand = 4;
+
 constexpr std::string_view kConflictMarks[] = {"<<<<<<<", "=======", ">>>>>>>", "|||||||"};
-
-// Marks each byte of the eight that equals c by its highest bit. Only the lowest mark is sure.
-std::uint64_t MarkEqual(std::uint64_t bytes, char c) {
-  constexpr std::uint64_t kEach = 0x0101010101010101u;
-  const std::uint64_t difference = bytes ^ (kEach * static_cast<unsigned char>(c));
-  return (difference - kEach) & ~difference & (kEach * 0x80);
-}
-
-// The first of the characters from `at` on, or `end`.
-template <char... kWanted>
-const char* FindAnyOf(const char* at, const char* end) {
-  if constexpr (std::endian::native == std::endian::little) {
-    for (; end - at >= 8; at += 8) {
-      std::uint64_t bytes = 0;
-      std::memcpy(&bytes, at, sizeof bytes);
-      const std::uint64_t marks = (MarkEqual(bytes, kWanted) | ...);
-      if (marks != 0) return at + std::countr_zero(marks) / 8;
-    }
-  }
-  while (at != end && ((*at != kWanted) && ...)) ++at;
-  return at;
-}
 
 }  // namespace
 
@@ -134,7 +116,8 @@ void Cursor::SkipLine() {
 }
 
 bool Cursor::AtConflictMark() const {
-  if (!atLineStart()) return false;
+  const char first = Peek();
+  if ((first != '<' && first != '=' && first != '>' && first != '|') || !atLineStart()) return false;
   const std::string_view start = rest().substr(0, kMarkLength);
   if (std::find(std::begin(kConflictMarks), std::end(kConflictMarks), start) == std::end(kConflictMarks))
     return false;
@@ -155,6 +138,7 @@ bool Cursor::CommandAt(const char* at) const {
   while (at != end_ && IsByte(*at, kLetterByte)) ++at;
   if (at == end_ || !IsByte(*at, kSpaceByte)) return false;
   const std::string_view word(start, static_cast<std::size_t>(at - start));
+  if (word.size() < kShortestCommand) return false;
   return std::find(std::begin(kCommands), std::end(kCommands), word) != std::end(kCommands);
 }
 

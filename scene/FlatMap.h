@@ -38,42 +38,55 @@ class FlatMap {
   // Null where the key was never asked for by At.
   const Value* Find(std::uint64_t number, std::string_view name) const {
     if (entries_.empty()) return nullptr;
-    const Entry& entry = entries_[SlotOf(entries_, number, name)];
-    return entry.used ? &entry.value : nullptr;
+    const Entry& entry = entries_[SlotOf(number, name, HashOf(name, number))];
+    return entry.hash != kUnused ? &entry.value : nullptr;
   }
 
   // Valid until the next call.
   Value& At(std::uint64_t number, std::string_view name) {
     if ((used_ + 1) * 3 > entries_.size() * 2) Grow();
-    Entry& entry = entries_[SlotOf(entries_, number, name)];
-    if (!entry.used) {
-      entry = {name, Value{}, number, true};
+    const std::uint64_t hash = HashOf(name, number);
+    Entry& entry = entries_[SlotOf(number, name, hash)];
+    if (entry.hash == kUnused) {
+      entry = {name, number, Kept(hash), Value{}};
       ++used_;
     }
     return entry.value;
   }
 
  private:
+  static constexpr std::uint32_t kUnused = 0;
+
+  // The hash is kept so that hardly any other name is looked at, and none when the table grows.
   struct Entry {
     std::string_view name;
-    Value value{};
     std::uint64_t number = 0;
-    bool used = false;
+    std::uint32_t hash = kUnused;
+    Value value{};
   };
 
-  static std::size_t SlotOf(const std::vector<Entry>& entries, std::uint64_t number, std::string_view name) {
-    const std::size_t mask = entries.size() - 1;
-    std::size_t slot = static_cast<std::size_t>(HashOf(name, number)) & mask;
-    while (entries[slot].used && (entries[slot].number != number || entries[slot].name != name)) {
-      slot = (slot + 1) & mask;
+  // The part of a hash that the slot depends on, made different from kUnused.
+  static std::uint32_t Kept(std::uint64_t hash) { return static_cast<std::uint32_t>(hash) | 1u << 31; }
+
+  std::size_t SlotOf(std::uint64_t number, std::string_view name, std::uint64_t hash) const {
+    const std::uint32_t kept = Kept(hash);
+    const std::size_t mask = entries_.size() - 1;
+    std::size_t slot = kept & mask;
+    for (;; slot = (slot + 1) & mask) {
+      const Entry& entry = entries_[slot];
+      if (entry.hash == kUnused || (entry.hash == kept && entry.number == number && entry.name == name))
+        return slot;
     }
-    return slot;
   }
 
   void Grow() {
     std::vector<Entry> larger(entries_.empty() ? 16 : entries_.size() * 2);
+    const std::size_t mask = larger.size() - 1;
     for (const Entry& entry : entries_) {
-      if (entry.used) larger[SlotOf(larger, entry.number, entry.name)] = entry;
+      if (entry.hash == kUnused) continue;
+      std::size_t slot = entry.hash & mask;
+      while (larger[slot].hash != kUnused) slot = (slot + 1) & mask;
+      larger[slot] = entry;
     }
     entries_ = std::move(larger);
   }

@@ -1,9 +1,6 @@
 #include "scene/Value.h"
 
-#include <charconv>
-#include <cmath>
-#include <system_error>
-
+#include "scan/Decimal.h"
 #include "scene/ByteClasses.h"
 #include "scene/Cursor.h"
 #include "scene/Text.h"
@@ -33,31 +30,36 @@ void SkipBetween(Cursor& cursor) {
 }  // namespace
 
 std::optional<double> NumberOf(std::string_view word) {
-  if (word.size() > 1 && word[0] == '+' && word[1] != '-') word.remove_prefix(1);
+  // A number that letters follow is none here: where a scene has units, they are words of their own.
   if (word.empty() || !(IsByte(word.back(), kDigitByte) || word.back() == '.')) return std::nullopt;
   double value = 0.0;
-  const auto [end, error] = std::from_chars(word.data(), word.data() + word.size(), value);
-  if (end != word.data() + word.size()) return std::nullopt;
-  if (error == std::errc()) return value;
-  // Too small or too large: only a negative exponent makes a number too small.
-  const std::size_t exponent = word.find_first_of("eE");
-  const bool small = error == std::errc::result_out_of_range && exponent != std::string_view::npos &&
-                     exponent + 1 < word.size() && word[exponent + 1] == '-';
-  if (small) return word[0] == '-' ? -0.0 : 0.0;
-  return std::nullopt;
+  const auto status = scan::ReadNumber(word.data(), static_cast<std::int64_t>(word.size()), &value);
+  return status == scan::NumberStatus::Ok ? std::optional<double>(value) : std::nullopt;
 }
 
 std::vector<double> Value::Numbers(std::size_t most) const {
   std::vector<double> numbers;
   Cursor cursor(text_);
+  // A number before the last white space ends within the text, so that it can be read without looking for its
+  // end.
+  const std::size_t lastSpace = text_.find_last_of(" \t\n\r");
+  const char* const sure = text_.data() + (lastSpace == std::string_view::npos ? 0 : lastSpace);
   for (std::size_t passed = 0; numbers.size() < most;) {
     SkipBetween(cursor);
-    const std::optional<double> number = NumberOrFlag(cursor.TakeWord());
-    if (!number) break;
+    const char* const at = cursor.rest().data();
+    double value = 0.0;
+    const char* const after = at < sure ? scan::ReadPlainNumber(at, sure, ' ', &value) : nullptr;
+    if (after != nullptr) {
+      cursor.Advance(static_cast<std::size_t>(after - at));
+    } else {
+      const std::optional<double> number = NumberOrFlag(cursor.TakeWord());
+      if (!number) break;
+      value = *number;
+    }
     if (passed < first_) {
       ++passed;
     } else {
-      numbers.push_back(*number);
+      numbers.push_back(value);
     }
   }
   return numbers;
