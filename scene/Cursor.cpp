@@ -51,7 +51,7 @@ bool Cursor::SkipComment(std::uint32_t* openComment) {
     return true;
   }
   noCommentEnd_ = true;
-  if (openComment != nullptr && *openComment == kNone) *openComment = offset();
+  if (*openComment == kNone) *openComment = offset();
   do {
     SkipLine();
   } while (at_ != end_ && !CommandAt(at_));
@@ -79,9 +79,10 @@ std::string_view Cursor::TakeString(bool* closed, bool* escaped) {
     if (*at_ == '\\') {
       *escaped = true;
       at_ += std::min<std::ptrdiff_t>(2, end_ - at_);
-      continue;
+      if (at_[-1] != '\n') continue;
+    } else {
+      ++at_;
     }
-    ++at_;
     // A line that begins like a command is either part of a text over several lines, or the string was left
     // open. What the next quote does says which.
     if (!CommandAt(at_)) continue;
@@ -169,9 +170,12 @@ CommandStop Cursor::FindCommandEnd(bool strange) {
         if (AtConflictMark()) return {StopKind::ConflictMark, offset()};
         if (CommandAt(at_)) return {StopKind::NextCommand, offset()};
         break;
-      case '/':
-        if (!SkipComment(nullptr)) ++at_;
+      case '/': {
+        std::uint32_t openComment = kNone;
+        if (!SkipComment(&openComment)) ++at_;
+        if (openComment != kNone) return {StopKind::OpenComment, openComment};
         break;
+      }
       case '{':
         if (Peek(1) == '{') return {StopKind::StrangeByte, found};
         ++at_;

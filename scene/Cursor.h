@@ -14,12 +14,13 @@ enum class StopKind {
   ConflictMark,  // at a line with the mark of a merge conflict
   StrangeByte,   // at a byte that means nothing here, or at the "{{" of a template field
   OpenString,    // a string is never closed
+  OpenComment,   // a comment has no end
   TextEnd,
 };
 
 struct CommandStop {
   StopKind kind;
-  std::uint32_t offset;  // of what is named above; for an open string, of its quote
+  std::uint32_t offset;  // of what is named above, at its beginning
 };
 
 class Cursor {
@@ -64,7 +65,8 @@ class Cursor {
   bool AtCommandOnItsOwnLine() const;
 
   // To where the command ends, or where it turns out not to. Strings and comments are passed over. With
-  // `strange`, stops at strange bytes too. After an open string the cursor stands where reading can go on.
+  // `strange`, stops at strange bytes too. After an open string or comment the cursor stands where reading
+  // can go on: at the next command.
   CommandStop FindCommandEnd(bool strange);
 
  private:

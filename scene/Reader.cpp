@@ -202,6 +202,9 @@ bool Reader::FindEnd(bool strange, std::uint32_t* end) {
     case StopKind::OpenString:
       diagnostics_->Report(Code::OpenString, {stop.offset, 1});
       return false;
+    case StopKind::OpenComment:
+      diagnostics_->Report(Code::OpenComment, {stop.offset, 2});
+      return false;
     default:
       diagnostics_->Report(Code::CommandCutOff, {commandOffset_, command_.size()}, {command_});
       return false;

@@ -57,12 +57,13 @@ void Reader::ReadParent() {
   }
   if (names.empty()) return Lacks("a node");
   NodeId parent = kNoNode;
+  const diag::Range place = names.back().place;
   if (!toTop) {
     parent = builder_.Resolve(names.back());
     names.pop_back();
   }
   if (names.empty()) {
-    if (current_ != kNoNode) builder_.MoveUnder(current_, parent);
+    if (current_ != kNoNode) builder_.MoveUnder(current_, parent, place);
     return;
   }
   for (const Named& name : names) {
@@ -71,7 +72,7 @@ void Reader::ReadParent() {
     if (instance) {
       builder_.AddInstance(node, parent);
     } else {
-      builder_.MoveUnder(node, parent);
+      builder_.MoveUnder(node, parent, name.place);
     }
   }
 }

@@ -34,7 +34,8 @@ class SceneBuilder {
   NodeId FindCreated(Named name, std::string_view command);
 
   void Rename(NodeId node, Named name);
-  void MoveUnder(NodeId node, NodeId parent);  // kNoNode: to the top
+  // kNoNode: to the top.
+  void MoveUnder(NodeId node, NodeId parent, diag::Range place);
   void AddInstance(NodeId node, NodeId parent);
   void SetNameSpace(std::string_view nameSpace);  // of names to come; without ":"
 
@@ -75,6 +76,7 @@ class SceneBuilder {
   std::string_view OwnName(Named name);
   std::string_view FreeName(NodeId parent, std::string_view name);
   NodeId NodeFromElsewhere(Named name);
+  bool IsElsewhere(NodeId id, diag::Range place, std::string_view command);
   Plug PlugOf(Named plug);
   void Index(std::uint32_t connection);
 

@@ -113,8 +113,16 @@ NodeId SceneBuilder::FindCreated(Named name, std::string_view command) {
   return match.node;
 }
 
+// Whether the node is not the file's own, and cannot be changed. It is reported.
+bool SceneBuilder::IsElsewhere(NodeId id, diag::Range place, std::string_view command) {
+  if (scene_.nodes_[id].origin != Origin::Elsewhere) return false;
+  diagnostics_->Report(diag::Code::UnknownNode, place, {command, scene_.nodes_[id].name});
+  return true;
+}
+
 void SceneBuilder::Rename(NodeId id, Named name) {
   Node& node = scene_.nodes_[id];
+  if (IsElsewhere(id, name.place, "rename")) return;
   const std::string_view own = OwnName(name);
   if (own.empty() || own == node.name) return;
   scene_.names_.Remove(id, node.parent, node.name);
@@ -124,8 +132,9 @@ void SceneBuilder::Rename(NodeId id, Named name) {
   scene_.names_.Add(id, node.parent, free);
 }
 
-void SceneBuilder::MoveUnder(NodeId id, NodeId parent) {
+void SceneBuilder::MoveUnder(NodeId id, NodeId parent, diag::Range place) {
   Node& node = scene_.nodes_[id];
+  if (IsElsewhere(id, place, "parent")) return;
   if (node.parent == parent) return;
   scene_.names_.Remove(id, node.parent, node.name);
   const std::string_view free = FreeName(parent, node.name);

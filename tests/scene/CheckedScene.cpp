@@ -46,12 +46,10 @@ class Checker {
     const std::size_t count = scene_.nodes().size();
     std::vector<int> listed(count, 0);
     std::vector<std::size_t> children(count, 0);
-    std::size_t roots = 0;
     for (NodeId id = 0; id < count; ++id) {
       const scene::Node& node = scene_.node(id);
       Require(InText(node.place), "a node has its place in the text");
       Require(node.parent == kNoNode || node.parent < count, "a parent is a node");
-      roots += node.parent == kNoNode ? 1 : 0;
       NodeId before = 0;
       for (NodeId child = node.firstChild; child != kNoNode; child = scene_.node(child).nextSibling) {
         Require(child >= before, "children are in the order of the file");

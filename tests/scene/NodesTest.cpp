@@ -134,6 +134,19 @@ TEST_F(NodesTest, ARenamedNodeGivesItsNameFree) {
   EXPECT_THAT(Paths(), ElementsAre("|a1", "|a"));
 }
 
+TEST_F(NodesTest, ANodeFromElsewhereIsNeitherRenamedNorMoved) {
+  Read(
+      "createNode transform -n \"a\";select -ne \"hero:b\";\nrename \"c\";\nparent \"a\";\nparent -w "
+      "\"hero:b\";");
+  EXPECT_EQ(scene_.Find("c"), kNoNode);
+  EXPECT_EQ(scene_.PathOf(At("hero:b")), "hero:b");
+  EXPECT_THAT(
+      Diagnostics(),
+      ElementsAre("2:9: the command \"rename\" names \"hero:b\", which the file does not create [MA0207]",
+                  "3:9: the command \"parent\" names \"hero:b\", which the file does not create [MA0207]",
+                  "4:12: the command \"parent\" names \"hero:b\", which the file does not create [MA0207]"));
+}
+
 TEST_F(NodesTest, ParentMovesNodes) {
   Read(
       "createNode transform -n \"a\";createNode transform -n \"b\";createNode transform -n \"c\" -p \"a\";"

@@ -79,6 +79,8 @@ TEST_F(ReadingTest, AnOpenCommentEndsBeforeTheNextCommand) {
   EXPECT_THAT(Between("setAttr \".tx\" /* open\n5;"),
               ElementsAre("2:15: this comment has no end [MA0102]",
                           "2:1: the command \"setAttr\" has no \";\" before the next command [MA0104]"));
+  EXPECT_THAT(Between("someCommand /* open\n; \""), ElementsAre("2:13: this comment has no end [MA0102]"));
+  EXPECT_THAT(Between("setAttr \".tx\" 5 /* open"), ElementsAre("2:17: this comment has no end [MA0102]"));
   EXPECT_THAT(Between("/* one\nsetAttr \".tx\" 5;\n/* two"),
               ElementsAre("2:1: this comment has no end [MA0102]", "4:1: this comment has no end [MA0102]"));
   EXPECT_EQ(scene_.Number(At("before"), "tx"), 5.0);
