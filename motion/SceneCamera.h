@@ -1,0 +1,40 @@
+// The camera of a scene at a frame, and the picture that the scene renders.
+#pragma once
+
+#include <array>
+#include <string_view>
+#include <vector>
+
+#include "motion/Camera.h"
+#include "motion/Evaluator.h"
+
+namespace motion {
+
+// Asks an evaluator for all that a camera's picture depends on.
+class SceneCamera {
+ public:
+  // The evaluator must outlive the camera. `shape` is a node of a camera's type.
+  SceneCamera(Evaluator* evaluator, scene::NodeId shape);
+
+  // The camera at the frame that the evaluator stands at.
+  Camera Now() const;
+
+  // Whether anything of it can change from frame to frame.
+  bool Moves() const;
+
+  // What is asked for, for Evaluator::KeptBelow.
+  std::vector<NumberId> Numbers() const { return {numbers_.begin(), numbers_.end()}; }
+
+ private:
+  static constexpr std::size_t kNumbers = 13;
+
+  double Value(std::size_t attribute) const { return evaluator_->Value(numbers_[attribute]); }
+
+  Evaluator* evaluator_;
+  std::array<NumberId, kNumbers> numbers_{};
+};
+
+// The picture of a scene's render settings. Where it is silent, the defaults of the version that wrote it.
+Picture PictureOf(const scene::Scene& scene);
+
+}  // namespace motion
