@@ -5,15 +5,15 @@
 //
 //   bytes                 2 . 5 _ - 1 ; _ s e t A t t r _
 //   terminator            . . . 1 . . 1 1 . . . . . . . 1   white space and ";"
-//   terminator << 1 | 1   1 . . . 1 . . 1 1 . . . . . . .   comes after one, or is the first byte
+//   terminator << 1 | 1   1 . . . 1 . . 1 1 . . . . . . .   comes after one, or is the first byte of all
 //   starts                1 . . . 1 . . . 1 . . . . . . .   of words: the above without terminators
 //   harmless              1 1 1 . . 1 . . . 1 1 1 1 1 1 .   letters but c and s, digits, "."
 //   dash                  . . . . 1 . . . . . . . . . . .
 //   wordByte >> 1         1 1 . 1 1 . . 1 1 1 1 1 1 1 . .   a letter, digit, "-" or "." is next
 //   stops                 . . . . . . . . 1 . . . . . . .   starts & ~(harmless | dash & wordByte >> 1)
 //
-// So "2.5" and "-1;" are passed over, and the reader goes on at "setAttr". Where the highest bit of
-// `terminator` is set, as here, a word may start at the next block's first byte.
+// So "2.5" and "-1;" are passed over, and the reader goes on at "setAttr". Masks are made only of the first
+// block and of those where something may stop.
 #pragma once
 
 #include <bit>
@@ -40,14 +40,25 @@ inline constexpr bool IsWordByte(char c) { return IsLetter(c) || IsNumberStart(c
 
 enum class SkipWhere { BetweenCommands, InCommand };
 
-template <SkipWhere kWhere, typename Classify>
+// `Processor` has two functions of its own:
+//
+//   BlockMasks Classify(block)                   of the 64 bytes of a block
+//   const char* PassQuiet<kWhere>(block, end, lines)
+//
+// PassQuiet decides in vector registers that nothing stops in a block, which is so for most of them: it
+// passes over such blocks and returns the first one in which something may stop, or which is not whole. A "-"
+// is looked at together with the byte after it, so that one at the very end is left open. The bytes before
+// those of a block are a second load, one byte earlier, and part of the text. Line feeds are counted by
+// subtracting a comparison, 0 or -1 in each byte, from a vector of counters, which is emptied before one of
+// them is full.
+template <SkipWhere kWhere, typename Processor>
 [[gnu::always_inline]] inline const char* SkipBlocks(const char* position, const char* end,
-                                                     std::int32_t* lines, Classify classify) {
-  std::uint64_t boundary = 1;  // whether a token may start at the block's first byte
+                                                     std::int32_t* lines) {
   const char* block = position;
-  for (; end - block >= kSkipBlock; block += kSkipBlock) {
-    const BlockMasks masks = classify(block);
-    const std::uint64_t starts = ~masks.terminator & (masks.terminator << 1 | boundary);
+  const auto startsWord = [&] { return block == position || IsWordEnd(block[-1]); };
+  while (end - block >= kSkipBlock) {
+    const BlockMasks masks = Processor::Classify(block);
+    const std::uint64_t starts = ~masks.terminator & (masks.terminator << 1 | std::uint64_t{startsWord()});
     const std::uint64_t beforeWord = masks.wordByte >> 1 | std::uint64_t{IsWordByte(block[kSkipBlock])} << 63;
     std::uint64_t stops = starts & ~(masks.harmless | (masks.dash & beforeWord));
     if constexpr (kWhere == SkipWhere::InCommand) stops = (starts & ~masks.harmless) | masks.semicolon;
@@ -57,10 +68,11 @@ template <SkipWhere kWhere, typename Classify>
       return block + at;
     }
     *lines += std::popcount(masks.lineFeed);
-    boundary = masks.terminator >> 63;
+    block = Processor::template PassQuiet<kWhere>(block + kSkipBlock, end, lines);
+    if (block[-1] == '-') --block;  // whether it stops depends on what comes after it
   }
   // A word that the last block cuts is left to be read whole.
-  if (boundary == 0) {
+  if (!startsWord()) {
     while (block != position && !IsWordEnd(block[-1])) --block;
   }
   return block;

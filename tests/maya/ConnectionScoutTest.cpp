@@ -104,7 +104,6 @@ class Chasm {
 
 TEST_F(ConnectionScoutTest, OneCommandIsLookedForInTwoThousandBytesHoweverLongTheTextIs) {
   constexpr std::size_t kBound = 2100;
-  const std::string longName(kBound, 'n');
   for (const std::string& head :
        {std::string(), std::string("\n"), std::string("\nconnectAttr \""), std::string("\nconnectAttr \"a."),
         std::string("\nconnectAttr \"a.b\" \""), std::string("\nconnectAttr \"a.b\" \"c.")}) {

@@ -106,7 +106,7 @@ FAULTS = (
     Fault("the unit palf is taken for pal", "maya/MAYA_Parse_Units.cpp",
           "{\"palf\", kPalField}", "{\"palf\", kPal}"),
     Fault("a word that two blocks share begins twice", "scan/SkipTextBlocks.h",
-          "boundary = masks.terminator >> 63;", "boundary = 1;"),
+          "return block == position || IsWordEnd(block[-1]);", "return true;"),
 
     # --- comp/ ---
     Fault("a rotation about Y keeps its sign", "comp/MAYA_Parse_Transform.cpp",
