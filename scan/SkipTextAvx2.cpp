@@ -24,8 +24,8 @@ struct Rectangle {
 
 // A byte has the bits that the entries of both its nibbles have.
 struct NibbleTables {
-  alignas(16) char low[16];
-  alignas(16) char high[16];
+  alignas(16) std::uint8_t low[16];
+  alignas(16) std::uint8_t high[16];
 
   template <std::size_t kCount>
   explicit constexpr NibbleTables(const Rectangle (&rectangles)[kCount]) : low(), high() {
@@ -37,14 +37,16 @@ struct NibbleTables {
 
   // As the look-up finds it: a byte of 128 and above finds nothing among the low nibbles.
   constexpr unsigned BitsOf(unsigned byte) const {
-    return byte < 128 ? static_cast<unsigned char>(low[byte % 16] & high[byte / 16]) : 0u;
+    return byte < 128 ? unsigned{low[byte % 16]} & high[byte / 16] : 0;
   }
 
  private:
   static constexpr unsigned NibbleOf(char digit) {
     return static_cast<unsigned>(digit <= '9' ? digit - '0' : digit - 'a' + 10);
   }
-  static constexpr void Add(unsigned bit, char* entry) { *entry = static_cast<char>(*entry | bit); }
+  static constexpr void Add(unsigned bit, std::uint8_t* entry) {
+    *entry = static_cast<std::uint8_t>(*entry | bit);
+  }
 };
 
 constexpr std::string_view kLettersLessC = "12456789abcdef";  // from A, a to O, o
@@ -124,8 +126,8 @@ TARGET_AVX2 inline __m256i Load(const char* at) {
   return _mm256_loadu_si256(reinterpret_cast<const __m256i*>(at));
 }
 
-TARGET_AVX2 inline __m256i TableOf(const char (&entries)[16]) {
-  return _mm256_broadcastsi128_si256(_mm_load_si128(reinterpret_cast<const __m128i*>(entries)));
+TARGET_AVX2 inline __m256i TableOf(const void* entries) {
+  return _mm256_broadcastsi128_si256(_mm_load_si128(static_cast<const __m128i*>(entries)));
 }
 
 TARGET_AVX2 inline __m256i Equal(__m256i bytes, char c) {
