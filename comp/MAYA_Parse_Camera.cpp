@@ -1,8 +1,8 @@
 // The lens of a camera layer: film size, zoom, and the place of its transform. Reads the resolution, the
 // pixel aspect and `transforms`; calls the layer, stream and camera suites.
 #include "comp/Conversions.h"
-#include "comp/LayerStreams.h"
 #include "hostapi/CameraSuite.h"
+#include "hostapi/LayerStreams.h"
 #include "hostapi/LayerSuite.h"
 #include "maya/ListAccess.h"
 #include "maya/MAYA_Parse.h"
@@ -11,11 +11,11 @@
 void MAYA_Parse::SetCamera(VOR_Layer* layer, const MAYA_Camera* camera) {
   constexpr std::uint8_t kOff = 0;
   ThrowOnError(LayerSuite10().SetLayerFlag(layer, HOST_LAYER_FLAG_AIMED, kOff));
-  SetUnguarded(layer, kPositionStream, 0.0);
+  SetUnguarded(layer, HOST_STREAM_POSITION, 0.0);
   const double filmSize = CalculatePixelFit(camera);
   const std::int32_t direction = camera->filmFit != 0 ? HOST_FILM_VERTICAL : HOST_FILM_HORIZONTAL;
   ThrowOnError(CameraSuite2().SetCameraFilmSize(layer, direction, &filmSize));
-  SetUnguarded(layer, kZoomStream, CalculateZoom(camera, filmSize, nullptr));
+  SetUnguarded(layer, HOST_STREAM_ZOOM, CalculateZoom(camera, filmSize, nullptr));
 
   const std::int32_t parent = transformNames_.Find(camera->parent);
   if (parent == kNoIndex) return;

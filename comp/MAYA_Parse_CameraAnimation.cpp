@@ -1,7 +1,7 @@
 // A camera's animation: zoom keys from its focal-length curve, then the keys of its transform. Reads
 // `curves`, `transforms` and the settings; calls the stream and keyframe suites.
-#include "comp/LayerStreams.h"
 #include "hostapi/KeyframeSuite.h"
+#include "hostapi/LayerStreams.h"
 #include "maya/ListAccess.h"
 #include "maya/MAYA_Parse.h"
 #include "plugin/Globals.h"
@@ -23,7 +23,7 @@ void MAYA_Parse::ApplyZoomAnimation(VOR_Layer* layer, const MAYA_Camera* camera)
     const auto curve = FetchRecord<MAYA_AnimCurve>(curves, camera->focalLengthCurve);
     // Deliberate: one key is enough here, while a channel of a transform is animated from two keys upwards.
     if (RecordCount(curve.keys) < 1) return;
-    stream = AcquireStream(layer, kZoomStream);
+    stream = AcquireStream(layer, HOST_STREAM_ZOOM);
     std::int32_t existing = 0;
     ThrowOnError(KeyframeSuite3().GetStreamKeyframeCount(stream, &existing));
     if (existing >= 1) {

@@ -3,8 +3,8 @@
 #include <algorithm>
 #include <iterator>
 
-#include "comp/LayerStreams.h"
 #include "comp/NodeChannels.h"
+#include "hostapi/LayerStreams.h"
 #include "hostapi/LayerSuite.h"
 #include "maya/ListAccess.h"
 #include "maya/MAYA_Parse.h"
@@ -27,13 +27,13 @@ void MAYA_Parse::ApplyAnchorPointAnimation(VOR_Layer* layer, const MAYA_Transfor
 
   VOR_AddKeyframesInfo* batch = nullptr;
   HostError kept = Guarded([&] {
-    StartAddingKeyframes(layer, kAnchorPointStream, &batch);
+    StartAddingKeyframes(layer, HOST_STREAM_ANCHOR_POINT, &batch);
     for (std::int32_t n = 0; n < channels.sharedCount; ++n) {
       const T_Time time = KeyTime(channels, n);
       double point[kAxisCount];
       std::copy(std::begin(node->translate), std::end(node->translate), point);
       channels.Extract(kTranslateGroup, n, point);
-      InsertThreeDKeyframe(batch, layer, kAnchorPointStream, &time, ConvertDist(point[0]),
+      InsertThreeDKeyframe(batch, layer, HOST_STREAM_ANCHOR_POINT, &time, ConvertDist(point[0]),
                            -ConvertDist(point[1]), -ConvertDist(point[2]));
     }
   });
@@ -44,6 +44,6 @@ void MAYA_Parse::ApplyAnchorPointAnimation(VOR_Layer* layer, const MAYA_Transfor
 void MAYA_Parse::SetAnchorPoint(VOR_Layer* layer, const MAYA_Transform* node) {
   constexpr std::uint8_t kOn = 1;
   ThrowOnError(LayerSuite10().SetLayerFlag(layer, HOST_LAYER_FLAG_AIMED, kOn));
-  SetThreeDStream(layer, kAnchorPointStream, ConvertDist(node->translate[0]),
+  SetThreeDStream(layer, HOST_STREAM_ANCHOR_POINT, ConvertDist(node->translate[0]),
                   -ConvertDist(node->translate[1]), -ConvertDist(node->translate[2]));
 }

@@ -4,7 +4,7 @@
 #include <cstddef>
 
 #include "comp/Conversions.h"
-#include "comp/LayerStreams.h"
+#include "hostapi/LayerStreams.h"
 #include "maya/MAYA_Parse.h"
 #include "plugin/ErrorCodes.h"
 
@@ -51,11 +51,11 @@ void MAYA_Parse::SetTransform(VOR_Layer* layer, const MAYA_Transform* node) {
   CopyChannels(*node, values);
   PivotedTransform transform = ConvertPivots(*node);
   const MatrixComponents at = DecomposeTransform(&transform, values);
-  SetThreeDStream(layer, kAnchorPointStream, 0.0, 0.0, 0.0);
-  SetThreeDStream(layer, kScaleStream, at.scale[0] * kPercent, at.scale[1] * kPercent,
+  SetThreeDStream(layer, HOST_STREAM_ANCHOR_POINT, 0.0, 0.0, 0.0);
+  SetThreeDStream(layer, HOST_STREAM_SCALE, at.scale[0] * kPercent, at.scale[1] * kPercent,
                   at.scale[2] * kPercent);
-  SetOneDStream(layer, kRotationXStream, at.rotation[0] * kRadiansToDegrees);
-  SetOneDStream(layer, kRotationYStream, at.rotation[1] * kRadiansToDegrees);
-  SetOneDStream(layer, kRotationZStream, at.rotation[2] * kRadiansToDegrees);
-  SetThreeDStream(layer, kPositionStream, at.translation[0], at.translation[1], at.translation[2]);
+  SetOneDStream(layer, HOST_STREAM_ROTATION_X, at.rotation[0] * kRadiansToDegrees);
+  SetOneDStream(layer, HOST_STREAM_ROTATION_Y, at.rotation[1] * kRadiansToDegrees);
+  SetOneDStream(layer, HOST_STREAM_ROTATION_Z, at.rotation[2] * kRadiansToDegrees);
+  SetThreeDStream(layer, HOST_STREAM_POSITION, at.translation[0], at.translation[1], at.translation[2]);
 }

@@ -1,9 +1,9 @@
 // Keys of a node's position, rotation and scale: for every sampled key the node's matrix is rebuilt, taken
 // apart and written to five streams. Reads `curves` and the units; keys go through MAYA_Parse_Streams.cpp.
 #include "comp/Conversions.h"
-#include "comp/LayerStreams.h"
 #include "comp/NodeChannels.h"
 #include "comp/UnwrapAngle.h"
+#include "hostapi/LayerStreams.h"
 #include "maya/MAYA_Parse.h"
 #include "plugin/Guarded.h"
 
@@ -11,8 +11,9 @@ namespace {
 
 // The animated streams, in the order in which their batches are opened, filled and closed.
 enum Batch : std::size_t { kScaleBatch, kXBatch, kYBatch, kZBatch, kPositionBatch, kBatchCount };
-constexpr LayerStreamId kBatchStreams[kBatchCount] = {kScaleStream, kRotationXStream, kRotationYStream,
-                                                      kRotationZStream, kPositionStream};
+constexpr LayerStreamId kBatchStreams[kBatchCount] = {HOST_STREAM_SCALE, HOST_STREAM_ROTATION_X,
+                                                      HOST_STREAM_ROTATION_Y, HOST_STREAM_ROTATION_Z,
+                                                      HOST_STREAM_POSITION};
 
 }  // namespace
 
@@ -49,12 +50,12 @@ void MAYA_Parse::InsertTransformKeys(VOR_Layer* layer, const MAYA_Transform& nod
       angles[axis] = n > 0 ? UnwrapAngle(at.rotation[axis], previous[axis]) : at.rotation[axis];
       previous[axis] = angles[axis];
     }
-    InsertThreeDKeyframe(batches[kScaleBatch], layer, kScaleStream, &time, at.scale[0] * kPercent,
+    InsertThreeDKeyframe(batches[kScaleBatch], layer, HOST_STREAM_SCALE, &time, at.scale[0] * kPercent,
                          at.scale[1] * kPercent, at.scale[2] * kPercent);
-    InsertOneDKeyframe(batches[kXBatch], layer, kRotationXStream, &time, angles[0] * kRadiansToDegrees);
-    InsertOneDKeyframe(batches[kYBatch], layer, kRotationYStream, &time, angles[1] * kRadiansToDegrees);
-    InsertOneDKeyframe(batches[kZBatch], layer, kRotationZStream, &time, angles[2] * kRadiansToDegrees);
-    InsertThreeDKeyframe(batches[kPositionBatch], layer, kPositionStream, &time, at.translation[0],
+    InsertOneDKeyframe(batches[kXBatch], layer, HOST_STREAM_ROTATION_X, &time, angles[0] * kRadiansToDegrees);
+    InsertOneDKeyframe(batches[kYBatch], layer, HOST_STREAM_ROTATION_Y, &time, angles[1] * kRadiansToDegrees);
+    InsertOneDKeyframe(batches[kZBatch], layer, HOST_STREAM_ROTATION_Z, &time, angles[2] * kRadiansToDegrees);
+    InsertThreeDKeyframe(batches[kPositionBatch], layer, HOST_STREAM_POSITION, &time, at.translation[0],
                          at.translation[1], at.translation[2]);
   }
 }

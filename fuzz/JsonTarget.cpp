@@ -59,7 +59,7 @@ std::unique_ptr<refhost::KeyColumns> TakeKeys(Bytes& bytes, std::size_t count, s
 refhost::Stream TakeStream(Bytes& bytes, std::int32_t id) {
   refhost::Stream stream;
   stream.id = id;
-  stream.dimension = id <= refhost::kScaleStream ? 3 : 1;
+  stream.dimension = id <= HOST_STREAM_SCALE ? 3 : 1;
   const auto dimension = static_cast<std::size_t>(stream.dimension);
   for (std::size_t i = 0; i < dimension; ++i) stream.value[i] = bytes.Take<double>();
   const std::size_t keys = bytes.TakeBelow(4 * kMostKeys);
@@ -84,8 +84,8 @@ void TakeLayer(Bytes& bytes, Scene* scene, refhost::Composition* composition) {
   layer.filmDirection = (flags >> 2) % 3;
   if (layer.filmDirection != refhost::kFilmNeverSet) layer.filmSize = bytes.Take<double>();
   constexpr std::int32_t kStreams[] = {
-      refhost::kAnchorStream,    refhost::kPositionStream,  refhost::kScaleStream, refhost::kZRotationStream,
-      refhost::kXRotationStream, refhost::kYRotationStream, refhost::kZoomStream};
+      HOST_STREAM_ANCHOR_POINT, HOST_STREAM_POSITION,   HOST_STREAM_SCALE, HOST_STREAM_ROTATION_Z,
+      HOST_STREAM_ROTATION_X,   HOST_STREAM_ROTATION_Y, HOST_STREAM_ZOOM};
   const auto streams = bytes.Take<std::uint8_t>();
   for (std::size_t i = 0; i < std::size(kStreams); ++i) {
     if ((streams >> i & 1) != 0) layer.streams.push_back(TakeStream(bytes, kStreams[i]));

@@ -14,6 +14,11 @@ extern "C" {
 #define QZGP_PERSISTENT_DATA_SUITE "QZGP Persistent Data Suite"
 #define QZGP_PERSISTENT_DATA_SUITE_3 3
 
+/* The importer's one preference: where it stands in the store. 0 takes distances as they stand in the scene,
+ * anything else converts them from the scene's linear unit. */
+#define HOST_PREF_SECTION "Maya Camera"
+#define HOST_PREF_LINEAR_UNITS "Use Linear Units"
+
 typedef struct QZGP_PersistentDataSuite3 {
   /* Slot 0. Hands out the application's preference store, which the host keeps. */
   HostError (*GetAppPrefsBlob)(HostPrefsStore** store);

@@ -23,8 +23,8 @@ constexpr std::int32_t kCallbackCount = 2;
 void ReadPreference(QZGP_SuiteHandler& suites) {
   HostPrefsStore* store = nullptr;
   suites.PersistentDataSuite3().GetAppPrefsBlob(&store);
-  suites.PersistentDataSuite3().GetPrefLong(store, "Maya Camera", "Use Linear Units", G_use_linear_unitsL,
-                                            &G_use_linear_unitsL);
+  suites.PersistentDataSuite3().GetPrefLong(store, HOST_PREF_SECTION, HOST_PREF_LINEAR_UNITS,
+                                            G_use_linear_unitsL, &G_use_linear_unitsL);
 }
 
 HostError RegisterImporter(QZGP_SuiteHandler& suites, const char* name) {

@@ -61,9 +61,8 @@ MemoryBlock* Call::memory(HostMemHandle* handle) {
 }
 
 bool Call::isStore(HostPrefsStore* handle) {
-  constexpr std::size_t onlyStore = 1;
   const bool known =
-      host_.codec.isOf(HandleKind::Store, handle) && HandleCodec::lastingNumber(handle) == onlyStore;
+      host_.codec.isOf(HandleKind::Store, handle) && HandleCodec::lastingNumber(handle) == kStoreNumber;
   if (!known) refuseHandle(handle, HandleKind::Store, "the preference store");
   return known;
 }

@@ -5,6 +5,7 @@
 // throws when the rehearsal asked for an exception, so nothing that has to happen may come after it.
 #pragma once
 
+#include <cstddef>
 #include <cstdint>
 #include <string>
 
@@ -13,6 +14,9 @@
 #include "refhost/Operations.h"
 
 namespace refhost {
+
+// The number of the one preference store, in its handle.
+inline constexpr std::size_t kStoreNumber = 1;
 
 class Call {
  public:

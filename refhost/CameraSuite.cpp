@@ -7,9 +7,6 @@
 namespace refhost {
 namespace {
 
-static_assert(kFilmHorizontal == HOST_FILM_HORIZONTAL && kFilmVertical == HOST_FILM_VERTICAL,
-              "the project keeps the direction as the call gave it");
-
 void setCameraFilmSize(Call& call, VOR_Layer* layer, std::int32_t direction, const double* filmSize) {
   Layer* camera = call.layer(layer);
   if (camera == nullptr) return;

@@ -21,9 +21,9 @@ bool isKeptByDesign(const HostState& host, std::uint32_t number, const HeldStrea
   if (held.releaseFailed) return true;
   if (held.layer->kind != LayerKind::Camera) return false;
   const std::int32_t id = held.stream->id;
-  if (id != kPositionStream && id != kZoomStream) return false;
+  if (id != HOST_STREAM_POSITION && id != HOST_STREAM_ZOOM) return false;
   const bool hadNoSuite = !held.valueSet && number <= host.streamsWithoutValueSuite;
-  return held.valueFailed || hadNoSuite || (id == kZoomStream && held.heldKeys);
+  return held.valueFailed || hadNoSuite || (id == HOST_STREAM_ZOOM && held.heldKeys);
 }
 
 void listSuites(const HostState& host, std::vector<Leftover>& leftovers) {

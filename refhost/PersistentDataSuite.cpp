@@ -7,13 +7,9 @@
 namespace refhost {
 namespace {
 
-constexpr std::size_t kStoreNumber = 1;
 // The entry that an option of the host stands for.
-constexpr std::string_view kLinearUnitsSection = "Maya Camera";
-constexpr std::string_view kLinearUnitsKey = "Use Linear Units";
-
 bool isLinearUnits(std::string_view section, std::string_view key) {
-  return section == kLinearUnitsSection && key == kLinearUnitsKey;
+  return section == HOST_PREF_SECTION && key == HOST_PREF_LINEAR_UNITS;
 }
 
 HostError GetAppPrefsBlob(HostPrefsStore** store) {

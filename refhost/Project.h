@@ -13,6 +13,7 @@
 #include <vector>
 
 #include "hostapi/HostTypes.h"
+#include "hostapi/LayerStreams.h"
 #include "refhost/KeyTimes.h"
 
 namespace refhost {
@@ -20,19 +21,8 @@ namespace refhost {
 struct Composition;
 struct Layer;
 
-// The numbers of the streams.
-inline constexpr int32_t kAnchorStream = 0;  // a camera's point of interest
-inline constexpr int32_t kPositionStream = 1;
-inline constexpr int32_t kScaleStream = 2;
-inline constexpr int32_t kZRotationStream = 3;
-inline constexpr int32_t kXRotationStream = 8;
-inline constexpr int32_t kYRotationStream = 9;
-inline constexpr int32_t kZoomStream = 11;  // cameras only
-
-// The sides of the film that a film size can measure.
+// The film direction of a camera without a film size.
 inline constexpr int32_t kFilmNeverSet = 0;
-inline constexpr int32_t kFilmHorizontal = 1;
-inline constexpr int32_t kFilmVertical = 2;
 
 // The keys of one stream, sorted by time, no two at one time. values holds `dimension` numbers per key.
 struct KeyColumns {
@@ -42,10 +32,10 @@ struct KeyColumns {
 
 // One animatable property of a layer.
 struct Stream {
-  int32_t id = kAnchorStream;
-  int32_t dimension = 0;              // 1 or 3
-  double value[3] = {0.0, 0.0, 0.0};  // the static value; stays when keys are added
-  std::unique_ptr<KeyColumns> keys;   // null when the stream has none
+  int32_t id = HOST_STREAM_ANCHOR_POINT;  // LayerStreamId
+  int32_t dimension = 0;                  // 1 or 3
+  double value[3] = {0.0, 0.0, 0.0};      // the static value; stays when keys are added
+  std::unique_ptr<KeyColumns> keys;       // null when the stream has none
 
   std::size_t keyCount() const { return keys ? keys->times.size() : 0; }
 };
@@ -62,7 +52,7 @@ struct Layer {
   bool threeDimensional = false;          // layer flag 0x800
   bool aimed = false;                     // layer flag 8192: a camera that looks at its point of interest
   int32_t childCount = 0;                 // layers whose parent this one is
-  int32_t filmDirection = kFilmNeverSet;  // camera: the measured side
+  int32_t filmDirection = kFilmNeverSet;  // camera: HOST_FILM_HORIZONTAL or HOST_FILM_VERTICAL
   double filmSize = 0.0;                  // camera: points; 0 when never set
   std::vector<Stream> streams;            // camera: 0, 1, 2, 3, 8, 9, 11; others: 0, 1, 2, 3, 8, 9
 

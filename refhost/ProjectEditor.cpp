@@ -56,10 +56,10 @@ Layer& ProjectEditor::addCameraLayer(Composition& composition, const char* name,
                                      int32_t zoomKeys) {
   Layer& layer = addLayer(composition, LayerKind::Camera, name);
   for (Stream& stream : layer.streams) {
-    if (stream.id == kAnchorStream) {
+    if (stream.id == HOST_STREAM_ANCHOR_POINT) {
       stream.value[0] = interest[0];
       stream.value[1] = interest[1];
-    } else if (stream.id == kZoomStream) {
+    } else if (stream.id == HOST_STREAM_ZOOM) {
       stream.value[0] = composition.width;
       if (zoomKeys < 1) continue;
       std::vector<T_Time> times;

@@ -16,13 +16,13 @@ struct StreamFacts {
 
 // The zoom stands last, so that the layers without one have the table's beginning.
 constexpr StreamFacts kStreams[] = {
-    {kAnchorStream, 3, 0.0, "anchor point"},
-    {kPositionStream, 3, 0.0, "position"},
-    {kScaleStream, 3, kFullScale, "scale"},
-    {kZRotationStream, 1, 0.0, "Z rotation"},
-    {kXRotationStream, 1, 0.0, "X rotation"},
-    {kYRotationStream, 1, 0.0, "Y rotation"},
-    {kZoomStream, 1, 0.0, "zoom"},
+    {HOST_STREAM_ANCHOR_POINT, 3, 0.0, "anchor point"},
+    {HOST_STREAM_POSITION, 3, 0.0, "position"},
+    {HOST_STREAM_SCALE, 3, kFullScale, "scale"},
+    {HOST_STREAM_ROTATION_Z, 1, 0.0, "Z rotation"},
+    {HOST_STREAM_ROTATION_X, 1, 0.0, "X rotation"},
+    {HOST_STREAM_ROTATION_Y, 1, 0.0, "Y rotation"},
+    {HOST_STREAM_ZOOM, 1, 0.0, "zoom"},
 };
 constexpr std::size_t kStreamCount = sizeof(kStreams) / sizeof(kStreams[0]);
 
@@ -50,7 +50,7 @@ std::vector<Stream> makeStreams(LayerKind kind) {
 }
 
 const char* streamName(int32_t id, LayerKind kind) {
-  if (id == kAnchorStream && kind == LayerKind::Camera) return "point of interest";
+  if (id == HOST_STREAM_ANCHOR_POINT && kind == LayerKind::Camera) return "point of interest";
   for (const StreamFacts& facts : kStreams) {
     if (facts.id == id) return facts.name;
   }

@@ -6,6 +6,7 @@
 #include "bench/micro/MicroBenchmark.h"
 #include "hostapi/CompSuite.h"
 #include "hostapi/KeyframeSuite.h"
+#include "hostapi/LayerStreams.h"
 #include "hostapi/StreamSuite.h"
 #include "maya/MAYA_Parse.h"
 #include "plugin/Globals.h"
@@ -21,8 +22,8 @@ constexpr int kKeys = 240;
 constexpr int kLayersPerHost = 256;
 
 // Streams by their numbers, with the values of a key.
-constexpr std::int32_t kPosition = 1;
-constexpr std::int32_t kZRotation = 3;
+constexpr std::int32_t kPosition = HOST_STREAM_POSITION;
+constexpr std::int32_t kZRotation = HOST_STREAM_ROTATION_Z;
 constexpr int kValuesOfFiveStreams = 3 + 3 + 1 + 1 + 1;
 
 template <typename Suite>

@@ -3,6 +3,7 @@
 
 #include <string>
 
+#include "hostapi/LayerStreams.h"
 #include "refhost/Host.h"
 
 namespace docs_test {
@@ -45,13 +46,13 @@ std::string Curve(const std::string& name, const std::string& keys);
 std::string Drive(const std::string& curve, const std::string& plug);
 
 // The host's numbers of the streams.
-inline constexpr std::int32_t kPointOfInterest = 0;
-inline constexpr std::int32_t kPosition = 1;
-inline constexpr std::int32_t kScale = 2;
-inline constexpr std::int32_t kRotationZ = 3;
-inline constexpr std::int32_t kRotationX = 8;
-inline constexpr std::int32_t kRotationY = 9;
-inline constexpr std::int32_t kZoom = 11;
+inline constexpr std::int32_t kPointOfInterest = HOST_STREAM_ANCHOR_POINT;
+inline constexpr std::int32_t kPosition = HOST_STREAM_POSITION;
+inline constexpr std::int32_t kScale = HOST_STREAM_SCALE;
+inline constexpr std::int32_t kRotationZ = HOST_STREAM_ROTATION_Z;
+inline constexpr std::int32_t kRotationX = HOST_STREAM_ROTATION_X;
+inline constexpr std::int32_t kRotationY = HOST_STREAM_ROTATION_Y;
+inline constexpr std::int32_t kZoom = HOST_STREAM_ZOOM;
 
 // The zoom of a camera with all defaults in Scene(): 35 mm behind 1.4173 inches, 640 pixels wide.
 inline constexpr double kDefaultZoom = 640.0 * 35.0 / 25.4 / 1.4173;

@@ -113,11 +113,12 @@ class HostInterface(unittest.TestCase):
         for name, value in headers.constants().items():
             self.assertIn(value, DOCUMENT, name)
 
-    def test_the_stream_table_is_that_of_the_builder(self):
-        source = read("comp/LayerStreams.h")
+    def test_the_stream_table_is_that_of_the_border(self):
+        source = read("hostapi/LayerStreams.h")
         rows = re.findall(r"^\| (\d+) \| (.+?) \| ([13]) \| (\w+) \|$", section("The layer streams"), re.MULTILINE)
-        declared = re.findall(r"^\s+k\w+Stream = (\d+),\s+// (\w+)", source, re.MULTILINE)
-        self.assertEqual([(number, unit) for number, _, _, unit in rows], declared)
+        declared = re.findall(r"^\s+HOST_STREAM_\w+ = (\d+),?\s+/\* (one|three), (\w+)", source, re.MULTILINE)
+        counts = {"1": "one", "3": "three"}
+        self.assertEqual([(number, counts[count], unit) for number, _, count, unit in rows], declared)
 
 
 if __name__ == "__main__":

@@ -1,17 +1,19 @@
 #include "tests/examples/CompositionView.h"
 
+#include <cstdint>
+
+#include "hostapi/LayerStreams.h"
+
 namespace conversion {
 namespace {
 
-enum StreamNumber {
-  kAnchor = 0,
-  kPosition = 1,
-  kScale = 2,
-  kZRotation = 3,
-  kXRotation = 8,
-  kYRotation = 9,
-  kZoom = 11
-};
+constexpr std::int32_t kAnchor = HOST_STREAM_ANCHOR_POINT;
+constexpr std::int32_t kPosition = HOST_STREAM_POSITION;
+constexpr std::int32_t kScale = HOST_STREAM_SCALE;
+constexpr std::int32_t kZRotation = HOST_STREAM_ROTATION_Z;
+constexpr std::int32_t kXRotation = HOST_STREAM_ROTATION_X;
+constexpr std::int32_t kYRotation = HOST_STREAM_ROTATION_Y;
+constexpr std::int32_t kZoom = HOST_STREAM_ZOOM;
 
 double valueAt(const refhost::Stream& stream, std::size_t component, std::size_t key) {
   if (!stream.keys) return stream.value[component];

@@ -11,6 +11,7 @@
 #include <string>
 #include <vector>
 
+#include "hostapi/LayerStreams.h"
 #include "tests/scenes/ImportedScene.h"
 #include "tests/support/TemporaryFolder.h"
 
@@ -24,10 +25,10 @@ using scenes::ImportedScene;
 using testing::DoubleNear;
 using testing::ElementsAre;
 
-constexpr int kPointOfInterest = 0;
-constexpr int kPosition = 1;
-constexpr int kZRotation = 3;
-constexpr int kZoom = 11;
+constexpr int kPointOfInterest = HOST_STREAM_ANCHOR_POINT;
+constexpr int kPosition = HOST_STREAM_POSITION;
+constexpr int kZRotation = HOST_STREAM_ROTATION_Z;
+constexpr int kZoom = HOST_STREAM_ZOOM;
 constexpr std::size_t kKeys = 24;  // of every animated channel
 
 std::filesystem::path example(const char* name) {

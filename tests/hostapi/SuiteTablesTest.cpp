@@ -10,6 +10,7 @@
 #include "hostapi/CompSuite.h"
 #include "hostapi/FileImportManagerSuite.h"
 #include "hostapi/KeyframeSuite.h"
+#include "hostapi/LayerStreams.h"
 #include "hostapi/LayerSuite.h"
 #include "hostapi/MemorySuite.h"
 #include "hostapi/PersistentDataSuite.h"
@@ -120,6 +121,18 @@ TEST(SuiteTablesTest, ConstantsOfTheSuitesHaveTheirValues) {
   EXPECT_EQ(HOST_FILM_HORIZONTAL, 1);
   EXPECT_EQ(HOST_FILM_VERTICAL, 2);
   EXPECT_EQ(HOST_TIME_MODE_COMP, 0);
+  EXPECT_STREQ(HOST_PREF_SECTION, "Maya Camera");
+  EXPECT_STREQ(HOST_PREF_LINEAR_UNITS, "Use Linear Units");
+}
+
+TEST(SuiteTablesTest, StreamsHaveTheirNumbers) {
+  EXPECT_EQ(HOST_STREAM_ANCHOR_POINT, 0);
+  EXPECT_EQ(HOST_STREAM_POSITION, 1);
+  EXPECT_EQ(HOST_STREAM_SCALE, 2);
+  EXPECT_EQ(HOST_STREAM_ROTATION_Z, 3);
+  EXPECT_EQ(HOST_STREAM_ROTATION_X, 8);
+  EXPECT_EQ(HOST_STREAM_ROTATION_Y, 9);
+  EXPECT_EQ(HOST_STREAM_ZOOM, 11);
 }
 
 }  // namespace

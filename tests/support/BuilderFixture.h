@@ -11,6 +11,7 @@
 #include <vector>
 
 #include "hostapi/ErrorCodes.h"
+#include "hostapi/LayerStreams.h"
 #include "maya/MAYA_Parse.h"
 #include "refhost/Host.h"
 
@@ -19,13 +20,13 @@ namespace testsupport {
 inline constexpr std::int32_t kBuilderPluginId = 7;
 
 // Streams by their numbers.
-inline constexpr int kAnchor = 0;
-inline constexpr int kPosition = 1;
-inline constexpr int kScale = 2;
-inline constexpr int kZRotation = 3;
-inline constexpr int kXRotation = 8;
-inline constexpr int kYRotation = 9;
-inline constexpr int kZoom = 11;
+inline constexpr int kAnchor = HOST_STREAM_ANCHOR_POINT;
+inline constexpr int kPosition = HOST_STREAM_POSITION;
+inline constexpr int kScale = HOST_STREAM_SCALE;
+inline constexpr int kZRotation = HOST_STREAM_ROTATION_Z;
+inline constexpr int kXRotation = HOST_STREAM_ROTATION_X;
+inline constexpr int kYRotation = HOST_STREAM_ROTATION_Y;
+inline constexpr int kZoom = HOST_STREAM_ZOOM;
 
 class BuilderTest : public ::testing::Test {
  protected:

@@ -4,6 +4,9 @@
 #include <memory>
 #include <vector>
 
+#include "hostapi/CameraSuite.h"
+#include "hostapi/LayerStreams.h"
+
 namespace mayascene_test {
 namespace {
 
@@ -55,14 +58,14 @@ HandBuiltScene::HandBuiltScene() {
 
   Layer* camera = add(LayerKind::Camera, "shotcamShape", nullptr);
   camera->aimed = true;
-  camera->filmDirection = 2;
+  camera->filmDirection = HOST_FILM_VERTICAL;
   camera->filmSize = 36.0;
   for (std::size_t i = 0; i < 3; ++i) streamIn(*camera, 0).value[i] = 1.5 + static_cast<double>(i);
   for (std::size_t i = 0; i < 3; ++i) streamIn(*camera, 1).value[i] = -10.25 * static_cast<double>(i);
-  streamIn(*camera, 11).value[0] = 2057.38625;
-  streamIn(*camera, 11).keys = std::make_unique<refhost::KeyColumns>();
-  streamIn(*camera, 11).keys->times = {{0, 24000}};
-  streamIn(*camera, 11).keys->values = {2100.5};
+  streamIn(*camera, HOST_STREAM_ZOOM).value[0] = 2057.38625;
+  streamIn(*camera, HOST_STREAM_ZOOM).keys = std::make_unique<refhost::KeyColumns>();
+  streamIn(*camera, HOST_STREAM_ZOOM).keys->times = {{0, 24000}};
+  streamIn(*camera, HOST_STREAM_ZOOM).keys->values = {2100.5};
 
   Layer* arm = add(LayerKind::Null, "arm", nullptr);
   camera->parent = arm;

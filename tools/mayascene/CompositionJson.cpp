@@ -4,6 +4,7 @@
 #include <string_view>
 #include <vector>
 
+#include "hostapi/CameraSuite.h"
 #include "tools/mayascene/JsonWriter.h"
 #include "tools/mayascene/StreamWords.h"
 
@@ -144,7 +145,7 @@ void writeFilmSize(JsonWriter& json, const Layer& layer) {
   if (layer.filmDirection == refhost::kFilmNeverSet) return json.null();
   json.beginObject();
   json.key("direction");
-  json.text(layer.filmDirection == refhost::kFilmVertical ? "vertical" : "horizontal");
+  json.text(layer.filmDirection == HOST_FILM_VERTICAL ? "vertical" : "horizontal");
   json.key("points");
   json.number(layer.filmSize);
   json.endObject();

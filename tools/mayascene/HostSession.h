@@ -40,10 +40,6 @@ class HostSession {
   refhost::CallbackResult deathHook_;
 };
 
-// The preference's place in the store.
-inline constexpr const char* kPreferenceSection = "Maya Camera";
-inline constexpr const char* kLinearUnitsKey = "Use Linear Units";
-
 // The store that is used where the user names none.
 std::filesystem::path preferenceFile(const std::string& named);
 

@@ -7,6 +7,8 @@
 #include <unordered_map>
 #include <vector>
 
+#include "hostapi/CameraSuite.h"
+#include "hostapi/LayerStreams.h"
 #include "tools/mayascene/Quantities.h"
 #include "tools/mayascene/StreamWords.h"
 
@@ -40,7 +42,7 @@ std::string padded(std::string_view text, std::size_t width) {
 std::string filmText(const Layer& camera) {
   const double millimetres = camera.filmSize / kPointsPerInch * kMillimetresPerInch;
   return numberText(camera.filmSize) + " pt (" + numberText(millimetres) + " mm) " +
-         (camera.filmDirection == refhost::kFilmVertical ? "vertically" : "horizontally");
+         (camera.filmDirection == HOST_FILM_VERTICAL ? "vertically" : "horizontally");
 }
 
 std::vector<Row> rowsOf(const Layer& layer) {
@@ -56,7 +58,7 @@ std::vector<Row> rowsOf(const Layer& layer) {
       row.keys = keysText(*stream, layer.composition->frameRate);
     }
     rows.push_back(std::move(row));
-    if (words.id == refhost::kZoomStream && layer.filmDirection != refhost::kFilmNeverSet)
+    if (words.id == HOST_STREAM_ZOOM && layer.filmDirection != refhost::kFilmNeverSet)
       rows.push_back({"film size", filmText(layer), ""});
   }
   return rows;

@@ -5,6 +5,7 @@
 #include <memory>
 #include <string>
 
+#include "hostapi/PersistentDataSuite.h"
 #include "refhost/Preferences.h"
 #include "tools/mayascene/HostSession.h"
 #include "tools/mayascene/OutputFile.h"
@@ -33,13 +34,13 @@ ExitStatus runPrefs(const PrefsArguments& arguments, Diagnostics& diagnostics) {
   refhost::Preferences store(file);
   std::string failure;
   if (arguments.linearUnits) {
-    store.set(kPreferenceSection, kLinearUnitsKey, *arguments.linearUnits);
+    store.set(HOST_PREF_SECTION, HOST_PREF_LINEAR_UNITS, *arguments.linearUnits);
     if (!store.write(&failure)) {
       diagnostics.complain("", failure);
       return ExitStatus::CannotWrite;
     }
   }
-  const std::int32_t value = store.find(kPreferenceSection, kLinearUnitsKey).value_or(0);
+  const std::int32_t value = store.find(HOST_PREF_SECTION, HOST_PREF_LINEAR_UNITS).value_or(0);
   const bool kept = store.fileExists() || arguments.linearUnits.has_value();
   const std::unique_ptr<OutputFile> out = OutputFile::open(kStandardOutput, &failure);
   out->stream() << "linear-units  " << value << "  (" << meaningOf(value) << ")\n"

@@ -4,7 +4,7 @@
 #include <cstdint>
 #include <string_view>
 
-#include "refhost/Project.h"
+#include "hostapi/LayerStreams.h"
 
 namespace mayascene {
 
@@ -20,13 +20,13 @@ struct StreamWords {
 
 // In the order in which a person asks for them.
 inline constexpr StreamWords kStreamWords[] = {
-    {refhost::kZoomStream, "zoom", "zoom", " px", "zoom", "zoom", "pixels"},
-    {refhost::kPositionStream, "position", "position", " pt", "position", "position", "points"},
-    {refhost::kXRotationStream, "X rotation", "X rotation", " deg", "xRotation", "xRotation", "degrees"},
-    {refhost::kYRotationStream, "Y rotation", "Y rotation", " deg", "yRotation", "yRotation", "degrees"},
-    {refhost::kZRotationStream, "Z rotation", "Z rotation", " deg", "zRotation", "zRotation", "degrees"},
-    {refhost::kScaleStream, "scale", "scale", " %", "scale", "scale", "percent"},
-    {refhost::kAnchorStream, "anchor point", "point of interest", " pt", "anchorPoint", "pointOfInterest",
+    {HOST_STREAM_ZOOM, "zoom", "zoom", " px", "zoom", "zoom", "pixels"},
+    {HOST_STREAM_POSITION, "position", "position", " pt", "position", "position", "points"},
+    {HOST_STREAM_ROTATION_X, "X rotation", "X rotation", " deg", "xRotation", "xRotation", "degrees"},
+    {HOST_STREAM_ROTATION_Y, "Y rotation", "Y rotation", " deg", "yRotation", "yRotation", "degrees"},
+    {HOST_STREAM_ROTATION_Z, "Z rotation", "Z rotation", " deg", "zRotation", "zRotation", "degrees"},
+    {HOST_STREAM_SCALE, "scale", "scale", " %", "scale", "scale", "percent"},
+    {HOST_STREAM_ANCHOR_POINT, "anchor point", "point of interest", " pt", "anchorPoint", "pointOfInterest",
      "points"},
 };
 
