@@ -88,7 +88,7 @@ NodeChannels MAYA_Parse::VerifyChannels(const MAYA_Transform& node) {
     if (channel.count == shared) continue;
     // Deliberate: the text names a camera, whatever the node is.
     ReportError(LocalizedText(kInconsistentKeysMessage));
-    throw int{kInconsistentKeys};
+    ThrowCode(kInconsistentKeys);
   }
   fetched.ListSampled();
   fetched.sharedCount = static_cast<std::int32_t>(shared);

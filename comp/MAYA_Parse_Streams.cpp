@@ -1,9 +1,38 @@
 // Values and keyframe batches on layer streams. Reads nothing of the scene; calls the stream and keyframe
 // suites.
+#include <utility>
+
 #include "hostapi/KeyframeSuite.h"
 #include "maya/MAYA_Parse.h"
 #include "plugin/Globals.h"
 #include "plugin/Guarded.h"
+
+namespace {
+
+// A stream that is released at the latest when an exception passes.
+class StreamInUse {
+ public:
+  StreamInUse(QZGP_SuiteHandler& suites, VOR_Stream* handle) : suites_(suites), handle_(handle) {}
+  ~StreamInUse() {
+    if (handle_ != nullptr) GuardedAtBorder([this] { Release(); });
+  }
+  StreamInUse(const StreamInUse&) = delete;
+  StreamInUse& operator=(const StreamInUse&) = delete;
+
+  VOR_Stream* handle() const { return handle_; }
+
+  // An exception out of the release passes; it is not tried again.
+  void Release() {
+    VOR_Stream* const handle = std::exchange(handle_, nullptr);
+    if (handle != nullptr) suites_.StreamSuite7().ReleaseStream(handle);
+  }
+
+ private:
+  QZGP_SuiteHandler& suites_;
+  VOR_Stream* handle_;
+};
+
+}  // namespace
 
 VOR_Stream* MAYA_Parse::AcquireStream(VOR_Layer* layer, std::int32_t streamId) {
   VOR_Stream* stream = nullptr;
@@ -14,25 +43,16 @@ VOR_Stream* MAYA_Parse::AcquireStream(VOR_Layer* layer, std::int32_t streamId) {
 // Works with a stream of the layer and releases it, whatever happens. The code of the release is ignored.
 template <typename Work>
 void MAYA_Parse::UseStream(VOR_Layer* layer, std::int32_t streamId, Work&& work) {
-  VOR_Stream* const stream = AcquireStream(layer, streamId);
-  const auto release = [&] {
-    if (stream != nullptr) StreamSuite7().ReleaseStream(stream);
-  };
-  HostError code = kNoError;
-  try {
-    code = Guarded([&] { work(stream); });
-  } catch (...) {
-    release();
-    throw;
-  }
-  release();
+  StreamInUse stream(*this, AcquireStream(layer, streamId));
+  const HostError code = Guarded([&] { return work(stream.handle()); });
+  stream.Release();
   ThrowOnError(code);
 }
 
 void MAYA_Parse::SetStream(VOR_Layer* layer, std::int32_t streamId, double x, double y, double z) {
   UseStream(layer, streamId, [&](VOR_Stream* stream) {
     const StreamValueRecord value{stream, {x, y, z, 0.0}};
-    ThrowOnError(StreamSuite8().SetStreamValue(G_plugin_idL, stream, &value));
+    return StreamSuite8().SetStreamValue(G_plugin_idL, stream, &value);
   });
 }
 
@@ -50,16 +70,17 @@ void MAYA_Parse::SetThreeDStream(VOR_Layer* layer, std::int32_t streamId, double
 
 void MAYA_Parse::StartAddingKeyframes(VOR_Layer* layer, std::int32_t streamId, VOR_AddKeyframesInfo** batch) {
   UseStream(layer, streamId,
-            [&](VOR_Stream* stream) { ThrowOnError(KeyframeSuite3().BeginKeyframeBatch(stream, batch)); });
+            [&](VOR_Stream* stream) { return KeyframeSuite3().BeginKeyframeBatch(stream, batch); });
 }
 
 void MAYA_Parse::InsertKeyframe(VOR_AddKeyframesInfo* batch, VOR_Layer* layer, std::int32_t streamId,
                                 const T_Time* time, double x, double y, double z) {
   UseStream(layer, streamId, [&](VOR_Stream* stream) {
     std::int32_t index = 0;
-    ThrowOnError(KeyframeSuite3().AddBatchKeyframe(batch, HOST_TIME_MODE_COMP, time, &index));
+    const HostError code = KeyframeSuite3().AddBatchKeyframe(batch, HOST_TIME_MODE_COMP, time, &index);
+    if (code != kNoError) return code;
     const StreamValueRecord value{stream, {x, y, z, 0.0}};
-    ThrowOnError(KeyframeSuite4().SetBatchKeyframeValue(batch, index, &value));
+    return KeyframeSuite4().SetBatchKeyframeValue(batch, index, &value);
   });
 }
 

@@ -68,13 +68,19 @@ enum {
       HOST_UTILITY_COUNT
 };
 
-enum { HOST_THROW_NOTHING = 0, HOST_THROW_BAD_ALLOC = 1, HOST_THROW_RUNTIME_ERROR = 2 };
+enum {
+  HOST_THROW_NOTHING = 0,
+  HOST_THROW_BAD_ALLOC = 1,
+  HOST_THROW_RUNTIME_ERROR = 2,
+  HOST_THROW_OTHER = 3 /* an exception of a type that nobody else knows */
+};
 
 /* One failure to rehearse. The nth call (from 1; 0 is every call) of the service does nothing, hands out
- * null or zero and returns the code (which may be 0), or throws the standard exception: std::bad_alloc, or
- * std::runtime_error("rehearsed failure"). Handed out as zero are also a text in a buffer (it becomes ""),
- * the bytes of a read, a number scanned, and the matrix of MatrixSetIdentity. What a call changes in place
- * stays as it is: the record of RecordListGet, and the matrices of the composing calls. */
+ * null or zero and returns the code (which may be 0), or throws: std::bad_alloc,
+ * std::runtime_error("rehearsed failure"), or an exception that only catch (...) catches. Handed out as zero
+ * are also a text in a buffer (it becomes ""), the bytes of a read, a number scanned, and the matrix of
+ * MatrixSetIdentity. What a call changes in place stays as it is: the record of RecordListGet, and the
+ * matrices of the composing calls. */
 typedef struct HostUtilityFailure {
   int32_t service; /* HOST_UTILITY_... */
   int64_t nth;

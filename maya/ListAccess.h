@@ -40,7 +40,7 @@ template <typename Record, typename Change>
 void ChangeRecord(RecordList* list, std::int64_t index, Change&& change) {
   void* record = nullptr;
   ThrowOnError(RecordListLock(list, index, &record));
-  if (record == nullptr) throw int{HOST_ERR_LIST_INDEX};
+  if (record == nullptr) ThrowCode(HOST_ERR_LIST_INDEX);
   change(*static_cast<Record*>(record));
   ThrowOnError(RecordListUnlock(list, index));
 }

@@ -235,14 +235,14 @@ void MAYA_Lex::ReportError(const char* message) { UtilitySuite7().ShowMessage(G_
 void MAYA_Lex::FailReading() {
   NoteLine(kReadingError, tokenStart);
   ReportError(LocalizedText(kReadingMessage));
-  throw int{kReadingError};
+  ThrowCode(kReadingError);
 }
 
 void MAYA_Lex::FailAtEnd() {
   // Of a token that is never closed, its beginning tells more than the end of the text.
   NoteLine(kUnexpectedEnd, tokenStart);
   ReportError(LocalizedText(kUnexpectedEndMessage));
-  throw int{kUnexpectedEnd};
+  ThrowCode(kUnexpectedEnd);
 }
 
 // Counted once, when it is needed: `line` leaves out what stands inside strings and comments. A line ends as

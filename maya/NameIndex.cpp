@@ -4,10 +4,10 @@
 #include <array>
 #include <chrono>
 #include <cstring>
-#include <exception>
 #include <random>
 
 #include "maya/SceneRecords.h"
+#include "plugin/Guarded.h"
 
 namespace {
 
@@ -45,12 +45,11 @@ Multipliers DrawMultipliers() {
   std::uint64_t seed =
       static_cast<std::uint64_t>(std::chrono::steady_clock::now().time_since_epoch().count()) ^
       reinterpret_cast<std::uintptr_t>(&kFirstCapacity);
-  try {
+  // Without a source of chance, the time and the place in memory have to do.
+  Unreported([&] {
     std::random_device device;
     seed ^= (std::uint64_t{device()} << 32) | device();
-  } catch (const std::exception&) {
-    // Without a source of chance, the time and the place in memory have to do.
-  }
+  });
   std::mt19937_64 random(seed);
   Multipliers multipliers;
   for (std::uint64_t& multiplier : multipliers) multiplier = random();

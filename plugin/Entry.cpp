@@ -40,7 +40,7 @@ HostError RegisterImporter(QZGP_SuiteHandler& suites, const char* name) {
 
 HostError MayaImportEntry(const WNBasicSuite* basicSuite, std::int32_t, std::int32_t, std::int32_t pluginId,
                           void*) {
-  return Guarded([&] {
+  return GuardedAtBorder([&] {
     G_basic_suiteP = basicSuite;
     G_plugin_idL = pluginId;
     QZGP_SuiteHandler suites(basicSuite);
@@ -48,10 +48,10 @@ HostError MayaImportEntry(const WNBasicSuite* basicSuite, std::int32_t, std::int
     ReadPreference(suites);
     suites.RegisterSuite6().RegisterDeathHook(pluginId, DeathHook, 0);
     const char* const name = LocalizedText(kImporterName);
-    ThrowOnError(tableCode == kNoError ? RegisterImporter(suites, name) : tableCode);
+    return tableCode == kNoError ? RegisterImporter(suites, name) : tableCode;
   });
 }
 
 HostError DeathHook(std::intptr_t) {
-  return Guarded([] { UnregisterMessages(); });
+  return GuardedAtBorder([] { UnregisterMessages(); });
 }

@@ -1,7 +1,7 @@
 // The codes that the importer itself returns, and the one place where a code becomes an exception.
 //
 // Inside the parser and the builder a failure is a bare integer exception that carries the code. Guarded (in
-// Guarded.h) turns it back.
+// Guarded.h) turns it back. No other file of the importer says "throw", "try" or "catch".
 #pragma once
 
 #include "hostapi/ErrorCodes.h"
@@ -14,7 +14,10 @@ inline constexpr HostError kReadingError = HOST_ERR_MAYA_SYNTAX;
 inline constexpr HostError kUnexpectedEnd = HOST_ERR_MAYA_UNEXPECTED_END;
 inline constexpr HostError kInconsistentKeys = HOST_ERR_MAYA_KEY_COUNTS;
 
-// Throws a code that is not 0 as a bare integer.
+// Throws the code as a bare integer, also where it is 0: an object that was not made, with no word why.
+[[noreturn]] inline void ThrowCode(HostError code) { throw int{code}; }
+
+// Throws a code that is not 0.
 inline void ThrowOnError(HostError code) {
-  if (code != kNoError) throw int{code};
+  if (code != kNoError) ThrowCode(code);
 }

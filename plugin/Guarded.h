@@ -2,23 +2,48 @@
 #pragma once
 
 #include <exception>
-#include <utility>
+#include <type_traits>
 
 #include "hostutil/HostReport.h"
 #include "plugin/ErrorCodes.h"
 
-// Runs the work and returns the code that it ended with: 0 when it returned, an integer exception's own
-// value, or what the host's translate-and-report makes of a standard exception. Any other exception passes
-// through.
+// Runs the work, which returns a code or nothing, and returns the code that it ended with: its own or 0, an
+// integer exception's value, or what the host's translate-and-report makes of a standard exception. Any other
+// exception passes through.
 template <typename Work>
 HostError Guarded(Work&& work) {
   try {
-    std::forward<Work>(work)();
-    return kNoError;
+    if constexpr (std::is_void_v<std::invoke_result_t<Work&>>) {
+      work();
+      return kNoError;
+    } else {
+      return work();
+    }
   } catch (int code) {
     return code;
   } catch (const std::exception& exception) {
     return TranslateAndReport(exception);
+  }
+}
+
+// The same where nothing may get out: at the C border, and in a destructor while an exception passes. What is
+// neither an integer nor a standard exception is HOST_ERR_EXCEPTION_OTHER, without a message.
+template <typename Work>
+HostError GuardedAtBorder(Work&& work) {
+  try {
+    return Guarded(work);
+  } catch (...) {
+    return HOST_ERR_EXCEPTION_OTHER;
+  }
+}
+
+// Runs work that may fail without anybody being told: a standard exception ends it, and that is all.
+template <typename Work>
+void Unreported(Work&& work) {
+  try {
+    work();
+  } catch (const std::exception&) {
+    return;
   }
 }
 

@@ -23,15 +23,15 @@ HostFile* MakeFile(const HostUTF16Unit* path) {
   const UTF16Handle owned(text);
   HostFile* file = nullptr;
   const HostError code = HostFileCreate(text, &file);
-  if (code != kNoError || file == nullptr) throw int{code};
+  if (code != kNoError || file == nullptr) ThrowCode(code);
   return file;
 }
 
 // Reads the first `count` bytes; the file is closed in every case.
 HostError ReadFromStart(HostFile* file, std::int64_t count, void* buffer) {
   HostError kept = Guarded([&] {
-    ThrowOnError(HostFileOpen(file, HOST_FILE_READ));
-    ThrowOnError(HostFileRead(file, count, buffer));
+    const HostError code = HostFileOpen(file, HOST_FILE_READ);
+    return code == kNoError ? HostFileRead(file, count, buffer) : code;
   });
   KeepFirst(&kept, HostFileClose(file));
   return kept;
@@ -52,7 +52,7 @@ class FileBuffer {
     code = suites_.MemorySuite1().LockMemHandle(handle_, &address);
     if (code != kNoError) return code;
     text_ = static_cast<char*>(address);
-    code = Guarded([&] { ThrowOnError(ReadFromStart(file, size, text_)); });
+    code = Guarded([&] { return ReadFromStart(file, size, text_); });
     if (text_ == nullptr) return code;
     size_ = code == kNoError ? size : 0;
     std::memset(text_ + size_, 0, kTerminatorBytes);
@@ -109,47 +109,52 @@ void ParseAndBuild(const FileBuffer& buffer, HostFile* file, VOR_Item* folder) {
   parser.MakeComp(folder, name.get());
 }
 
+// An exception that Guarded lets through leaves what is open open, the buffer too, but for the parser and the
+// suites; the callback makes a code of it.
 HostError Import(const HostUTF16Unit* path, VOR_Item* folder) {
   QZGP_SuiteHandler suites(G_basic_suiteP);
   FileBuffer buffer(suites);
   // Deliberate: the file object is not disposed of.
   HostFile* file = nullptr;
   HostError fileCode = Guarded([&] { file = MakeFile(path); });
-  if (fileCode == kNoError) fileCode = Guarded([&] { ThrowOnError(ReadScene(file, suites, &buffer)); });
+  if (fileCode == kNoError) fileCode = Guarded([&] { return ReadScene(file, suites, &buffer); });
   HostError kept = Guarded([&] { ParseAndBuild(buffer, file, folder); });
   KeepFirst(&kept, fileCode);
   KeepFirst(&kept, buffer.Release());
   return kept;
 }
 
-// The header test without messages, between the two ends of the host's silence.
+// The header test without messages, between the two ends of the host's silence. Whatever is thrown on the
+// way, the silence ends and the file is disposed of.
 HostError VerifySilently(const HostUTF16Unit* path, QZGP_SuiteHandler& suites, std::uint8_t* canImport) {
   constexpr std::int32_t kNoReport = 0;
   HostSilentErrorState state{};
-  ThrowOnError(suites.UtilitySuite7().BeginSilentErrors(&state));
+  const HostError code = suites.UtilitySuite7().BeginSilentErrors(&state);
+  if (code != kNoError) return code;
   HostFile* file = nullptr;
-  HostError kept = Guarded([&] {
+  HostError kept = GuardedAtBorder([&] {
     file = MakeFile(path);
-    ThrowOnError(CheckMayaHeader(file, suites, true, canImport));
+    return CheckMayaHeader(file, suites, true, canImport);
   });
-  KeepFirst(&kept, Guarded([&] { ThrowOnError(suites.UtilitySuite7().EndSilentErrors(kNoReport, &state)); }));
-  if (file != nullptr) KeepFirst(&kept, Guarded([&] { ThrowOnError(HostFileDispose(file)); }));
+  KeepFirst(&kept,
+            GuardedAtBorder([&] { return suites.UtilitySuite7().EndSilentErrors(kNoReport, &state); }));
+  if (file != nullptr) KeepFirst(&kept, GuardedAtBorder([&] { return HostFileDispose(file); }));
   return kept;
 }
 
 }  // namespace
 
 HostError ImportFileCallback(const HostUTF16Unit* path, void*, void*, VOR_Item* folder) {
-  return Guarded([&] { ThrowOnError(Import(path, folder)); });
+  return GuardedAtBorder([&] { return Import(path, folder); });
 }
 
 HostError VerifyFileCallback(const HostUTF16Unit* path, void*, std::uint8_t* canImport) {
   if (canImport == nullptr) return kNullArgument;
   *canImport = 0;
   if (path == nullptr || path[0] == 0) return kNoError;
-  return Guarded([&] {
+  return GuardedAtBorder([&] {
     QZGP_SuiteHandler suites(G_basic_suiteP);
-    ThrowOnError(VerifySilently(path, suites, canImport));
+    return VerifySilently(path, suites, canImport);
   });
 }
 

@@ -39,7 +39,7 @@ QZGP_SuiteHandler::~QZGP_SuiteHandler() {
   }
 }
 
-void QZGP_SuiteHandler::MissingSuiteError() { throw int{kMissingSuite}; }
+void QZGP_SuiteHandler::MissingSuiteError() { ThrowCode(kMissingSuite); }
 
 void QZGP_SuiteHandler::Acquire(Slot slot) {
   const void* suite = nullptr;

@@ -3,7 +3,15 @@
 #include <new>
 #include <stdexcept>
 
+#include "refhost/Rehearsal.h"
+
 namespace refhost {
+namespace {
+
+// What nobody else can catch by its type.
+struct OtherException {};
+
+}  // namespace
 
 void Call::refuse(HostError code, const std::string& sentence) {
   error_ = code;
@@ -75,8 +83,7 @@ void Call::judge() {
   const Verdict verdict = host_.rehearsal.judge(operation_);
   rehearsed_ = verdict.rehearsed;
   error_ = verdict.code;
-  throws_ = verdict.throws();
-  outOfMemory_ = verdict.kind == Failure::Kind::BadAlloc;
+  kind_ = verdict.kind;
 }
 
 TraceLine& Call::startLine() {
@@ -93,17 +100,24 @@ TraceLine* Call::traced(const char* suite, std::int32_t version) {
 
 void Call::conclude() {
   if (line_ != nullptr) {
-    if (throws_) {
-      line_->text("error", outOfMemory_ ? "bad_alloc" : "runtime_error");
+    if (throws()) {
+      line_->text("error", kindName(kind_));
     } else {
       line_->integer("error", error_);
     }
     line_->end();
     host_.trace.write(*line_);
   }
-  if (!throws_) return;
-  if (outOfMemory_) throw std::bad_alloc();
-  throw std::runtime_error(std::string("rehearsed failure of ") + factsOf(operation_).name);
+  switch (kind_) {
+    case Failure::Kind::Code:
+      return;
+    case Failure::Kind::BadAlloc:
+      throw std::bad_alloc();
+    case Failure::Kind::RuntimeError:
+      throw std::runtime_error(std::string("rehearsed failure of ") + factsOf(operation_).name);
+    case Failure::Kind::Other:
+      throw OtherException();
+  }
 }
 
 }  // namespace refhost

@@ -33,13 +33,13 @@ class Call {
   template <typename... Outs>
   bool goesOn(Outs*... outs) {
     if (!rehearsed_) return true;
-    if (!throws_ && error_ == 0) ((outs != nullptr ? void(*outs = Outs{}) : void()), ...);
+    if (!throws() && error_ == 0) ((outs != nullptr ? void(*outs = Outs{}) : void()), ...);
     return false;
   }
 
   // Whether the call did what it was asked for.
   bool didItsWork() const { return !rehearsed_ && error_ == 0; }
-  bool failed() const { return throws_ || error_ != 0; }
+  bool failed() const { return throws() || error_ != 0; }
 
   [[gnu::cold]] void refuse(HostError code, const std::string& sentence);
 
@@ -106,6 +106,7 @@ class Call {
   }
 
  private:
+  bool throws() const { return kind_ != Failure::Kind::Code; }
   void judge();
   [[gnu::cold]] TraceLine& startLine();
   [[gnu::cold]] void refuseHandle(const void* handle, HandleKind wanted, const char* what);
@@ -118,9 +119,8 @@ class Call {
   TraceLine* line_ = nullptr;  // the host's, while this call writes it
   HostError error_ = 0;
   Operation operation_;
+  Failure::Kind kind_ = Failure::Kind::Code;  // any other is thrown at the end
   bool rehearsed_ = false;
-  bool throws_ = false;       // at the end
-  bool outOfMemory_ = false;  // what it throws then: std::bad_alloc, or a runtime_error
 };
 
 }  // namespace refhost

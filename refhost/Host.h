@@ -25,7 +25,7 @@ enum class Callback { Entry, Import, Verify, Death };
 
 // One failure to rehearse; parsed by Rehearsal.h from the forms that the command line takes.
 struct Failure {
-  enum class Kind { Code, BadAlloc, RuntimeError };
+  enum class Kind { Code, BadAlloc, RuntimeError, Other };
   std::string operation;  // a suite call or utility service; empty: counted over all suite calls
   std::int64_t nth = 1;   // from 1; 0 is every call (only with an operation)
   bool onwards = false;   // this call and all after it (only without an operation)

@@ -45,14 +45,13 @@ bool setCode(Failure* failure, std::string_view code, std::string* complaint) {
 }
 
 bool setKind(Failure* failure, std::string_view kind, std::string* complaint) {
-  if (kind == "bad_alloc") {
-    failure->kind = Failure::Kind::BadAlloc;
-  } else if (kind == "runtime_error") {
-    failure->kind = Failure::Kind::RuntimeError;
-  } else {
-    return complain(complaint, kind, "an exception is bad_alloc or runtime_error");
+  for (const Failure::Kind known :
+       {Failure::Kind::BadAlloc, Failure::Kind::RuntimeError, Failure::Kind::Other}) {
+    if (kind != kindName(known)) continue;
+    failure->kind = known;
+    return true;
   }
-  return true;
+  return complain(complaint, kind, "an exception is bad_alloc, runtime_error or other");
 }
 
 // What stands behind the equals sign.
@@ -110,6 +109,20 @@ std::optional<Failure> parseNumbered(std::string_view text, const Effect& effect
 }
 
 }  // namespace
+
+const char* kindName(Failure::Kind kind) {
+  switch (kind) {
+    case Failure::Kind::Code:
+      break;
+    case Failure::Kind::BadAlloc:
+      return "bad_alloc";
+    case Failure::Kind::RuntimeError:
+      return "runtime_error";
+    case Failure::Kind::Other:
+      return "other";
+  }
+  return "code";
+}
 
 std::optional<Failure> parseFail(std::string_view text, std::string* complaint) {
   return parseNamed(text, kCodeEffect, complaint);

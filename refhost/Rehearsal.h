@@ -18,6 +18,9 @@ std::optional<Failure> parseThrow(std::string_view text, std::string* complaint)
 std::optional<Failure> parseFailAt(std::string_view text, std::string* complaint);
 std::optional<Failure> parseThrowAt(std::string_view text, std::string* complaint);
 
+// The word for a kind of exception, in these forms and in a trace.
+const char* kindName(Failure::Kind kind);
+
 // "SUITE:VERSION".
 std::optional<RefusedSuite> parseRefuse(std::string_view text, std::string* complaint);
 

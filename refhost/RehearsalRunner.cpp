@@ -16,6 +16,8 @@ std::int32_t thrownBy(Failure::Kind kind) {
       return HOST_THROW_BAD_ALLOC;
     case Failure::Kind::RuntimeError:
       return HOST_THROW_RUNTIME_ERROR;
+    case Failure::Kind::Other:
+      return HOST_THROW_OTHER;
   }
   return HOST_THROW_NOTHING;
 }

@@ -17,8 +17,6 @@ struct Verdict {
   bool rehearsed = false;
   Failure::Kind kind = Failure::Kind::Code;
   HostError code = 0;
-
-  bool throws() const { return rehearsed && kind != Failure::Kind::Code; }
 };
 
 class RehearsalRunner {

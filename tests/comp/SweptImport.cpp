@@ -98,7 +98,7 @@ std::string WithErrors(const std::vector<std::string>& calls, std::string_view e
   return text;
 }
 
-void ExpectMade(const SweptRun& run, const Made& made, std::size_t reports) {
+void ExpectMade(const SweptRun& run, const Made& made, std::size_t reports, std::size_t leftOpen) {
   const refhost::Project& project = run.host->project();
   Made there;
   there.compositions = project.compositions().size();
@@ -111,9 +111,7 @@ void ExpectMade(const SweptRun& run, const Made& made, std::size_t reports) {
   EXPECT_EQ(there.layers, made.layers);
   EXPECT_EQ(there.keys, made.keys);
   EXPECT_EQ(there.leftovers, made.leftovers);
-  for (const refhost::Leftover& left : run.result.leftovers) {
-    EXPECT_TRUE(left.keptByDesign) << left.description;
-  }
+  EXPECT_EQ(LeftOpen(run.result), leftOpen);
   EXPECT_EQ(run.result.messages.size(), reports);
   for (const std::string& message : run.result.messages) {
     EXPECT_TRUE(message.starts_with(refhost::errorSentence(run.result.code))) << message;

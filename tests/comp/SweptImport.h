@@ -94,8 +94,8 @@ class SweepCursor {
 // The lines of calls without their errors, each with this one.
 std::string WithErrors(const std::vector<std::string>& calls, std::string_view error);
 
-// The project holds what is expected, the ledger what is left over, and nothing is shown but by
-// translate-and-report, which `reports` says.
-void ExpectMade(const SweptRun& run, const Made& made, std::size_t reports);
+// The project holds what is expected, the ledger what is left over (`leftOpen` of it not by design), and
+// nothing is shown but by translate-and-report, which `reports` says.
+void ExpectMade(const SweptRun& run, const Made& made, std::size_t reports, std::size_t leftOpen = 0);
 
 }  // namespace testsupport

@@ -13,6 +13,7 @@
 #include "TemporaryFolder.h"
 #include "UtilityTest.h"
 #include "hostutil/HostSetup.h"
+#include "tests/support/ThrowsOther.h"
 
 namespace hostutil_tests {
 namespace {
@@ -208,6 +209,8 @@ void Rehearse(const FaultPoint& point, const HostUtilityFailure& failure) {
         EXPECT_THROW(point.call(scene), std::bad_alloc) << "call " << i + 1;
       } else if (failure.thrown == HOST_THROW_RUNTIME_ERROR) {
         EXPECT_THROW(point.call(scene), std::runtime_error) << "call " << i + 1;
+      } else if (failure.thrown == HOST_THROW_OTHER) {
+        EXPECT_TRUE(testsupport::ThrowsOther([&] { point.call(scene); })) << "call " << i + 1;
       } else {
         EXPECT_EQ(point.call(scene), failure.code) << "call " << i + 1;
       }
@@ -240,9 +243,9 @@ TEST_F(RehearsalSweepTest, WithCodeZeroEveryServiceDoesNothingAndHandsOutNothing
   }
 }
 
-TEST_F(RehearsalSweepTest, EveryServiceCanThrowEitherException) {
+TEST_F(RehearsalSweepTest, EveryServiceCanThrowEveryException) {
   for (const FaultPoint& point : FaultPoints()) {
-    for (const int32_t thrown : {HOST_THROW_BAD_ALLOC, HOST_THROW_RUNTIME_ERROR}) {
+    for (const int32_t thrown : {HOST_THROW_BAD_ALLOC, HOST_THROW_RUNTIME_ERROR, HOST_THROW_OTHER}) {
       Rehearse(point, {point.service, 3, 4711, thrown});
       Rehearse(point, {point.service, 0, 4711, thrown});
     }

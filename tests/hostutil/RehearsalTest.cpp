@@ -19,7 +19,7 @@ class RehearsalTest : public UtilityTest {
     ASSERT_EQ(HostAddUtilityFailure(&failure), HOST_ERR_NONE);
   }
 
-  // The codes of so many scans; -1 and -2 for what is thrown.
+  // The codes of so many scans; -1, -2 and -3 for what is thrown.
   static std::vector<HostError> Scans(int count) {
     std::vector<HostError> codes;
     for (int i = 0; i < count; ++i) {
@@ -31,6 +31,10 @@ class RehearsalTest : public UtilityTest {
       } catch (const std::runtime_error& error) {
         EXPECT_STREQ(error.what(), "rehearsed failure");
         codes.push_back(-2);
+      } catch (const std::exception&) {
+        codes.push_back(-4);
+      } catch (...) {
+        codes.push_back(-3);
       }
     }
     return codes;
@@ -54,9 +58,10 @@ TEST_F(RehearsalTest, CallZeroIsEveryCall) {
 TEST_F(RehearsalTest, AFailureCanThrow) {
   Add({HOST_UTILITY_NumberScan, 2, 77, HOST_THROW_BAD_ALLOC});
   Add({HOST_UTILITY_NumberScan, 3, 77, HOST_THROW_RUNTIME_ERROR});
+  Add({HOST_UTILITY_NumberScan, 4, 77, HOST_THROW_OTHER});
   HostBeginRehearsal();
-  EXPECT_EQ(Scans(4), (Codes{0, -1, -2, 0}));
-  EXPECT_EQ(HostUtilityCallCount(HOST_UTILITY_NumberScan), 4) << "a call that throws is counted";
+  EXPECT_EQ(Scans(5), (Codes{0, -1, -2, -3, 0}));
+  EXPECT_EQ(HostUtilityCallCount(HOST_UTILITY_NumberScan), 5) << "a call that throws is counted";
 }
 
 TEST_F(RehearsalTest, SeveralFailuresOfOneServiceAllWork) {
@@ -126,7 +131,7 @@ TEST_F(RehearsalTest, AFailureOutOfRangeIsRefused) {
                                       {HOST_UTILITY_COUNT, 1, 7, 0},
                                       {HOST_UTILITY_NumberScan, -1, 7, 0},
                                       {HOST_UTILITY_NumberScan, 1, 7, -1},
-                                      {HOST_UTILITY_NumberScan, 1, 7, HOST_THROW_RUNTIME_ERROR + 1}};
+                                      {HOST_UTILITY_NumberScan, 1, 7, HOST_THROW_OTHER + 1}};
   for (const HostUtilityFailure& failure : wrong) {
     EXPECT_EQ(HostAddUtilityFailure(&failure), HOST_ERR_UTILITY_NULL);
   }

@@ -22,6 +22,10 @@ std::string With(std::string line, std::string_view key, std::string_view replac
 
 std::string WithNull(const std::string& line, std::string_view key) { return With(line, key, "null"); }
 
+bool IsReported(const Way& way) {
+  return way.kind == Failure::Kind::BadAlloc || way.kind == Failure::Kind::RuntimeError;
+}
+
 // The line of a call that fails: it hands nothing out.
 std::string Failed(const std::string& line, const std::string& error) {
   const std::string call = CallName(line);
@@ -74,7 +78,8 @@ Outcome CallbackModel::WhereCallsFail(std::size_t index, const Way& way, bool on
     outcome.code = endsSilence ? CodeBehind(way) : way.code;
     if (!thrown && CallName(good_[end]) == "AcquireSuite") outcome.code = HOST_ERR_MISSING_SUITE;
     outcome.canImport = endsSilence && canImport_;
-    outcome.reported = thrown && !endsSilence ? way.code : 0;  // what is shown while silent is not shown
+    const bool shown = IsReported(way) && !endsSilence;  // what is shown while silent is not shown
+    outcome.reported = shown ? way.code : 0;
   }
   LoseTheStore(&outcome.calls);
   return outcome;
@@ -91,7 +96,7 @@ Outcome CallbackModel::WhereAServiceFails(std::string_view service, std::size_t 
   outcome.code = behind ? CodeBehind(way) : way.code;
   outcome.canImport = disposal && canImport_;
   outcome.files = disposal ? 1 : 0;
-  outcome.reported = thrown && !held.IsSilent() ? way.code : 0;
+  outcome.reported = IsReported(way) && !held.IsSilent() ? way.code : 0;
   if (service == "RegisterStringTable" && !thrown) outcome.calls = CallsWithoutImporter();
   return outcome;
 }

@@ -131,7 +131,7 @@ TEST_F(EntryTest, ANullBasicSuiteIsThirteen) {
   EXPECT_EQ(MayaImportEntry(nullptr, 1, 0, kRunPluginId, nullptr), 13);
 }
 
-TEST_F(EntryTest, AStandardExceptionIsTranslatedAndReported) {
+TEST_F(EntryTest, AnExceptionBecomesItsCodeAndAStandardOneIsReported) {
   for (const char* const call :
        {"GetAppPrefsBlob", "GetPrefLong", "RegisterDeathHook", "RegisterImporterName",
         "RegisterImporterTypes", "RegisterImporterCallbacks", "RegisterStringTable"}) {
@@ -144,6 +144,10 @@ TEST_F(EntryTest, AStandardExceptionIsTranslatedAndReported) {
         LoadWith({ThrowCall(call, 1, refhost::Failure::Kind::RuntimeError)});
     EXPECT_EQ(other.code, HOST_ERR_EXCEPTION_OTHER);
     ExpectSound(other);
+    const refhost::CallbackResult unknown = LoadWith({ThrowCall(call, 1, refhost::Failure::Kind::Other)});
+    EXPECT_EQ(unknown.code, HOST_ERR_EXCEPTION_OTHER);
+    EXPECT_THAT(unknown.messages, ::testing::IsEmpty());
+    ExpectSound(unknown);
   }
 }
 

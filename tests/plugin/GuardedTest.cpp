@@ -54,6 +54,31 @@ TEST_F(GuardedTest, AnyOtherExceptionPassesThrough) {
   EXPECT_THROW(Guarded([] { throw 1.5; }), double);
 }
 
+TEST_F(GuardedTest, ACodeThatTheWorkReturnsIsTheCode) {
+  for (const HostError code : {0, 13, -1}) EXPECT_EQ(Guarded([&] { return code; }), code);
+  EXPECT_TRUE(reports_.empty());
+}
+
+TEST_F(GuardedTest, AtTheBorderNothingPassesThrough) {
+  EXPECT_EQ(GuardedAtBorder([] { throw "text"; }), HOST_ERR_EXCEPTION_OTHER);
+  EXPECT_EQ(GuardedAtBorder([]() -> HostError { throw 1.5; }), HOST_ERR_EXCEPTION_OTHER);
+  EXPECT_EQ(GuardedAtBorder([] {}), 0);
+  EXPECT_EQ(GuardedAtBorder([] { return HostError{77}; }), 77);
+  EXPECT_EQ(GuardedAtBorder([] { throw int{78}; }), 78);
+  EXPECT_TRUE(reports_.empty());
+  EXPECT_EQ(GuardedAtBorder([] { throw std::bad_alloc(); }), HOST_ERR_EXCEPTION_MEMORY);
+  EXPECT_EQ(reports_.size(), 1u);
+}
+
+TEST_F(GuardedTest, UnreportedWorkEndsWithItsStandardExceptionAndNobodyIsTold) {
+  bool done = false;
+  Unreported([&] { done = true; });
+  EXPECT_TRUE(done);
+  EXPECT_NO_THROW(Unreported([] { throw std::runtime_error("why"); }));
+  EXPECT_THROW(Unreported([] { throw int{5}; }), int);
+  EXPECT_TRUE(reports_.empty());
+}
+
 TEST_F(GuardedTest, TheFirstCodeIsKept) {
   HostError kept = 0;
   KeepFirst(&kept, 0);
@@ -62,6 +87,12 @@ TEST_F(GuardedTest, TheFirstCodeIsKept) {
   KeepFirst(&kept, 6);
   KeepFirst(&kept, 0);
   EXPECT_EQ(kept, 5);
+}
+
+TEST_F(GuardedTest, ThrowCodeThrowsEveryCode) {
+  for (const HostError code : {0, 13, -1}) {
+    EXPECT_THAT([&] { ThrowCode(code); }, ::testing::Throws<int>(::testing::Eq(code)));
+  }
 }
 
 TEST_F(GuardedTest, OnlyACodeThatIsNotZeroIsThrown) {

@@ -145,6 +145,35 @@ TEST_F(ImportFailureTest, EveryThrownExceptionIsTranslatedAndLeavesNothing) {
   }
 }
 
+TEST_F(ImportFailureTest, AnUnknownExceptionLeavesTheTextLockedAndReleasesTheParsersSuites) {
+  const refhost::CallbackResult result =
+      Import(path_, {ThrowCall("CreateComp", 1, refhost::Failure::Kind::Other)});
+  EXPECT_EQ(result.code, HOST_ERR_EXCEPTION_OTHER);
+  EXPECT_THAT(result.messages, IsEmpty());
+  EXPECT_EQ(CallsNamed("UnlockMemHandle"), 0u);
+  EXPECT_EQ(CallsNamed("FreeMemHandle"), 0u);
+  ASSERT_EQ(result.leftovers.size(), 2u);
+  EXPECT_EQ(result.leftovers[0].description,
+            "mem:1 (file buffer, " + std::to_string(std::string(kScene).size() + 2) + " bytes)");
+  EXPECT_FALSE(result.leftovers[0].keptByDesign);
+  EXPECT_TRUE(result.leftovers[1].keptByDesign);  // the file object
+  EXPECT_EQ(Import(path_).code, 0);
+}
+
+TEST_F(ImportFailureTest, AnUnknownExceptionPassesTheOpenBatchesButReleasesTheStreamInUse) {
+  const refhost::CallbackResult result =
+      Import(path_, {ThrowCall("SetBatchKeyframeValue", 3, refhost::Failure::Kind::Other)});
+  EXPECT_EQ(result.code, HOST_ERR_EXCEPTION_OTHER);
+  std::size_t batches = 0;
+  for (const refhost::Leftover& left : result.leftovers) {
+    EXPECT_FALSE(left.description.starts_with("stream:")) << left.description;
+    if (left.description.starts_with("batch:")) ++batches;
+  }
+  // The zoom has two keys of its own; the third value is the first of the five batches of the rig.
+  EXPECT_EQ(batches, 5u);
+  EXPECT_EQ(CallsNamed("EndKeyframeBatch"), 1u);
+}
+
 TEST_F(ImportFailureTest, EveryUtilityServiceFailingInTurnIsSound) {
   Import(path_);
   for (const char* const service :

@@ -208,6 +208,24 @@ TEST_F(VerifyTest, EveryThrownExceptionIsTranslatedAndTheSilenceEnds) {
   }
 }
 
+TEST_F(VerifyTest, AnUnknownExceptionIsSilentTooAndTheSilenceEnds) {
+  const auto path = Write("scene.ma", kScene);
+  for (const char* const call : {"AcquireSuite", "BeginSilentErrors", "EndSilentErrors", "FileCreate",
+                                 "FileOpen", "FileRead", "FileClose", "FileDispose", "StringMake"}) {
+    SCOPED_TRACE(call);
+    const std::string name(call);
+    const refhost::CallbackResult result = Verify(path, {ThrowCall(call, 1, refhost::Failure::Kind::Other)});
+    EXPECT_EQ(result.code, HOST_ERR_EXCEPTION_OTHER);
+    EXPECT_THAT(result.messages, ::testing::IsEmpty());
+    EXPECT_EQ(result.canImport, name == "EndSilentErrors" || name == "FileDispose");
+    const bool silent = name != "AcquireSuite" && name != "BeginSilentErrors";
+    EXPECT_EQ(CallsNamed("EndSilentErrors"), silent ? 1u : 0u);
+    EXPECT_EQ(host_->callCount("FileDispose"),
+              silent && name != "FileCreate" && name != "StringMake" ? 1 : 0);
+    ExpectSound(result);
+  }
+}
+
 TEST_F(VerifyTest, EverySuiteCallFailingInTurnIsSound) {
   const auto path = Write("scene.ma", kScene);
   const std::int64_t calls = Verify(path).suiteCalls;

@@ -21,6 +21,7 @@ TEST(RehearsalForms, EveryGoodFormIsRead) {
   constexpr auto code = Failure::Kind::Code;
   constexpr auto badAlloc = Failure::Kind::BadAlloc;
   constexpr auto runtimeError = Failure::Kind::RuntimeError;
+  constexpr auto other = Failure::Kind::Other;
   const GoodForm forms[] = {
       {parseFail, "CreateComp:1=512", "CreateComp", 1, false, code, 512},
       {parseFail, "AcquireSuite:0=-3", "AcquireSuite", 0, false, code, -3},
@@ -29,10 +30,13 @@ TEST(RehearsalForms, EveryGoodFormIsRead) {
        INT32_MAX},
       {parseThrow, "ReleaseStream:3=bad_alloc", "ReleaseStream", 3, false, badAlloc, 0},
       {parseThrow, "ListAppend:4=runtime_error", "ListAppend", 4, false, runtimeError, 0},
+      {parseThrow, "FileRead:0=other", "FileRead", 0, false, other, 0},
       {parseFailAt, "5=6", "", 5, false, code, 6},
       {parseFailAt, "7+=-2147483648", "", 7, true, code, INT32_MIN},
       {parseThrowAt, "8=bad_alloc", "", 8, false, badAlloc, 0},
       {parseThrowAt, "9+=runtime_error", "", 9, true, runtimeError, 0},
+      {parseThrowAt, "10=other", "", 10, false, other, 0},
+      {parseThrowAt, "11+=other", "", 11, true, other, 0},
   };
   for (const GoodForm& form : forms) {
     std::string complaint;
@@ -73,8 +77,9 @@ TEST(RehearsalForms, EveryBadFormIsToldInWords) {
       {parseFail, "CreateComp:1=bad_alloc", "a code is a 32-bit integer"},
       {parseFail, "CreateComp:1=2 ", "a code is a 32-bit integer"},
       {parseThrow, "CreateComp:1", namedThrowForm},
-      {parseThrow, "CreateComp:1=5", "\"5\": an exception is bad_alloc or runtime_error"},
+      {parseThrow, "CreateComp:1=5", "\"5\": an exception is bad_alloc, runtime_error or other"},
       {parseThrow, "CreateComp:1=Bad_Alloc", "an exception is"},
+      {parseThrow, "CreateComp:1=code", "an exception is"},
       {parseFailAt, "5", numberedForm},
       {parseFailAt, "0=5", "\"0\": calls are numbered from 1"},
       {parseFailAt, "=5", "calls are numbered from 1"},

@@ -6,6 +6,7 @@
 #include "hostutil/HostNumbers.h"
 #include "hostutil/HostSetup.h"
 #include "tests/refhost/StandIn.h"
+#include "tests/support/ThrowsOther.h"
 
 namespace refhost {
 namespace {
@@ -130,20 +131,23 @@ TEST(Rehearsal, ThrownExceptionsAreNamedInTheTrace) {
   Failure failure = codeFailure("GetAppPrefsBlob", 1, 0);
   failure.kind = Failure::Kind::BadAlloc;
   options.failures.push_back(failure);
-  failure = atCall(2, true, 0);
+  failure = atCall(2, false, 0);
   failure.kind = Failure::Kind::RuntimeError;
+  options.failures.push_back(failure);
+  failure = atCall(3, true, 0);
+  failure.kind = Failure::Kind::Other;
   options.failures.push_back(failure);
   StandIn plugin(options);
   HostPrefsStore* store = nullptr;
   EXPECT_THROW(kPersistentDataSuite3.GetAppPrefsBlob(&store), std::bad_alloc);
   EXPECT_THROW(kPersistentDataSuite3.GetAppPrefsBlob(&store), std::runtime_error);
-  EXPECT_THROW(show(), std::runtime_error);
+  EXPECT_TRUE(testsupport::ThrowsOther([] { show(); }));
   EXPECT_THAT(
       plugin.lines(),
       ElementsAre(
           R"({"call":"GetAppPrefsBlob","suite":"QZGP Persistent Data Suite","version":3,"store":null,"error":"bad_alloc"})",
           R"({"call":"GetAppPrefsBlob","suite":"QZGP Persistent Data Suite","version":3,"store":null,"error":"runtime_error"})",
-          R"({"call":"ShowMessage","suite":"QZGP Utility Suite","version":7,"pluginId":7,"text":"text","error":"runtime_error"})"));
+          R"({"call":"ShowMessage","suite":"QZGP Utility Suite","version":7,"pluginId":7,"text":"text","error":"other"})"));
 }
 
 TEST(Rehearsal, ExceptionIsThrownWithoutATraceToo) {
@@ -319,11 +323,18 @@ TEST(Rehearsal, EveryOperationFailsOnDemandByItsName) {
 TEST(Rehearsal, EveryOperationThrowsOnDemand) {
   for (const NamedCall& named : kCalls) {
     const char* name = factsOf(named.operation).name;
-    Failure failure = codeFailure(name, 0, 0);
+    Failure failure = codeFailure(name, 1, 0);
     failure.kind = Failure::Kind::RuntimeError;
-    StandIn plugin(withFailure(failure));
-    EXPECT_THROW(named.call(*plugin.host().basicSuite()), std::runtime_error) << name;
+    HostOptions options = withFailure(failure);
+    failure.nth = 2;
+    failure.kind = Failure::Kind::Other;
+    options.failures.push_back(failure);
+    StandIn plugin(options);
+    const auto call = [&] { named.call(*plugin.host().basicSuite()); };
+    EXPECT_THROW(call(), std::runtime_error) << name;
     EXPECT_THAT(plugin.lastLine(), ::testing::EndsWith(",\"error\":\"runtime_error\"}")) << name;
+    EXPECT_TRUE(testsupport::ThrowsOther(call)) << name;
+    EXPECT_THAT(plugin.lastLine(), ::testing::EndsWith(",\"error\":\"other\"}")) << name;
   }
 }
 

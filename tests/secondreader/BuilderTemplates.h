@@ -13,7 +13,13 @@ template <typename Work>
 void Builder::withStream(Handle layer, std::int32_t id, Work work) {
   Handle stream = 0;
   check(suites_.acquireLayerStream(layer, id, &stream));
-  const HostError kept = suites_.host().guarded([&] { work(stream); });
+  HostError kept = HOST_ERR_NONE;
+  try {
+    kept = suites_.host().guarded([&] { work(stream); });
+  } catch (const UnknownException&) {
+    if (stream != 0) suites_.host().atBorder([&] { suites_.releaseStream(stream); });
+    throw;
+  }
   if (stream != 0) suites_.releaseStream(stream);
   check(kept);
 }

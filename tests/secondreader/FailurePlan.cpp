@@ -41,9 +41,24 @@ bool FailurePlan::refuses(std::string_view suite, std::int32_t version) const {
   return false;
 }
 
+const char* wordOf(refhost::Failure::Kind kind) {
+  switch (kind) {
+    case refhost::Failure::Kind::Code:
+      break;
+    case refhost::Failure::Kind::BadAlloc:
+      return "bad_alloc";
+    case refhost::Failure::Kind::RuntimeError:
+      return "runtime_error";
+    case refhost::Failure::Kind::Other:
+      return "other";
+  }
+  return "";
+}
+
 void throwPlanned(const refhost::Failure& failure, const std::string& what) {
   if (failure.kind == refhost::Failure::Kind::BadAlloc) throw std::bad_alloc();
   if (failure.kind == refhost::Failure::Kind::RuntimeError) throw std::runtime_error(what);
+  if (failure.kind == refhost::Failure::Kind::Other) throw UnknownException{};
 }
 
 }  // namespace secondreader

@@ -40,7 +40,13 @@ class FailurePlan {
   std::map<std::string, std::int64_t> counts_;
 };
 
-// Throws the standard exception of a planned failure; nothing when it is a code.
+// The word for a kind of exception in a trace.
+const char* wordOf(refhost::Failure::Kind kind);
+
+// A planned exception that is no standard one.
+struct UnknownException {};
+
+// Throws the exception of a planned failure; nothing when it is a code.
 void throwPlanned(const refhost::Failure& failure, const std::string& what);
 
 }  // namespace secondreader

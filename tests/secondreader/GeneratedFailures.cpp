@@ -23,6 +23,8 @@ constexpr std::string_view kEntryCalls[] = {
 constexpr const char* kSuites[] = {"QZGP Utility Suite", "QZGP Memory Suite", "QZGP Comp Suite",
                                    "QZGP Layer Suite",   "QZGP Camera Suite", "QZGP Stream Suite",
                                    "QZGP Keyframe Suite"};
+constexpr refhost::Failure::Kind kKinds[] = {
+    refhost::Failure::Kind::BadAlloc, refhost::Failure::Kind::RuntimeError, refhost::Failure::Kind::Other};
 constexpr HostError kCodes[] = {0, 0, 7321, -1, 13, 2001, 1289986};
 
 class Planner {
@@ -41,8 +43,7 @@ class Planner {
     }
     failure.code = dice_.oneOf(kCodes);
     if (dice_.chance(30)) {
-      failure.kind =
-          dice_.chance(50) ? refhost::Failure::Kind::BadAlloc : refhost::Failure::Kind::RuntimeError;
+      failure.kind = dice_.oneOf(kKinds);
     }
     return failure;
   }

@@ -80,8 +80,7 @@ void PlayedCall::handedInteger(const char* key, std::int64_t value) {
 HostError PlayedCall::finish() {
   const bool throws = failure_ && failure_->kind != refhost::Failure::Kind::Code;
   if (throws) {
-    const bool memory = failure_->kind == refhost::Failure::Kind::BadAlloc;
-    line_.text("error", memory ? "bad_alloc" : "runtime_error");
+    line_.text("error", wordOf(failure_->kind));
   } else {
     line_.integer("error", error_);
   }

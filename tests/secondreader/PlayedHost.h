@@ -61,6 +61,16 @@ class PlayedHost {
     }
   }
 
+  // The same where no exception passes; the code of an unknown one is that of any other failure.
+  template <typename Work>
+  HostError atBorder(Work work) {
+    try {
+      return guarded(work);
+    } catch (const UnknownException&) {
+      return HOST_ERR_EXCEPTION_OTHER;
+    }
+  }
+
   // Counts a call of a utility service. True when it is to do nothing and return *code; throws when it is to
   // throw.
   bool serviceFails(const char* name, HostError* code);

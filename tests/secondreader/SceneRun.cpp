@@ -7,6 +7,7 @@
 
 #include "plugin/Entry.h"
 #include "plugin/Globals.h"
+#include "tests/secondreader/FailurePlan.h"
 #include "tests/secondreader/ProjectText.h"
 #include "tests/secondreader/SceneGenerator.h"
 #include "tests/secondreader/TraceComparison.h"
@@ -110,7 +111,7 @@ std::string describe(const refhost::HostOptions& options) {
     if (failure.kind == refhost::Failure::Kind::Code) {
       words << failure.code;
     } else {
-      words << (failure.kind == refhost::Failure::Kind::BadAlloc ? "bad_alloc" : "runtime_error");
+      words << wordOf(failure.kind);
     }
     words << ';';
   }

@@ -82,7 +82,7 @@ PredictedCallback Callbacks::run(refhost::Callback callback, Work work) {
   }
   host_.lines.push_back({entered.ended()});
   host_.plan.begin(callback);
-  const HostError code = host_.guarded(work);
+  const HostError code = host_.atBorder(work);
   host_.plan.end();
   PlayedLine left("leave");
   left.text("callback", nameOf(callback));
@@ -162,12 +162,12 @@ void Callbacks::verify() {
   withSuites(host_, [&](SuiteUser& suites) {
     check(suites.beginSilentErrors());
     std::optional<PlayedFile> file;
-    HostError kept = host_.guarded([&] {
+    HostError kept = host_.atBorder([&] {
       file = makeFile();
       if (file) check(testHeader(suites, file, true, &canImport_));
     });
     const auto keepFirst = [&](auto work) {
-      const HostError code = host_.guarded([&] { check(work()); });
+      const HostError code = host_.atBorder([&] { check(work()); });
       if (kept == HOST_ERR_NONE) kept = code;
     };
     keepFirst([&] { return suites.endSilentErrors(); });

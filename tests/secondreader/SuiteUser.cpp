@@ -40,6 +40,8 @@ void SuiteUser::releaseAll() {
     }
   } catch (const std::exception&) {
     throw ProcessEnds{};
+  } catch (const UnknownException&) {
+    throw ProcessEnds{};
   }
 }
 

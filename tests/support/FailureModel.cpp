@@ -110,12 +110,30 @@ void HeldByCallback::TakeStream(std::string_view line) {
   streams_.push_back({handle, unguarded, id == "11" && !unguarded, false});
 }
 
-std::vector<std::string> HeldByCallback::CleanUp() const {
+std::vector<std::string> HeldByCallback::EndsOfSilenceAndStream() const {
   std::vector<std::string> calls;
   if (silent_) calls.push_back(Line("EndSilentErrors", "QZGP Utility Suite", 7, ",\"report\":0"));
   for (const Stream& stream : streams_) {
     if (!stream.unguarded && !stream.zoom) calls.push_back(ReleaseStreamLine(stream.handle));
   }
+  return calls;
+}
+
+std::vector<std::string> HeldByCallback::Unwinding() const {
+  std::vector<std::string> calls = EndsOfSilenceAndStream();
+  for (const Suite& suite : parserSuites_) calls.push_back(suite.second);
+  for (const Suite& suite : driverSuites_) calls.push_back(suite.second);
+  return calls;
+}
+
+std::size_t HeldByCallback::LeftOpen() const {
+  const auto zooms = std::count_if(streams_.begin(), streams_.end(),
+                                   [](const Stream& held) { return held.zoom && !held.left; });
+  return batches_.size() + static_cast<std::size_t>(zooms) + (memory_.empty() ? 0 : 1);
+}
+
+std::vector<std::string> HeldByCallback::CleanUp() const {
+  std::vector<std::string> calls = EndsOfSilenceAndStream();
   for (const std::string& batch : batches_) {
     calls.push_back(Line("EndKeyframeBatch", "QZGP Keyframe Suite", 3, ",\"commit\":1,\"batch\":" + batch));
   }
@@ -134,6 +152,12 @@ std::vector<std::string> HeldByCallback::CleanUp() const {
 
 bool HeldByCallback::IsUnguarded(std::string_view stream) const {
   return unguarded_.count(std::string(stream)) != 0;
+}
+
+std::size_t LeftOpen(const refhost::CallbackResult& result) {
+  const auto& leftovers = result.leftovers;
+  return static_cast<std::size_t>(
+      std::count_if(leftovers.begin(), leftovers.end(), [](const auto& left) { return !left.keptByDesign; }));
 }
 
 HeldByCallback HeldAfter(const std::vector<std::string>& trace, std::size_t count, bool lastFailed) {

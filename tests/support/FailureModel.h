@@ -32,10 +32,16 @@ struct Way {
   const char* error;
 };
 
+// Standard exceptions, which are reported.
 inline constexpr Way kExceptions[] = {
     {refhost::Failure::Kind::BadAlloc, HOST_ERR_EXCEPTION_MEMORY, "\"bad_alloc\""},
     {refhost::Failure::Kind::RuntimeError, HOST_ERR_EXCEPTION_OTHER, "\"runtime_error\""},
 };
+
+// An exception of a type that nobody knows, which is not.
+inline constexpr Way kOther = {refhost::Failure::Kind::Other, HOST_ERR_EXCEPTION_OTHER, "\"other\""};
+
+inline constexpr Way kAllExceptions[] = {kExceptions[0], kExceptions[1], kOther};
 
 // Follows a trace line by line and knows what is held.
 class HeldByCallback {
@@ -46,6 +52,13 @@ class HeldByCallback {
   // The calls, in order, that end a callback that fails now: the silence, the stream in use, open batches,
   // the zoom stream, the parser's suites, the text, the driver's suites.
   std::vector<std::string> CleanUp() const;
+
+  // The same where an exception of an unknown type passes: the silence, the stream in use, and the suites.
+  // All else stays open.
+  std::vector<std::string> Unwinding() const;
+
+  // How much then stays open that is reported as left behind: batches, the zoom stream and the text.
+  std::size_t LeftOpen() const;
 
   // Whether silent errors have begun and not ended.
   bool IsSilent() const { return silent_; }
@@ -67,6 +80,7 @@ class HeldByCallback {
   using Suite = std::pair<std::size_t, std::string>;  // its place in the order of release, its line
 
   void TakeStream(std::string_view line);
+  std::vector<std::string> EndsOfSilenceAndStream() const;
 
   std::set<Suite> driverSuites_;
   std::set<Suite> parserSuites_;
@@ -88,6 +102,9 @@ HeldByCallback HeldAfter(const std::vector<std::string>& trace, std::size_t coun
 // Whether a code that the call gives back changes nothing.
 bool IsCodeIgnored(std::string_view line, const HeldByCallback& before);
 bool IsCodeIgnored(const std::vector<std::string>& trace, std::size_t index);
+
+// How many of the leftovers of a callback are not kept by design.
+std::size_t LeftOpen(const refhost::CallbackResult& result);
 
 struct Made {
   std::size_t compositions = 0;

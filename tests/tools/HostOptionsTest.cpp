@@ -168,6 +168,25 @@ TEST_F(HostOptions, ThrowThrowsAStandardException) {
             "bad_alloc");
 }
 
+TEST_F(HostOptions, AnExceptionOfAnUnknownTypeEndsTheImportWithoutAMessageAndWhatIsOpenIsLeft) {
+  const ToolResult result = import({"still.ma", "--throw", "CreateComp:1=other"});
+  EXPECT_EQ(result.status, 1);
+  EXPECT_TRUE(contains(result.err, "still.ma: error 2052 (EXCEPTION_OTHER): ")) << result.err;
+  EXPECT_TRUE(contains(result.err, "mem:1 (file buffer, ")) << result.err;
+  EXPECT_EQ(firstCall(traceOf({"still.ma", "--throw", "CreateComp:1=other"}), "CreateComp")["error"],
+            "other");
+  // Out of the utility library, and in every callback.
+  for (const char* const service : {"ListAppend:1=other", "FileRead:1=other", "FileCreate:0=other"}) {
+    const ToolResult thrown = import({"still.ma", "--throw", service});
+    EXPECT_EQ(thrown.status, 1) << service;
+    EXPECT_TRUE(contains(thrown.err, "error 2052 (EXCEPTION_OTHER)")) << thrown.err;
+  }
+  const ToolResult verified = run({"verify", "still.ma", "--throw", "FileRead:1=other"});
+  EXPECT_EQ(verified.status, 1);
+  EXPECT_TRUE(contains(verified.err, "error 2052 (EXCEPTION_OTHER)")) << verified.err;
+  EXPECT_EQ(import({"still.ma", "--during", "entry", "--throw", "GetPrefLong:1=other"}).status, 4);
+}
+
 TEST_F(HostOptions, ThrowAtThrowsAtTheKthCall) {
   const auto trace = traceOf({"still.ma", "--throw-at", "2=runtime_error"});
   EXPECT_EQ(firstCall(trace, "NewMemHandle")["error"], "runtime_error");

@@ -85,7 +85,7 @@ void addHostOptions(CLI::App* verb, HostArguments* host, Words* words) {
               "the K-th suite call fails with CODE; +: and all after it")
       ->group(group);
   addRepeated(verb, "--throw", &words->throwing, "OPERATION:NTH=KIND",
-              "the call throws instead: bad_alloc or runtime_error")
+              "the call throws instead: bad_alloc, runtime_error or other")
       ->group(group);
   addRepeated(verb, "--throw-at", &words->throwAt, "K[+]=KIND", "the K-th suite call throws")->group(group);
   addRepeated(verb, "--refuse", &words->refuse, "SUITE:VERSION", "the suite cannot be acquired")
