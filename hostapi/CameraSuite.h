@@ -22,7 +22,9 @@ typedef struct QZGP_CameraSuite2 {
   void (*reserved0[1])(void);
 
   /* Slot 1 (this interface's own choice). Sets the film size of a camera layer: in points (72 to the
-   * inch), positive, measured in the given direction. */
+   * inch), positive, measured in the given direction.
+   * Codes: HOST_ERR_BAD_HANDLE, HOST_ERR_BAD_POINTER, HOST_ERR_BAD_VALUE, HOST_ERR_BAD_FILM_SIZE,
+   * HOST_ERR_BAD_DIRECTION, HOST_ERR_NOT_A_CAMERA. */
   HostError (*SetCameraFilmSize)(VOR_Layer* layer, int32_t direction, const double* filmSize);
 } QZGP_CameraSuite2;
 

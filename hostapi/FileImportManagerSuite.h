@@ -25,11 +25,13 @@ typedef struct HostImporterExtension {
   char text[4];
 } HostImporterExtension;
 
-/* Imports the file of that UTF-16 path into the folder. The two pointers between are not read. */
+/* Imports the file of that UTF-16 path into the folder. The two pointers between are not read. With a code
+ * other than 0 it stopped; what it had made stays. */
 typedef HostError (*HostImportCallback)(const HostUTF16Unit* path, void* ignored1, void* ignored2,
                                         VOR_Item* folder);
 
-/* Sets *canImport to 1 when the importer takes the file, else to 0. The middle pointer is not read. */
+/* Sets *canImport to 1 when the importer takes the file, else to 0, after a failure too, but for one to end
+ * the silence or to dispose of the file. The middle pointer is not read. */
 typedef HostError (*HostVerifyCallback)(const HostUTF16Unit* path, void* ignored, uint8_t* canImport);
 
 /* The callbacks of an importer. The host copies the set. */
@@ -40,15 +42,18 @@ typedef struct HostImporterCallbacks {
 } HostImporterCallbacks;
 
 typedef struct QZGP_FileImportManagerSuite3 {
-  /* Slot 0. Makes an importer under a display name (UTF-8, not empty), which the host copies. */
+  /* Slot 0. Makes an importer under a display name (UTF-8, not empty), which the host copies.
+   * Codes: HOST_ERR_BAD_POINTER, HOST_ERR_REGISTRATION. */
   HostError (*RegisterImporterName)(const char* name, HostImporterId* importer);
 
-  /* Slot 1. Says which files the importer is for. The host copies both arrays. */
+  /* Slot 1. Says which files the importer is for. The host copies both arrays.
+   * Codes: HOST_ERR_BAD_HANDLE, HOST_ERR_BAD_POINTER, HOST_ERR_REGISTRATION. */
   HostError (*RegisterImporterTypes)(HostImporterId importer, int32_t typeCount,
                                      const HostImporterType* types, int32_t extensionCount,
                                      const HostImporterExtension* extensions);
 
-  /* Slot 2. Gives the importer its callbacks. count is 2, the number of callbacks that are not null. */
+  /* Slot 2. Gives the importer its callbacks. count is 2, the number of callbacks that are not null.
+   * Codes: HOST_ERR_BAD_HANDLE, HOST_ERR_BAD_POINTER, HOST_ERR_REGISTRATION. */
   HostError (*RegisterImporterCallbacks)(HostImporterId importer, int32_t count,
                                          const HostImporterCallbacks* callbacks);
 } QZGP_FileImportManagerSuite3;

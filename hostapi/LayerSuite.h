@@ -21,18 +21,21 @@ extern "C" {
 typedef struct QZGP_LayerSuite10 {
   void (*reserved0[11])(void);
 
-  /* Slot 11. Switches one flag on (1) or off (0). */
+  /* Slot 11. Switches one flag on (1) or off (0).
+   * Codes: HOST_ERR_BAD_HANDLE. */
   HostError (*SetLayerFlag)(VOR_Layer* layer, int32_t flag, uint8_t value);
 
   void (*reserved12[13])(void);
 
-  /* Slot 25. Adds an item (a composition that is not, and does not contain, this one) as a layer. */
+  /* Slot 25. Adds an item (a composition that is not, and does not contain, this one) as a layer.
+   * Codes: HOST_ERR_BAD_HANDLE, HOST_ERR_BAD_POINTER, HOST_ERR_NOT_A_COMP, HOST_ERR_TOO_MANY_LAYERS. */
   HostError (*AddLayerFromItem)(VOR_Item* item, VOR_CompItem* comp, VOR_Layer** layer);
 
   void (*reserved26[16])(void);
 
   /* Slot 42. Makes parent the parent of layer; both are of one composition, and no circle may arise. No
-   * value of either layer changes. */
+   * value of either layer changes.
+   * Codes: HOST_ERR_BAD_HANDLE, HOST_ERR_WRONG_COMP, HOST_ERR_PARENT_CIRCLE. */
   HostError (*SetLayerParent)(VOR_Layer* layer, VOR_Layer* parent);
 } QZGP_LayerSuite10;
 

@@ -16,17 +16,22 @@ extern "C" {
 
 typedef struct QZGP_MemorySuite1 {
   /* Slot 0. Allocates size bytes (0 or more), contents unspecified. The name is for the host's own
-   * reports. Flags: 0, the only value defined. On success the caller owns the handle until FreeMemHandle. */
+   * reports. Flags: 0, the only value defined. On success the caller owns the handle until FreeMemHandle.
+   * Codes: HOST_ERR_BAD_POINTER, HOST_ERR_BAD_PLUGIN_ID, HOST_ERR_MEMORY, HOST_ERR_BAD_MEMORY_SIZE,
+   * HOST_ERR_TOO_MUCH_MEMORY. */
   HostError (*NewMemHandle)(int32_t pluginId, const char* name, int64_t size, int32_t flags,
                             HostMemHandle** handle);
 
-  /* Slot 1. Frees the block, locked or not, and ends the handle. */
+  /* Slot 1. Frees the block, locked or not, and ends the handle.
+   * Codes: HOST_ERR_BAD_HANDLE. */
   HostError (*FreeMemHandle)(HostMemHandle* handle);
 
-  /* Slot 2. Hands out the block's address, which stays the same until the matching unlock. Locks nest. */
+  /* Slot 2. Hands out the block's address, which stays the same until the matching unlock. Locks nest.
+   * Codes: HOST_ERR_BAD_HANDLE, HOST_ERR_BAD_POINTER. */
   HostError (*LockMemHandle)(HostMemHandle* handle, void** address);
 
-  /* Slot 3. Ends one lock. An unlock after a lock that failed is accepted. */
+  /* Slot 3. Ends one lock. An unlock after a lock that failed is accepted.
+   * Codes: HOST_ERR_BAD_HANDLE, HOST_ERR_MEMORY_STATE. */
   HostError (*UnlockMemHandle)(HostMemHandle* handle);
 } QZGP_MemorySuite1;
 

@@ -20,13 +20,15 @@ extern "C" {
 #define HOST_PREF_LINEAR_UNITS "Use Linear Units"
 
 typedef struct QZGP_PersistentDataSuite3 {
-  /* Slot 0. Hands out the application's preference store, which the host keeps. */
+  /* Slot 0. Hands out the application's preference store, which the host keeps.
+   * Codes: HOST_ERR_BAD_POINTER. */
   HostError (*GetAppPrefsBlob)(HostPrefsStore** store);
 
   void (*reserved1[8])(void);
 
   /* Slot 9. Reads a 32-bit integer into *value. An entry that is missing is made with the default. A null
-   * store has no entries: *value is the default, and none is made. On failure *value is unchanged. */
+   * store has no entries: *value is the default, and none is made. On failure *value is unchanged.
+   * Codes: HOST_ERR_BAD_HANDLE, HOST_ERR_BAD_POINTER. */
   HostError (*GetPrefLong)(HostPrefsStore* store, const char* section, const char* key, int32_t defaultValue,
                            int32_t* value);
 } QZGP_PersistentDataSuite3;

@@ -27,12 +27,15 @@ typedef struct QZGP_StreamSuite7 {
   void (*reserved0[3])(void);
 
   /* Slot 3 (this interface's own choice). Acquires a stream of a layer by its number (LayerStreamId).
-   * Each success hands out a handle of its own, which the caller owns until ReleaseStream. */
+   * Each success hands out a handle of its own, which the caller owns until ReleaseStream.
+   * Codes: HOST_ERR_BAD_HANDLE, HOST_ERR_BAD_POINTER, HOST_ERR_BAD_PLUGIN_ID, HOST_ERR_NO_SUCH_STREAM,
+   * HOST_ERR_MEMORY. */
   HostError (*AcquireLayerStream)(int32_t pluginId, VOR_Layer* layer, int32_t streamId, VOR_Stream** stream);
 
   void (*reserved4[4])(void);
 
-  /* Slot 8 (this interface's own choice). Ends the handle. A batch opened with it goes on. */
+  /* Slot 8 (this interface's own choice). Ends the handle. A batch opened with it goes on.
+   * Codes: HOST_ERR_BAD_HANDLE. */
   HostError (*ReleaseStream)(VOR_Stream* stream);
 } QZGP_StreamSuite7;
 
@@ -40,7 +43,8 @@ typedef struct QZGP_StreamSuite8 {
   void (*reserved0[5])(void);
 
   /* Slot 5 (this interface's own choice). Sets the static value; the record's own stream handle is the
-   * same stream. Keys, where there are any, stay. */
+   * same stream. Keys, where there are any, stay.
+   * Codes: HOST_ERR_BAD_HANDLE, HOST_ERR_BAD_POINTER, HOST_ERR_BAD_PLUGIN_ID, HOST_ERR_BAD_VALUE. */
   HostError (*SetStreamValue)(int32_t pluginId, VOR_Stream* stream, const StreamValueRecord* value);
 } QZGP_StreamSuite8;
 

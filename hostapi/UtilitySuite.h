@@ -21,16 +21,19 @@ typedef struct HostSilentErrorState {
 } HostSilentErrorState;
 
 typedef struct QZGP_UtilitySuite7 {
-  /* Slot 0. Shows a NUL-terminated UTF-8 text to the user. The host copies it. */
+  /* Slot 0. Shows a NUL-terminated UTF-8 text to the user. The host copies it.
+   * Codes: HOST_ERR_BAD_POINTER, HOST_ERR_BAD_PLUGIN_ID. */
   HostError (*ShowMessage)(int32_t pluginId, const char* text);
 
   void (*reserved1[2])(void);
 
-  /* Slot 3. From here on the host shows no error, until the matching EndSilentErrors. Spans nest. */
+  /* Slot 3. From here on the host shows no error, until the matching EndSilentErrors. Spans nest.
+   * Codes: HOST_ERR_BAD_POINTER. */
   HostError (*BeginSilentErrors)(HostSilentErrorState* state);
 
   /* Slot 4. Ends the span that began with this state record. With report not 0 the errors kept back are
-   * shown now, with 0 they are dropped. */
+   * shown now, with 0 they are dropped.
+   * Codes: HOST_ERR_BAD_POINTER, HOST_ERR_SILENT_ERRORS. */
   HostError (*EndSilentErrors)(int32_t report, HostSilentErrorState* state);
 } QZGP_UtilitySuite7;
 

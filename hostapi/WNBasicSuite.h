@@ -14,10 +14,12 @@ extern "C" {
 typedef struct WNBasicSuite {
   /* Slot 0. Hands out the table of the suite of that name and version. Each success is one acquisition
    * and is given back by one release; the table lives until the last release. On failure *suite is
-   * unspecified. */
+   * unspecified.
+   * Codes: HOST_ERR_BAD_POINTER, HOST_ERR_SUITE_REFUSED. */
   HostError (*AcquireSuite)(const char* name, int32_t version, const void** suite);
 
-  /* Slot 1. Gives one acquisition back. */
+  /* Slot 1. Gives one acquisition back.
+   * Codes: HOST_ERR_BAD_POINTER, HOST_ERR_SUITE_NOT_HELD. */
   HostError (*ReleaseSuiteByName)(const char* name, int32_t version);
 } WNBasicSuite;
 

@@ -12,15 +12,18 @@ Allowance::Allowance(const HostOptions& options)
       keys(std::max<std::int64_t>(options.mostKeys, 0)),
       memory(std::max<std::int64_t>(options.mostMemory, 0)) {}
 
-bool takesLayer(Call& call, std::int32_t keys) {
+bool takesLayer(Call& call) {
   const HostState& host = call.host();
-  if (host.allowance.layers < 1) {
-    call.refuse(HOST_ERR_TOO_MANY_LAYERS,
-                "the host takes no more than " + std::to_string(host.options.mostLayers) + " layers");
-  } else if (host.allowance.keys < keys) {
-    refuseKey(call);
-  }
-  return !call.failed();
+  if (host.allowance.layers >= 1) return true;
+  call.refuse(HOST_ERR_TOO_MANY_LAYERS,
+              "the host takes no more than " + std::to_string(host.options.mostLayers) + " layers");
+  return false;
+}
+
+bool takesKeys(Call& call, std::int32_t keys) {
+  if (call.host().allowance.keys >= keys) return true;
+  refuseKey(call);
+  return false;
 }
 
 bool takesMemory(Call& call, std::int64_t bytes) {

@@ -22,9 +22,10 @@ struct Allowance {
   std::int64_t memory;  // bytes behind memory handles
 };
 
-// Whether the host takes a further layer with so many keys, or so many bytes. False after a refusal. Who
-// makes it takes it off the allowance.
-bool takesLayer(Call& call, std::int32_t keys);
+// Whether the host takes a further layer, so many keys, or so many bytes. False after a refusal. Who makes it
+// takes it off the allowance.
+bool takesLayer(Call& call);
+bool takesKeys(Call& call, std::int32_t keys);
 bool takesMemory(Call& call, std::int64_t bytes);
 
 void refuseKey(Call& call);

@@ -107,7 +107,7 @@ void newCameraLayer(Call& call, const char* name, VOR_CompItem* comp, const doub
   const std::int32_t zoomKeys = std::max(host.options.zoomKeys, 0);
   Composition* found = call.composition(comp);
   if (found == nullptr || !call.given(name, "the name") || !call.given(layer, "the place for the layer") ||
-      !call.areFinite(center, 2, "the centre") || !takesLayer(call, zoomKeys)) {
+      !call.areFinite(center, 2, "the centre") || !takesLayer(call) || !takesKeys(call, zoomKeys)) {
     return;
   }
   double interest[2] = {center[0], center[1]};
@@ -147,7 +147,7 @@ void newNullLayer(Call& call, const char* name, VOR_CompItem* comp, const T_Time
     call.refuse(HOST_ERR_BAD_TIME, "a time of " + shown(*time) + " is no length");
     return;
   }
-  if (!takesLayer(call, 0)) return;
+  if (!takesLayer(call)) return;
   *layer = handleOf(call, call.host().editor.addNullLayer(*found, name));
   --call.host().allowance.layers;
 }

@@ -32,7 +32,7 @@ void addLayerFromItem(Call& call, VOR_Item* item, VOR_CompItem* comp, VOR_Layer*
     call.refuse(HOST_ERR_NOT_A_COMP, codec.describe(comp) + " would contain itself");
     return;
   }
-  if (!takesLayer(call, 0)) return;
+  if (!takesLayer(call)) return;
   const Layer& made = call.host().editor.addCompositionLayer(*target, *source->composition);
   --call.host().allowance.layers;
   *layer =
