@@ -3,7 +3,6 @@
 #include <algorithm>
 #include <iterator>
 
-#include "comp/NodeChannels.h"
 #include "hostapi/LayerStreams.h"
 #include "hostapi/LayerSuite.h"
 #include "maya/ListAccess.h"
@@ -22,17 +21,17 @@ bool MAYA_Parse::SetCameraLookAt(VOR_Layer* layer, const MAYA_Camera* camera,
 }
 
 void MAYA_Parse::ApplyAnchorPointAnimation(VOR_Layer* layer, const MAYA_Transform* node) {
-  const NodeChannels channels = VerifyChannels(*node);
-  if (channels.sharedCount < 1) return;
+  const std::int32_t keyCount = VerifyAnimInfo(node);
+  if (keyCount < 1) return;
 
   VOR_AddKeyframesInfo* batch = nullptr;
   HostError kept = Guarded([&] {
     StartAddingKeyframes(layer, HOST_STREAM_ANCHOR_POINT, &batch);
-    for (std::int32_t n = 0; n < channels.sharedCount; ++n) {
-      const T_Time time = KeyTime(channels, n);
+    for (std::int32_t n = 0; n < keyCount; ++n) {
+      const T_Time time = GetKeyTime(node, n);
       double point[kAxisCount];
       std::copy(std::begin(node->translate), std::end(node->translate), point);
-      channels.Extract(kTranslateGroup, n, point);
+      ExtractAnimInfo(node, kTranslateGroup, n, point);
       InsertThreeDKeyframe(batch, layer, HOST_STREAM_ANCHOR_POINT, &time, ConvertDist(point[0]),
                            -ConvertDist(point[1]), -ConvertDist(point[2]));
     }

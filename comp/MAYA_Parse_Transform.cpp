@@ -1,8 +1,6 @@
 // A transform in the host's space: scene points (x, y, z) become (x, -y, -z), angles about Y and Z change
 // sign, and the pivots are folded into the position. Reads the units; sets streams through
 // MAYA_Parse_Streams.cpp.
-#include <cstddef>
-
 #include "comp/Conversions.h"
 #include "hostapi/LayerStreams.h"
 #include "maya/MAYA_Parse.h"
@@ -21,33 +19,31 @@ PivotedTransform MAYA_Parse::ConvertPivots(const MAYA_Transform& node) const {
   return pivots;
 }
 
-void MAYA_Parse::CopyChannels(const MAYA_Transform& node, double (&values)[kChannelCount]) {
+void MAYA_Parse::CopyChannels(const MAYA_Transform& node, ChannelValues& values) {
   for (int axis = 0; axis < kAxisCount; ++axis) {
-    values[kAxisCount * kTranslateGroup + axis] = node.translate[axis];
-    values[kAxisCount * kRotateGroup + axis] = node.rotate[axis];
-    values[kAxisCount * kScaleGroup + axis] = node.scale[axis];
+    values[kTranslateGroup][axis] = node.translate[axis];
+    values[kRotateGroup][axis] = node.rotate[axis];
+    values[kScaleGroup][axis] = node.scale[axis];
   }
 }
 
 // Fills in the channels beside the pivots, and takes the whole apart.
 MatrixComponents MAYA_Parse::DecomposeTransform(PivotedTransform* transform,
-                                                const double (&values)[kChannelCount]) const {
-  constexpr std::ptrdiff_t axes = kAxisCount;
-  const double* const rotate = values + axes * kRotateGroup;
-  const double* const scale = values + axes * kScaleGroup;
-  for (int axis = 0; axis < kAxisCount; ++axis) transform->scale[axis] = scale[axis];
+                                                const ChannelValues& values) const {
+  const auto& rotate = values[kRotateGroup];
+  for (int axis = 0; axis < kAxisCount; ++axis) transform->scale[axis] = values[kScaleGroup][axis];
   // Deliberate: always about X, then Y, then Z; the node's own rotate order is not looked at.
   transform->rotation[0] = ConvertRot(rotate[0]) * kDegreesToRadians;
   transform->rotation[1] = ConvertRot(rotate[1]) * -kDegreesToRadians;
   transform->rotation[2] = ConvertRot(rotate[2]) * -kDegreesToRadians;
-  ConvertPoint(values + axes * kTranslateGroup, transform->translation);
+  ConvertPoint(values[kTranslateGroup], transform->translation);
   MatrixComponents components;
   ThrowOnError(MatrixDecomposePivoted(transform, &components));
   return components;
 }
 
 void MAYA_Parse::SetTransform(VOR_Layer* layer, const MAYA_Transform* node) {
-  double values[kChannelCount];
+  ChannelValues values;
   CopyChannels(*node, values);
   PivotedTransform transform = ConvertPivots(*node);
   const MatrixComponents at = DecomposeTransform(&transform, values);

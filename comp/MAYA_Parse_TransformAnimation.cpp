@@ -1,7 +1,8 @@
 // Keys of a node's position, rotation and scale: for every sampled key the node's matrix is rebuilt, taken
 // apart and written to five streams. Reads `curves` and the units; keys go through MAYA_Parse_Streams.cpp.
+#include <cstring>
+
 #include "comp/Conversions.h"
-#include "comp/NodeChannels.h"
 #include "comp/UnwrapAngle.h"
 #include "hostapi/LayerStreams.h"
 #include "maya/MAYA_Parse.h"
@@ -18,14 +19,13 @@ constexpr LayerStreamId kBatchStreams[kBatchCount] = {HOST_STREAM_SCALE, HOST_ST
 }  // namespace
 
 void MAYA_Parse::ApplyTransformAnimation(VOR_Layer* layer, const MAYA_Transform* node) {
-  NodeChannels channels = VerifyChannels(*node);
-  if (channels.sharedCount < 1) return;
-  channels.FetchRuns();
+  const std::int32_t keyCount = VerifyAnimInfo(node);
+  if (keyCount < 1) return;
 
   VOR_AddKeyframesInfo* batches[kBatchCount] = {};
   HostError kept = Guarded([&] {
     for (std::size_t i = 0; i < kBatchCount; ++i) StartAddingKeyframes(layer, kBatchStreams[i], &batches[i]);
-    InsertTransformKeys(layer, *node, channels, batches);
+    InsertTransformKeys(layer, *node, keyCount, batches);
   });
   for (VOR_AddKeyframesInfo* const batch : batches) {
     if (batch != nullptr) KeepFirst(&kept, Guarded([&] { EndAddingKeyframes(batch); }));
@@ -33,17 +33,19 @@ void MAYA_Parse::ApplyTransformAnimation(VOR_Layer* layer, const MAYA_Transform*
   ThrowOnError(kept);
 }
 
-void MAYA_Parse::InsertTransformKeys(VOR_Layer* layer, const MAYA_Transform& node,
-                                     const NodeChannels& channels, VOR_AddKeyframesInfo* const* batches) {
+void MAYA_Parse::InsertTransformKeys(VOR_Layer* layer, const MAYA_Transform& node, std::int32_t keyCount,
+                                     VOR_AddKeyframesInfo* const* batches) {
   PivotedTransform transform = ConvertPivots(node);
-  double still[kChannelCount];
+  ChannelValues still;
   CopyChannels(node, still);
-  double values[kChannelCount];
+  ChannelValues values;
   double previous[kAxisCount] = {};
-  for (std::int32_t n = 0; n < channels.sharedCount; ++n) {
-    const T_Time time = KeyTime(channels, n);
-    for (int channel = 0; channel < kChannelCount; ++channel) values[channel] = still[channel];
-    channels.Sample(n, values);
+  for (std::int32_t n = 0; n < keyCount; ++n) {
+    const T_Time time = GetKeyTime(&node, n);
+    std::memcpy(values, still, sizeof values);
+    for (const int group : {kScaleGroup, kRotateGroup, kTranslateGroup}) {
+      ExtractAnimInfo(&node, group, n, values[group]);
+    }
     const MatrixComponents at = DecomposeTransform(&transform, values);
     double angles[kAxisCount];
     for (int axis = 0; axis < kAxisCount; ++axis) {

@@ -56,10 +56,10 @@ typedef struct PivotedTransform {
   double translation[3];
 } PivotedTransform;
 
-/* Composes the transform and takes it apart. Does what these services do one after the other, to the last
- * bit, and counts as their calls: MatrixSetIdentity; MatrixTranslate by -scalePivot; MatrixScale;
- * MatrixTranslate by scalePivot and by -rotatePivot; MatrixRotateAxis about X, Y and Z; MatrixTranslate by
- * rotatePivot and by translation; MatrixDecompose. Ends with the code of the first that fails. */
+/* Composes the transform and takes it apart. Gives what these services give one after the other, to the last
+ * bit: MatrixSetIdentity; MatrixTranslate by -scalePivot; MatrixScale; MatrixTranslate by scalePivot and by
+ * -rotatePivot; MatrixRotateAxis about X, Y and Z; MatrixTranslate by rotatePivot and by translation;
+ * MatrixDecompose. Fails as MatrixDecompose does; a rehearsal takes the whole for one call of that. */
 HOSTUTIL_API HostError MatrixDecomposePivoted(const PivotedTransform* from, MatrixComponents* components);
 
 #ifdef __cplusplus

@@ -118,17 +118,6 @@ HostError AppendRecords(RecordList* list, const void* records, int64_t count) {
   return HOST_ERR_NONE;
 }
 
-// One by one, up to the first that fails.
-HostError AppendInRehearsal(RecordList* list, const void* records, int64_t count) {
-  if (!IsList(list) || records == nullptr || count < 0) return HOST_ERR_UTILITY_NULL;
-  const auto* record = static_cast<const unsigned char*>(records);
-  for (int64_t i = 0; i < count; ++i) {
-    if (const HostError code = RecordListAppend(list, record); code != HOST_ERR_NONE) return code;
-    record += list->recordSize;
-  }
-  return HOST_ERR_NONE;
-}
-
 }  // namespace
 
 HostError RecordListAppend(RecordList* list, const void* record) {
@@ -137,8 +126,7 @@ HostError RecordListAppend(RecordList* list, const void* record) {
 }
 
 HostError RecordListAppendRun(RecordList* list, const void* records, int64_t count) {
-  if (!hostutil::MayWorkInBulk()) return AppendInRehearsal(list, records, count);
-  hostutil::CountCalls(HOST_UTILITY_ListAppend, std::max(count, int64_t{0}));
+  if (HostError code; hostutil::Rehearsed(HOST_UTILITY_ListAppend, &code)) return code;
   return AppendRecords(list, records, count);
 }
 
@@ -173,11 +161,17 @@ HostError RecordListGet(const RecordList* list, int64_t index, void* record) {
   return CopyRecord(list, index, record);
 }
 
-const void* RecordListGetRun(const RecordList* list, int64_t index, int64_t count, int64_t gets) {
-  if (!hostutil::MayWorkInBulk() || !IsList(list) || count < 1) return nullptr;
-  if (index < 0 || index > list->count - count) return nullptr;
-  hostutil::CountCalls(HOST_UTILITY_ListGet, gets);
-  return list->At(index);
+HostError RecordListGetRun(const RecordList* list, int64_t index, int64_t count, const void** records) {
+  if (HostError code; hostutil::Rehearsed(HOST_UTILITY_ListGet, &code)) {
+    hostutil::HandOutNothing(records);
+    return code;
+  }
+  if (records == nullptr) return HOST_ERR_UTILITY_NULL;
+  *records = nullptr;
+  if (!IsList(list)) return HOST_ERR_UTILITY_NULL;
+  if (index < 0 || count < 1 || index > list->count - count) return HOST_ERR_LIST_INDEX;
+  *records = list->At(index);
+  return HOST_ERR_NONE;
 }
 
 HostError RecordListLock(RecordList* list, int64_t index, void** record) {

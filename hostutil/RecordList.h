@@ -32,9 +32,9 @@ HOSTUTIL_API HostError RecordListCreate(int64_t recordSize, int64_t growth, int6
  * cannot grow (it is then unchanged), HOST_ERR_LIST_LOCKED while any record is locked. */
 HOSTUTIL_API HostError RecordListAppend(RecordList* list, const void* record);
 
-/* Appends copies of `count` records (0 or more) that lie one behind the other; all or, after a failure, none.
- * Counts as `count` calls of RecordListAppend. Where a rehearsal plans a failure it makes them one by one,
- * and those before the one that fails stay. */
+/* Appends copies of `count` records (0 or more) that lie one behind the other, and not in the list itself;
+ * all or, after a failure, none. Fails as RecordListAppend does; a rehearsal takes the whole run for one call
+ * of it. */
 HOSTUTIL_API HostError RecordListAppendRun(RecordList* list, const void* records, int64_t count);
 
 /* Makes room for `count` more records, so that they will be appended without growing. A hint: where there is
@@ -44,11 +44,11 @@ HOSTUTIL_API void RecordListReserve(RecordList* list, int64_t count);
 /* Copies record `index` (from 0) out. HOST_ERR_LIST_INDEX when there is none. */
 HOSTUTIL_API HostError RecordListGet(const RecordList* list, int64_t index, void* record);
 
-/* The address of `count` records (1 or more) from `index` on, which lie one behind the other, for one who is
- * going to copy them out `gets` times in all; those copies are then not to be made, and count as calls of
- * RecordListGet at once, also those that an end before the last one leaves out. Null where they have to be
- * made one by one: when records are missing, or a failure is planned. Valid until the next append. */
-HOSTUTIL_API const void* RecordListGetRun(const RecordList* list, int64_t index, int64_t count, int64_t gets);
+/* Hands out the address of `count` records (1 or more) from `index` on, which lie one behind the other, for
+ * reading. It is valid until the list grows or ends. HOST_ERR_LIST_INDEX when there are not so many. A
+ * rehearsal takes the whole run for one call of RecordListGet. */
+HOSTUTIL_API HostError RecordListGetRun(const RecordList* list, int64_t index, int64_t count,
+                                        const void** records);
 
 /* Hands out the address of record `index`, for reading and writing; it stays the same until the matching
  * unlock. Locks nest, and several records can be locked. HOST_ERR_LIST_INDEX when there is no such record,

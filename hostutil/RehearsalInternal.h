@@ -32,15 +32,13 @@ inline bool MayBePlanned(int32_t service) {
   return failuresPlanned;
 }
 
-// For a service that does the work of many calls at once: it may not where a failure is planned, so that the
-// calls are then made one by one; else it counts them all.
-inline bool MayWorkInBulk() { return !rehearsalRunning || !failuresPlanned; }
+// Counts so many calls at once, none of which is planned to fail.
 inline void CountCalls(int32_t service, int64_t calls) {
   if (rehearsalRunning) callCounts[static_cast<std::size_t>(service)] += calls;
 }
 
-// For a service that stands for many calls: how many of the next ones nothing is planned for, at most `calls`.
-// It makes so many at once and counts them with CountCalls; the one after them asks Rehearsed.
+// For a service that stands for many calls: how many of the next ones nothing is planned for, at most
+// `calls`. It makes so many at once and counts them with CountCalls; the one after them asks Rehearsed.
 int64_t CallsBeforePlanned(int32_t service, int64_t calls);
 inline int64_t CallsBeforeFailure(int32_t service, int64_t calls) {
   return rehearsalRunning && failuresPlanned ? CallsBeforePlanned(service, calls) : calls;

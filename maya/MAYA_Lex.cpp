@@ -72,12 +72,19 @@ MAYA_Lex::MAYA_Lex(const WNBasicSuite* basicSuite, const char* text, const char*
       position(buffer),
       end_(text != nullptr && end != nullptr ? end : buffer + std::strlen(buffer)) {}
 
+void MAYA_Lex::SkipWhiteSpace() {
+  if (position > end_) return;
+  const char* at = position;
+  for (; scan::IsWhiteSpace(*at); ++at) line += *at == '\n' ? 1 : 0;
+  tokenStart = position = at;
+}
+
 MayaToken MAYA_Lex::GetNextToken(const char** start, const char** last) {
   if (position > end_) {
     *start = *last = end_;
     return EndOfFile;
   }
-  PassWhiteSpace();
+  SkipWhiteSpace();
   MayaToken kind = Unknown;
   switch (*position) {
     case '\0':
@@ -122,19 +129,9 @@ MayaToken MAYA_Lex::GetNextToken(const char** start, const char** last) {
   return kind;
 }
 
-void MAYA_Lex::SkipWhiteSpace() {
-  if (position <= end_) PassWhiteSpace();
-}
-
-void MAYA_Lex::PassWhiteSpace() {
-  const char* at = position;
-  for (; scan::IsWhiteSpace(*at); ++at) line += *at == '\n' ? 1 : 0;
-  tokenStart = position = at;
-}
-
 void MAYA_Lex::SkipHarmless() {
   if (position > end_) return;
-  PassWhiteSpace();
+  SkipWhiteSpace();
   if (scan::IsAny(*position, scan::kKeywordStart | scan::kQuote))
     return;  // as a rule the next command begins here
   static const scan::SkipText skip = scan::TextSkippers().back().betweenCommands;

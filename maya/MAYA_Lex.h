@@ -91,8 +91,6 @@ class MAYA_Lex : public QZGP_SuiteHandler {
   void NoteLine(std::int32_t code, const char* at) const;
 
  private:
-  // The position is not behind the end: asked once for each token, not again here.
-  void PassWhiteSpace();
   void ScanWord();
   void ParseLineComment();
   void ParseBlockComment();

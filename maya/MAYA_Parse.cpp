@@ -81,19 +81,22 @@ void MAYA_Parse::ParseLocatorSetAttr() {}
 
 void MAYA_Parse::BuildString(const char* first, const char* last, std::int32_t* length,
                              char (&text)[kNameCapacity]) {
-  const auto size = static_cast<std::size_t>(last - first) + 1;
-  *length = size > kLongestToken ? 0 : static_cast<std::int32_t>(size);
-  std::memcpy(text, first, static_cast<std::size_t>(*length));
-  text[*length] = '\0';
+  const std::size_t size = TakenLength(first, last);
+  std::memcpy(text, first, size);
+  text[size] = '\0';
+  *length = static_cast<std::int32_t>(size);
 }
 
 void MAYA_Parse::BuildQuote(const char* first, const char* last, std::int32_t* length,
                             char (&text)[kNameCapacity]) {
-  BuildString(first, last, length, text);
-  if (*length < 2) return;
-  const auto inner = static_cast<std::size_t>(*length) - 2;
-  std::memmove(text, text + 1, inner);
-  text[inner] = '\0';
+  const std::size_t size = TakenLength(first, last);
+  if (size < kQuoteCount) {
+    *length = 0;
+    text[0] = '\0';
+    return;
+  }
+  BuildString(first + 1, last - 1, length, text);
+  *length = static_cast<std::int32_t>(size);
 }
 
 // The next token of a command that is read up to its ";". The end of the text is an error there.
@@ -104,11 +107,10 @@ MayaToken MAYA_Parse::NextInCommand(const char** first, const char** last) {
 }
 
 double MAYA_Parse::ScanNumber(const char* first, const char* last) const {
-  // As WordText takes it: a token that is too long is empty. Its first NUL ends the number by itself.
-  const std::ptrdiff_t size = last - first + 1;
-  const bool isTaken = size <= static_cast<std::ptrdiff_t>(kLongestToken);
+  // The first NUL of a token ends the number by itself.
   double value = 0.0;
-  ThrowOnNumberError(HostNumberScan(first, isTaken ? size : 0, &value), first);
+  ThrowOnNumberError(HostNumberScan(first, static_cast<std::int64_t>(TakenLength(first, last)), &value),
+                     first);
   return value;
 }
 

@@ -15,10 +15,9 @@
 #include "maya/ConnectionScout.h"
 #include "maya/MAYA_Lex.h"
 #include "maya/NameIndex.h"
+#include "maya/NodeChannels.h"
 #include "maya/SceneRecords.h"
 #include "maya/SceneUnits.h"
-
-struct NodeChannels;
 
 class MAYA_Parse : public MAYA_Lex {
  public:
@@ -42,11 +41,13 @@ class MAYA_Parse : public MAYA_Lex {
   void ParseCameraParent();
   void ParseLocatorSetAttr();
 
-  // Copies a token of at most 254 bytes, NUL-terminated; a longer one gives the empty text and length 0.
+  // Copies a token of at most 254 bytes, NUL-terminated; a longer one gives the empty text and length 0. What
+  // stands in the field after the NUL stays.
   static void BuildString(const char* first, const char* last, std::int32_t* length,
                           char (&text)[kNameCapacity]);
 
-  // The same without the token's first and last byte, its quotes; the length still counts them.
+  // The same without the token's first and last byte, its quotes; the length still counts them. A token
+  // without both gives the empty text too.
   static void BuildQuote(const char* first, const char* last, std::int32_t* length,
                          char (&text)[kNameCapacity]);
 
@@ -137,16 +138,23 @@ class MAYA_Parse : public MAYA_Lex {
 
   // ---- comp/MAYA_Parse_Sampling.cpp: the keys of a node, by index ----
 
+  // VerifyAnimInfo comes first, then for each key from 0 on its time, and then its values. All throw the code
+  // of a list that fails.
+
   // The key count that the node's channels share, 0 when none is animated. Throws 1289987 after its message
-  // when two animated channels differ.
+  // when two animated channels differ. What it finds is remembered for the two others.
   std::int32_t VerifyAnimInfo(const MAYA_Transform* node);
 
-  // The time of key n. With n 0 in a frame-based scene the key becomes time 0.
+  // The time of key n. With n 0 in a frame-based scene the key becomes time 0. With n 0 the keys of a node
+  // that is remembered are looked up, all at once.
   T_Time GetKeyTime(const MAYA_Transform* node, std::int32_t n);
 
   // Overwrites the animated axes of `values` with key n of the group's curves; a curve of one key gives that.
+  // The group is a ChannelGroup. After a failure the axes before it stay written.
   void ExtractAnimInfo(const MAYA_Transform* node, std::int32_t group, std::int32_t n,
-                       double (&values)[kAxisCount]);
+                       double (&values)[kAxisCount]) {
+    if (!channels_.Extract(*node, group, n, values)) FetchAnimInfo(*node, group, n, values);
+  }
 
   // ---- comp/MAYA_Parse_Streams.cpp: values and keyframe batches ----
 
@@ -218,6 +226,8 @@ class MAYA_Parse : public MAYA_Lex {
   RecordList* locators = nullptr;
 
  private:
+  using ChannelValues = double[kGroupCount][kAxisCount];
+
   // maya/MAYA_Parse.cpp
   MayaToken NextInCommand(const char** first, const char** last);
   double ScanNumber(const char* first, const char* last) const;
@@ -268,7 +278,7 @@ class MAYA_Parse : public MAYA_Lex {
                       const RecordList* keys);
 
   // comp/MAYA_Parse_TransformAnimation.cpp
-  void InsertTransformKeys(VOR_Layer* layer, const MAYA_Transform& node, const NodeChannels& channels,
+  void InsertTransformKeys(VOR_Layer* layer, const MAYA_Transform& node, std::int32_t keyCount,
                            VOR_AddKeyframesInfo* const* batches);
 
   // comp/MAYA_Parse_Camera.cpp
@@ -277,13 +287,13 @@ class MAYA_Parse : public MAYA_Lex {
   // comp/MAYA_Parse_Transform.cpp
   void ConvertPoint(const double* point, double (&host)[kAxisCount]) const;
   PivotedTransform ConvertPivots(const MAYA_Transform& node) const;
-  static void CopyChannels(const MAYA_Transform& node, double (&values)[kChannelCount]);
-  MatrixComponents DecomposeTransform(PivotedTransform* transform,
-                                      const double (&values)[kChannelCount]) const;
+  static void CopyChannels(const MAYA_Transform& node, ChannelValues& values);
+  MatrixComponents DecomposeTransform(PivotedTransform* transform, const ChannelValues& values) const;
 
   // comp/MAYA_Parse_Sampling.cpp
-  NodeChannels VerifyChannels(const MAYA_Transform& node);
-  T_Time KeyTime(const NodeChannels& channels, std::int32_t n) const;
+  [[gnu::noinline]] T_Time FetchKeyTime(const MAYA_Transform& node, std::int32_t n);
+  void FetchAnimInfo(const MAYA_Transform& node, std::int32_t group, std::int32_t n,
+                     double (&values)[kAxisCount]);
 
   // comp/MAYA_Parse_Streams.cpp
   VOR_Stream* AcquireStream(VOR_Layer* layer, std::int32_t streamId);
@@ -303,4 +313,5 @@ class MAYA_Parse : public MAYA_Lex {
   std::vector<std::uint32_t> chainOfTransform_;  // the last parent chain that used it
   std::uint32_t chain_ = 0;
   std::vector<std::int32_t> constraintOfTransform_;  // the first complete constraint that turns it
+  NodeChannels channels_;                            // of the node that VerifyAnimInfo found in order last
 };

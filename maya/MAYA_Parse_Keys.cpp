@@ -33,6 +33,7 @@ std::int64_t MoreKeys(std::string_view keyCount, std::int64_t read, const char* 
 }  // namespace
 
 void MAYA_Parse::ParseAnimSetAttr() {
+  channels_ = NodeChannels();  // keys move when they grow in number
   std::string_view keyCount;
   if (FindKeyAttribute(&keyCount)) ReadKeys(keyCount);
   WriteBackCurve();

@@ -101,6 +101,10 @@ bool MAYA_Parse::TakeName(char (&name)[kNameCapacity]) {
   const char* first = nullptr;
   const char* last = nullptr;
   const MayaToken kind = NextInCommand(&first, &last);
-  if (kind == String) StoreName(name, QuotedText(first, last));
+  if (kind == String) {
+    if (name[0] != '\0') std::memset(name, 0, sizeof name);  // a field holds zeros after its text
+    std::int32_t length = 0;
+    BuildQuote(first, last, &length, name);
+  }
   return kind == Semicolon;
 }

@@ -15,7 +15,8 @@ inline constexpr std::int32_t kNoIndex = -1;
 
 // The slots of MAYA_Transform::curve: nine channels as three groups of three axes, then three links.
 inline constexpr int kAxisCount = 3;
-inline constexpr int kChannelCount = 9;
+inline constexpr int kGroupCount = 3;
+inline constexpr int kChannelCount = kGroupCount * kAxisCount;
 enum ChannelGroup : std::int32_t { kTranslateGroup = 0, kRotateGroup = 1, kScaleGroup = 2 };
 inline constexpr int kFollowedSlot = 9;      // the transform whose translate feeds the constraint
 inline constexpr int kTargetSlot = 10;       // the transform that the constraint looks at

@@ -108,20 +108,41 @@ TEST(BuilderFailuresTest, AMissingKeyframeSuiteIsThirteenAndOpensNothing) {
   EXPECT_THAT(run.host->project().layers(), SizeIs(1));
 }
 
-TEST(BuilderFailuresTest, EachMatrixCallThatFailsStopsBeforeTheFirstStream) {
-  constexpr std::pair<const char*, std::int64_t> kCalls[] = {{"MatrixSetIdentity", 1},
-                                                             {"MatrixTranslate", 5},
-                                                             {"MatrixScale", 1},
-                                                             {"MatrixRotateAxis", 3},
-                                                             {"MatrixDecompose", 1}};
-  for (const auto& [service, count] : kCalls) {
-    for (std::int64_t nth = 1; nth <= count; ++nth) {
-      const ImportRun run =
-          ImportText(Scene(TransformText("rig") + CameraText("lens", "rig")), Failing(service, nth));
-      EXPECT_EQ(run.result.code, kRehearsed) << service << ' ' << nth;
-      EXPECT_THAT(CallsOf(run.trace, "AcquireLayerStream"), SizeIs(2)) << service << ' ' << nth;  // the lens
-    }
+TEST(BuilderFailuresTest, AMatrixThatFailsStopsBeforeTheFirstStream) {
+  const ImportRun run =
+      ImportText(Scene(TransformText("rig") + CameraText("lens", "rig")), Failing("MatrixDecompose", 1));
+  EXPECT_EQ(run.result.code, kRehearsed);
+  EXPECT_THAT(CallsOf(run.trace, "AcquireLayerStream"), SizeIs(2));  // the lens
+}
+
+TEST(BuilderFailuresTest, EveryTransformIsOneMatrixCall) {
+  const ImportRun run = ImportText(TenKeys(), {});
+  EXPECT_EQ(run.result.code, 0);
+  EXPECT_EQ(run.host->callCount("MatrixDecompose"), 1 + 10);  // the static pose, and the keys
+  for (const char* const service :
+       {"MatrixSetIdentity", "MatrixTranslate", "MatrixScale", "MatrixRotateAxis"}) {
+    EXPECT_EQ(run.host->callCount(service), 0) << service;
   }
+}
+
+// A run of keys that cannot be fetched, in an import whose last reads of lists those are: for each run, the
+// batches that were closed. None of them has a key.
+std::vector<std::size_t> BatchesClosedAfterAFailedRun(const std::string& scene, std::int64_t runs) {
+  std::vector<std::size_t> closed;
+  const std::int64_t reads = ImportText(scene, {}).host->callCount("ListGet");
+  for (std::int64_t nth = reads - runs + 1; nth <= reads; ++nth) {
+    const ImportRun run = ImportText(scene, Failing("ListGet", nth));
+    EXPECT_EQ(run.result.code, kRehearsed);
+    EXPECT_TRUE(run.result.ledgerClean());
+    EXPECT_THAT(CallsOf(run.trace, "AddBatchKeyframe"), IsEmpty());
+    EXPECT_THAT(CallsOf(run.trace, "BeginKeyframeBatch"), SizeIs(5));
+    closed.push_back(CallsOf(run.trace, "EndKeyframeBatch").size());
+  }
+  return closed;
+}
+
+TEST(BuilderFailuresTest, BatchesAreClosedAfterAFailedFetchOfTheKeysOfAChannel) {
+  EXPECT_THAT(BatchesClosedAfterAFailedRun(TenKeys() + Animation("rig.ry", {{1, 77}}), 2), ElementsAre(5, 5));
 }
 
 TEST(BuilderFailuresTest, AFailureAfterTheFirstStreamLeavesTheEarlierStreamsSet) {

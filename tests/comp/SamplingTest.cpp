@@ -1,3 +1,6 @@
+#include <cstring>
+
+#include "hostutil/HostSetup.h"
 #include "hostutil/RecordList.h"
 #include "plugin/Globals.h"
 #include "tests/support/BuilderFixture.h"
@@ -192,6 +195,145 @@ TEST_F(SamplingTest, ExtractingAGroupLooksAtNoOtherGroup) {
   Use(Animation("n.tx", KeysFrom(1, {1, 2, 3})));
   node_.curve[3] = 4711;
   EXPECT_THAT(Extracted(0, 1), ElementsAre(2.0, -102.0, -103.0));
+}
+
+// What VerifyAnimInfo found is told from what is fetched anew by the lists that are read.
+class RememberedSamplingTest : public SamplingTest {
+ protected:
+  // Two nodes of different curves and key times, "a" and "b".
+  void UseTwo() {
+    Begin(SceneHead("-t sec") + TransformText("a") + TransformText("b") +
+          Animation("a.tx", KeysFrom(10, {1, 2, 3})) + Animation("a.ry", {{10, 77}}) +
+          Animation("b.ty", KeysFrom(20, {4, 5})));
+    node_ = TransformAt(0);
+    other_ = TransformAt(1);
+  }
+
+  // Begins to sample "a".
+  void Remember() {
+    ASSERT_EQ(parser().VerifyAnimInfo(&node_), 3);
+    ASSERT_EQ(parser().GetKeyTime(&node_, 0), (T_Time{10000, 1000}));
+  }
+
+  // Checks key 1 of "a", and says how many records of lists that took.
+  std::int64_t ReadsOfKeyOne(const MAYA_Transform& node) {
+    const std::int64_t before = HostUtilityCallCount(HOST_UTILITY_ListGet);
+    EXPECT_EQ(parser().GetKeyTime(&node, 1), (T_Time{11000, 1000}));
+    double values[3] = {-101.0, -102.0, -103.0};
+    parser().ExtractAnimInfo(&node, kRotateGroup, 1, values);
+    EXPECT_THAT(values, ElementsAre(-101.0, 77.0, -103.0));
+    parser().ExtractAnimInfo(&node, kTranslateGroup, 1, values);
+    EXPECT_THAT(values, ElementsAre(2.0, 77.0, -103.0));
+    return HostUtilityCallCount(HOST_UTILITY_ListGet) - before;
+  }
+
+  static constexpr std::int64_t kReadsWithoutMemory = 6;  // a curve and a key, three times
+
+  MAYA_Transform other_{};
+};
+
+TEST_F(RememberedSamplingTest, ANodeThatWasVerifiedIsReadWithoutItsCurves) {
+  UseTwo();
+  EXPECT_EQ(ReadsOfKeyOne(node_), kReadsWithoutMemory);
+  Remember();
+  EXPECT_EQ(ReadsOfKeyOne(node_), 0);
+}
+
+TEST_F(RememberedSamplingTest, KeyZeroFetchesTheKeysOfEachChannelAtOnce) {
+  UseTwo();
+  ASSERT_EQ(parser().VerifyAnimInfo(&node_), 3);
+  EXPECT_EQ(ReadsOfKeyOne(node_), kReadsWithoutMemory);
+  const std::int64_t before = HostUtilityCallCount(HOST_UTILITY_ListGet);
+  parser().GetKeyTime(&node_, 0);
+  EXPECT_EQ(HostUtilityCallCount(HOST_UTILITY_ListGet) - before, 2);
+}
+
+TEST_F(RememberedSamplingTest, TheSameCurvesAtAnotherAddressAreRecognised) {
+  UseTwo();
+  Remember();
+  MAYA_Transform copy = DefaultTransform();
+  std::memcpy(copy.curve, node_.curve, sizeof copy.curve);
+  copy.curve[kTargetSlot] = 1;
+  EXPECT_EQ(ReadsOfKeyOne(copy), 0);
+}
+
+TEST_F(RememberedSamplingTest, OtherCurvesAtTheSameAddressAreNotTakenForTheNode) {
+  UseTwo();
+  Remember();
+  node_ = other_;
+  EXPECT_EQ(parser().GetKeyTime(&node_, 1), (T_Time{21000, 1000}));
+  EXPECT_THAT(Extracted(kTranslateGroup, 1), ElementsAre(-101.0, 5.0, -103.0));
+}
+
+TEST_F(RememberedSamplingTest, AnotherNodeInBetweenChangesNothing) {
+  UseTwo();
+  Remember();
+  EXPECT_EQ(parser().GetKeyTime(&other_, 0), (T_Time{20000, 1000}));
+  EXPECT_EQ(parser().GetKeyTime(&other_, 1), (T_Time{21000, 1000}));
+  double values[3] = {-101.0, -102.0, -103.0};
+  parser().ExtractAnimInfo(&other_, kTranslateGroup, 0, values);
+  EXPECT_THAT(values, ElementsAre(-101.0, 4.0, -103.0));
+  EXPECT_EQ(ReadsOfKeyOne(node_), 0);
+}
+
+TEST_F(RememberedSamplingTest, TheNodeVerifiedLastIsTheOneRemembered) {
+  UseTwo();
+  Remember();
+  ASSERT_EQ(parser().VerifyAnimInfo(&other_), 2);
+  EXPECT_EQ(ReadsOfKeyOne(node_), kReadsWithoutMemory);
+}
+
+TEST_F(RememberedSamplingTest, AVerificationThatThrowsLeavesNothingRemembered) {
+  const auto verify = [&] { parser().VerifyAnimInfo(&other_); };
+  UseTwo();
+  Remember();
+  other_.curve[0] = 4711;
+  EXPECT_EQ(CodeOf(verify), HOST_ERR_LIST_INDEX);
+  EXPECT_EQ(ReadsOfKeyOne(node_), kReadsWithoutMemory);
+
+  Remember();
+  other_ = node_;
+  other_.curve[5] = 2;  // two keys, not three
+  EXPECT_EQ(CodeOf(verify), 1289987);
+  EXPECT_EQ(ReadsOfKeyOne(node_), kReadsWithoutMemory);
+}
+
+TEST_F(RememberedSamplingTest, AFailedReadWhileTheSameNodeIsVerifiedAgainLeavesNothingRemembered) {
+  UseTwo();
+  Remember();
+  const HostUtilityFailure failure{HOST_UTILITY_ListGet, HostUtilityCallCount(HOST_UTILITY_ListGet) + 2, -77,
+                                   HOST_THROW_NOTHING};
+  ASSERT_EQ(HostAddUtilityFailure(&failure), 0);
+  EXPECT_EQ(CodeOf([&] { parser().VerifyAnimInfo(&node_); }), -77);
+  EXPECT_EQ(ReadsOfKeyOne(node_), kReadsWithoutMemory);
+  HostClearUtilityFailures();
+}
+
+TEST_F(RememberedSamplingTest, AFailedRunLeavesTheOffsetAndTheKeysAreStillRead) {
+  Begin(SceneHead("-t film") + TransformText("a") + Animation("a.tx", KeysFrom(10, {1, 2})) +
+        Animation("a.ty", KeysFrom(10, {3, 4})));
+  node_ = TransformAt(0);
+  ASSERT_EQ(parser().VerifyAnimInfo(&node_), 2);
+  const HostUtilityFailure failure{HOST_UTILITY_ListGet, HostUtilityCallCount(HOST_UTILITY_ListGet) + 2, -77,
+                                   HOST_THROW_NOTHING};
+  ASSERT_EQ(HostAddUtilityFailure(&failure), 0);
+  EXPECT_EQ(CodeOf([&] { parser().GetKeyTime(&node_, 0); }), -77);
+  HostClearUtilityFailures();
+  EXPECT_DOUBLE_EQ(G_time_offsetD, 0.0);
+  EXPECT_THAT(Extracted(kTranslateGroup, 1), ElementsAre(2.0, 4.0, -103.0));
+}
+
+TEST_F(RememberedSamplingTest, KeysThatAreReadAfterwardsAreSeen) {
+  Begin(SceneHead("-t sec") + TransformText("a") + Animation("a.tx", KeysFrom(10, {1, 2})));
+  node_ = TransformAt(0);
+  ASSERT_EQ(parser().VerifyAnimInfo(&node_), 2);
+  parser().GetKeyTime(&node_, 0);
+  // The curve, which is still current, takes the keys of its command once more.
+  parser().position = std::strstr(parser().buffer, "\".ktv");
+  ASSERT_NE(parser().position, nullptr);
+  parser().ParseAnimSetAttr();
+  EXPECT_EQ(parser().GetKeyTime(&node_, 3), (T_Time{11000, 1000}));
+  EXPECT_THAT(Extracted(kTranslateGroup, 2), ElementsAre(1.0, -102.0, -103.0));
 }
 
 }  // namespace

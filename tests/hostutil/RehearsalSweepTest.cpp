@@ -51,6 +51,7 @@ struct Scene {
   RecordList* madeList = reinterpret_cast<RecordList*>(1);
   HostStringTable* madeTable = reinterpret_cast<HostStringTable*>(1);
   void* address = reinterpret_cast<void*>(1);
+  const void* run = reinterpret_cast<void*>(1);
   int64_t number = 99;
   int32_t order = 99;
   double value = 99;
@@ -82,6 +83,9 @@ int64_t CountOf(const RecordList* list) {
 }
 
 const int64_t kSeven = 7;
+const int64_t kRun[] = {7, 8};
+
+const PivotedTransform kPivoted = {{1, 2, 3}, {4, 5, 6}, {7, 8, 9}, {0.1, 0.2, 0.3}, {10, 11, 12}};
 
 HostError CallRegister(Scene* s) {
   const char* const entries[] = {"key=text"};
@@ -149,8 +153,14 @@ const std::vector<FaultPoint>& FaultPoints() {
       {"RecordListAppend", HOST_UTILITY_ListAppend,
        [](Scene* s) { return RecordListAppend(s->openList, &kSeven); },
        [](Scene* s) { return CountOf(s->openList) == 3; }},
+      {"RecordListAppendRun", HOST_UTILITY_ListAppend,
+       [](Scene* s) { return RecordListAppendRun(s->openList, kRun, 2); },
+       [](Scene* s) { return CountOf(s->openList) == 3; }},
       {"RecordListGet", HOST_UTILITY_ListGet, [](Scene* s) { return RecordListGet(s->list, 0, &s->record); },
        [](Scene* s) { return s->record == 99; }},
+      {"RecordListGetRun", HOST_UTILITY_ListGet,
+       [](Scene* s) { return RecordListGetRun(s->list, 1, 2, &s->run); },
+       [](Scene* s) { return s->run == nullptr; }},
       {"RecordListLock", HOST_UTILITY_ListLock,
        [](Scene* s) { return RecordListLock(s->openList, 0, &s->address); },
        [](Scene* s) {
@@ -182,6 +192,9 @@ const std::vector<FaultPoint>& FaultPoints() {
        [](Scene* s) { return MatrixRotateAxis(&s->matrix, 1, 0, 0, 1); }, MatrixUntouched},
       {"MatrixDecompose", HOST_UTILITY_MatrixDecompose,
        [](Scene* s) { return MatrixDecompose(&s->matrix, &s->components, nullptr); },
+       [](Scene* s) { return AllZero(s->components); }},
+      {"MatrixDecomposePivoted", HOST_UTILITY_MatrixDecompose,
+       [](Scene* s) { return MatrixDecomposePivoted(&kPivoted, &s->components); },
        [](Scene* s) { return AllZero(s->components); }},
       {"HostRatioCompare", HOST_UTILITY_RatioCompare, CallCompare, [](Scene* s) { return s->order == 0; }},
   };
@@ -293,6 +306,7 @@ TEST_F(RehearsalSweepTest, ARehearsedFailureTakesNullPlacesToHandOutTo) {
   EXPECT_EQ(HostStripExtension(nullptr, 1, nullptr), 4711);
   EXPECT_EQ(HostRegisterStringTable(nullptr, nullptr, 1, nullptr), 4711);
   EXPECT_EQ(RecordListCreate(8, 1, 0, nullptr), 4711);
+  EXPECT_EQ(RecordListGetRun(nullptr, 0, 1, nullptr), 4711);
   EXPECT_EQ(RecordListLock(nullptr, 0, nullptr), 4711);
   EXPECT_EQ(RecordListCount(nullptr, nullptr), 4711);
   EXPECT_EQ(UTF16StringMakeFromUnits(nullptr, nullptr), 4711);
@@ -303,6 +317,7 @@ TEST_F(RehearsalSweepTest, ARehearsedFailureTakesNullPlacesToHandOutTo) {
   EXPECT_EQ(HostNumberScan(nullptr, 0, nullptr), 4711);
   EXPECT_EQ(MatrixSetIdentity(nullptr), 4711);
   EXPECT_EQ(MatrixDecompose(nullptr, nullptr, nullptr), 4711);
+  EXPECT_EQ(MatrixDecomposePivoted(nullptr, nullptr), 4711);
   EXPECT_EQ(HostRatioCompare(nullptr, nullptr, nullptr), 4711);
 }
 

@@ -200,12 +200,12 @@ TEST_F(KeysTest, FailedListsThrowTheirCodesAndLoseNothing) {
     std::int32_t service;
     std::int64_t nth;
   };
-  // The first list and record are the curve's, the second those of its keys.
+  // The first list and record are the curve's, the second those of its keys; the comment parts two runs.
   for (const Row& row :
        {Row{HOST_UTILITY_ListCreate, 2}, Row{HOST_UTILITY_ListAppend, 2}, Row{HOST_UTILITY_ListAppend, 3}}) {
     {
       const UtilityRehearsal failing(row.service, row.nth, 7003);
-      EXPECT_EQ(ReadWith("setAttr \".ktv\" 1 2 3 4;"), 7003);
+      EXPECT_EQ(ReadWith("setAttr \".ktv\" 1 2 /**/ 3 4;"), 7003);
     }
     EndScene();
     EXPECT_EQ(HeldLists(), 0u);

@@ -84,8 +84,8 @@ FAULTS = (
     Fault("a slash and three stars close a comment", "maya/MAYA_Lex.cpp",
           "if (*position != '*') continue;\n    ++position;",
           "if (*position != '*') continue;\n    if (position[1] == '/') ++position;"),
-    Fault("a token of 254 bytes is too long", "maya/MAYA_Parse.cpp",
-          "*length = size > kLongestToken ? 0", "*length = size >= kLongestToken ? 0"),
+    Fault("a token of 254 bytes is too long", "maya/TokenText.h",
+          "return length <= kLongestToken ? length : 0;", "return length < kLongestToken ? length : 0;"),
     Fault("the lists are disposed of in another order", "maya/MAYA_Parse.cpp",
           "RecordListDispose(cameras);\n  RecordListDispose(transforms);",
           "RecordListDispose(transforms);\n  RecordListDispose(cameras);"),
@@ -113,13 +113,14 @@ FAULTS = (
           "ConvertRot(rotate[1]) * -kDegreesToRadians;", "ConvertRot(rotate[1]) * kDegreesToRadians;"),
     Fault("z of an aimed camera's keys keeps its sign", "comp/MAYA_Parse_LookAt.cpp",
           "-ConvertDist(point[1]), -ConvertDist(point[2]));", "-ConvertDist(point[1]), ConvertDist(point[2]));"),
-    Fault("a channel of one key is dropped from the sampling", "comp/MAYA_Parse_Sampling.cpp",
-          "if (channels[place].count != 0) sampled[sampledCount++] = place;",
-          "if (channels[place].count > 1) sampled[sampledCount++] = place;"),
-    Fault("a channel of one key is dropped from an aim target", "comp/MAYA_Parse_Sampling.cpp",
-          "ReadKey(channels[static_cast<std::size_t>(slot)], n, &values[axis]);",
-          "if (channels[static_cast<std::size_t>(slot)].count > 1) "
-          "ReadKey(channels[static_cast<std::size_t>(slot)], n, &values[axis]);"),
+    Fault("a channel of one key is dropped from the sampling", "maya/NodeChannels.cpp",
+          "if (channel.count == 0) continue;", "if (channel.count < kAnimatedKeyCount) continue;"),
+    Fault("a channel of one key is dropped from an aim target", "comp/MAYA_Parse_LookAt.cpp",
+          "ExtractAnimInfo(node, kTranslateGroup, n, point);",
+          "ExtractAnimInfo(node, kTranslateGroup, n, point);\n"
+          "      for (int axis = 0; axis < kAxisCount; ++axis) {\n"
+          "        if (NodeChannels::Find(curves, node->curve[axis]).count == 1) point[axis] = node->translate[axis];\n"
+          "      }"),
     Fault("the time offset is not reset", "comp/MAYA_Parse_Assembly.cpp",
           "  ResetOffset();\n", ""),
     Fault("batches are closed in the opposite order", "comp/MAYA_Parse_TransformAnimation.cpp",

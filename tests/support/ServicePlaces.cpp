@@ -1,7 +1,6 @@
 #include "tests/support/ServicePlaces.h"
 
 #include <cstdint>
-#include <limits>
 #include <ostream>
 #include <streambuf>
 #include <utility>
@@ -56,9 +55,6 @@ const std::vector<std::string>& ServiceNames() {
 
 ServicePlaces PlacesOfServices(refhost::Callback callback, const std::filesystem::path& scene,
                                refhost::HostOptions options) {
-  // Where a failure is planned no service stands for many calls, made in advance; this one never comes.
-  constexpr std::int64_t kNever = std::numeric_limits<std::int64_t>::max();
-  options.failures.push_back({ServiceNames().front(), kNever, false, refhost::Failure::Kind::Code, 0});
   WatchingBuffer buffer;
   std::ostream trace(&buffer);
   options.trace = &trace;
