@@ -81,13 +81,12 @@ void Batch::clear() {
   endFailed = false;
 }
 
-void Batch::setValue(std::size_t index, const double* value) {
-  const std::size_t dimension = static_cast<std::size_t>(stream->dimension);
+void Batch::setValueApart(std::size_t index, const double* value) {
   if (index == nextValued) {
-    for (std::size_t i = 0; i < dimension; ++i) values.add(value[i]);
-    ++nextValued;
-    return;
+    values.makeRoom(kMostDimensions);
+    return setValue(index, value);
   }
+  const std::size_t dimension = static_cast<std::size_t>(stream->dimension);
   if (nextValued != kOutOfOrder) valued.assign(nextValued, 1);
   nextValued = kOutOfOrder;
   if (index >= valued.size()) {

@@ -28,23 +28,16 @@ struct Batch {
   static constexpr std::size_t kOutOfOrder = SIZE_MAX;
   static constexpr std::size_t kMostDimensions = 3;
 
-  void addKey(const T_Time& time) { times.add(time); }
-
-  // The same where there is room.
-  bool hasRoomForKey() const { return times.hasRoom(1); }
-  void addKeyInRoom(const T_Time& time) {
+  // There is room for the key in `times`.
+  void addKey(const T_Time& time) {
     *times.next() = time;
     times.advance(1);
   }
 
-  // Whether it is the turn of that key to get its value, and there is room. All three numbers have to be
-  // finite, also those that the stream does not have.
-  bool canAddValueOf(std::int32_t index, const double* value) const {
-    const double zero = 0.0 * value[0] + 0.0 * value[1] + 0.0 * value[2];
-    const auto key = static_cast<std::size_t>(index);
-    return zero == 0.0 && key == nextValued && key < times.size() && values.hasRoom(kMostDimensions);
-  }
-  void addValueInRoom(const double* value) {
+  // Gives the key of that index, which is there, its value: as many of the three numbers as the stream has.
+  void setValue(std::size_t index, const double* value) {
+    if (index != nextValued || !values.hasRoom(kMostDimensions)) [[unlikely]]
+      return setValueApart(index, value);
     double* const next = values.next();
     next[0] = value[0];
     next[1] = value[1];
@@ -53,11 +46,12 @@ struct Batch {
     ++nextValued;
   }
 
-  // There is a key of that index.
-  void setValue(std::size_t index, const double* value);
-
   // Makes the batch blank. The columns keep their memory for the next batch.
   void clear();
+
+ private:
+  // Where there is no room, or it is not the key's turn.
+  [[gnu::cold]] void setValueApart(std::size_t index, const double* value);
 };
 
 // Takes the keys of the batch into the columns (null: there are none yet): sorted by time, stably, of equal

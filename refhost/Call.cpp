@@ -13,37 +13,43 @@ struct OtherException {};
 
 }  // namespace
 
-void Call::refuse(HostError code, const std::string& sentence) {
-  error_ = code;
-  host_.refuse(std::string(factsOf(operation_).name) + ": " + sentence);
+HostError refuse(Operation operation, HostError code, const std::string& sentence) {
+  HostState::live().refuse(std::string(factsOf(operation).name) + ": " + sentence);
+  return code;
 }
 
-void Call::refuseHandle(const void* handle, HandleKind wanted, const char* what) {
-  const HandleKind kind = host_.codec.kindOf(handle);
-  const bool stale = host_.streams.wasGivenBack(handle) || host_.batches.wasGivenBack(handle) ||
-                     host_.memory.wasGivenBack(handle);
+HostError refuseHandle(Operation operation, const void* handle, HandleKind wanted, const char* what) {
+  HostState& host = HostState::live();
+  const HandleKind kind = host.codec.kindOf(handle);
+  const bool stale = host.streams.wasGivenBack(handle) || host.batches.wasGivenBack(handle) ||
+                     host.memory.wasGivenBack(handle);
   std::string sentence = what;
   if (handle == nullptr) {
     sentence += " is a null handle";
   } else if (kind == HandleKind::None) {
     sentence += " is no handle of this host";
   } else if (kind != wanted) {
-    sentence += " is " + host_.codec.describe(handle) + ", which is no " + kindName(wanted) + " handle";
+    sentence += " is " + host.codec.describe(handle) + ", which is no " + kindName(wanted) + " handle";
   } else if (stale) {
-    sentence += " is " + host_.codec.describe(handle) + ", which was given back before";
+    sentence += " is " + host.codec.describe(handle) + ", which was given back before";
   } else {
-    sentence += " is " + host_.codec.describe(handle) + ", which was never handed out";
+    sentence += " is " + host.codec.describe(handle) + ", which was never handed out";
   }
-  refuse(HOST_ERR_BAD_HANDLE, sentence);
+  return refuse(operation, HOST_ERR_BAD_HANDLE, sentence);
 }
 
-void Call::refuseNull(const char* what) {
-  refuse(HOST_ERR_BAD_POINTER, std::string(what) + " is a null pointer");
+HostError refuseNull(Operation operation, const char* what) {
+  return refuse(operation, HOST_ERR_BAD_POINTER, std::string(what) + " is a null pointer");
 }
 
-void Call::refusePluginId(std::int32_t pluginId) {
-  refuse(HOST_ERR_BAD_PLUGIN_ID,
-         "the plug-in id " + std::to_string(pluginId) + " is not " + std::to_string(host_.options.pluginId));
+HostError refusePluginId(Operation operation, std::int32_t pluginId) {
+  return refuse(operation, HOST_ERR_BAD_PLUGIN_ID,
+                "the plug-in id " + std::to_string(pluginId) + " is not " +
+                    std::to_string(HostState::live().options.pluginId));
+}
+
+HostError refuseNotFinite(Operation operation, const char* what) {
+  return refuse(operation, HOST_ERR_BAD_VALUE, std::string(what) + " is not finite");
 }
 
 Composition* Call::composition(VOR_CompItem* handle, const char* what) {
@@ -73,10 +79,6 @@ bool Call::isStore(HostPrefsStore* handle) {
       host_.codec.isOf(HandleKind::Store, handle) && HandleCodec::lastingNumber(handle) == kStoreNumber;
   if (!known) refuseHandle(handle, HandleKind::Store, "the preference store");
   return known;
-}
-
-void Call::refuseNotFinite(const char* what) {
-  refuse(HOST_ERR_BAD_VALUE, std::string(what) + " is not finite");
 }
 
 void Call::judge() {

@@ -3,6 +3,9 @@
 // A thunk makes a Call, does its work when goesOn() says so, describes itself when traced() says so, and
 // returns finish(). The work refuses what breaks a promise: each refusal has a code and a sentence. finish()
 // throws when the rehearsal asked for an exception, so nothing that has to happen may come after it.
+//
+// The operations that an import makes for every key are Calls too, but only where one is rehearsed or traced;
+// see perform() below.
 #pragma once
 
 #include <cstddef>
@@ -18,32 +21,49 @@ namespace refhost {
 // The number of the one preference store, in its handle.
 inline constexpr std::size_t kStoreNumber = 1;
 
+// Refusals of the live host: each keeps the sentence, begun with the operation's name, and gives the code.
+// `what` names the part of the call that is refused, such as "the parent".
+[[gnu::cold]] HostError refuse(Operation operation, HostError code, const std::string& sentence);
+[[gnu::cold]] HostError refuseHandle(Operation operation, const void* handle, HandleKind wanted,
+                                     const char* what);
+[[gnu::cold]] HostError refuseNull(Operation operation, const char* what);
+[[gnu::cold]] HostError refusePluginId(Operation operation, std::int32_t pluginId);
+[[gnu::cold]] HostError refuseNotFinite(Operation operation, const char* what);
+
 class Call {
  public:
   explicit Call(Operation operation) : host_(HostState::live()), operation_(operation) {
-    if (host_.rehearsal.count(operation)) [[unlikely]]
-      judge();
+    if (host_.rehearsal.count(operation)) judge();
   }
   Call(const Call&) = delete;
   Call& operator=(const Call&) = delete;
 
   HostState& host() { return host_; }
+  Operation operation() const { return operation_; }
 
   // False when the rehearsal has the call do nothing. A call that then returns 0 hands out null and 0.
   template <typename... Outs>
   bool goesOn(Outs*... outs) {
     if (!rehearsed_) return true;
-    if (!throws() && error_ == 0) ((outs != nullptr ? void(*outs = Outs{}) : void()), ...);
+    handOutNothing(outs...);
     return false;
+  }
+
+  // Of a call that did nothing, and returns 0.
+  template <typename... Outs>
+  void handOutNothing(Outs*... outs) {
+    if (!failed()) ((outs != nullptr ? void(*outs = Outs{}) : void()), ...);
   }
 
   // Whether the call did what it was asked for.
   bool didItsWork() const { return !rehearsed_ && error_ == 0; }
   bool failed() const { return throws() || error_ != 0; }
 
-  [[gnu::cold]] void refuse(HostError code, const std::string& sentence);
+  void refuse(HostError code, const std::string& sentence) {
+    error_ = refhost::refuse(operation_, code, sentence);
+  }
 
-  // A refusal with a code of its own that is nobody's broken promise.
+  // The code is the call's, whether it is a refusal's or that of nobody's broken promise.
   void fail(HostError code) { error_ = code; }
 
   // The objects behind handles. Null after a refusal that says what is wrong; `what` names the handle's part
@@ -51,24 +71,18 @@ class Call {
   Composition* composition(VOR_CompItem* handle, const char* what = "the composition");
   Item* item(VOR_Item* handle, const char* what);
   Layer* layer(VOR_Layer* handle, const char* what = "the layer") {
-    if (host_.codec.isOf(HandleKind::Layer, handle)) [[likely]] {
-      Layer* found = host_.editor.layer(HandleCodec::lastingNumber(handle));
-      if (found != nullptr) [[likely]]
-        return found;
-    }
-    refuseHandle(handle, HandleKind::Layer, what);
-    return nullptr;
+    Layer* found = host_.layer(handle);
+    if (found == nullptr) refuseHandle(handle, HandleKind::Layer, what);
+    return found;
   }
   HeldStream* stream(VOR_Stream* handle, const char* what = "the stream") {
     HeldStream* found = host_.streams.find(handle);
-    if (found == nullptr) [[unlikely]]
-      refuseHandle(handle, HandleKind::Stream, what);
+    if (found == nullptr) refuseHandle(handle, HandleKind::Stream, what);
     return found;
   }
   Batch* batch(VOR_AddKeyframesInfo* handle) {
     Batch* found = host_.batches.find(handle);
-    if (found == nullptr) [[unlikely]]
-      refuseHandle(handle, HandleKind::Batch, "the batch");
+    if (found == nullptr) refuseHandle(handle, HandleKind::Batch, "the batch");
     return found;
   }
   MemoryBlock* memory(HostMemHandle* handle);
@@ -76,22 +90,18 @@ class Call {
 
   // False after a refusal.
   bool given(const void* pointer, const char* what) {
-    if (pointer == nullptr) [[unlikely]]
-      refuseNull(what);
+    if (pointer == nullptr) error_ = refuseNull(operation_, what);
     return pointer != nullptr;
   }
   bool isPluginId(std::int32_t pluginId) {
-    if (pluginId != host_.options.pluginId) [[unlikely]]
-      refusePluginId(pluginId);
-    return pluginId == host_.options.pluginId;
+    const bool right = pluginId == host_.options.pluginId;
+    if (!right) error_ = refusePluginId(operation_, pluginId);
+    return right;
   }
   bool areFinite(const double* values, std::int32_t count, const char* what) {
-    double zero = 0.0;  // 0 times what is not finite is not a number
-    for (std::int32_t i = 0; i < count; ++i) zero += 0.0 * values[i];
-    if (zero == 0.0 || host_.options.permissive) [[likely]]
-      return true;
-    refuseNotFinite(what);
-    return false;
+    const bool taken = host_.takesNumbers(values, count);
+    if (!taken) error_ = refuseNotFinite(operation_, what);
+    return taken;
   }
 
   // The line to describe the arguments in, null when there is no trace.
@@ -100,20 +110,18 @@ class Call {
   TraceLine* traced(const char* suite, std::int32_t version);
 
   HostError finish() {
-    if (line_ != nullptr || rehearsed_) [[unlikely]]
-      conclude();
+    if (line_ != nullptr || rehearsed_) conclude();
     return error_;
   }
 
  private:
   bool throws() const { return kind_ != Failure::Kind::Code; }
   void judge();
-  [[gnu::cold]] TraceLine& startLine();
-  [[gnu::cold]] void refuseHandle(const void* handle, HandleKind wanted, const char* what);
-  [[gnu::cold]] void refuseNull(const char* what);
-  [[gnu::cold]] void refusePluginId(std::int32_t pluginId);
-  [[gnu::cold]] void refuseNotFinite(const char* what);
-  [[gnu::cold]] void conclude();
+  TraceLine& startLine();
+  void refuseHandle(const void* handle, HandleKind wanted, const char* what) {
+    error_ = refhost::refuseHandle(operation_, handle, wanted, what);
+  }
+  void conclude();
 
   HostState& host_;
   TraceLine* line_ = nullptr;  // the host's, while this call writes it
@@ -122,5 +130,31 @@ class Call {
   Failure::Kind kind_ = Failure::Kind::Code;  // any other is thrown at the end
   bool rehearsed_ = false;
 };
+
+// As perform() does an operation that is rehearsed or traced.
+template <typename Task, typename... Arguments>
+[[gnu::cold, gnu::noinline]] HostError performWatched(Arguments... arguments) {
+  Call call(Task::kOperation);
+  if (call.goesOn()) {
+    call.fail(Task::work(call.host(), arguments...));
+  } else {
+    Task::idle(call, arguments...);
+  }
+  if (TraceLine* line = call.traced()) Task::describe(*line, arguments...);
+  return call.finish();
+}
+
+// An operation that is made for every key; the table of its suite holds it as it is. A task has the
+// operation's number and does it in three parts: work() is the operation and gives its code, idle() is for a
+// call that the rehearsal has do nothing, describe() adds the arguments to the trace. work() ends where it
+// refuses, so that an ordinary call makes no other and needs no stack.
+template <typename Task, typename... Arguments>
+HostError perform(Arguments... arguments) {
+  HostState& host = HostState::live();
+  if (host.watched()) [[unlikely]]
+    return performWatched<Task>(arguments...);
+  host.rehearsal.count(Task::kOperation);
+  return Task::work(host, arguments...);
+}
 
 }  // namespace refhost

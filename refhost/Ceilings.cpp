@@ -22,7 +22,7 @@ bool takesLayer(Call& call) {
 
 bool takesKeys(Call& call, std::int32_t keys) {
   if (call.host().allowance.keys >= keys) return true;
-  refuseKey(call);
+  call.fail(refuseKey(call.operation()));
   return false;
 }
 
@@ -35,9 +35,10 @@ bool takesMemory(Call& call, std::int64_t bytes) {
   return false;
 }
 
-void refuseKey(Call& call) {
-  call.refuse(HOST_ERR_TOO_MANY_KEYS,
-              "the host takes no more than " + std::to_string(call.host().options.mostKeys) + " keys");
+HostError refuseKey(Operation operation) {
+  return refuse(
+      operation, HOST_ERR_TOO_MANY_KEYS,
+      "the host takes no more than " + std::to_string(HostState::live().options.mostKeys) + " keys");
 }
 
 }  // namespace refhost

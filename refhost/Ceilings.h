@@ -7,6 +7,7 @@
 #include <cstdint>
 
 #include "refhost/Host.h"
+#include "refhost/Operations.h"
 
 namespace refhost {
 
@@ -28,6 +29,7 @@ bool takesLayer(Call& call);
 bool takesKeys(Call& call, std::int32_t keys);
 bool takesMemory(Call& call, std::int64_t bytes);
 
-void refuseKey(Call& call);
+// A refusal of a further key.
+[[gnu::cold]] HostError refuseKey(Operation operation);
 
 }  // namespace refhost

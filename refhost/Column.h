@@ -17,13 +17,10 @@ class Column {
   Value& operator[](std::size_t at) { return room_[at]; }
   const Value& operator[](std::size_t at) const { return room_[at]; }
 
-  // Whether so many more values need no more memory.
-  bool hasRoom(std::size_t count) const { return room_.size() - size_ >= count; }
-
-  void add(Value value) {
-    if (!hasRoom(1)) [[unlikely]]
-      grow(size_ + 1);
-    room_[size_++] = value;
+  // Whether so many more values need no more memory, and seeing to it.
+  bool hasRoom(std::size_t count) const { return capacity_ - size_ >= count; }
+  [[gnu::cold]] void makeRoom(std::size_t count) {
+    if (!hasRoom(count)) grow(size_ + count);
   }
 
   // Where the next values go, as far as there is room, and so many of them added there.
@@ -32,7 +29,7 @@ class Column {
 
   // Values that come to it are zero.
   void resize(std::size_t size) {
-    if (size > room_.size()) grow(size);
+    if (size > capacity_) grow(size);
     if (size > size_) std::fill(room_.data() + size_, room_.data() + size, Value{});
     size_ = size;
   }
@@ -40,13 +37,15 @@ class Column {
   void clear() { size_ = 0; }
 
  private:
-  [[gnu::noinline]] void grow(std::size_t least) {
+  void grow(std::size_t least) {
     constexpr std::size_t kFirstRoom = 64;
-    room_.resize(std::max({least, 2 * room_.size(), kFirstRoom}));
+    room_.resize(std::max({least, 2 * capacity_, kFirstRoom}));
+    capacity_ = room_.size();
   }
 
   std::vector<Value> room_;  // the values, and zeros or old values behind them
   std::size_t size_ = 0;
+  std::size_t capacity_ = 0;  // the size of `room_`, which is asked for with every value
 };
 
 }  // namespace refhost

@@ -109,13 +109,14 @@ class HandlePool {
 
   // Hands out a new handle and the object behind it, which is blank. Null when there are no more numbers or
   // slots.
-  Object* add(void** handle) {
-    if (handedOut_ == UINT32_MAX || (firstFree_ == kNoSlot && !makeSlot())) return nullptr;
-    return addToFreeSlot(handle);
-  }
+  Object* add(void** handle) { return makeFreeSlot() ? addToFreeSlot(handle) : nullptr; }
 
-  // The same in two steps: whether there is a slot that was given back, and handing that out.
+  // The same in steps: whether there is a free slot, seeing to it, and handing it out. False when there are
+  // no more numbers or slots.
   bool hasFreeSlot() const { return firstFree_ != kNoSlot && handedOut_ != UINT32_MAX; }
+  [[gnu::cold]] bool makeFreeSlot() {
+    return handedOut_ != UINT32_MAX && (firstFree_ != kNoSlot || makeSlot());
+  }
   Object* addToFreeSlot(void** handle) {
     const std::size_t index = firstFree_;
     Slot& slot = slots_[index];

@@ -54,7 +54,8 @@ struct Importer {
   HostImporterCallbacks callbacks{};
 };
 
-class HostState {
+// Hidden, so that every call finds the live one where it lies, without a table of addresses.
+class [[gnu::visibility("hidden")]] HostState {
  public:
   explicit HostState(HostOptions given);
   ~HostState();
@@ -67,8 +68,30 @@ class HostState {
   // canImport is written to the trace for verify only.
   CallbackResult end(HostError code, bool canImport);
 
-  // Whether a call may be rehearsed or has to be told. Settled where a callback begins and ends.
+  // Whether a call may be rehearsed or has to be traced. Settled where a callback begins and ends.
   bool watched() const { return watched_; }
+
+  // Null when there is none of that handle.
+  Layer* layer(VOR_Layer * handle) {
+    if (!codec.isOf(HandleKind::Layer, handle)) [[unlikely]]
+      return nullptr;
+    return editor.layer(HandleCodec::lastingNumber(handle));
+  }
+
+  // Whether the numbers are finite, or the host takes any.
+  bool takesNumbers(const double* values, std::int32_t count) const {
+    double zero = 0.0;  // 0 times what is not finite is not a number
+    for (std::int32_t i = 0; i < count; ++i) zero += 0.0 * values[i];
+    return zero == 0.0 || options.permissive;
+  }
+
+  // The same of a stream's value: as many numbers as it has. The others are 0 as a rule.
+  bool takesValue(const StreamValueRecord& record, std::int32_t dimension) const {
+    const double* const value = record.value;
+    if (0.0 * value[0] + 0.0 * value[1] + 0.0 * value[2] == 0.0) [[likely]]
+      return true;
+    return takesNumbers(value, dimension);
+  }
 
   void refuse(std::string sentence) { result.refusals.push_back(std::move(sentence)); }
 

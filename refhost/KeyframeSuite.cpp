@@ -55,109 +55,110 @@ HostError BeginKeyframeBatch(VOR_Stream* stream, VOR_AddKeyframesInfo** batch) {
   return call.finish();
 }
 
-// The sentences of the operations that are called for every key are put together apart from them.
-[[gnu::cold, gnu::noinline]] void refuseTimeMode(Call& call, std::int32_t timeMode) {
-  call.refuse(HOST_ERR_BAD_TIME_MODE, "the time mode " + std::to_string(timeMode) + " is not 0");
-}
+// The tasks of every key: what they refuse is put together apart from them.
+struct AddingKey {
+  static constexpr Operation kOperation = Operation::AddBatchKeyframe;
 
-[[gnu::cold, gnu::noinline]] void refuseTime(Call& call, const T_Time& time) {
-  call.refuse(HOST_ERR_BAD_TIME, "a key time of " + std::to_string(time.value) + "/0 has scale 0");
-}
-
-[[gnu::cold, gnu::noinline]] void refuseOtherStream(Call& call, VOR_AddKeyframesInfo* batch,
-                                                    VOR_Stream* stream) {
-  const HandleCodec& codec = call.host().codec;
-  call.refuse(HOST_ERR_BATCH_KEY, codec.describe(stream) + " is not of the stream that " +
-                                      codec.describe(batch) + " was opened on");
-}
-
-[[gnu::cold, gnu::noinline]] void refuseIndex(Call& call, VOR_AddKeyframesInfo* batch, std::int32_t index) {
-  call.refuse(HOST_ERR_BATCH_KEY,
-              call.host().codec.describe(batch) + " holds no key of the index " + std::to_string(index));
-}
-
-void addBatchKeyframe(Call& call, VOR_AddKeyframesInfo* batch, std::int32_t timeMode, const T_Time* time,
-                      std::int32_t* index) {
-  Batch* open = call.batch(batch);
-  if (open == nullptr || !call.given(time, "the time") || !call.given(index, "the place for the index"))
-    return;
-  if (timeMode != HOST_TIME_MODE_COMP) return refuseTimeMode(call, timeMode);
-  if (time->scale == 0 && !call.host().options.permissive) return refuseTime(call, *time);
-  if (call.host().allowance.keys == 0) return refuseKey(call);
-  *index = static_cast<std::int32_t>(open->times.size());
-  open->addKey(*time);
-  --call.host().allowance.keys;
-}
-
-[[gnu::noinline]] HostError addBatchKeyframeWatched(VOR_AddKeyframesInfo* batch, std::int32_t timeMode,
-                                                    const T_Time* time, std::int32_t* index) {
-  Call call(Operation::AddBatchKeyframe);
-  if (call.goesOn(index)) addBatchKeyframe(call, batch, timeMode, time, index);
-  if (TraceLine* line = call.traced()) {
-    line->handle("batch", batch).integer("timeMode", timeMode).time("time", time);
-    line->handedInteger("index", index);
-  }
-  return call.finish();
-}
-
-// The ordinary call, kept short because an import makes it for every key of every stream: nobody watches, and
-// there is nothing to refuse. Every other call goes the long way.
-HostError AddBatchKeyframe(VOR_AddKeyframesInfo* batch, std::int32_t timeMode, const T_Time* time,
-                           std::int32_t* index) {
-  HostState& host = HostState::live();
-  Batch* const open = host.batches.find(batch);
-  if (!host.watched() && open != nullptr && timeMode == HOST_TIME_MODE_COMP && time != nullptr &&
-      time->scale != 0 && index != nullptr && host.allowance.keys != 0 && open->hasRoomForKey()) [[likely]] {
-    host.rehearsal.count(Operation::AddBatchKeyframe);
+  static HostError work(HostState& host, VOR_AddKeyframesInfo* batch, std::int32_t timeMode,
+                        const T_Time* time, std::int32_t* index) {
+    Batch* const open = host.batches.find(batch);
+    if (open == nullptr) [[unlikely]]
+      return refuseHandle(kOperation, batch, HandleKind::Batch, "the batch");
+    if (time == nullptr) [[unlikely]]
+      return refuseNull(kOperation, "the time");
+    if (index == nullptr) [[unlikely]]
+      return refuseNull(kOperation, "the place for the index");
+    if (timeMode != HOST_TIME_MODE_COMP) [[unlikely]]
+      return refuseTimeMode(timeMode);
+    if (time->scale == 0 && !host.options.permissive) [[unlikely]]
+      return refuseTime(time->value);
+    if (host.allowance.keys == 0) [[unlikely]]
+      return refuseKey(kOperation);
+    if (!open->times.hasRoom(1)) [[unlikely]]
+      return workWithMoreRoom(host, batch, timeMode, time, index);
     *index = static_cast<std::int32_t>(open->times.size());
-    open->addKeyInRoom(*time);
+    open->addKey(*time);
     --host.allowance.keys;
     return 0;
   }
-  return addBatchKeyframeWatched(batch, timeMode, time, index);
-}
 
-void setBatchKeyframeValue(Call& call, VOR_AddKeyframesInfo* batch, std::int32_t index,
-                           const StreamValueRecord* value) {
-  Batch* open = call.batch(batch);
-  if (open == nullptr || !call.given(value, "the value record")) return;
-  const HeldStream* recorded = call.stream(value->stream, "the record's stream");
-  if (recorded == nullptr) return;
-  if (recorded->stream != open->stream) return refuseOtherStream(call, batch, value->stream);
-  if (index < 0 || static_cast<std::size_t>(index) >= open->times.size())
-    return refuseIndex(call, batch, index);
-  if (!call.areFinite(value->value, open->stream->dimension, "the value")) return;
-  open->setValue(static_cast<std::size_t>(index), value->value);
-}
-
-[[gnu::noinline]] HostError setBatchKeyframeValueWatched(VOR_AddKeyframesInfo* batch, std::int32_t index,
-                                                         const StreamValueRecord* value) {
-  Call call(Operation::SetBatchKeyframeValue);
-  if (call.goesOn()) setBatchKeyframeValue(call, batch, index, value);
-  if (TraceLine* line = call.traced()) {
-    line->handle("batch", batch).integer("index", index);
-    line->handle("stream", value == nullptr ? nullptr : value->stream);
-    line->recordValues("value", value);
+  static void idle(Call& call, VOR_AddKeyframesInfo*, std::int32_t, const T_Time*, std::int32_t* index) {
+    call.handOutNothing(index);
   }
-  return call.finish();
-}
 
-// As short as AddBatchKeyframe.
-HostError SetBatchKeyframeValue(VOR_AddKeyframesInfo* batch, std::int32_t index,
-                                const StreamValueRecord* value) {
-  HostState& host = HostState::live();
-  Batch* const open = host.batches.find(batch);
-  if (!host.watched() && open != nullptr && value != nullptr) [[likely]] {
+  static void describe(TraceLine& line, VOR_AddKeyframesInfo* batch, std::int32_t timeMode,
+                       const T_Time* time, std::int32_t* index) {
+    line.handle("batch", batch).integer("timeMode", timeMode).time("time", time);
+    line.handedInteger("index", index);
+  }
+
+ private:
+  // Makes room for a key of the batch, which is open, and begins again.
+  [[gnu::cold, gnu::noinline]] static HostError workWithMoreRoom(HostState& host, VOR_AddKeyframesInfo* batch,
+                                                                 std::int32_t timeMode, const T_Time* time,
+                                                                 std::int32_t* index) {
+    host.batches.find(batch)->times.makeRoom(1);
+    return work(host, batch, timeMode, time, index);
+  }
+
+  [[gnu::cold, gnu::noinline]] static HostError refuseTimeMode(std::int32_t timeMode) {
+    return refuse(kOperation, HOST_ERR_BAD_TIME_MODE,
+                  "the time mode " + std::to_string(timeMode) + " is not 0");
+  }
+
+  [[gnu::cold, gnu::noinline]] static HostError refuseTime(std::int32_t value) {
+    return refuse(kOperation, HOST_ERR_BAD_TIME, "a key time of " + std::to_string(value) + "/0 has scale 0");
+  }
+};
+
+struct SettingKey {
+  static constexpr Operation kOperation = Operation::SetBatchKeyframeValue;
+
+  static HostError work(HostState& host, VOR_AddKeyframesInfo* batch, std::int32_t index,
+                        const StreamValueRecord* value) {
+    Batch* const open = host.batches.find(batch);
+    if (open == nullptr) [[unlikely]]
+      return refuseHandle(kOperation, batch, HandleKind::Batch, "the batch");
+    if (value == nullptr) [[unlikely]]
+      return refuseNull(kOperation, "the value record");
     const HeldStream* const recorded = host.streams.find(value->stream);
-    if (recorded != nullptr && recorded->stream == open->stream && open->canAddValueOf(index, value->value))
-        [[likely]] {
-      host.rehearsal.count(Operation::SetBatchKeyframeValue);
-      open->addValueInRoom(value->value);
-      return 0;
-    }
+    if (recorded == nullptr) [[unlikely]]
+      return refuseHandle(kOperation, value->stream, HandleKind::Stream, "the record's stream");
+    if (recorded->stream != open->stream) [[unlikely]]
+      return refuseOtherStream(batch, value->stream);
+    const auto key = static_cast<std::size_t>(index);  // of a negative index, beyond every key
+    if (key >= open->times.size()) [[unlikely]]
+      return refuseIndex(batch, index);
+    if (!host.takesValue(*value, open->stream->dimension)) [[unlikely]]
+      return refuseNotFinite(kOperation, "the value");
+    open->setValue(key, value->value);
+    return 0;
   }
-  return setBatchKeyframeValueWatched(batch, index, value);
-}
+
+  static void idle(Call&, VOR_AddKeyframesInfo*, std::int32_t, const StreamValueRecord*) {}
+
+  static void describe(TraceLine& line, VOR_AddKeyframesInfo* batch, std::int32_t index,
+                       const StreamValueRecord* value) {
+    line.handle("batch", batch).integer("index", index);
+    line.handle("stream", value == nullptr ? nullptr : value->stream);
+    line.recordValues("value", value);
+  }
+
+ private:
+  [[gnu::cold, gnu::noinline]] static HostError refuseOtherStream(VOR_AddKeyframesInfo* batch,
+                                                                  VOR_Stream* stream) {
+    const HandleCodec& codec = HostState::live().codec;
+    return refuse(
+        kOperation, HOST_ERR_BATCH_KEY,
+        codec.describe(stream) + " is not of the stream that " + codec.describe(batch) + " was opened on");
+  }
+
+  [[gnu::cold, gnu::noinline]] static HostError refuseIndex(VOR_AddKeyframesInfo* batch, std::int32_t index) {
+    return refuse(
+        kOperation, HOST_ERR_BATCH_KEY,
+        HostState::live().codec.describe(batch) + " holds no key of the index " + std::to_string(index));
+  }
+};
 
 // Keys that the stream does not keep are no longer the host's.
 void endBatch(HostState& host, Batch& batch, bool commit) {
@@ -184,14 +185,14 @@ constexpr QZGP_KeyframeSuite3 table3() {
   QZGP_KeyframeSuite3 suite{};
   suite.GetStreamKeyframeCount = GetStreamKeyframeCount;
   suite.BeginKeyframeBatch = BeginKeyframeBatch;
-  suite.AddBatchKeyframe = AddBatchKeyframe;
+  suite.AddBatchKeyframe = perform<AddingKey>;
   suite.EndKeyframeBatch = EndKeyframeBatch;
   return suite;
 }
 
 constexpr QZGP_KeyframeSuite4 table4() {
   QZGP_KeyframeSuite4 suite{};
-  suite.SetBatchKeyframeValue = SetBatchKeyframeValue;
+  suite.SetBatchKeyframeValue = perform<SettingKey>;
   return suite;
 }
 

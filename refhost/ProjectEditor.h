@@ -56,7 +56,9 @@ class ProjectEditor {
   // Null when the layer has none of that id.
   static Stream* findStream(Layer& layer, int32_t id) {
     const std::size_t place = streamPlace(id);
-    return place < layer.streams.size() ? &layer.streams[place] : nullptr;
+    if (place == kNoStreamPlace) return nullptr;
+    Stream* const found = layer.streams.data() + place;  // or behind the last: a zoom is a camera's alone
+    return found != layer.streams.data() + layer.streams.size() ? found : nullptr;
   }
 
   // Whether the layer is the other one or stands above it.

@@ -7,83 +7,74 @@
 namespace refhost {
 namespace {
 
-// The sentences of the operations that are called for every key are put together apart from them.
-[[gnu::cold, gnu::noinline]] void refuseStreamNumber(Call& call, VOR_Layer* layer, std::int32_t streamId) {
-  call.refuse(HOST_ERR_NO_SUCH_STREAM,
-              call.host().codec.describe(layer) + " has no stream of the number " + std::to_string(streamId));
-}
+// The tasks of every key: what they refuse is put together apart from them.
+struct Acquiring {
+  static constexpr Operation kOperation = Operation::AcquireLayerStream;
 
-[[gnu::cold, gnu::noinline]] void refuseMoreStreams(Call& call) {
-  call.refuse(HOST_ERR_MEMORY, "too many streams are held");
-}
-
-void acquireLayerStream(Call& call, VOR_Layer* layer, std::int32_t streamId, VOR_Stream** stream) {
-  Layer* found = call.layer(layer);
-  if (found == nullptr || !call.given(stream, "the place for the stream")) return;
-  Stream* property = ProjectEditor::findStream(*found, streamId);
-  if (property == nullptr) return refuseStreamNumber(call, layer, streamId);
-  void* handle = nullptr;
-  HeldStream* held = call.host().streams.add(&handle);
-  if (held == nullptr) return refuseMoreStreams(call);
-  held->layer = found;
-  held->stream = property;
-  *stream = static_cast<VOR_Stream*>(handle);
-}
-
-[[gnu::noinline]] HostError acquireLayerStreamWatched(std::int32_t pluginId, VOR_Layer* layer,
-                                                      std::int32_t streamId, VOR_Stream** stream) {
-  Call call(Operation::AcquireLayerStream);
-  if (call.goesOn(stream) && call.isPluginId(pluginId)) acquireLayerStream(call, layer, streamId, stream);
-  if (TraceLine* line = call.traced()) {
-    line->integer("pluginId", pluginId).handle("layer", layer).integer("streamId", streamId);
-    line->handed("stream", stream);
+  static HostError work(HostState& host, std::int32_t pluginId, VOR_Layer* layer, std::int32_t streamId,
+                        VOR_Stream** stream) {
+    if (pluginId != host.options.pluginId) [[unlikely]]
+      return refusePluginId(kOperation, pluginId);
+    Layer* const found = host.layer(layer);
+    if (found == nullptr) [[unlikely]]
+      return refuseHandle(kOperation, layer, HandleKind::Layer, "the layer");
+    if (stream == nullptr) [[unlikely]]
+      return refuseNull(kOperation, "the place for the stream");
+    Stream* const property = ProjectEditor::findStream(*found, streamId);
+    if (property == nullptr) [[unlikely]]
+      return refuseNumber(layer, streamId);
+    if (!host.streams.hasFreeSlot()) [[unlikely]]
+      return workWithMoreSlots(host, pluginId, layer, streamId, stream);
+    void* handle = nullptr;
+    HeldStream* const held = host.streams.addToFreeSlot(&handle);
+    held->layer = found;
+    held->stream = property;
+    *stream = static_cast<VOR_Stream*>(handle);
+    return 0;
   }
-  return call.finish();
-}
 
-// The ordinary call, kept short because an import makes it for every key of every stream: nobody watches, and
-// there is nothing to refuse. Every other call goes the long way.
-HostError AcquireLayerStream(std::int32_t pluginId, VOR_Layer* layer, std::int32_t streamId,
-                             VOR_Stream** stream) {
-  HostState& host = HostState::live();
-  if (!host.watched() && pluginId == host.options.pluginId && stream != nullptr &&
-      host.codec.isOf(HandleKind::Layer, layer)) [[likely]] {
-    Layer* const found = host.editor.layer(HandleCodec::lastingNumber(layer));
-    Stream* const property = found == nullptr ? nullptr : ProjectEditor::findStream(*found, streamId);
-    if (property != nullptr && host.streams.hasFreeSlot()) [[likely]] {
-      void* handle = nullptr;
-      HeldStream* const held = host.streams.addToFreeSlot(&handle);
-      host.rehearsal.count(Operation::AcquireLayerStream);
-      held->layer = found;
-      held->stream = property;
-      *stream = static_cast<VOR_Stream*>(handle);
-      return 0;
-    }
+  static void idle(Call& call, std::int32_t, VOR_Layer*, std::int32_t, VOR_Stream** stream) {
+    call.handOutNothing(stream);
   }
-  return acquireLayerStreamWatched(pluginId, layer, streamId, stream);
-}
 
-[[gnu::noinline]] HostError releaseStreamWatched(VOR_Stream* stream) {
-  Call call(Operation::ReleaseStream);
-  if (call.goesOn()) {
-    if (call.stream(stream) != nullptr) call.host().streams.remove(stream);
-  } else if (HeldStream* held = call.host().streams.find(stream)) {
-    held->releaseFailed = true;
+  static void describe(TraceLine& line, std::int32_t pluginId, VOR_Layer* layer, std::int32_t streamId,
+                       VOR_Stream** stream) {
+    line.integer("pluginId", pluginId).handle("layer", layer).integer("streamId", streamId);
+    line.handed("stream", stream);
   }
-  if (TraceLine* line = call.traced()) line->handle("stream", stream);
-  return call.finish();
-}
 
-// As short as AcquireLayerStream.
-HostError ReleaseStream(VOR_Stream* stream) {
-  HostState& host = HostState::live();
-  if (!host.watched() && host.streams.find(stream) != nullptr) [[likely]] {
-    host.rehearsal.count(Operation::ReleaseStream);
+ private:
+  // Makes a slot and begins again.
+  [[gnu::cold, gnu::noinline]] static HostError workWithMoreSlots(HostState& host, std::int32_t pluginId,
+                                                                  VOR_Layer* layer, std::int32_t streamId,
+                                                                  VOR_Stream** stream) {
+    if (host.streams.makeFreeSlot()) return work(host, pluginId, layer, streamId, stream);
+    return refuse(kOperation, HOST_ERR_MEMORY, "too many streams are held");
+  }
+
+  [[gnu::cold, gnu::noinline]] static HostError refuseNumber(VOR_Layer* layer, std::int32_t streamId) {
+    return refuse(
+        kOperation, HOST_ERR_NO_SUCH_STREAM,
+        HostState::live().codec.describe(layer) + " has no stream of the number " + std::to_string(streamId));
+  }
+};
+
+struct Releasing {
+  static constexpr Operation kOperation = Operation::ReleaseStream;
+
+  static HostError work(HostState& host, VOR_Stream* stream) {
+    if (host.streams.find(stream) == nullptr) [[unlikely]]
+      return refuseHandle(kOperation, stream, HandleKind::Stream, "the stream");
     host.streams.remove(stream);
     return 0;
   }
-  return releaseStreamWatched(stream);
-}
+
+  static void idle(Call& call, VOR_Stream* stream) {
+    if (HeldStream* held = call.host().streams.find(stream)) held->releaseFailed = true;
+  }
+
+  static void describe(TraceLine& line, VOR_Stream* stream) { line.handle("stream", stream); }
+};
 
 void setStreamValue(Call& call, VOR_Stream* stream, const StreamValueRecord* value) {
   HeldStream* held = call.stream(stream);
@@ -114,8 +105,8 @@ HostError SetStreamValue(std::int32_t pluginId, VOR_Stream* stream, const Stream
 
 constexpr QZGP_StreamSuite7 table7() {
   QZGP_StreamSuite7 suite{};
-  suite.AcquireLayerStream = AcquireLayerStream;
-  suite.ReleaseStream = ReleaseStream;
+  suite.AcquireLayerStream = perform<Acquiring>;
+  suite.ReleaseStream = perform<Releasing>;
   return suite;
 }
 

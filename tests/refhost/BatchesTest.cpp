@@ -169,9 +169,10 @@ TEST(LongBatch, OfAMillionKeysInDescendingOrderIsSorted) {
   Batch batch;
   batch.stream = &stream;
   for (std::int32_t key = 0; key < count; ++key) {
+    batch.times.makeRoom(1);
     batch.addKey({count - key, 24000});
-    const double value = key;
-    batch.setValue(static_cast<std::size_t>(key), &value);
+    const double value[] = {static_cast<double>(key), 0.0, 0.0};
+    batch.setValue(static_cast<std::size_t>(key), value);
   }
   std::unique_ptr<KeyColumns> keys;
   KeyTimes last;
@@ -181,6 +182,36 @@ TEST(LongBatch, OfAMillionKeysInDescendingOrderIsSorted) {
     ASSERT_EQ(keys->times[key].value, static_cast<std::int32_t>(key) + 1);
     ASSERT_DOUBLE_EQ(keys->values[key], static_cast<double>(count - 1 - static_cast<std::int32_t>(key)));
   }
+}
+
+TEST(SharedTimes, AreOfStreamsWithTheSameTimesAlone) {
+  StandIn plugin;
+  VOR_Layer* layer = plugin.makeNull(plugin.makeComp());
+  const auto fill = [&](std::int32_t id, std::vector<T_Time> times) {
+    VOR_Stream* stream = plugin.acquire(layer, id);
+    VOR_AddKeyframesInfo* batch = plugin.open(stream);
+    for (const T_Time& time : times) plugin.addKey(batch, stream, time, id);
+    EXPECT_EQ(kKeyframeSuite3.EndKeyframeBatch(1, batch), 0);
+    EXPECT_EQ(kStreamSuite7.ReleaseStream(stream), 0);
+  };
+  const auto timesOf = [&](std::int32_t id) {
+    std::vector<std::int32_t> values;
+    for (const T_Time& time : plugin.host().project().layers().back().findStream(id)->keys->times)
+      values.push_back(time.value);
+    return values;
+  };
+  const auto rowOf = [&](std::int32_t id) {
+    return &plugin.host().project().layers().back().findStream(id)->keys->times[0];
+  };
+  fill(3, {{5, 24}, {2, 24}});
+  fill(8, {{2, 24}, {5, 24}});
+  fill(9, {{2, 24}, {6, 24}});
+  EXPECT_EQ(rowOf(3), rowOf(8));
+  EXPECT_NE(rowOf(8), rowOf(9));
+  fill(8, {{3, 24}});
+  EXPECT_EQ(timesOf(3), (std::vector<std::int32_t>{2, 5}));
+  EXPECT_EQ(timesOf(8), (std::vector<std::int32_t>{2, 3, 5}));
+  EXPECT_EQ(timesOf(9), (std::vector<std::int32_t>{2, 6}));
 }
 
 }  // namespace

@@ -67,6 +67,38 @@ TEST(Handles, HeldObjectsComeInTheOrderInWhichTheyWereHandedOut) {
   EXPECT_THAT(worths, ElementsAre(20, 30));
 }
 
+TEST(Handles, NoPointerIsFoundInAFreeSlot) {
+  const HandleCodec codec(5);
+  HandlePool<Thing> pool(codec, HandleKind::Stream);
+  const auto findsNothing = [&](const char* when) {
+    for (std::uintptr_t bits = 0; bits < 4096; ++bits) {
+      EXPECT_EQ(pool.find(reinterpret_cast<void*>(bits)), nullptr) << when << bits;
+      EXPECT_EQ(pool.find(reinterpret_cast<void*>(~bits)), nullptr) << when << bits;
+    }
+  };
+  findsNothing("before the first object: ");
+  std::vector<void*> handles;
+  for (int worth = 1; worth <= 9; ++worth) handles.push_back(handOut(pool, worth));
+  findsNothing("among nine objects: ");
+  for (std::size_t i = 0; i < handles.size(); i += 2) pool.remove(handles[i]);
+  findsNothing("after some were given back: ");
+  for (std::size_t i = 0; i < handles.size(); ++i)
+    EXPECT_EQ(pool.find(handles[i]) == nullptr, i % 2 == 0) << i;
+}
+
+TEST(Handles, AHandleOfAnotherPoolThatLeadsBeyondTheLastSlotIsNotFound) {
+  const HandleCodec codec(5);
+  HandlePool<Thing> small(codec, HandleKind::Stream);
+  HandlePool<Thing> large(codec, HandleKind::Stream);
+  handOut(small, 1);
+  std::vector<void*> handles;
+  for (int worth = 1; worth <= 100; ++worth) handles.push_back(handOut(large, worth));
+  EXPECT_NE(small.find(handles[0]), nullptr) << "the same kind, slot and number";
+  for (std::size_t i = 1; i < handles.size(); ++i) EXPECT_EQ(small.find(handles[i]), nullptr) << i;
+  for (std::size_t i = 0; i < handles.size(); ++i)
+    EXPECT_EQ(large.find(handles[i])->worth, static_cast<int>(i) + 1);
+}
+
 TEST(Handles, PointerToAnObjectOfTheProcessIsForeign) {
   const HandleCodec codec(0);
   HandlePool<Thing> pool(codec, HandleKind::Stream);

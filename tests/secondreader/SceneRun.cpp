@@ -8,7 +8,6 @@
 #include "plugin/Entry.h"
 #include "plugin/Globals.h"
 #include "tests/secondreader/FailurePlan.h"
-#include "tests/secondreader/ProjectText.h"
 #include "tests/secondreader/SceneGenerator.h"
 #include "tests/secondreader/TraceComparison.h"
 #include "tests/support/OwnProcess.h"
@@ -24,12 +23,10 @@ struct Results {
   refhost::CallbackResult verify;
   std::vector<refhost::CallbackResult> imports;
   refhost::CallbackResult death;
-  std::string project;
 };
 
-// `trace` may be null: nobody watches the host then, and it takes its short ways.
-Results runHost(refhost::HostOptions options, const std::string& path, int imports, std::ostream* trace) {
-  options.trace = trace;
+Results runHost(refhost::HostOptions options, const std::string& path, int imports, std::ostream& trace) {
+  options.trace = &trace;
   G_use_linear_unitsL = 0;
   Results results;
   {
@@ -37,7 +34,6 @@ Results runHost(refhost::HostOptions options, const std::string& path, int impor
     host.load(&MayaImportEntry, &results.entry);
     results.verify = host.verifyScene(path);
     for (int i = 0; i < imports; ++i) results.imports.push_back(host.importScene(path));
-    results.project = textOf(host.project());
     results.death = host.unload();
   }
   // What a death hook that could not be registered left.
@@ -71,35 +67,6 @@ void compare(std::ostringstream& words, const char* callback, const PredictedCal
   }
 }
 
-std::vector<std::string> describe(const std::vector<refhost::Leftover>& leftovers) {
-  std::vector<std::string> words;
-  for (const refhost::Leftover& leftover : leftovers) words.push_back(leftover.description);
-  return words;
-}
-
-void compareUnwatched(std::ostringstream& words, const char* callback, const refhost::CallbackResult& watched,
-                      const refhost::CallbackResult& unwatched) {
-  const bool same = watched.code == unwatched.code && watched.line == unwatched.line &&
-                    watched.canImport == unwatched.canImport && watched.messages == unwatched.messages &&
-                    watched.refusals == unwatched.refusals && watched.suiteCalls == unwatched.suiteCalls &&
-                    describe(watched.leftovers) == describe(unwatched.leftovers);
-  if (!same) words << callback << ": another result when nobody watches the host\n";
-}
-
-void compareUnwatched(std::ostringstream& words, const Results& watched, const Results& unwatched) {
-  compareUnwatched(words, "entry", watched.entry, unwatched.entry);
-  compareUnwatched(words, "verify", watched.verify, unwatched.verify);
-  for (std::size_t i = 0; i < watched.imports.size(); ++i) {
-    compareUnwatched(words, "import", watched.imports[i], unwatched.imports[i]);
-  }
-  compareUnwatched(words, "death", watched.death, unwatched.death);
-  if (watched.project != unwatched.project) {
-    words << "another project when nobody watches the host\nwatched:\n"
-          << watched.project << "unwatched:\n"
-          << unwatched.project;
-  }
-}
-
 std::string describe(const refhost::HostOptions& options) {
   std::ostringstream words;
   for (const refhost::RefusedSuite& refused : options.refusedSuites) {
@@ -121,7 +88,7 @@ std::string describe(const refhost::HostOptions& options) {
 void compareReturn(std::ostringstream& words, const Prediction& prediction,
                    const refhost::HostOptions& options, const std::string& path, int imports) {
   std::ostringstream trace;
-  const Results results = runHost(options, path, imports, &trace);
+  const Results results = runHost(options, path, imports, trace);
   compareTrace(words, prediction, trace.str());
   compare(words, "entry", prediction.entry, results.entry);
   compare(words, "verify", prediction.verify, results.verify);
@@ -129,31 +96,24 @@ void compareReturn(std::ostringstream& words, const Prediction& prediction,
     compare(words, "import", prediction.imports[i], results.imports[i]);
   }
   compare(words, "death", prediction.death, results.death);
-  compareUnwatched(words, results, runHost(options, path, imports, nullptr));
 }
 
 void compareEnd(std::ostringstream& words, const Prediction& prediction, const refhost::HostOptions& options,
                 const std::string& path, int imports, const testsupport::TemporaryFolder& folder) {
   constexpr const char* kTraceName = "trace of a process that ends";
-  const auto expectAborted = [&words](const char* which, int signal) {
-    if (signal == SIGABRT) return;
-    words << which << ": the process was to end, and ";
-    if (signal == 0) {
-      words << "the callbacks returned\n";
-    } else {
-      words << "signal " << signal << " ended it\n";
-    }
-  };
-  expectAborted("watched", testsupport::SignalOfOwnProcess([&] {
-                  std::ofstream trace;
-                  // What is still in a buffer would be lost.
-                  trace.rdbuf()->pubsetbuf(nullptr, 0);
-                  trace.open(folder.path() / kTraceName, std::ios::binary);
-                  runHost(options, path, imports, &trace);
-                }));
+  const int signal = testsupport::SignalOfOwnProcess([&] {
+    std::ofstream trace;
+    // What is still in a buffer would be lost.
+    trace.rdbuf()->pubsetbuf(nullptr, 0);
+    trace.open(folder.path() / kTraceName, std::ios::binary);
+    runHost(options, path, imports, trace);
+  });
+  if (signal == 0) {
+    words << "the process was to end, and the callbacks returned\n";
+  } else if (signal != SIGABRT) {
+    words << "the process was to end by an abort, and signal " << signal << " ended it\n";
+  }
   compareTrace(words, prediction, folder.read(kTraceName));
-  expectAborted("unwatched",
-                testsupport::SignalOfOwnProcess([&] { runHost(options, path, imports, nullptr); }));
 }
 
 }  // namespace

@@ -1,6 +1,6 @@
-// Runs a scene through the importer under the embedded host, and holds what came of it to the prediction. A
-// second run, without a trace, has to come to the same results and the same project. Where the process is to
-// end, both run in a process of their own, which has to end by SIGABRT with the predicted trace behind it.
+// Runs a scene through the importer under the embedded host, and holds what came of it to the prediction.
+// Where the process is to end, that is a process of its own, which has to end by SIGABRT with the predicted
+// trace behind it.
 #pragma once
 
 #include <cstdint>
