@@ -56,6 +56,23 @@ enum class Code : std::uint16_t {
   SeveralTargets = 404,
   TwistSign = 405,
   StereoRig = 406,
+  // Cameras and locators: diag/CameraCodes.cpp
+  CameraNotFound = 501,
+  FilmOffsetLost = 502,
+  LensSqueezeInAperture = 503,
+  PictureEffectLost = 504,
+  CameraMirrored = 505,
+  CameraSheared = 506,
+  CameraWithoutLens = 507,
+  CameraNotFinite = 508,
+  NullSheared = 509,
+  NullNotFinite = 510,
+  LocatorsLeftOut = 511,
+  // What a bake writes: diag/BakeCodes.cpp
+  NoCamera = 601,
+  TooManyFrames = 602,
+  ClockTimeUnit = 603,
+  CameraInWorldSpace = 604,
 };
 
 // Ordered: a later one is worse.

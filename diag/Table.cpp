@@ -13,7 +13,8 @@ namespace {
 
 std::vector<Entry> WholeTable() {
   std::vector<Entry> table;
-  for (const std::span<const Entry> part : {ReadingCodes(), NodeCodes(), CurveCodes(), DriverCodes()}) {
+  for (const std::span<const Entry> part :
+       {ReadingCodes(), NodeCodes(), CurveCodes(), DriverCodes(), CameraCodes(), BakeCodes()}) {
     table.insert(table.end(), part.begin(), part.end());
   }
   return table;

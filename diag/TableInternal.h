@@ -11,5 +11,7 @@ std::span<const Entry> ReadingCodes();
 std::span<const Entry> NodeCodes();
 std::span<const Entry> CurveCodes();
 std::span<const Entry> DriverCodes();
+std::span<const Entry> CameraCodes();
+std::span<const Entry> BakeCodes();
 
 }  // namespace diag

@@ -10,6 +10,7 @@
 #include <system_error>
 
 #include "refhost/Rehearsal.h"
+#include "tools/mayascene/BakeWords.h"
 #include "tools/mayascene/OutputFile.h"
 #include "tools/mayascene/TerminalText.h"
 #include "tools/mayascene/Version.h"
@@ -137,19 +138,31 @@ bool sameFile(const std::string& a, const std::string& b) {
          std::filesystem::equivalent(a, b, ignored);
 }
 
-// An output that would be written over the other one, over a scene, or into the middle of the other one.
-void checkOutputs(const std::string& json, const std::string& trace, const std::vector<std::string>& scenes) {
-  if (json == kStandardOutput && trace == kStandardOutput) {
-    throw CLI::ValidationError("--json and --trace", "only one output can go to standard output");
-  }
+struct NamedOutput {
+  std::string option;
+  std::string target;  // empty: none
+};
+
+void checkPair(const NamedOutput& a, const NamedOutput& b) {
   std::error_code ignored;
-  if (!json.empty() && !trace.empty() && sameFile(json, trace) &&
-      !std::filesystem::is_character_file(json, ignored)) {
-    throw CLI::ValidationError("--json and --trace", "the two outputs need two files");
+  if (a.target.empty() || b.target.empty()) return;
+  const std::string both = a.option + " and " + b.option;
+  if (a.target == kStandardOutput && b.target == kStandardOutput) {
+    throw CLI::ValidationError(both, "only one output can go to standard output");
   }
-  for (const std::string& scene : scenes) {
-    for (const std::string& output : {json, trace}) {
-      if (output.empty() || output == kStandardOutput || !sameFile(output, scene)) continue;
+  if (sameFile(a.target, b.target) && !std::filesystem::is_character_file(a.target, ignored)) {
+    throw CLI::ValidationError(both, "the two outputs need two files");
+  }
+}
+
+// An output that would be written over another one, over a scene, or into the middle of another one.
+void checkOutputs(const std::vector<NamedOutput>& outputs, const std::vector<std::string>& scenes) {
+  for (std::size_t i = 0; i < outputs.size(); ++i) {
+    for (std::size_t j = i + 1; j < outputs.size(); ++j) checkPair(outputs[i], outputs[j]);
+    const std::string& output = outputs[i].target;
+    if (output.empty() || output == kStandardOutput) continue;
+    for (const std::string& scene : scenes) {
+      if (!sameFile(output, scene)) continue;
       throw CLI::ValidationError("output", output + " is one of the scenes and would be overwritten");
     }
   }
@@ -181,11 +194,15 @@ struct CommandLine {
   ImportArguments import;
   VerifyArguments verify;
   PrefsArguments prefs;
+  BakeArguments bake;
   Words importWords, verifyWords;
+  BakeWords importBakeWords, bakeWords;
+  bool importBakes = false;
   std::string preferenceName, preferenceValue;
   CLI::App* importVerb = nullptr;
   CLI::App* verifyVerb = nullptr;
   CLI::App* prefsVerb = nullptr;
+  CLI::App* bakeVerb = nullptr;
   CLI::App* setVerb = nullptr;
 
   CommandLine() {
@@ -195,6 +212,7 @@ struct CommandLine {
     app.require_subcommand(1);
     app.footer(kFooter);
     addImport();
+    addBake();
     addVerify();
     addPrefs();
   }
@@ -211,8 +229,22 @@ struct CommandLine {
     importVerb->add_option("--json", import.json, "write all of it, keys included; - is standard output")
         ->option_text("FILE");
     importVerb->add_flag("-q,--quiet", import.quiet, "print nothing but errors");
+    importVerb->add_flag("--bake", importBakes, "bake each scene first: see mayascene bake");
     addHostOptions(importVerb, &import.host, &importWords);
     addCeilings(importVerb, &import.host);
+    addBakeOptions(importVerb, &importBakeWords, "With --bake");
+  }
+
+  void addBake() {
+    bakeVerb = app.add_subcommand("bake", "write scenes anew, with a value at every frame");
+    bakeVerb->add_option("SCENE", bake.scenes, "a Maya ASCII scene, animated in any way")
+        ->required()
+        ->option_text(" ");
+    bakeVerb->add_option("-o,--output", bake.output, "the bake; with several scenes a folder for them")
+        ->required()
+        ->option_text("OUT");
+    bakeVerb->add_flag("-q,--quiet", bake.quiet, "print nothing but errors");
+    addBakeOptions(bakeVerb, &bakeWords, "");
   }
 
   void addVerify() {
@@ -240,17 +272,34 @@ struct CommandLine {
         ->check(CLI::IsMember({"0", "1"}));
   }
 
+  void translateImportBake() {
+    const std::vector<std::string> given = givenBakeOptions(*importVerb);
+    if (!importBakes && !given.empty()) {
+      throw CLI::ValidationError(given.front(), "goes with --bake");
+    }
+    if (importBakes) translateBakeWords(importBakeWords, &import.bake.emplace());
+  }
+
   Arguments parse(std::vector<std::string> words) {
     app.parse(std::move(words));
-    for (const CLI::App* verb : {importVerb, verifyVerb, prefsVerb, setVerb}) refuseEmptyValues(*verb);
+    for (const CLI::App* verb : {importVerb, bakeVerb, verifyVerb, prefsVerb, setVerb})
+      refuseEmptyValues(*verb);
     Arguments arguments;
     if (importVerb->parsed()) {
       translateWords(importWords, &import.host);
-      checkOutputs(import.json, import.host.trace, import.scenes);
+      translateImportBake();
+      checkOutputs({{"--json", import.json},
+                    {"--trace", import.host.trace},
+                    {"--report", import.bake ? import.bake->report : ""}},
+                   import.scenes);
       arguments.import = import;
+    } else if (bakeVerb->parsed()) {
+      translateBakeWords(bakeWords, &bake);
+      checkOutputs({{"--output", bake.output}, {"--report", bake.report}}, bake.scenes);
+      arguments.bake = bake;
     } else if (verifyVerb->parsed()) {
       translateWords(verifyWords, &verify.host);
-      checkOutputs("", verify.host.trace, verify.scenes);
+      checkOutputs({{"--trace", verify.host.trace}}, verify.scenes);
       arguments.verify = verify;
     } else {
       if (setVerb->parsed()) prefs.linearUnits = preferenceValue == "1" ? 1 : 0;

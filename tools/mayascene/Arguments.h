@@ -8,6 +8,7 @@
 #include <vector>
 
 #include "refhost/Host.h"
+#include "tools/mayascene/BakeCommand.h"
 #include "tools/mayascene/ExitStatus.h"
 
 namespace mayascene {
@@ -35,6 +36,7 @@ struct ImportArguments {
   std::vector<std::string> scenes;
   std::string json;  // empty: none; "-": standard output
   bool quiet = false;
+  std::optional<BakeArguments> bake;  // bake each scene first; its scenes and its output are not set
 };
 
 struct VerifyArguments {
@@ -48,11 +50,12 @@ struct PrefsArguments {
   std::optional<std::int32_t> linearUnits;  // the value to set; none: show
 };
 
-// Exactly one of the three is there, or none and the run is over: help was shown, or usage was wrong.
+// Exactly one of the four is there, or none and the run is over: help was shown, or usage was wrong.
 struct Arguments {
   std::optional<ImportArguments> import;
   std::optional<VerifyArguments> verify;
   std::optional<PrefsArguments> prefs;
+  std::optional<BakeArguments> bake;
   ExitStatus over = ExitStatus::Done;
 };
 

@@ -30,6 +30,13 @@ void Diagnostics::remark(std::string_view subject, std::string_view sentence) {
   if (!quiet_) line(subject, sentence, false);
 }
 
+void Diagnostics::show(std::string_view file, const diag::Diagnostic& diagnostic) {
+  const bool error = diag::EntryOf(diagnostic.code).severity == diag::Severity::Error;
+  if (quiet_ && !error) return;
+  const std::string text = diag::Render(file, diagnostic);
+  stream_ << (error ? style_.alarm(text) : text) << std::flush;
+}
+
 ExitStatus Diagnostics::judge(std::string_view subject, const refhost::CallbackResult& result) {
   for (const std::string& refusal : result.refusals) complain(subject, "the host refused: " + refusal);
   if (result.code != 0) complain(subject, describeFailure(result));

@@ -5,6 +5,7 @@
 #include <string>
 #include <string_view>
 
+#include "diag/Diagnostic.h"
 #include "refhost/Host.h"
 #include "tools/mayascene/ExitStatus.h"
 #include "tools/mayascene/TerminalText.h"
@@ -19,6 +20,10 @@ class Diagnostics {
   // "mayascene: SUBJECT: SENTENCE"; without the subject where that is empty. Both may hold anything.
   void complain(std::string_view subject, std::string_view sentence);
   void remark(std::string_view subject, std::string_view sentence);  // not when quiet
+
+  // A diagnostic of a scene in the form "file:line:column: warning: sentence [code]", and what to do. When
+  // quiet, errors only.
+  void show(std::string_view file, const diag::Diagnostic& diagnostic);
 
   // What was wrong with a callback: the code that it returned, what the host refused, what it left behind.
   // Refused where the code is not 0 or the ledger is not clean.

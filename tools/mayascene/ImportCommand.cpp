@@ -2,28 +2,33 @@
 
 #include <unistd.h>
 
+#include <filesystem>
 #include <memory>
 #include <string>
 #include <utility>
 
+#include "tools/mayascene/BakeReportJson.h"
 #include "tools/mayascene/CompositionJson.h"
 #include "tools/mayascene/HostSession.h"
 #include "tools/mayascene/Outline.h"
 #include "tools/mayascene/OutputFile.h"
 #include "tools/mayascene/Report.h"
+#include "tools/mayascene/SceneBake.h"
 #include "tools/mayascene/SceneFile.h"
+#include "tools/mayascene/TemporaryBake.h"
 
 namespace mayascene {
 namespace {
 
 // The outputs of a run; each is null where it was not asked for.
 struct Outputs {
-  std::unique_ptr<OutputFile> outline, json, trace;
+  std::unique_ptr<OutputFile> outline, json, trace, report;
 
   bool open(const ImportArguments& arguments, std::string* failure) {
     const bool outputTaken = arguments.json == kStandardOutput || arguments.host.trace == kStandardOutput;
     return openOne(arguments.quiet || outputTaken ? "" : kStandardOutput, &outline, failure) &&
            openOne(arguments.json, &json, failure) &&
+           openOne(arguments.bake ? arguments.bake->report : "", &report, failure) &&
            openOne(arguments.host.trace, &trace, failure, OutputFile::openLog);
   }
 
@@ -36,7 +41,7 @@ struct Outputs {
 
   ExitStatus commit(Diagnostics& diagnostics) {
     ExitStatus status = ExitStatus::Done;
-    for (OutputFile* output : {outline.get(), json.get(), trace.get()}) {
+    for (OutputFile* output : {outline.get(), json.get(), trace.get(), report.get()}) {
       std::string failure;
       if (output == nullptr || output->commit(&failure)) continue;
       diagnostics.complain("", failure);
@@ -68,9 +73,49 @@ SceneReport importOne(const std::string& path, HostSession& session, Diagnostics
   return report;
 }
 
+// The host knows the bake's path alone; what it says is shown with the scene's.
+void nameScene(const std::string& bake, const std::string& scene, refhost::CallbackResult* result) {
+  const auto replace = [&](std::string* text) {
+    const std::size_t at = text->find(bake);
+    if (at != std::string::npos) text->replace(at, bake.size(), scene);
+  };
+  for (refhost::Leftover& leftover : result->leftovers) replace(&leftover.description);
+  for (std::string& refusal : result->refusals) replace(&refusal);
+  for (std::string& message : result->messages) replace(&message);
+}
+
+// Bakes the scene and imports the bake; what is said names the scene.
+SceneReport importBaked(const std::string& path, const BakeArguments& arguments, HostSession& session,
+                        Diagnostics& diagnostics, BakedScene* baked) {
+  SceneReport report;
+  report.path = path;
+  std::string failure;
+  const auto bake = TemporaryBake::make(std::filesystem::path(path).filename().string(), &failure);
+  if (bake != nullptr) {
+    *baked = bakeScene(path, arguments.options, arguments.words, diagnostics, bake->stream());
+    showBake(*baked, diagnostics);
+  }
+  if (bake == nullptr || !bake->finish(&failure)) {
+    diagnostics.complain(path, failure);
+    report.status = ExitStatus::CannotWrite;
+    return report;
+  }
+  report.status = baked->status;
+  if (!isWorthKeeping(*baked, arguments.options)) {
+    report.explained = true;
+    if (report.status != ExitStatus::Unreadable) report.outcome = Outcome::Refused;
+    return report;
+  }
+  report.result = session.host().importScene(bake->path());
+  nameScene(bake->path(), path, &report.result);
+  report.outcome = outcomeOf(lookAtScene(bake->path()), report.result);
+  if (arguments.strict && baked->warnings != 0) report.status = worse(report.status, ExitStatus::Refused);
+  return report;
+}
+
 // What goes to standard error about one scene, and its status.
 ExitStatus judgeScene(const SceneReport& report, bool outlinePrinted, Diagnostics& diagnostics) {
-  if (report.outcome == Outcome::Unreadable) return ExitStatus::Unreadable;
+  if (report.outcome == Outcome::Unreadable || report.explained) return report.status;
   if (!outlinePrinted) diagnostics.messages(report.path, report.result);
   const ExitStatus status = diagnostics.judge(report.path, report.result);
   if (report.outcome != Outcome::Refused) return status;
@@ -84,14 +129,20 @@ ExitStatus importAll(const ImportArguments& arguments, HostSession& session, Out
   const Style style(colourAllowed(STDOUT_FILENO));
   bool first = true;
   for (const std::string& path : arguments.scenes) {
-    SceneReport report = importOne(path, session, diagnostics);
-    if (outputs.outline && report.outcome != Outcome::Unreadable) {
+    SceneReport report;
+    if (arguments.bake) {
+      report = importBaked(path, *arguments.bake, session, diagnostics, &run->bakes.emplace_back());
+    } else {
+      report = importOne(path, session, diagnostics);
+    }
+    if (outputs.outline && report.outcome != Outcome::Unreadable && !report.explained) {
       std::ostream& out = outputs.outline->stream();
       if (!std::exchange(first, false)) out << '\n';
       printOutline(out, report, style);
       out.flush();
     }
-    report.status = judgeScene(report, outputs.outline != nullptr, diagnostics);
+    const ExitStatus bakeStatus = arguments.bake ? report.status : ExitStatus::Done;
+    report.status = worse(bakeStatus, judgeScene(report, outputs.outline != nullptr, diagnostics));
     status = worse(status, report.status);
     run->scenes.push_back(std::move(report));
   }
@@ -120,6 +171,8 @@ ExitStatus runImport(const ImportArguments& arguments, Diagnostics& diagnostics)
     run.deathHook = session.deathHook();
   }
   if (loaded && outputs.json) writeCompositionJson(outputs.json->stream(), run);
+  if (loaded && outputs.report) writeBakeReport(outputs.report->stream(), run.bakes);
+  if (!loaded) outputs.report.reset();
   if (!loaded) outputs.json.reset();  // what lay there stays
   return worse(status, outputs.commit(diagnostics));
 }

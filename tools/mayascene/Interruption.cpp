@@ -21,10 +21,15 @@ static_assert(std::atomic<const char*>::is_always_lock_free, "a signal handler r
 
 std::streambuf* terminationLog = nullptr;
 
+// Files first: a folder goes only when it is empty.
 void removeUnfinished() noexcept {
   for (std::atomic<const char*>& slot : unfinished) {
+    const char* name = slot.load();
+    if (name != nullptr && ::unlink(name) == 0) slot = nullptr;
+  }
+  for (std::atomic<const char*>& slot : unfinished) {
     const char* name = slot.exchange(nullptr);
-    if (name != nullptr) ::unlink(name);
+    if (name != nullptr) ::rmdir(name);
   }
 }
 

@@ -9,7 +9,8 @@ namespace mayascene {
 // and ends with 128 and the signal's number; one that std::terminate ends says so first.
 void handleInterruptions();
 
-// Remembers a file that is not finished yet. The name stays the caller's, unchanged, until it is forgotten.
+// Remembers a file that is not finished yet, or the folder of one. The name stays the caller's, unchanged,
+// until it is forgotten.
 void rememberUnfinished(const char* name);
 void forgetUnfinished(const char* name);
 

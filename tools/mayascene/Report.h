@@ -7,6 +7,7 @@
 
 #include "refhost/Host.h"
 #include "tools/mayascene/ExitStatus.h"
+#include "tools/mayascene/SceneBake.h"
 
 namespace mayascene {
 
@@ -22,6 +23,7 @@ struct SceneReport {
   std::string path;  // as the user named it; bytes
   Outcome outcome = Outcome::Unreadable;
   ExitStatus status = ExitStatus::Unreadable;
+  bool explained = false;          // why nothing was imported was said already
   refhost::CallbackResult result;  // its folder lives as long as the host
 };
 
@@ -29,6 +31,7 @@ struct RunReport {
   std::int32_t linearUnits = 0;  // the preference that the scenes were imported with
   refhost::CallbackResult entry;
   std::vector<SceneReport> scenes;
+  std::vector<BakedScene> bakes;  // of each scene, where they were asked for
   refhost::CallbackResult deathHook;
 };
 

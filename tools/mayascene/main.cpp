@@ -9,6 +9,7 @@
 
 #include "refhost/ProcessMemory.h"
 #include "tools/mayascene/Arguments.h"
+#include "tools/mayascene/BakeCommand.h"
 #include "tools/mayascene/Diagnostics.h"
 #include "tools/mayascene/ImportCommand.h"
 #include "tools/mayascene/Interruption.h"
@@ -23,10 +24,12 @@ using mayascene::ExitStatus;
 
 ExitStatus run(int argc, const char* const* argv) {
   const Arguments arguments = mayascene::parseArguments(argc, argv, std::cout, std::cerr);
-  const bool quiet =
-      (arguments.import && arguments.import->quiet) || (arguments.verify && arguments.verify->quiet);
+  const bool quiet = (arguments.import && arguments.import->quiet) ||
+                     (arguments.verify && arguments.verify->quiet) ||
+                     (arguments.bake && arguments.bake->quiet);
   Diagnostics diagnostics(std::cerr, mayascene::Style(mayascene::colourAllowed(STDERR_FILENO)), quiet);
   if (arguments.import) return mayascene::runImport(*arguments.import, diagnostics);
+  if (arguments.bake) return mayascene::runBake(*arguments.bake, diagnostics);
   if (arguments.verify) return mayascene::runVerify(*arguments.verify, diagnostics);
   if (arguments.prefs) return mayascene::runPrefs(*arguments.prefs, diagnostics);
   return arguments.over;

@@ -1,0 +1,35 @@
+// Which frames are baked.
+#pragma once
+
+#include <cstddef>
+#include <optional>
+#include <vector>
+
+#include "bake/Options.h"
+#include "diag/Collector.h"
+#include "motion/Measures.h"
+#include "scene/Scene.h"
+
+namespace bake {
+
+// The frames first, first + step, … in the scene's own numbers, which may be fractions.
+struct FrameRange {
+  double first = 1.0;
+  double step = 1.0;
+  std::size_t count = 1;
+
+  double Frame(std::size_t index) const { return first + static_cast<double>(index) * step; }
+  double Last() const { return Frame(count - 1); }
+};
+
+// The most frames that a scene may have where nobody says which ones.
+inline constexpr std::size_t kMostFrames = 100'000;
+
+// The range of the options; else what the scene plays and all keys that move the nodes or what drives them,
+// outward to whole frames; with neither, frame 1. `unitsPerFrame` is one frame in the scene's time unit. None
+// after an error: too many frames, or more than a composition's time can hold.
+std::optional<FrameRange> FindFrames(const scene::Scene& scene, const std::vector<scene::NodeId>& written,
+                                     const Options& options, double unitsPerFrame,
+                                     const motion::Measures& measures, diag::Collector* diagnostics);
+
+}  // namespace bake

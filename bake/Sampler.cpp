@@ -1,0 +1,115 @@
+#include "bake/Sampler.h"
+
+#include <algorithm>
+#include <cmath>
+#include <iterator>
+
+#include "bake/PlainForm.h"
+#include "motion/Transform.h"
+
+namespace bake {
+namespace {
+
+constexpr double kDegrees = 57.29577951308232;  // in a radian
+
+// Channels that come out of a matrix are level where they differ by rounding alone.
+constexpr double kMatrixRounding = 1e-12;
+
+constexpr std::string_view kChannelNames[kSlotCount] = {
+    "translateX", "translateY", "translateZ", "rotateX", "rotateY", "rotateZ", "scaleX", "scaleY", "scaleZ"};
+
+bool IsRotation(std::size_t slot) { return slot >= kRotateX && slot <= kRotateZ; }
+
+double LargestMagnitude(const Channel& channel) {
+  double largest = 0.0;
+  for (const double value : channel.values) largest = std::max(largest, std::fabs(value));
+  return largest;
+}
+
+bool AllFinite(const Channel& channel) {
+  return std::all_of(channel.values.begin(), channel.values.end(), [](double v) { return std::isfinite(v); });
+}
+
+}  // namespace
+
+Sampler::Sampler(motion::Evaluator* evaluator, const motion::Picture& picture, const FrameRange& frames,
+                 double unitsPerFrame)
+    : evaluator_(evaluator), picture_(picture), frames_(frames), unitsPerFrame_(unitsPerFrame) {}
+
+std::size_t Sampler::AddLocal(scene::NodeId node) {
+  Source source;
+  if (IsPlain(evaluator_->scene(), node)) {
+    for (std::size_t slot = 0; slot < kSlotCount; ++slot) {
+      source.numbers[slot] = evaluator_->Number(node, kChannelNames[slot]);
+    }
+  } else {
+    source.matrix = evaluator_->Local(node);
+  }
+  sources_.push_back(source);
+  tracks_.emplace_back();
+  return tracks_.size() - 1;
+}
+
+std::size_t Sampler::AddWorld(scene::NodeId node, bool scaled) {
+  Source source;
+  source.matrix = evaluator_->World(node);
+  source.scaled = scaled;
+  sources_.push_back(source);
+  tracks_.emplace_back();
+  return tracks_.size() - 1;
+}
+
+void Sampler::Run() {
+  for (Track& track : tracks_) {
+    for (Channel& channel : track.channels) channel.values.reserve(frames_.count);
+  }
+  for (LensTrack& lens : lenses_) lens.focalLength.values.reserve(frames_.count);
+  for (std::size_t frame = 0; frame < frames_.count; ++frame) {
+    evaluator_->MoveTo(frames_.Frame(frame) * unitsPerFrame_);
+    for (std::size_t i = 0; i < tracks_.size(); ++i) {
+      if (sources_[i].matrix) {
+        SampleMatrix(&sources_[i], &tracks_[i]);
+      } else {
+        SampleNumbers(sources_[i], &tracks_[i]);
+      }
+    }
+    for (std::size_t i = 0; i < lenses_.size(); ++i) SampleLens(&lensSources_[i], &lenses_[i]);
+  }
+  for (std::size_t i = 0; i < tracks_.size(); ++i) {
+    for (Channel& channel : tracks_[i].channels) {
+      tracks_[i].finite = tracks_[i].finite && AllFinite(channel);
+      Settle(&channel, sources_[i].matrix ? kMatrixRounding * LargestMagnitude(channel) : 0.0);
+    }
+  }
+  for (LensTrack& lens : lenses_) Settle(&lens.focalLength);
+}
+
+void Sampler::SampleNumbers(const Source& source, Track* track) {
+  const double degrees = evaluator_->measures().radians * kDegrees;
+  const bool inDegrees = std::fabs(degrees - 1.0) < kMatrixRounding;
+  for (std::size_t slot = 0; slot < kSlotCount; ++slot) {
+    const double value = evaluator_->Value(source.numbers[slot]);
+    track->channels[slot].values.push_back(IsRotation(slot) && !inDegrees ? value * degrees : value);
+  }
+}
+
+void Sampler::SampleMatrix(Source* source, Track* track) {
+  motion::Matrix matrix = evaluator_->Value(*source->matrix);
+  if (!motion::IsFinite(matrix)) {
+    track->finite = false;
+    matrix = {};
+  }
+  track->mirrors = track->mirrors || motion::Determinant(motion::WithoutOrigin(matrix)) < 0.0;
+  track->skew = std::max(track->skew, motion::Skew(matrix));
+  motion::MatrixParts parts = motion::TakeApart(matrix, source->angles);
+  source->angles = parts.rotate;
+  if (!source->scaled) parts.scale = {1.0, 1.0, 1.0};
+  for (int axis = 0; axis < 3; ++axis) {
+    const auto place = static_cast<std::size_t>(axis);
+    track->channels[kTranslateX + place].values.push_back(parts.translate[axis]);
+    track->channels[kRotateX + place].values.push_back(parts.rotate[axis] * kDegrees);
+    track->channels[kScaleX + place].values.push_back(parts.scale[axis]);
+  }
+}
+
+}  // namespace bake

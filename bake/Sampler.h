@@ -1,0 +1,68 @@
+// Evaluates what is written, frame by frame.
+#pragma once
+
+#include <array>
+#include <cstddef>
+#include <optional>
+#include <string_view>
+#include <vector>
+
+#include "bake/FrameRange.h"
+#include "bake/Track.h"
+#include "diag/Collector.h"
+#include "motion/Camera.h"
+#include "motion/Evaluator.h"
+#include "scene/Scene.h"
+
+namespace bake {
+
+// Ask for tracks, run once, then take the tracks by the numbers that were given for them.
+class Sampler {
+ public:
+  // All must outlive the sampler. `unitsPerFrame` is one frame in the scene's time unit.
+  Sampler(motion::Evaluator* evaluator, const motion::Picture& picture, const FrameRange& frames,
+          double unitsPerFrame);
+
+  // The node against its parent: its own channels to the bit where they say all.
+  std::size_t AddLocal(scene::NodeId node);
+
+  // The node against the world; what is not `scaled` has scale 1.
+  std::size_t AddWorld(scene::NodeId node, bool scaled);
+
+  std::size_t AddLens(scene::NodeId camera);
+
+  void Run();
+
+  Track& track(std::size_t number) { return tracks_[number]; }
+  LensTrack& lens(std::size_t number) { return lenses_[number]; }
+
+ private:
+  // Where a track's values come from: nine numbers, or a matrix.
+  struct Source {
+    std::array<motion::NumberId, kSlotCount> numbers{};
+    std::optional<motion::MatrixId> matrix;
+    bool scaled = true;
+    motion::Vector angles;  // of the frame before, in radians
+  };
+  // Where a lens' values come from, in the order of its table.
+  static constexpr std::size_t kLensNumbers = 24;
+  struct LensSource {
+    std::array<motion::NumberId, kLensNumbers> numbers{};
+    double window = 0.0;  // of the first frame, along the side that fills the picture: inches
+  };
+
+  void SampleNumbers(const Source& source, Track* track);
+  void SampleMatrix(Source* source, Track* track);
+  void SampleLens(LensSource* source, LensTrack* lens);
+
+  motion::Evaluator* evaluator_;
+  motion::Picture picture_;
+  FrameRange frames_;
+  double unitsPerFrame_;
+  std::vector<Source> sources_;
+  std::vector<Track> tracks_;
+  std::vector<LensSource> lensSources_;
+  std::vector<LensTrack> lenses_;
+};
+
+}  // namespace bake

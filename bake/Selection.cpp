@@ -1,0 +1,79 @@
+#include "bake/Selection.h"
+
+#include <algorithm>
+#include <array>
+#include <string>
+
+namespace bake {
+namespace {
+
+using scene::NodeId;
+
+constexpr std::array<std::string_view, 2> kCameraTypes = {"camera", "stereoRigCamera"};
+constexpr std::array<std::string_view, 4> kStartupCameras = {"perspShape", "topShape", "frontShape",
+                                                             "sideShape"};
+constexpr std::array<std::string_view, 3> kMarks = {"null", "NULL", "Null"};
+
+template <typename List>
+bool IsOneOf(std::string_view word, const List& list) {
+  return std::find(list.begin(), list.end(), word) != list.end();
+}
+
+bool IsStartupCamera(const scene::Node& node) { return node.shared && IsOneOf(node.name, kStartupCameras); }
+
+bool IsSetUp(const scene::Scene& scene, NodeId id) {
+  const scene::Node& node = scene.node(id);
+  if (node.origin != scene::Origin::Created || !IsOneOf(node.type, kCameraTypes)) return false;
+  return !IsStartupCamera(node) && scene.Number(id, "orthographic").value_or(0.0) == 0.0;
+}
+
+// A name of the command line: a node's own name, or its whole path.
+bool Names(const scene::Scene& scene, NodeId id, std::string_view wanted) {
+  if (id == scene::kNoNode) return false;
+  return scene.node(id).name == wanted || (wanted.starts_with('|') && scene.PathOf(id) == wanted);
+}
+
+bool IsWanted(const scene::Scene& scene, NodeId camera, const Options& options, std::vector<bool>* found) {
+  bool wanted = options.cameras.empty();
+  for (std::size_t i = 0; i < options.cameras.size(); ++i) {
+    const std::string& name = options.cameras[i];
+    if (!Names(scene, camera, name) && !Names(scene, scene.node(camera).parent, name)) continue;
+    (*found)[i] = true;
+    wanted = true;
+  }
+  return wanted;
+}
+
+void SelectLocator(NodeId id, std::string_view name, const Options& options, Selection* selection) {
+  if (options.locators == Locators::kAll || (options.locators == Locators::kMarked && IsMarked(name))) {
+    selection->locators.push_back(id);
+  } else if (options.locators == Locators::kMarked) {
+    ++selection->locatorsLeftOut;
+  }
+}
+
+}  // namespace
+
+bool IsMarked(std::string_view name) {
+  return std::any_of(kMarks.begin(), kMarks.end(),
+                     [name](std::string_view mark) { return name.find(mark) != std::string_view::npos; });
+}
+
+Selection Select(const scene::Scene& scene, const Options& options, diag::Collector* diagnostics) {
+  Selection selection;
+  std::vector<bool> found(options.cameras.size(), false);
+  for (NodeId id = 0; id < scene.nodes().size(); ++id) {
+    const scene::Node& node = scene.node(id);
+    if (node.type == "locator" && node.origin == scene::Origin::Created) {
+      SelectLocator(id, node.name, options, &selection);
+    } else if (IsSetUp(scene, id) && IsWanted(scene, id, options, &found)) {
+      selection.cameras.push_back(id);
+    }
+  }
+  for (std::size_t i = 0; i < found.size(); ++i) {
+    if (!found[i]) diagnostics->Report(diag::Code::CameraNotFound, {}, {options.cameras[i]});
+  }
+  return selection;
+}
+
+}  // namespace bake

@@ -1,0 +1,28 @@
+// Which cameras and locators of a scene are written.
+#pragma once
+
+#include <cstddef>
+#include <string_view>
+#include <vector>
+
+#include "bake/Options.h"
+#include "diag/Collector.h"
+#include "scene/Scene.h"
+
+namespace bake {
+
+// Shapes, in the order of the file.
+struct Selection {
+  std::vector<scene::NodeId> cameras;
+  std::vector<scene::NodeId> locators;
+  std::size_t locatorsLeftOut = 0;  // without a mark, where only marked ones are wanted
+};
+
+// Whether the importer takes a locator of the name.
+bool IsMarked(std::string_view name);
+
+// The cameras that somebody set up: no orthographic ones, and not those that every scene begins with. Reports
+// each name of the options that fits none of them.
+Selection Select(const scene::Scene& scene, const Options& options, diag::Collector* diagnostics);
+
+}  // namespace bake

@@ -1,0 +1,52 @@
+#include "bake/UniqueNames.h"
+
+#include <algorithm>
+
+namespace bake {
+namespace {
+
+// The importer drops a camera of this name.
+constexpr std::string_view kDropped = "perspshape";
+
+bool MayStand(char c) {
+  return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') || (c >= '0' && c <= '9') || c == '_' || c == ':' ||
+         static_cast<unsigned char>(c) >= 0x80;
+}
+
+std::string Lowered(std::string_view name) {
+  std::string lowered(name);
+  for (char& c : lowered) {
+    if (c >= 'A' && c <= 'Z') c = static_cast<char>(c - 'A' + 'a');
+  }
+  return lowered;
+}
+
+// Cuts a name so that no character of several bytes is cut in two.
+std::string_view CutTo(std::string_view name, std::size_t longest) {
+  if (name.size() <= longest) return name;
+  std::size_t size = longest;
+  while (size > 0 && (static_cast<unsigned char>(name[size]) & 0xc0) == 0x80) --size;
+  return name.substr(0, size != 0 ? size : longest);
+}
+
+}  // namespace
+
+UniqueNames::UniqueNames() : taken_{std::string(kDropped)} {}
+
+std::string UniqueNames::Take(std::string_view wanted) {
+  std::string base(wanted);
+  std::replace_if(
+      base.begin(), base.end(), [](char c) { return !MayStand(c); }, '_');
+  if (base.empty()) base = "node";
+  base = CutTo(base, kLongest);
+  std::string name = base;
+  std::uint64_t& number = next_.try_emplace(Lowered(base), 2).first->second;
+  while (!taken_.insert(Lowered(name)).second) {
+    const std::string suffix = "_" + std::to_string(number++);
+    name = CutTo(base, kLongest - suffix.size());
+    name += suffix;
+  }
+  return name;
+}
+
+}  // namespace bake

@@ -1,0 +1,73 @@
+#include "tools/mayascene/BakeCommand.h"
+
+#include <memory>
+#include <utility>
+
+#include "tools/mayascene/BakeOutputs.h"
+#include "tools/mayascene/BakeReportJson.h"
+#include "tools/mayascene/OutputFile.h"
+#include "tools/mayascene/SceneBake.h"
+
+namespace mayascene {
+namespace {
+
+BakedScene bakeTo(const std::string& path, const std::string& place, const BakeArguments& arguments,
+                  Diagnostics& diagnostics) {
+  std::string failure;
+  const auto output = OutputFile::open(place, &failure);
+  if (output == nullptr) {
+    diagnostics.complain("", failure);
+    BakedScene unwritten;
+    unwritten.path = path;
+    unwritten.status = ExitStatus::CannotWrite;
+    return unwritten;
+  }
+  BakedScene baked = bakeScene(path, arguments.options, arguments.words, diagnostics, output->stream());
+  if (!isWorthKeeping(baked, arguments.options)) return baked;
+  if (output->commit(&failure)) {
+    baked.output = place;
+  } else {
+    diagnostics.complain("", failure);
+    baked.status = ExitStatus::CannotWrite;
+  }
+  return baked;
+}
+
+ExitStatus writeReport(OutputFile* report, const std::vector<BakedScene>& scenes, Diagnostics& diagnostics) {
+  std::string failure;
+  writeBakeReport(report->stream(), scenes);
+  if (report->commit(&failure)) return ExitStatus::Done;
+  diagnostics.complain("", failure);
+  return ExitStatus::CannotWrite;
+}
+
+}  // namespace
+
+ExitStatus runBake(const BakeArguments& arguments, Diagnostics& diagnostics) {
+  std::string failure;
+  const std::vector<std::string> places = placeBakes(arguments.scenes, arguments.output, &failure);
+  if (places.empty()) {
+    diagnostics.complain("", failure);
+    return ExitStatus::WrongUsage;
+  }
+  std::unique_ptr<OutputFile> report;
+  if (!arguments.report.empty()) {
+    report = OutputFile::open(arguments.report, &failure);
+    if (report == nullptr) {
+      diagnostics.complain("", failure);
+      return ExitStatus::CannotWrite;
+    }
+  }
+  ExitStatus status = ExitStatus::Done;
+  std::vector<BakedScene> scenes;
+  for (std::size_t i = 0; i < places.size(); ++i) {
+    BakedScene scene = bakeTo(arguments.scenes[i], places[i], arguments, diagnostics);
+    if (arguments.strict && scene.warnings != 0) scene.status = worse(scene.status, ExitStatus::Refused);
+    showBake(scene, diagnostics);
+    status = worse(status, scene.status);
+    scenes.push_back(std::move(scene));
+  }
+  return report ? worse(status, writeReport(report.get(), scenes, diagnostics)) : status;
+}
+
+}  // namespace mayascene

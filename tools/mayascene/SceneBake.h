@@ -1,0 +1,40 @@
+// One scene's bake: read, evaluated, written, and what is said about it.
+#pragma once
+
+#include <cstdint>
+#include <ostream>
+#include <string>
+#include <vector>
+
+#include "bake/Bake.h"
+#include "diag/Collector.h"
+#include "tools/mayascene/Diagnostics.h"
+#include "tools/mayascene/ExitStatus.h"
+
+namespace mayascene {
+
+// What came of one scene, for the report.
+struct BakedScene {
+  std::string path;    // as the user named it; bytes
+  std::string output;  // the bake's, empty where there is none
+  ExitStatus status = ExitStatus::Unreadable;
+  bake::Report report;
+  std::vector<diag::Diagnostic> diagnostics;  // with their places, the worst first
+  std::uint64_t errors = 0;
+  std::uint64_t warnings = 0;
+  std::uint64_t notes = 0;
+};
+
+// Reads the scene and writes its bake. A file that cannot be read, or that is no Maya ASCII scene, is said at
+// once, and nothing is written: Unreadable, Refused. Else Done, or Refused where something that was asked for
+// could not be written.
+BakedScene bakeScene(const std::string& path, const bake::Options& options, const std::string& words,
+                     Diagnostics& diagnostics, std::ostream& out);
+
+// Whether the bake holds what was asked for: it has frames, and one of the cameras where some are named.
+bool isWorthKeeping(const BakedScene& scene, const bake::Options& options);
+
+// On standard error: a line a camera, errors and warnings, and how many notes there are.
+void showBake(const BakedScene& scene, Diagnostics& diagnostics);
+
+}  // namespace mayascene
