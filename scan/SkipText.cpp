@@ -42,8 +42,7 @@ std::span<const TextSkipper> TextSkippers() {
       {kPlain,
        {"SSE2", SkipBetweenCommandsSse2, SkipInCommandSse2},
        {"AVX2", SkipBetweenCommandsAvx2, SkipInCommandAvx2}}};
-  const std::size_t count = HasAvx2() ? 3 : 2;
-  return std::span(kSkippers).first(count);
+  return std::span(kSkippers).first(2 + std::size_t{HasAvx2()});
 #else
   static constexpr std::array<TextSkipper, 1> kSkippers = {kPlain};
   return kSkippers;

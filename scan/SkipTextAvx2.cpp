@@ -210,7 +210,10 @@ struct Avx2 {
 }  // namespace
 
 bool HasAvx2() {
-  return __builtin_cpu_supports("avx2") && __builtin_cpu_supports("bmi") && __builtin_cpu_supports("popcnt");
+  const bool avx2 = __builtin_cpu_supports("avx2") != 0;
+  const bool bmi = __builtin_cpu_supports("bmi") != 0;
+  const bool popcnt = __builtin_cpu_supports("popcnt") != 0;
+  return avx2 & bmi & popcnt;
 }
 
 TARGET_AVX2 const char* SkipBetweenCommandsAvx2(const char* position, const char* end, std::int32_t* lines) {

@@ -67,6 +67,17 @@ TEST_F(FailureLinesTest, ANumberThatCannotBeReadIsAtItsLine) {
             4);
 }
 
+TEST_F(FailureLinesTest, EveryNumberOfARunIsAtItsLine) {
+  const std::string curve =
+      "createNode animCurveTL -n \"a\";\nsetAttr \".ktv[0:2]\" 1 0\n\t2 0.5\r\n\n 3 1;\n";
+  const std::string transform = "createNode transform -n \"b\";\nsetAttr \".t\" 1\n2\n\n 3;\n";
+  constexpr std::int64_t kLines[] = {2, 2, 3, 3, 5, 5, 7, 8, 10};
+  for (std::size_t number = 0; number < std::size(kLines); ++number) {
+    const UtilityRehearsal failing(HOST_UTILITY_NumberScan, static_cast<std::int64_t>(number) + 1, 7123);
+    EXPECT_EQ(LineOf(curve + transform, 7123), kLines[number]) << number;
+  }
+}
+
 TEST_F(FailureLinesTest, ATextWithoutAFailureNotesNothing) {
   EXPECT_EQ(Read("createNode camera -n \"c\";\n"), 0);
   for (const HostError code : {0, 1289985, 1289986}) EXPECT_EQ(HostTakeNotedLine(code), 0);
