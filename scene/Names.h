@@ -10,8 +10,8 @@
 
 namespace scene {
 
-// Knows each node by its name and by its place under its parent. Keeps no names: they must outlive it. Every
-// call takes the same short time, however many nodes share a name.
+// Knows each node by its name and by its place under its parent. Keeps no names: they must outlive it. The
+// time of a call has a bound, however many nodes share a name.
 class Names {
  public:
   // The node stands under the parent (kNoNode: at the top) by the name. Ids are given in rising order. A name
@@ -32,29 +32,44 @@ class Names {
   };
 
   // "cam", "rig|cam" or "|rig|cam". A ":" before a name, which means the topmost namespace, is passed over.
-  // Of nodes that share the first name of a path that does not begin with "|", kMostCandidates are looked at.
-  static constexpr int kMostCandidates = 1000;
+  // Nodes are looked for by the name of the path that the fewest of them have; of very many, only
+  // kMostCandidates are looked at.
+  static constexpr std::uint32_t kMostCandidates = 64;
   Match Find(std::string_view nameOrPath) const;
 
  private:
   struct Namesakes {
     NodeId first = kNoNode;
     NodeId last = kNoNode;
+    std::uint32_t count = 0;
   };
   struct Child {
     NodeId node = kNoNode;
   };
-  // The neighbours of a node among its namesakes.
-  struct Links {
+  // Where a node was added, and its neighbours among its namesakes.
+  struct Entry {
+    std::string_view name = {};
+    NodeId parent = kNoNode;
     NodeId before = kNoNode;
     NodeId after = kNoNode;
   };
 
+  // A name of a path.
+  struct Part {
+    const Namesakes* namesakes = nullptr;  // null: no node has the name
+    std::string_view above = {};           // the path up to the name and with it
+    std::string_view below = {};           // what follows
+  };
+
   NodeId Below(NodeId node, std::string_view path) const;
+  bool IsAt(NodeId node, std::string_view path) const;
+  Part RarestPart(std::string_view path) const;
+  template <typename Fits>
+  Match FindAmong(const Namesakes* namesakes, Fits fits) const;
 
   FlatMap<Namesakes> byName_;
   FlatMap<Child> byPlace_;
-  std::vector<Links> links_;  // by node
+  std::vector<Entry> entries_;  // by node
 };
 
 }  // namespace scene

@@ -136,21 +136,51 @@ TEST(UnitsTest, EveryRateIsKnown) {
   }
 }
 
-TEST(NamesTest, APathThatBeginsWithAFrequentNameIsLookedForAmongTheFirst) {
-  Names names;
+// Nodes "g" and "x", side by side under so many nodes "top".
+NodeId AddFrequent(Names& names, std::uint32_t count) {
   NodeId id = 0;
-  // "g|x" under the last of those that are looked at, and under the first of those that are not.
-  for (int i = 0; i <= Names::kMostCandidates; ++i) {
-    const NodeId above = id++;
-    names.Add(above, kNoNode, i == 0 ? "a" : "b");
-    names.Add(id++, above, "g");
+  for (std::uint32_t i = 0; i < count; ++i) {
+    names.Add(id, kNoNode, "top");
+    names.Add(id + 1, id, "g");
+    names.Add(id + 2, id, "x");
+    id += 3;
   }
-  const NodeId lastLooked = static_cast<NodeId>(2 * Names::kMostCandidates - 1);
-  names.Add(id, lastLooked, "x");
-  EXPECT_EQ(names.Find("g|x").node, id);
-  ++id;
-  names.Add(id, lastLooked + 2, "y");
-  EXPECT_EQ(names.Find("g|y").node, kNoNode);
+  return id;
+}
+
+TEST(NamesTest, APathIsLookedForByItsRarestName) {
+  Names names;
+  const NodeId id = AddFrequent(names, 2 * Names::kMostCandidates);
+  names.Add(id, id - 2, "rare");  // under the last "g"
+  names.Add(id + 1, id, "x");
+  EXPECT_EQ(names.Find("g|rare").node, id);
+  EXPECT_EQ(names.Find("rare|x").node, id + 1);
+  EXPECT_EQ(names.Find("top|g|rare|x").node, id + 1);
+  EXPECT_EQ(names.Find("x|rare").node, kNoNode);
+  EXPECT_EQ(names.Find("g|none").node, kNoNode);
+  EXPECT_EQ(names.Find("none|x").node, kNoNode);
+  EXPECT_EQ(names.Find("top|x").node, 2u);
+  EXPECT_TRUE(names.Find("top|x").several);
+}
+
+TEST(NamesTest, WhereVeryManyShareEveryNameSomeAreLookedAt) {
+  Names names;
+  const NodeId id = AddFrequent(names, Names::kMostCandidates);
+  names.Add(id, kNoNode, "g");
+  names.Add(id + 1, id, "x");
+  EXPECT_EQ(names.Find("g|x").node, kNoNode);
+  EXPECT_EQ(names.Find("|g|x").node, id + 1);
+}
+
+TEST(NamesTest, AnInstanceIsFoundByItsPath) {
+  Names names;
+  names.Add(0, kNoNode, "a");
+  names.Add(1, kNoNode, "b");
+  names.Add(2, 0, "s");
+  names.AddInstance(2, 1, "s");
+  names.Add(3, kNoNode, "b");  // so that the path is looked for from its end first
+  EXPECT_EQ(names.Find("b|s").node, 2u);
+  EXPECT_FALSE(names.Find("b|s").several);
 }
 
 TEST(NamesTest, RemovingKeepsTheOrderOfTheRest) {
