@@ -1,8 +1,5 @@
 #include "motion/SceneCamera.h"
 
-#include <charconv>
-#include <cmath>
-
 #include "motion/ConstraintBinding.h"
 
 namespace motion {
@@ -29,19 +26,6 @@ constexpr std::string_view kNames[] = {
     "cameraScale",   "horizontalFilmOffset",   "verticalFilmOffset",   "shakeEnabled", "horizontalShake",
     "verticalShake", "shakeOverscanEnabled",   "shakeOverscan",
 };
-
-constexpr int kFirstWidePicture = 2013;  // the version from which on the default is 960 by 540
-
-// The year of the version that a scene requires, 0 where it does not say. Older versions have small numbers.
-int VersionOf(const scene::Scene& scene) {
-  int version = 0;
-  for (const scene::Requirement& requirement : scene.requirements()) {
-    if (requirement.name != "maya") continue;
-    const std::string_view text = requirement.version;
-    (void)std::from_chars(text.data(), text.data() + text.size(), version);
-  }
-  return version;
-}
 
 }  // namespace
 
@@ -75,16 +59,8 @@ bool SceneCamera::Moves() const {
   return false;
 }
 
-Picture PictureOf(const scene::Scene& scene) {
-  const int version = VersionOf(scene);
-  Picture picture;
-  if (version != 0 && version < kFirstWidePicture) picture = {640.0, 480.0, 1.3333333};
-  const scene::NodeId node = scene.Find("defaultResolution");
-  if (node == scene::kNoNode) return picture;
-  picture.width = scene.Number(node, "width").value_or(picture.width);
-  picture.height = scene.Number(node, "height").value_or(picture.height);
-  picture.deviceAspect = scene.Number(node, "deviceAspectRatio").value_or(picture.deviceAspect);
-  return picture;
+Picture PictureOf(const scene::Settings& settings) {
+  return {settings.width.value, settings.height.value, settings.deviceAspect.value};
 }
 
 }  // namespace motion

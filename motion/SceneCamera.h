@@ -7,6 +7,7 @@
 
 #include "motion/Camera.h"
 #include "motion/Evaluator.h"
+#include "scene/Settings.h"
 
 namespace motion {
 
@@ -34,7 +35,7 @@ class SceneCamera {
   std::array<NumberId, kNumbers> numbers_{};
 };
 
-// The picture of a scene's render settings. Where it is silent, the defaults of the version that wrote it.
-Picture PictureOf(const scene::Scene& scene);
+// The picture of a scene's render settings.
+Picture PictureOf(const scene::Settings& settings);
 
 }  // namespace motion

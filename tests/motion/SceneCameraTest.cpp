@@ -60,23 +60,17 @@ TEST_F(SceneCameraTest, AnApertureMoves) {
   EXPECT_NEAR(shot.Now().horizontalAperture, 1.5, 1e-15);
 }
 
-TEST_F(SceneCameraTest, ThePictureIsThatOfTheRenderSettings) {
-  Read("select -ne :defaultResolution;\nsetAttr \".w\" 720;\nsetAttr \".h\" 576;\nsetAttr \".dar\" 1.25;\n");
-  const Picture picture = motion::PictureOf(scene());
+TEST_F(SceneCameraTest, ThePictureIsThatOfTheSettings) {
+  scene::Settings settings;
+  settings.width.value = 720.0;
+  settings.height.value = 576.0;
+  settings.deviceAspect.value = 1.25;
+  const Picture picture = motion::PictureOf(settings);
   EXPECT_EQ(picture.width, 720.0);
   EXPECT_EQ(picture.height, 576.0);
   EXPECT_EQ(picture.deviceAspect, 1.25);
-}
-
-TEST_F(SceneCameraTest, TheDefaultPictureGoesByTheVersion) {
-  for (const auto& [head, width] : {std::pair("requires maya \"2020\";\n", 960.0),
-                                    {"requires maya \"2012\";\n", 640.0},
-                                    {"requires maya \"7.0ff03\";\n", 640.0},
-                                    {"requires maya \"2016 Extension 2\";\n", 960.0},
-                                    {"", 960.0}}) {
-    Read(head);
-    EXPECT_EQ(motion::PictureOf(scene()).width, width) << head;
-  }
+  // A pixel aspect means the same to both.
+  EXPECT_EQ(PixelAspect(picture), settings.pixelAspect());
 }
 
 }  // namespace
