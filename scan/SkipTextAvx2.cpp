@@ -37,7 +37,9 @@ struct NibbleTables {
 
   // As the look-up finds it: a byte of 128 and above finds nothing among the low nibbles.
   constexpr unsigned BitsOf(unsigned byte) const {
-    return byte < 128 ? unsigned{low[byte % 16]} & high[byte / 16] : 0;
+    if (byte >= 128) return 0;
+    const unsigned common = low[byte % 16] & high[byte / 16];
+    return common;
   }
 
  private:

@@ -332,6 +332,10 @@ TEST_F(RememberedSamplingTest, KeysThatAreReadAfterwardsAreSeen) {
   parser().position = std::strstr(parser().buffer, "\".ktv");
   ASSERT_NE(parser().position, nullptr);
   parser().ParseAnimSetAttr();
+  const std::int64_t before = HostUtilityCallCount(HOST_UTILITY_ListGet);
+  EXPECT_EQ(parser().GetKeyTime(&node_, 1), (T_Time{11000, 1000}));
+  EXPECT_EQ(HostUtilityCallCount(HOST_UTILITY_ListGet) - before, 2)
+      << "the curve, and the key where it lies now";
   EXPECT_EQ(parser().GetKeyTime(&node_, 3), (T_Time{11000, 1000}));
   EXPECT_THAT(Extracted(kTranslateGroup, 2), ElementsAre(1.0, -102.0, -103.0));
 }

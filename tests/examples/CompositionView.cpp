@@ -20,11 +20,11 @@ double valueAt(const refhost::Stream& stream, std::size_t component, std::size_t
   return stream.keys->values.at(key * static_cast<std::size_t>(stream.dimension) + component);
 }
 
-double number(const refhost::Layer& layer, StreamNumber id, std::size_t key) {
+double number(const refhost::Layer& layer, std::int32_t id, std::size_t key) {
   return valueAt(*layer.findStream(id), 0, key);
 }
 
-Vector3 vector(const refhost::Layer& layer, StreamNumber id, std::size_t key) {
+Vector3 vector(const refhost::Layer& layer, std::int32_t id, std::size_t key) {
   const refhost::Stream& stream = *layer.findStream(id);
   return {valueAt(stream, 0, key), valueAt(stream, 1, key), valueAt(stream, 2, key)};
 }
