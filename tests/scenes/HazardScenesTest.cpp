@@ -8,6 +8,7 @@
 #include <vector>
 
 #include "hostapi/ErrorCodes.h"
+#include "hostapi/LayerStreams.h"
 #include "tests/scenes/ImportedScene.h"
 #include "tests/scenes/SceneOutcome.h"
 #include "tests/support/TemporaryFolder.h"
@@ -109,7 +110,7 @@ TEST(HazardScenes, OfTwoTransformsOfOneNameTheSecondIsPlaced) {
   ASSERT_TRUE(scene.loaded());
   const refhost::Layer* crane = scene.layer("crane");
   ASSERT_NE(crane, nullptr);
-  EXPECT_NEAR(crane->findStream(refhost::kPositionStream)->value[2], -20.0, 1e-12);
+  EXPECT_NEAR(crane->findStream(HOST_STREAM_POSITION)->value[2], -20.0, 1e-12);
   EXPECT_EQ(crane->parent, nullptr);
 }
 
@@ -118,8 +119,8 @@ TEST(HazardScenes, NumbersThatAreMissingFromATripleAreThoseOfATransformAtRest) {
   ASSERT_TRUE(scene.loaded());
   const refhost::Layer* camera = scene.layer("shortShape");
   ASSERT_NE(camera, nullptr);
-  EXPECT_THAT(camera->findStream(refhost::kPositionStream)->value, ElementsAre(2.0, 0.0, 0.0));
-  EXPECT_THAT(camera->findStream(refhost::kScaleStream)->value, ElementsAre(300.0, 100.0, 100.0));
+  EXPECT_THAT(camera->findStream(HOST_STREAM_POSITION)->value, ElementsAre(2.0, 0.0, 0.0));
+  EXPECT_THAT(camera->findStream(HOST_STREAM_SCALE)->value, ElementsAre(300.0, 100.0, 100.0));
 }
 
 // 85 KB of text ask for a million layers.

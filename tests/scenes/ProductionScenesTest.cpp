@@ -6,6 +6,7 @@
 #include <vector>
 
 #include "hostapi/ErrorCodes.h"
+#include "hostapi/LayerStreams.h"
 #include "tests/scenes/ImportedScene.h"
 #include "tests/scenes/SceneOutcome.h"
 
@@ -84,8 +85,8 @@ TEST(ProductionScenes, LensAndCameraKeepEachItsOwnKeys) {
   ASSERT_TRUE(scene.loaded());
   const refhost::Layer* camera = scene.layer("zoomerShape");
   ASSERT_NE(camera, nullptr);
-  const refhost::KeyTimes& zoom = camera->findStream(refhost::kZoomStream)->keys->times;
-  const refhost::KeyTimes& position = camera->findStream(refhost::kPositionStream)->keys->times;
+  const refhost::KeyTimes& zoom = camera->findStream(HOST_STREAM_ZOOM)->keys->times;
+  const refhost::KeyTimes& position = camera->findStream(HOST_STREAM_POSITION)->keys->times;
   constexpr int kFrame = 1000;  // of a scale of 24000; each counts from its own first
   EXPECT_EQ(zoom[1].value, (100 - 1) * kFrame);
   EXPECT_EQ(zoom[1].scale, 24u * kFrame);
@@ -100,7 +101,7 @@ TEST(ProductionScenes, TheParentsHangUnderEachOtherInOrder) {
   std::vector<std::string> parents;
   while ((layer = layer->parent) != nullptr) parents.push_back(layer->name);
   EXPECT_THAT(parents, ElementsAre("group", "tilt", "dolly", "rig", "master"));
-  EXPECT_EQ(scene.layer("dolly")->findStream(refhost::kPositionStream)->keyCount(), 2u);
+  EXPECT_EQ(scene.layer("dolly")->findStream(HOST_STREAM_POSITION)->keyCount(), 2u);
 }
 
 TEST(ProductionScenes, TheLookAtInFullNamesMovesThePointOfInterest) {
@@ -108,7 +109,7 @@ TEST(ProductionScenes, TheLookAtInFullNamesMovesThePointOfInterest) {
   ASSERT_TRUE(scene.loaded());
   const refhost::Layer* camera = scene.layer("watchShape");
   ASSERT_NE(camera, nullptr);
-  EXPECT_THAT(camera->findStream(refhost::kAnchorStream)->value, ElementsAre(5.0, -6.0, 7.0));
+  EXPECT_THAT(camera->findStream(HOST_STREAM_ANCHOR_POINT)->value, ElementsAre(5.0, -6.0, 7.0));
 }
 
 TEST(ProductionScenes, ARateInAWordIsTheCompositions) {

@@ -125,6 +125,7 @@ void Builder::animateCamera(Handle layer, const Camera& camera) {
       std::int32_t count = 0;
       check(suites_.getStreamKeyframeCount(stream, &count));
       held = count > 0;
+      if (held) suites_.host().excuse(stream);
       if (!held) zoomKeys(stream, batch, camera, *keys);
     });
     const HostError closing = suites_.host().guarded([&] { closeBatches({batch}); });

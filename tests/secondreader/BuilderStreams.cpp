@@ -12,6 +12,7 @@ void Builder::setStream(Handle layer, std::int32_t id, const SuiteUser::Value& v
 void Builder::setStreamUnguarded(Handle layer, std::int32_t id, const SuiteUser::Value& value) {
   Handle stream = 0;
   check(suites_.acquireLayerStream(layer, id, &stream));
+  suites_.host().excuse(stream);
   check(suites_.setStreamValue(stream, value));
   check(suites_.releaseStream(stream));
 }

@@ -45,6 +45,18 @@ HostError PlayedHost::translateAndReport(const std::exception& exception) {
   return code;
 }
 
+std::vector<std::string> PlayedHost::leftOpen() const {
+  std::vector<std::string> names;
+  for (const HeldStream& held : heldStreams) {
+    if (!held.excused) names.push_back("stream:" + std::to_string(held.number));
+  }
+  for (const OpenBatch& open : openBatches) {
+    if (!open.excused) names.push_back("batch:" + std::to_string(open.number));
+  }
+  if (heldMemory != 0) names.push_back("mem:" + std::to_string(heldMemory));
+  return names;
+}
+
 bool PlayedHost::serviceFails(const char* name, HostError* code) {
   const auto failure = plan.service(name);
   if (!failure) return false;

@@ -62,9 +62,15 @@ void compare(std::ostringstream& words, const char* callback, const PredictedCal
   for (const std::string& refusal : result.refusals) {
     if (refusal == "an exception left the plug-in") words << callback << ": " << refusal << '\n';
   }
+  std::vector<std::string> leftBehind;
   for (const refhost::Leftover& leftover : result.leftovers) {
-    if (!leftover.keptByDesign) words << callback << ": left behind: " << leftover.description << '\n';
+    if (leftover.keptByDesign) continue;
+    leftBehind.push_back(leftover.description.substr(0, leftover.description.find(' ')));
   }
+  if (predicted.leftBehind == leftBehind) return;
+  for (const std::string& held : predicted.leftBehind)
+    words << callback << ": predicted left: " << held << '\n';
+  for (const std::string& held : leftBehind) words << callback << ": left behind: " << held << '\n';
 }
 
 std::string describe(const refhost::HostOptions& options) {

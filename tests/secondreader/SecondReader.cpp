@@ -82,19 +82,29 @@ PredictedCallback Callbacks::run(refhost::Callback callback, Work work) {
   }
   host_.lines.push_back({entered.ended()});
   host_.plan.begin(callback);
-  const HostError code = host_.atBorder(work);
+  HostError code = HOST_ERR_EXCEPTION_OTHER;
+  std::vector<std::string> leftBehind;
+  try {
+    code = host_.guarded(work);
+  } catch (const UnknownException&) {
+    leftBehind = host_.leftOpen();
+  }
   host_.plan.end();
   PlayedLine left("leave");
   left.text("callback", nameOf(callback));
   if (verifying) left.plain("canImport", canImport_ ? "true" : "false");
   host_.lines.push_back({left.integer("error", code).ended()});
-  PredictedCallback result{code, canImport_, std::move(host_.messages),
+  PredictedCallback result{code,
+                           canImport_,
+                           std::move(host_.messages),
+                           std::move(leftBehind),
                            static_cast<int>(host_.plan.suiteCalls()),
                            static_cast<int>(host_.plan.count("NumberScan"))};
   host_.messages.clear();
   host_.silent = false;
   host_.heldStreams.clear();
   host_.openBatches.clear();
+  host_.heldMemory = 0;
   canImport_ = false;
   return result;
 }

@@ -16,6 +16,7 @@ struct PredictedCallback {
   HostError code = 0;
   bool canImport = false;
   std::vector<std::string> messages;
+  std::vector<std::string> leftBehind;  // by handle; empty but for an exception of an unknown type
   int suiteCalls = 0;
   int numberScans = 0;  // counted only in the callback that the rehearsal is for
 };

@@ -67,7 +67,7 @@ HostError SuiteUser::endSilentErrors() {
 
 HostError SuiteUser::newMemHandle(std::int64_t size, Handle* handle) {
   PlayedCall call(host_, "NewMemHandle", use(kMemory1));
-  if (call.goesOn()) *handle = ++host_.memories;
+  if (call.goesOn()) host_.heldMemory = *handle = ++host_.memories;
   call.line().integer("pluginId", host_.options.pluginId).text("name", "file buffer");
   call.line().integer("size", size).integer("flags", 0);
   call.handed("handle", "mem", *handle);
@@ -76,6 +76,7 @@ HostError SuiteUser::newMemHandle(std::int64_t size, Handle* handle) {
 
 HostError SuiteUser::freeMemHandle(Handle handle) {
   PlayedCall call(host_, "FreeMemHandle", use(kMemory1));
+  host_.heldMemory = 0;  // nor is it reported where the call was made to fail
   call.line().handle("handle", "mem", handle);
   return call.finish();
 }

@@ -55,6 +55,8 @@ HostError SuiteUser::releaseStream(Handle stream) {
     const auto gone =
         std::erase_if(host_.heldStreams, [&](const auto& held) { return held.number == stream; });
     call.demand(gone != 0, HOST_ERR_BAD_HANDLE);
+  } else {
+    host_.excuse(stream);
   }
   call.line().handle("stream", "stream", stream);
   return call.finish();
@@ -143,6 +145,8 @@ HostError SuiteUser::endKeyframeBatch(Handle batch) {
     const auto gone =
         std::erase_if(host_.openBatches, [&](const auto& open) { return open.number == batch; });
     call.demand(gone != 0, HOST_ERR_BAD_HANDLE);
+  } else if (OpenBatch* open = find(host_.openBatches, batch)) {
+    open->excused = true;
   }
   call.line().integer("commit", 1).handle("batch", "batch", batch);
   return call.finish();
