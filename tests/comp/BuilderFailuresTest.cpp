@@ -125,24 +125,24 @@ TEST(BuilderFailuresTest, EveryTransformIsOneMatrixCall) {
   }
 }
 
-// A run of keys that cannot be fetched, in an import whose last reads of lists those are: for each run, the
-// batches that were closed. None of them has a key.
-std::vector<std::size_t> BatchesClosedAfterAFailedRun(const std::string& scene, std::int64_t runs) {
+// Each read of a list that fails after the batches were opened and before they have a key, which is when the
+// runs of keys are fetched: the batches that were closed.
+std::vector<std::size_t> BatchesClosedAfterAFailedRun(const std::string& scene) {
   std::vector<std::size_t> closed;
   const std::int64_t reads = ImportText(scene, {}).host->callCount("ListGet");
-  for (std::int64_t nth = reads - runs + 1; nth <= reads; ++nth) {
+  for (std::int64_t nth = 1; nth <= reads; ++nth) {
     const ImportRun run = ImportText(scene, Failing("ListGet", nth));
     EXPECT_EQ(run.result.code, kRehearsed);
     EXPECT_TRUE(run.result.ledgerClean());
-    EXPECT_THAT(CallsOf(run.trace, "AddBatchKeyframe"), IsEmpty());
-    EXPECT_THAT(CallsOf(run.trace, "BeginKeyframeBatch"), SizeIs(5));
+    const bool opened = !CallsOf(run.trace, "BeginKeyframeBatch").empty();
+    if (!opened || !CallsOf(run.trace, "AddBatchKeyframe").empty()) continue;
     closed.push_back(CallsOf(run.trace, "EndKeyframeBatch").size());
   }
   return closed;
 }
 
 TEST(BuilderFailuresTest, BatchesAreClosedAfterAFailedFetchOfTheKeysOfAChannel) {
-  EXPECT_THAT(BatchesClosedAfterAFailedRun(TenKeys() + Animation("rig.ry", {{1, 77}}), 2), ElementsAre(5, 5));
+  EXPECT_THAT(BatchesClosedAfterAFailedRun(TenKeys() + Animation("rig.ry", {{1, 77}})), ElementsAre(5, 5));
 }
 
 TEST(BuilderFailuresTest, AFailureAfterTheFirstStreamLeavesTheEarlierStreamsSet) {

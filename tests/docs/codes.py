@@ -9,6 +9,7 @@ CODE = re.compile(r"\bHOST_ERR_(\w+)")
 SLOT = re.compile(r"/\*((?:(?!\*/).)*)\*/\n  HostError \(\*(\w+)\)", re.DOTALL)
 FUNCTION = re.compile(r"\b(\w+)\([^;{}]*?\)\s*(?:const\s*)?\{")
 COMMENT_OR_TEXT = re.compile(r'//[^\n]*|/\*.*?\*/|"(?:\\.|[^"\\\n])*"', re.DOTALL)
+TASK = re.compile(r"\bstruct (\w+) \{\s*static constexpr Operation kOperation = Operation::(\w+);")
 KEYWORDS = ("if", "for", "while", "switch", "catch")
 
 
@@ -41,6 +42,14 @@ def functions(text):
     return found
 
 
+def tasks(text):
+    """The operations that are made for every key: a struct each, with the names of its functions."""
+    text = bare(text)
+    heads = list(TASK.finditer(text))
+    ends = [text.index("\n};", head.end()) for head in heads]
+    return {head[2]: functions(text[head.end() : end]) for head, end in zip(heads, ends)}
+
+
 def reached(body, functions_of, members, is_member, seen=frozenset()):
     """The codes in a body and in what it calls: functions, and members of the Call that it has."""
     found = set(CODE.findall(body))
@@ -64,6 +73,9 @@ def given():
         for operation in declared():
             if operation in own:
                 found[operation] = reached(own[operation], {**shared, **own}, members, False)
+        # Their refusals name the operation first; those of all operations stand beside the Call.
+        for operation, parts in tasks(path.read_text(encoding="utf-8")).items():
+            found[operation] = reached(parts["work"], {**shared, **members, **parts}, members, False)
     return found
 
 

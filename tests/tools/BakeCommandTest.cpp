@@ -114,7 +114,7 @@ TEST_F(BakeCommand, WarningsAreStatus1WithStrictAlone) {
                              "\tsetAttr \".fio\" -type \"double2\" 0.1 0 ;\n"));
   const ToolResult lenient = run({"bake", "shot.ma", "-o", "baked.ma"});
   EXPECT_EQ(lenient.status, 0);
-  EXPECT_THAT(lenient.err, HasSubstr("shot.ma:4:23: warning: the film offset of \"|a|aShape\" is lost"));
+  EXPECT_THAT(lenient.err, HasSubstr("shot.ma:8:23: warning: the film offset of \"|a|aShape\" is lost"));
   EXPECT_THAT(lenient.err, HasSubstr("help: "));
   EXPECT_EQ(run({"bake", "--strict", "shot.ma", "-o", "baked.ma"}).status, 1);
   EXPECT_TRUE(std::filesystem::exists(path("baked.ma")));
