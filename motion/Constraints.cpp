@@ -90,11 +90,12 @@ bool ScaleConstraint(const std::vector<TargetScale>& targets, const Matrix& pare
                      const Vector& offset, Vector* scale) {
   const Vector parent = AxisLengths(parentMatrix);
   if (parent.x == 0.0 || parent.y == 0.0 || parent.z == 0.0) return false;
-  Vector sum;
+  Vector sum{};
   double weights = 0.0;
   for (const TargetScale& target : targets) {
     const Vector lengths = AxisLengths(target.parentMatrix);
-    for (const int axis : {0, 1, 2}) sum[axis] += target.scale[axis] * lengths[axis] * target.weight;
+    const Vector inWorld{target.scale.x * lengths.x, target.scale.y * lengths.y, target.scale.z * lengths.z};
+    sum = sum + inWorld * target.weight;
     weights += target.weight;
   }
   if (weights == 0.0) return false;

@@ -68,7 +68,7 @@ void SceneBuilder::Connect(Named source, Named destination, ConnectHow how) {
   if (how != ConnectHow::NextAvailable) Index(static_cast<std::uint32_t>(scene_.connections_.size() - 1));
 }
 
-void SceneBuilder::Disconnect(Named source, Named destination) {
+void SceneBuilder::Disconnect(const Named& source, const Named& destination) {
   const Plug from = PlugOf(source);
   const Plug to = PlugOf(destination);
   const Connection* const there = scene_.ConnectionTo(to);

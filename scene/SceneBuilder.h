@@ -50,7 +50,7 @@ class SceneBuilder {
 
   enum class ConnectHow { Plain, Force, NextAvailable };
   void Connect(Named source, Named destination, ConnectHow how);
-  void Disconnect(Named source, Named destination);
+  void Disconnect(const Named& source, const Named& destination);
 
   // ---- the head of the file ----
 

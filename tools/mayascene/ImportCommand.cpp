@@ -170,10 +170,12 @@ ExitStatus runImport(const ImportArguments& arguments, Diagnostics& diagnostics)
     status = worse(status, session.finish());
     run.deathHook = session.deathHook();
   }
-  if (loaded && outputs.json) writeCompositionJson(outputs.json->stream(), run);
-  if (loaded && outputs.report) writeBakeReport(outputs.report->stream(), run.bakes);
-  if (!loaded) outputs.report.reset();
-  if (!loaded) outputs.json.reset();  // what lay there stays
+  if (!loaded) {  // what lay there stays
+    outputs.json.reset();
+    outputs.report.reset();
+  }
+  if (outputs.json) writeCompositionJson(outputs.json->stream(), run);
+  if (outputs.report) writeBakeReport(outputs.report->stream(), run.bakes);
   return worse(status, outputs.commit(diagnostics));
 }
 
