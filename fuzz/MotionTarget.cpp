@@ -70,9 +70,10 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     evaluator.MoveTo(frame);
     digests.push_back(Digest(evaluator, asked));
   }
-  for (std::size_t i = digests.size(); i-- > 0;) {
-    evaluator.MoveTo(kFrames[i]);
-    fuzz::Require(Digest(evaluator, asked) == digests[i], "a frame has its values in any order of frames");
+  for (std::size_t i = digests.size(); i != 0; --i) {
+    evaluator.MoveTo(kFrames[i - 1]);
+    fuzz::Require(Digest(evaluator, asked) == digests[i - 1],
+                  "a frame has its values in any order of frames");
   }
   (void)evaluator.KeptBelow(asked.numbers, asked.places);
   for (const diag::Diagnostic& diagnostic : diagnostics.kept()) (void)diag::Render("fuzz", diagnostic);

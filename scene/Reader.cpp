@@ -218,6 +218,8 @@ void Reader::PassOver() {
         return cursor_.Advance(1);
       case StopKind::ConflictMark:
         cursor_.SkipLine();
+        // Its line feed is passed once more: the next line may begin with a command.
+        if (cursor_.atLineStart()) cursor_.MoveTo(cursor_.offset() - 1);
         break;
       default:
         return;

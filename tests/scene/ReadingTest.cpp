@@ -134,6 +134,12 @@ TEST_F(ReadingTest, ACommandWithAConflictMarkInsideIsPassedOver) {
   EXPECT_THAT(Between("connectAttr \"a.b\"\n=======\n\"c.d\";"), ElementsAre(testing::HasSubstr("MA0105")));
 }
 
+TEST_F(ReadingTest, ACommandRightAfterTheConflictMarkInACommandWithoutEndIsRead) {
+  EXPECT_THAT(Between("someCommand 1\n>>>>>>> x"), ElementsAre(testing::HasSubstr("MA0105")));
+  Read("someCommand \"a\"\n>>>>>>>\ncreateNode transform -n \"next\";\n");
+  EXPECT_NE(scene_.Find("next"), scene::kNoNode);
+}
+
 TEST_F(ReadingTest, WhatOnlyLooksLikeAConflictMarkIsNone) {
   EXPECT_THAT(Between("// x\n//=======\n/* \n======= */"), IsEmpty());
   EXPECT_THAT(Between("========\n;"), ElementsAre("2:1: \"=\" cannot be read here [MA0107]"));
