@@ -62,6 +62,15 @@ TEST(PathsTest, BytesBecomeUnitsAndUndecodableOnesLoneSurrogates) {
   }
 }
 
+// Lead bytes F0 to F4, each bit of which counts.
+TEST(PathsTest, EveryLeadByteOfFourBytesIsRead) {
+  EXPECT_EQ(PathUnits("\xF0\x90\x80\x80"), (Units{0xD800, 0xDC00}));
+  EXPECT_EQ(PathUnits("\xF1\x80\x80\x80"), (Units{0xD8C0, 0xDC00}));
+  EXPECT_EQ(PathUnits("\xF2\x80\x80\x80"), (Units{0xD9C0, 0xDC00}));
+  EXPECT_EQ(PathUnits("\xF3\x80\x80\x80"), (Units{0xDAC0, 0xDC00}));
+  EXPECT_EQ(PathUnits("\xF4\x80\x80\x80"), (Units{0xDBC0, 0xDC00}));
+}
+
 TEST(PathsTest, WhatUTF8ForbidsIsKeptByteForByte) {
   const struct {
     const char* why;
