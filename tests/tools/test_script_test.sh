@@ -30,6 +30,9 @@ all_well() {
     echo \"\$2 \${MAYASCENE_TESTS-quick}\" >>$folder/forms"
 }
 
+# The long form runs this test too: which form a run has is decided by its own options alone.
+unset MAYASCENE_TESTS
+
 # run STATUS OPTION...: runs the script, which has to end so. The log then holds what it called.
 run() {
   local status=$1
