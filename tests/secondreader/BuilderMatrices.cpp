@@ -22,6 +22,10 @@ Triple Builder::hostPoint(const Triple& point) const {
 // other way in the host.
 Parts Builder::decomposed(const Transform& transform, const Triple& translate, const Triple& rotate,
                           const Triple& scale) const {
+  HostError code = HOST_ERR_NONE;
+  const bool nothing = suites_.host().serviceFails("MatrixDecompose", &code);
+  check(code);
+  if (nothing) return {};
   const Triple scalePivot = hostPoint(transform.scalePivot);
   const Triple rotatePivot = hostPoint(transform.rotatePivot);
   Matrix matrix = identity();

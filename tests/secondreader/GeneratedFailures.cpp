@@ -12,8 +12,9 @@ constexpr std::string_view kSuiteCalls[] = {
     "ReleaseStream",    "SetStreamValue",         "AddBatchKeyframe",     "BeginKeyframeBatch",
     "EndKeyframeBatch", "GetStreamKeyframeCount", "SetBatchKeyframeValue"};
 constexpr std::string_view kImportServices[] = {
-    "FileCreate",     "FileOpen",   "FileRead",   "FileClose",    "FileSize",   "FileName",
-    "StripExtension", "StringMake", "NumberScan", "RatioCompare", "StringCopy", "StringFormat"};
+    "FileCreate", "FileOpen",       "FileRead",       "FileClose",  "FileSize",
+    "FileName",   "StripExtension", "StringMake",     "NumberScan", "RatioCompare",
+    "StringCopy", "StringFormat",   "MatrixDecompose"};
 constexpr std::string_view kVerifyCalls[] = {"BeginSilentErrors", "EndSilentErrors", "AcquireSuite",
                                              "FileCreate",        "FileOpen",        "FileRead",
                                              "FileClose",         "FileDispose",     "StringMake"};

@@ -89,7 +89,11 @@ Triple anglesOfAny(Axes axes) {
   }
   if (count == kAxes) return {};
   if (count == kAxes - 1) return anglesOfOne(known, axes[known]);
-  if (count == 1) axes[missing] = cross(axes[(missing + 1) % kAxes], axes[(missing + 2) % kAxes]);
+  if (count == 1) {
+    // Axes of the smallest doubles are hardly at right angles.
+    axes[missing] = cross(axes[(missing + 1) % kAxes], axes[(missing + 2) % kAxes]);
+    takeLength(&axes[missing]);
+  }
   return anglesOf(axes);
 }
 

@@ -108,6 +108,20 @@ TEST(TakeApartTest, AMissingAxisIsFoundFromTheTwoOthers) {
   }
 }
 
+TEST(TakeApartTest, AMissingAxisHasTheLengthOfOneBetweenAxesThatAreNotAtRightAngles) {
+  // X is (1, 1, 0) in the smallest doubles, Z is (1, 0, 1): the Y at right angles to both is (-1, 1, 1) /
+  // sqrt 3.
+  Matrix matrix = identity();
+  matrix[0] = {5e-324, 0, 1, 0};
+  matrix[1] = {5e-324, 0, 0, 0};
+  matrix[2] = {0, 0, 1, 0};
+  // An eighth of a turn about Z taken back, the second coordinate of Y is 2 / sqrt 6 and that of Z is -1 / 2.
+  const Triple angles = takeApart(matrix)->rotation;
+  EXPECT_DOUBLE_EQ(angles[2], kQuarter / 2);
+  EXPECT_DOUBLE_EQ(angles[1], 0);
+  EXPECT_DOUBLE_EQ(angles[0], std::atan2(0.5, 2.0 / std::sqrt(6.0)));
+}
+
 TEST(TakeApartTest, AnAxisAloneLeavesItsOwnAngleZero) {
   expectNear(takeApart(after(turned({0.3, -0.4, 0.5}), scaling({2, 0, 0})))->rotation, {0, -0.4, 0.5});
   expectNear(takeApart(after(turned({0.3, 0, 0.5}), scaling({0, 3, 0})))->rotation, {0.3, 0, 0.5});
