@@ -22,6 +22,7 @@ std::uint32_t Chains::Add(scene::NodeId transform) {
     if (!Inherits(scene_, node)) break;
   }
   for (auto node = chain.rbegin(); node != chain.rend(); ++node) {
+    cutOff = cutOff || IsInheritanceDriven(scene_, *node);
     Link link;
     link.node = *node;
     link.above = above;

@@ -19,7 +19,7 @@ struct Link {
   scene::NodeId node = scene::kNoNode;
   std::uint32_t above = kNone;  // the link of its parent
   std::size_t track = 0;        // of the node against its parent
-  bool cutOff = false;          // what stands above it, or above that, is not in the file
+  bool cutOff = false;          // what stands above it, or above that, is not in the file or not always there
 
   // What holds of the link and of all those above it. Known after Judge.
   bool finite = true;

@@ -52,6 +52,8 @@ constexpr std::string_view kOfJoints[] = {
     "jointOrientZ",
 };
 
+constexpr std::string_view kInherits = "inheritsTransform";
+
 bool IsZero(const scene::Scene& scene, scene::NodeId node, std::string_view attribute) {
   return !scene.SourceOf(scene.PlugOf(node, attribute)) && scene.Number(node, attribute).value_or(0.0) == 0.0;
 }
@@ -72,7 +74,11 @@ bool IsPlain(const scene::Scene& scene, scene::NodeId node) {
 }
 
 bool Inherits(const scene::Scene& scene, scene::NodeId node) {
-  return scene.Number(node, "inheritsTransform").value_or(1.0) != 0.0;
+  return scene.Number(node, kInherits).value_or(1.0) != 0.0;
+}
+
+bool IsInheritanceDriven(const scene::Scene& scene, scene::NodeId node) {
+  return scene.SourceOf(scene.PlugOf(node, kInherits)).has_value();
 }
 
 }  // namespace bake

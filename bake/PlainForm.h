@@ -9,7 +9,9 @@ namespace bake {
 // no offset matrix, no joint orient, and nothing that drives one of these.
 bool IsPlain(const scene::Scene& scene, scene::NodeId node);
 
-// Whether the node takes over what stands above it.
+// Whether the node takes over what stands above it, by the value that the scene holds, and whether that can
+// change.
 bool Inherits(const scene::Scene& scene, scene::NodeId node);
+bool IsInheritanceDriven(const scene::Scene& scene, scene::NodeId node);
 
 }  // namespace bake

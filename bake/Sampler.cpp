@@ -43,7 +43,7 @@ std::size_t Sampler::AddLocal(scene::NodeId node) {
       source.numbers[slot] = evaluator_->Number(node, kChannelNames[slot]);
     }
   } else {
-    source.matrix = evaluator_->Local(node);
+    source.matrix = evaluator_->InParent(node);
   }
   sources_.push_back(source);
   tracks_.emplace_back();

@@ -25,6 +25,12 @@ MatrixId Evaluator::Local(scene::NodeId node) {
   return id;
 }
 
+MatrixId Evaluator::InParent(scene::NodeId node) {
+  const MatrixId id = ReserveMatrix(scene_.PlugOf(node, kDagLocalMatrix));
+  Settle();
+  return id;
+}
+
 MatrixId Evaluator::World(scene::NodeId node) {
   const MatrixId id = ReserveMatrix(scene_.PlugOf(node, kWorldMatrix));
   Settle();

@@ -61,8 +61,10 @@ class Evaluator {
   // A number in the scene's units, to the bit as it is written where nothing drives it.
   NumberId Number(scene::NodeId node, std::string_view attribute, std::int32_t index = scene::kNoIndex);
 
-  // From the node's space to its parent's, and to the world. Lengths in the scene's unit.
+  // Lengths in the scene's unit. `Local` is what the channels say; with the node's offset matrix it is
+  // `InParent`, from the node's space to its parent's. `World` leads on to the world.
   MatrixId Local(scene::NodeId node);
+  MatrixId InParent(scene::NodeId node);
   MatrixId World(scene::NodeId node);
 
   // Whether the value can change from frame to frame.

@@ -89,7 +89,8 @@ class PlaceStep final : public MatrixStep {
 
 bool IsPlaceMatrix(std::string_view attribute) {
   return attribute == kMatrix || attribute == kInverseMatrix || attribute == kWorldMatrix ||
-         attribute == kWorldInverseMatrix || attribute == kParentMatrix || attribute == kParentInverseMatrix;
+         attribute == kWorldInverseMatrix || attribute == kParentMatrix ||
+         attribute == kParentInverseMatrix || attribute == kDagLocalMatrix;
 }
 
 bool LocalStep::Compute(Matrix* result) {
@@ -131,6 +132,7 @@ std::unique_ptr<MatrixStep> MakePlaceMatrix(Binder* binder, std::string_view att
   if (!ofParent) binder->MatrixOf(kMatrix, &step->local);
   if (attribute == kInverseMatrix) return step;
   if (binder->Touches(kOffsetParentMatrix)) binder->MatrixOf(kOffsetParentMatrix, &step->offset);
+  if (attribute == kDagLocalMatrix) return step;
   if (binder->Touches(kInherits)) binder->Number(kInherits, &step->inherits);
   const scene::NodeId parent = binder->scene().node(binder->node()).parent;
   if (parent != scene::kNoNode) binder->WorldOf(parent, &step->parent);

@@ -16,9 +16,10 @@ inline constexpr std::string_view kWorldMatrix = "worldMatrix";
 inline constexpr std::string_view kWorldInverseMatrix = "worldInverseMatrix";
 inline constexpr std::string_view kParentMatrix = "parentMatrix";
 inline constexpr std::string_view kParentInverseMatrix = "parentInverseMatrix";
+inline constexpr std::string_view kDagLocalMatrix = "dagLocalMatrix";  // the offset matrix is in it
 inline constexpr std::string_view kOffsetParentMatrix = "offsetParentMatrix";
 
-// Whether the attribute is one of the first six.
+// Whether the attribute is one of the first seven.
 bool IsPlaceMatrix(std::string_view attribute);
 
 // The matrix of one transform.
@@ -35,7 +36,7 @@ class LocalStep final : public MatrixStep {
 
 std::unique_ptr<LocalStep> MakeLocal(Binder* binder);
 
-// The step that computes one of the other five matrices.
+// The step that computes one of the other six matrices.
 std::unique_ptr<MatrixStep> MakePlaceMatrix(Binder* binder, std::string_view attribute);
 
 }  // namespace motion

@@ -22,6 +22,7 @@ constexpr AttributeRow kTransform[] = {
     Triple("spt", "scalePivotTranslate", 0),
     Single("it", "inheritsTransform", 1),
     Single("opm", "offsetParentMatrix"),
+    Single("dlm", "dagLocalMatrix"),
     Single("m", "matrix"),
     Single("im", "inverseMatrix"),
     Single("wm", "worldMatrix"),

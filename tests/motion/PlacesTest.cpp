@@ -57,6 +57,16 @@ TEST_F(PlacesTest, AJointTakesItsOrientAndItsParentsScaleBack) {
   EXPECT_THAT(Local("free"), MatrixNear(Matrix{}, 0.0));
 }
 
+TEST_F(PlacesTest, WhatStandsBetweenANodeAndItsParentHasItsOffsetInIt) {
+  Read(
+      "createNode transform -n \"top\";\nsetAttr \".tx\" 100;\n"
+      "createNode transform -n \"leaf\" -p \"top\";\nsetAttr \".tx\" 1;\n"
+      "setAttr \".opm\" -type \"matrix\" 2 0 0 0 0 3 0 0 0 0 4 0 7 8 9 1;\n");
+  const motion::MatrixId inParent = evaluator().InParent(At("leaf"));
+  EXPECT_THAT(evaluator().Value(inParent),
+              MatrixNear(Scaling({2.0, 3.0, 4.0}) * Translation({9.0, 8.0, 9.0}), 0.0));
+}
+
 TEST_F(PlacesTest, LimitsHoldWhereTheyAreOn) {
   Read(
       "createNode transform -n \"rig\";\nsetAttr \".t\" -type \"double3\" 5 5 5;\nsetAttr \".rz\" 90;\n"
