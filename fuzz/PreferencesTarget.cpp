@@ -13,6 +13,7 @@
 #include "fuzz/MemoryFile.h"
 #include "fuzz/Require.h"
 #include "fuzz/Target.h"
+#include "hostapi/PersistentDataSuite.h"
 #include "refhost/Preferences.h"
 #include "tests/support/TemporaryFolder.h"
 
@@ -73,7 +74,7 @@ void CheckAdditions(refhost::Preferences& preferences, Entries& entries, std::st
   const std::size_t half = text.size() / 2;
   Add(preferences, entries, text.substr(0, half), "key", kValue);
   Add(preferences, entries, "section", text.substr(half), kValue);
-  Add(preferences, entries, "Maya Camera", "Use Linear Units", kValue);
+  Add(preferences, entries, HOST_PREF_SECTION, HOST_PREF_LINEAR_UNITS, kValue);
   CheckEntries(preferences, entries);
 }
 

@@ -10,6 +10,7 @@
 #include <fstream>
 #include <string>
 
+#include "hostapi/LayerStreams.h"
 #include "refhost/Host.h"
 #include "tests/examples/CompositionView.h"
 #include "tests/examples/ConversionScene.h"
@@ -67,7 +68,7 @@ class Conversion : public testing::Test {
     for (std::size_t point = 0; point < scene.pointCount(); ++point) {
       const refhost::Layer* layer = view.layer(scene.pointName(point));
       ASSERT_NE(layer, nullptr) << scene.pointName(point);
-      ASSERT_EQ(layer->findStream(1)->keyCount(), scene.keyCount());
+      ASSERT_EQ(layer->findStream(HOST_STREAM_POSITION)->keyCount(), scene.keyCount());
       for (std::size_t key = 0; key < std::max<std::size_t>(1, scene.keyCount()); ++key) {
         comparePoint(scene, point, view, *layer, key, hostUnits);
       }

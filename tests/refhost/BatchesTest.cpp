@@ -18,8 +18,8 @@ class Batches : public ::testing::Test {
  protected:
   StandIn plugin;
   VOR_Layer* layer = plugin.makeNull(plugin.makeComp());
-  VOR_Stream* rotation = plugin.acquire(layer, 3);
-  VOR_Stream* position = plugin.acquire(layer, 1);
+  VOR_Stream* rotation = plugin.acquire(layer, HOST_STREAM_ROTATION_Z);
+  VOR_Stream* position = plugin.acquire(layer, HOST_STREAM_POSITION);
 };
 
 TEST_F(Batches, KeysShowFromTheCommitOn) {
@@ -39,7 +39,7 @@ TEST_F(Batches, CommitSortsByTimeAndCarriesTheValuesAlong) {
   plugin.addKey(batch, position, {-1, 10}, 4.0, 5.0, 6.0);
   plugin.addKey(batch, position, {1, 5}, 7.0, 8.0, 9.0);
   kKeyframeSuite3.EndKeyframeBatch(1, batch);
-  const KeyColumns& keys = *streamOf(plugin, 1).keys;
+  const KeyColumns& keys = *streamOf(plugin, HOST_STREAM_POSITION).keys;
   EXPECT_THAT(keys.times, ElementsAre(T_Time{-1, 10}, T_Time{1, 5}, T_Time{3, 10}));
   EXPECT_THAT(keys.values, ElementsAre(4.0, 5.0, 6.0, 7.0, 8.0, 9.0, 1.0, 2.0, 3.0));
 }
@@ -51,7 +51,7 @@ TEST_F(Batches, OfKeysAtEqualTimesTheLaterStays) {
   plugin.addKey(batch, rotation, {2, 4}, 3.0);
   plugin.addKey(batch, rotation, {0, 7}, 4.0);
   kKeyframeSuite3.EndKeyframeBatch(1, batch);
-  const KeyColumns& keys = *streamOf(plugin, 3).keys;
+  const KeyColumns& keys = *streamOf(plugin, HOST_STREAM_ROTATION_Z).keys;
   EXPECT_THAT(keys.times, ElementsAre(T_Time{0, 7}, T_Time{2, 4}));
   EXPECT_THAT(keys.values, ElementsAre(4.0, 3.0));
 }
@@ -67,8 +67,8 @@ TEST_F(Batches, KeyWithoutValueIsDropped) {
   kKeyframeSuite3.AddBatchKeyframe(batch, 0, &late, &index);
   EXPECT_EQ(index, 2);
   kKeyframeSuite3.EndKeyframeBatch(1, batch);
-  EXPECT_THAT(streamOf(plugin, 1).keys->times, ElementsAre(T_Time{2, 10}));
-  EXPECT_THAT(streamOf(plugin, 1).keys->values, ElementsAre(1.0, 2.0, 3.0));
+  EXPECT_THAT(streamOf(plugin, HOST_STREAM_POSITION).keys->times, ElementsAre(T_Time{2, 10}));
+  EXPECT_THAT(streamOf(plugin, HOST_STREAM_POSITION).keys->values, ElementsAre(1.0, 2.0, 3.0));
 }
 
 TEST_F(Batches, KeyWithoutValueDoesNotReplaceOneAtItsTime) {
@@ -78,20 +78,20 @@ TEST_F(Batches, KeyWithoutValueDoesNotReplaceOneAtItsTime) {
   const T_Time same{2, 10};
   kKeyframeSuite3.AddBatchKeyframe(batch, 0, &same, &index);
   kKeyframeSuite3.EndKeyframeBatch(1, batch);
-  EXPECT_THAT(streamOf(plugin, 3).keys->values, ElementsAre(1.0));
+  EXPECT_THAT(streamOf(plugin, HOST_STREAM_ROTATION_Z).keys->values, ElementsAre(1.0));
 }
 
 TEST_F(Batches, CommitOfNoKeysLeavesTheStreamWithoutKeys) {
   EXPECT_EQ(kKeyframeSuite3.EndKeyframeBatch(1, plugin.open(rotation)), 0);
-  EXPECT_EQ(streamOf(plugin, 3).keys, nullptr);
-  EXPECT_EQ(streamOf(plugin, 3).keyCount(), 0U);
+  EXPECT_EQ(streamOf(plugin, HOST_STREAM_ROTATION_Z).keys, nullptr);
+  EXPECT_EQ(streamOf(plugin, HOST_STREAM_ROTATION_Z).keyCount(), 0U);
 }
 
 TEST_F(Batches, WithoutCommitNothingShows) {
   VOR_AddKeyframesInfo* batch = plugin.open(rotation);
   plugin.addKey(batch, rotation, {2, 10}, 1.0);
   EXPECT_EQ(kKeyframeSuite3.EndKeyframeBatch(0, batch), 0);
-  EXPECT_EQ(streamOf(plugin, 3).keyCount(), 0U);
+  EXPECT_EQ(streamOf(plugin, HOST_STREAM_ROTATION_Z).keyCount(), 0U);
 }
 
 TEST_F(Batches, LaterBatchMergesAndReplacesKeysAtItsTimes) {
@@ -103,17 +103,18 @@ TEST_F(Batches, LaterBatchMergesAndReplacesKeysAtItsTimes) {
   plugin.addKey(second, rotation, {2, 1}, 20.0);
   plugin.addKey(second, rotation, {30, 10}, 30.0);
   kKeyframeSuite3.EndKeyframeBatch(1, second);
-  EXPECT_THAT(streamOf(plugin, 3).keys->times, ElementsAre(T_Time{1, 1}, T_Time{2, 1}, T_Time{30, 10}));
-  EXPECT_THAT(streamOf(plugin, 3).keys->values, ElementsAre(1.0, 20.0, 30.0));
+  EXPECT_THAT(streamOf(plugin, HOST_STREAM_ROTATION_Z).keys->times,
+              ElementsAre(T_Time{1, 1}, T_Time{2, 1}, T_Time{30, 10}));
+  EXPECT_THAT(streamOf(plugin, HOST_STREAM_ROTATION_Z).keys->values, ElementsAre(1.0, 20.0, 30.0));
 }
 
 TEST_F(Batches, BatchOutlivesTheHandleThatOpenedIt) {
   VOR_AddKeyframesInfo* batch = plugin.open(rotation);
   kStreamSuite7.ReleaseStream(rotation);
-  VOR_Stream* other = plugin.acquire(layer, 3);
+  VOR_Stream* other = plugin.acquire(layer, HOST_STREAM_ROTATION_Z);
   plugin.addKey(batch, other, {1, 1}, 6.0);
   EXPECT_EQ(kKeyframeSuite3.EndKeyframeBatch(1, batch), 0);
-  EXPECT_EQ(streamOf(plugin, 3).keyCount(), 1U);
+  EXPECT_EQ(streamOf(plugin, HOST_STREAM_ROTATION_Z).keyCount(), 1U);
 }
 
 TEST_F(Batches, FiveBatchesOnFiveStreamsOfALayerAreOpenTogether) {
@@ -133,7 +134,7 @@ TEST_F(Batches, StaticValueStaysWhenKeysAreAdded) {
   VOR_AddKeyframesInfo* batch = plugin.open(rotation);
   plugin.addKey(batch, rotation, {1, 1}, 6.0);
   kKeyframeSuite3.EndKeyframeBatch(1, batch);
-  EXPECT_DOUBLE_EQ(streamOf(plugin, 3).value[0], 45.0);
+  EXPECT_DOUBLE_EQ(streamOf(plugin, HOST_STREAM_ROTATION_Z).value[0], 45.0);
 }
 
 TEST_F(Batches, ValueGivenTwiceIsTheSecond) {
@@ -142,7 +143,7 @@ TEST_F(Batches, ValueGivenTwiceIsTheSecond) {
   const StreamValueRecord again{rotation, {7.0, 0.0, 0.0, 0.0}};
   EXPECT_EQ(kKeyframeSuite4.SetBatchKeyframeValue(batch, 0, &again), 0);
   kKeyframeSuite3.EndKeyframeBatch(1, batch);
-  EXPECT_THAT(streamOf(plugin, 3).keys->values, ElementsAre(7.0));
+  EXPECT_THAT(streamOf(plugin, HOST_STREAM_ROTATION_Z).keys->values, ElementsAre(7.0));
 }
 
 TEST(KeyTimes, AreComparedExactly) {

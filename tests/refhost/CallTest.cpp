@@ -37,17 +37,18 @@ TEST_P(Calls, EachRefusalOfAStreamIsOfItsCallAlone) {
   VOR_Stream* stream = nullptr;
   VOR_Stream* other = nullptr;
   const auto succeeds = [&] {
-    EXPECT_EQ(acquire(kPluginId, layer, 3, &stream), 0);
+    EXPECT_EQ(acquire(kPluginId, layer, HOST_STREAM_ROTATION_Z, &stream), 0);
     EXPECT_EQ(kStreamSuite7.ReleaseStream(stream), 0);
   };
   succeeds();
-  EXPECT_EQ(acquire(kPluginId + 1, layer, 3, &other), HOST_ERR_BAD_PLUGIN_ID);
+  EXPECT_EQ(acquire(kPluginId + 1, layer, HOST_STREAM_ROTATION_Z, &other), HOST_ERR_BAD_PLUGIN_ID);
   succeeds();
-  EXPECT_EQ(acquire(kPluginId, reinterpret_cast<VOR_Layer*>(&other), 3, &other), HOST_ERR_BAD_HANDLE);
+  EXPECT_EQ(acquire(kPluginId, reinterpret_cast<VOR_Layer*>(&other), HOST_STREAM_ROTATION_Z, &other),
+            HOST_ERR_BAD_HANDLE);
   succeeds();
-  EXPECT_EQ(acquire(kPluginId, layer, 3, nullptr), HOST_ERR_BAD_POINTER);
+  EXPECT_EQ(acquire(kPluginId, layer, HOST_STREAM_ROTATION_Z, nullptr), HOST_ERR_BAD_POINTER);
   succeeds();
-  EXPECT_EQ(acquire(kPluginId, layer, 11, &other), HOST_ERR_NO_SUCH_STREAM);
+  EXPECT_EQ(acquire(kPluginId, layer, HOST_STREAM_ZOOM, &other), HOST_ERR_NO_SUCH_STREAM);
   succeeds();
   EXPECT_EQ(kStreamSuite7.ReleaseStream(stream), HOST_ERR_BAD_HANDLE);
   succeeds();
@@ -56,8 +57,8 @@ TEST_P(Calls, EachRefusalOfAStreamIsOfItsCallAlone) {
 }
 
 TEST_P(Calls, EachRefusalOfAKeyIsOfItsCallAlone) {
-  VOR_Stream* const stream = plugin.acquire(layer, 3);
-  VOR_Stream* const other = plugin.acquire(layer, 1);
+  VOR_Stream* const stream = plugin.acquire(layer, HOST_STREAM_ROTATION_Z);
+  VOR_Stream* const other = plugin.acquire(layer, HOST_STREAM_POSITION);
   VOR_AddKeyframesInfo* const batch = plugin.open(stream);
   std::int32_t index = -1;
   const auto succeeds = [&](std::int32_t next) {
@@ -90,20 +91,21 @@ TEST_P(Calls, EachRefusalOfAKeyIsOfItsCallAlone) {
   EXPECT_EQ(set(batch, 0, nullptr), HOST_ERR_BAD_POINTER);
   succeeds(8);
   EXPECT_EQ(kKeyframeSuite3.EndKeyframeBatch(1, batch), 0);
-  EXPECT_THAT(plugin.host().project().layers().back().findStream(3)->keys->values,
+  EXPECT_THAT(plugin.host().project().layers().back().findStream(HOST_STREAM_ROTATION_Z)->keys->values,
               ElementsAre(7, 8, 9, 10, 11, 12, 13, 14, 15));
   EXPECT_THAT(plugin.leave().refusals, SizeIs(9));
 }
 
 TEST_P(Calls, NumbersThatAStreamDoesNotHaveMayBeAnything) {
-  VOR_Stream* const stream = plugin.acquire(layer, 3);
+  VOR_Stream* const stream = plugin.acquire(layer, HOST_STREAM_ROTATION_Z);
   VOR_AddKeyframesInfo* const batch = plugin.open(stream);
   const StreamValueRecord value{stream, {7.0, std::nan(""), HUGE_VAL, std::nan("")}};
   std::int32_t index = -1;
   EXPECT_EQ(add(batch, 0, &kTime, &index), 0);
   EXPECT_EQ(set(batch, index, &value), 0);
   EXPECT_EQ(kKeyframeSuite3.EndKeyframeBatch(1, batch), 0);
-  EXPECT_THAT(plugin.host().project().layers().back().findStream(3)->keys->values, ElementsAre(7.0));
+  EXPECT_THAT(plugin.host().project().layers().back().findStream(HOST_STREAM_ROTATION_Z)->keys->values,
+              ElementsAre(7.0));
 }
 
 INSTANTIATE_TEST_SUITE_P(WithAndWithoutATrace, Calls, ::testing::Bool(),
@@ -116,13 +118,13 @@ class RehearsedCalls : public Calls {
 };
 
 TEST_P(RehearsedCalls, AnExceptionIsOfItsCallAlone) {
-  VOR_Stream* const first = plugin.acquire(layer, 3);
-  VOR_Stream* const second = plugin.acquire(layer, 3);
+  VOR_Stream* const first = plugin.acquire(layer, HOST_STREAM_ROTATION_Z);
+  VOR_Stream* const second = plugin.acquire(layer, HOST_STREAM_ROTATION_Z);
   EXPECT_EQ(kStreamSuite7.ReleaseStream(first), 0);
   EXPECT_THROW(kStreamSuite7.ReleaseStream(second), std::bad_alloc);
   EXPECT_EQ(kStreamSuite7.ReleaseStream(second), 0) << "it was not released";
   VOR_Stream* third = nullptr;
-  EXPECT_EQ(acquire(kPluginId, layer, 3, &third), 0);
+  EXPECT_EQ(acquire(kPluginId, layer, HOST_STREAM_ROTATION_Z, &third), 0);
 }
 
 INSTANTIATE_TEST_SUITE_P(WithAndWithoutATrace, RehearsedCalls, ::testing::Bool(),

@@ -103,8 +103,8 @@ class KeyCeiling : public testing::Test {
 
   StandIn plugin;
   VOR_Layer* layer = plugin.makeNull(plugin.makeComp());
-  VOR_Stream* turn = plugin.acquire(layer, 3);
-  VOR_Stream* tilt = plugin.acquire(layer, 8);
+  VOR_Stream* turn = plugin.acquire(layer, HOST_STREAM_ROTATION_Z);
+  VOR_Stream* tilt = plugin.acquire(layer, HOST_STREAM_ROTATION_X);
   VOR_AddKeyframesInfo* batch = plugin.open(turn);
 };
 
@@ -112,7 +112,7 @@ TEST_F(KeyCeiling, AKeyBeyondTheMostIsRefusedAndTheOthersStay) {
   for (std::int32_t at = 0; at < 3; ++at) EXPECT_EQ(addKey(batch, at, turn), 0);
   EXPECT_EQ(addKey(batch, 3, turn), HOST_ERR_TOO_MANY_KEYS);
   EXPECT_EQ(kKeyframeSuite3.EndKeyframeBatch(1, batch), 0);
-  const Stream* stream = plugin.host().project().layers()[0].findStream(3);
+  const Stream* stream = plugin.host().project().layers()[0].findStream(HOST_STREAM_ROTATION_Z);
   EXPECT_THAT(stream->keys->values, ElementsAre(1.0, 2.0, 3.0));
   EXPECT_THAT(plugin.leave().refusals, ElementsAre("AddBatchKeyframe: the host takes no more than 3 keys"));
 }
@@ -154,7 +154,7 @@ TEST_F(KeyCeiling, KeysOfABatchThatWasLeftBehindMakeRoomForOthers) {
   for (std::int32_t at = 0; at < 3; ++at) EXPECT_EQ(addKey(batch, at, turn), 0);
   EXPECT_THAT(plugin.leave().leftovers[2].description, HasSubstr("batch:1"));
   plugin.enterAgain(Callback::Import);
-  turn = plugin.acquire(layer, 3);
+  turn = plugin.acquire(layer, HOST_STREAM_ROTATION_Z);
   batch = plugin.open(turn);
   for (std::int32_t at = 0; at < 3; ++at) EXPECT_EQ(addKey(batch, at, turn), 0);
   EXPECT_EQ(addKey(batch, 3, turn), HOST_ERR_TOO_MANY_KEYS);
@@ -175,12 +175,12 @@ TEST(Ceilings, AKeyBeyondTheMostIsRefusedWithoutATraceToo) {
   VOR_AddKeyframesInfo* batch = nullptr;
   ASSERT_EQ(kCompSuite21.CreateComp(folder, kName, 64, 48, &one, &second, &one, &comp), 0);
   ASSERT_EQ(kCompSuite9.NewNullLayer("n", comp, &second, &layer), 0);
-  ASSERT_EQ(kStreamSuite7.AcquireLayerStream(kPluginId, layer, 3, &stream), 0);
+  ASSERT_EQ(kStreamSuite7.AcquireLayerStream(kPluginId, layer, HOST_STREAM_ROTATION_Z, &stream), 0);
   ASSERT_EQ(kKeyframeSuite3.BeginKeyframeBatch(stream, &batch), 0);
   for (std::int32_t at = 0; at < kMost; ++at) ASSERT_EQ(addKey(batch, at, stream), 0) << at;
   EXPECT_EQ(addKey(batch, kMost, stream), HOST_ERR_TOO_MANY_KEYS);
   EXPECT_EQ(kKeyframeSuite3.EndKeyframeBatch(1, batch), 0);
-  EXPECT_EQ(host.project().layers()[0].findStream(3)->keyCount(), std::size_t{kMost});
+  EXPECT_EQ(host.project().layers()[0].findStream(HOST_STREAM_ROTATION_Z)->keyCount(), std::size_t{kMost});
 }
 
 TEST(Ceilings, TheKeysOnANewCamerasZoomCount) {

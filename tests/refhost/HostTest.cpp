@@ -60,7 +60,7 @@ HostError entry(const WNBasicSuite* basic, std::int32_t, std::int32_t, std::int3
   seen->reserved = reserved;
   HostPrefsStore* store = nullptr;
   kPersistentDataSuite3.GetAppPrefsBlob(&store);
-  kPersistentDataSuite3.GetPrefLong(store, "Maya Camera", "Use Linear Units", 0, &seen->linearUnits);
+  kPersistentDataSuite3.GetPrefLong(store, HOST_PREF_SECTION, HOST_PREF_LINEAR_UNITS, 0, &seen->linearUnits);
   kRegisterSuite6.RegisterDeathHook(pluginId, deathHook, 77);
   if (seen->entryCode != 0) return seen->entryCode;
   HostImporterId importer = 0;
@@ -284,8 +284,9 @@ TEST_F(HostCalls, LinearUnitsAreThoseThatThePluginWasHandedLast) {
   HostPrefsStore* store = nullptr;
   std::int32_t value = 0;
   ASSERT_EQ(kPersistentDataSuite3.GetAppPrefsBlob(&store), 0);
-  ASSERT_EQ(kPersistentDataSuite3.GetPrefLong(store, "Maya Camera", "Another", 9, &value), 0);
-  EXPECT_EQ(kPersistentDataSuite3.GetPrefLong(store, "Maya Camera", "Use Linear Units", 8, &value), 5);
+  ASSERT_EQ(kPersistentDataSuite3.GetPrefLong(store, HOST_PREF_SECTION, "Another", 9, &value), 0);
+  EXPECT_EQ(kPersistentDataSuite3.GetPrefLong(store, HOST_PREF_SECTION, HOST_PREF_LINEAR_UNITS, 8, &value),
+            5);
   host.endCallback(0);
   EXPECT_EQ(host.linearUnits(), 6);
 }
@@ -312,9 +313,10 @@ TEST_F(HostCalls, WithoutAStoreTheDefaultIsTheAnswerAndNoEntryIsMade) {
   host.load(entry, &loaded);
   host.beginCallback(Callback::Entry, {});
   std::int32_t value = 0;
-  EXPECT_EQ(kPersistentDataSuite3.GetPrefLong(nullptr, "Maya Camera", "Another", 9, &value), 0);
+  EXPECT_EQ(kPersistentDataSuite3.GetPrefLong(nullptr, HOST_PREF_SECTION, "Another", 9, &value), 0);
   EXPECT_EQ(value, 9);
-  EXPECT_EQ(kPersistentDataSuite3.GetPrefLong(nullptr, "Maya Camera", "Use Linear Units", 8, &value), 0);
+  EXPECT_EQ(kPersistentDataSuite3.GetPrefLong(nullptr, HOST_PREF_SECTION, HOST_PREF_LINEAR_UNITS, 8, &value),
+            0);
   EXPECT_EQ(value, 8);
   EXPECT_THAT(host.endCallback(0).refusals, IsEmpty());
   EXPECT_EQ(host.linearUnits(), 8);

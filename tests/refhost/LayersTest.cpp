@@ -31,20 +31,20 @@ TEST(Layers, CameraStreamsExistWithTheirDefaults) {
   const Layer& camera = plugin.host().project().layers().back();
   EXPECT_EQ(camera.kind, LayerKind::Camera);
   EXPECT_THAT(streamIds(camera), ElementsAre(0, 1, 2, 3, 8, 9, 11));
-  expectValue(camera, 0, 320.0, 240.0, 0.0);
-  expectValue(camera, 1, 0.0, 0.0, 0.0);
-  expectValue(camera, 2, 100.0, 100.0, 100.0);
-  expectValue(camera, 3, 0.0, 0.0, 0.0);
-  expectValue(camera, 8, 0.0, 0.0, 0.0);
-  expectValue(camera, 9, 0.0, 0.0, 0.0);
-  expectValue(camera, 11, 640.0, 0.0, 0.0);
+  expectValue(camera, HOST_STREAM_ANCHOR_POINT, 320.0, 240.0, 0.0);
+  expectValue(camera, HOST_STREAM_POSITION, 0.0, 0.0, 0.0);
+  expectValue(camera, HOST_STREAM_SCALE, 100.0, 100.0, 100.0);
+  expectValue(camera, HOST_STREAM_ROTATION_Z, 0.0, 0.0, 0.0);
+  expectValue(camera, HOST_STREAM_ROTATION_X, 0.0, 0.0, 0.0);
+  expectValue(camera, HOST_STREAM_ROTATION_Y, 0.0, 0.0, 0.0);
+  expectValue(camera, HOST_STREAM_ZOOM, 640.0, 0.0, 0.0);
 }
 
 TEST(Layers, CentreOfACameraIsItsPointOfInterest) {
   StandIn plugin;
   VOR_Layer* layer = nullptr;
   kCompSuite9.NewCameraLayer("cam", plugin.makeComp(), 12.5, -3.0, &layer);
-  expectValue(plugin.host().project().layers().back(), 0, 12.5, -3.0, 0.0);
+  expectValue(plugin.host().project().layers().back(), HOST_STREAM_ANCHOR_POINT, 12.5, -3.0, 0.0);
 }
 
 TEST(Layers, NullStreamsExistWithTheirDefaults) {
@@ -53,12 +53,12 @@ TEST(Layers, NullStreamsExistWithTheirDefaults) {
   const Layer& null = plugin.host().project().layers().back();
   EXPECT_EQ(null.kind, LayerKind::Null);
   EXPECT_THAT(streamIds(null), ElementsAre(0, 1, 2, 3, 8, 9));
-  expectValue(null, 0, 0.0, 0.0, 0.0);
-  expectValue(null, 1, 0.0, 0.0, 0.0);
-  expectValue(null, 2, 100.0, 100.0, 100.0);
-  EXPECT_EQ(null.findStream(11), nullptr);
-  EXPECT_EQ(null.findStream(2)->dimension, 3);
-  EXPECT_EQ(null.findStream(9)->dimension, 1);
+  expectValue(null, HOST_STREAM_ANCHOR_POINT, 0.0, 0.0, 0.0);
+  expectValue(null, HOST_STREAM_POSITION, 0.0, 0.0, 0.0);
+  expectValue(null, HOST_STREAM_SCALE, 100.0, 100.0, 100.0);
+  EXPECT_EQ(null.findStream(HOST_STREAM_ZOOM), nullptr);
+  EXPECT_EQ(null.findStream(HOST_STREAM_SCALE)->dimension, 3);
+  EXPECT_EQ(null.findStream(HOST_STREAM_ROTATION_Y)->dimension, 1);
 }
 
 TEST(Layers, ZoomKeysAreThereFromTheStart) {
@@ -66,7 +66,7 @@ TEST(Layers, ZoomKeysAreThereFromTheStart) {
   options.zoomKeys = 3;
   StandIn plugin(options);
   plugin.makeCamera(plugin.makeComp());
-  const Stream& zoom = *plugin.host().project().layers().back().findStream(11);
+  const Stream& zoom = *plugin.host().project().layers().back().findStream(HOST_STREAM_ZOOM);
   ASSERT_EQ(zoom.keyCount(), 3U);
   EXPECT_EQ(zoom.keys->times[2].value, 2);
   EXPECT_EQ(zoom.keys->times[2].scale, 1U);
@@ -129,11 +129,11 @@ TEST(Layers, ParentChangesNoValue) {
   StandIn plugin;
   VOR_CompItem* comp = plugin.makeComp();
   VOR_Layer* child = plugin.makeNull(comp);
-  VOR_Stream* stream = plugin.acquire(child, 1);
+  VOR_Stream* stream = plugin.acquire(child, HOST_STREAM_POSITION);
   const StreamValueRecord value{stream, {1.0, 2.0, 3.0, 0.0}};
   kStreamSuite8.SetStreamValue(kPluginId, stream, &value);
   ASSERT_EQ(kLayerSuite10.SetLayerParent(child, plugin.makeNull(comp)), 0);
-  expectValue(plugin.host().project().layers()[0], 1, 1.0, 2.0, 3.0);
+  expectValue(plugin.host().project().layers()[0], HOST_STREAM_POSITION, 1.0, 2.0, 3.0);
 }
 
 TEST(Layers, LayerCanMoveToAnotherParent) {

@@ -41,8 +41,8 @@ TEST(Ledger, EverythingThatIsStillHeldIsListed) {
   basic.AcquireSuite(QZGP_LAYER_SUITE, 10, &suite);
   basic.AcquireSuite(QZGP_LAYER_SUITE, 10, &suite);
   basic.AcquireSuite(QZGP_MEMORY_SUITE, 1, &suite);
-  VOR_Stream* stream = plugin.acquire(layer, 1);
-  plugin.acquire(layer, 8);
+  VOR_Stream* stream = plugin.acquire(layer, HOST_STREAM_POSITION);
+  plugin.acquire(layer, HOST_STREAM_ROTATION_X);
   VOR_AddKeyframesInfo* batch = plugin.open(stream);
   plugin.addKey(batch, stream, {1, 1}, 1.0);
   kStreamSuite7.ReleaseStream(stream);
@@ -63,7 +63,7 @@ TEST(Ledger, WhatWasGivenBackIsNotListed) {
   const void* suite = nullptr;
   plugin.host().basicSuite()->AcquireSuite(QZGP_LAYER_SUITE, 10, &suite);
   plugin.host().basicSuite()->ReleaseSuiteByName(QZGP_LAYER_SUITE, 10);
-  VOR_Stream* stream = plugin.acquire(layer, 1);
+  VOR_Stream* stream = plugin.acquire(layer, HOST_STREAM_POSITION);
   kKeyframeSuite3.EndKeyframeBatch(1, plugin.open(stream));
   kStreamSuite7.ReleaseStream(stream);
   HostMemHandle* memory = nullptr;
@@ -77,16 +77,16 @@ TEST(Ledger, WhatWasGivenBackIsNotListed) {
 TEST(Ledger, IsFreshForEachCallback) {
   StandIn plugin;
   VOR_Layer* layer = plugin.makeNull(plugin.makeComp());
-  VOR_Stream* stream = plugin.acquire(layer, 1);
+  VOR_Stream* stream = plugin.acquire(layer, HOST_STREAM_POSITION);
   VOR_AddKeyframesInfo* batch = plugin.open(stream);
   plugin.addKey(batch, stream, {1, 1}, 1.0);
   EXPECT_THAT(plugin.leave().leftovers, SizeIs(2));
   plugin.enterAgain(Callback::Import);
   EXPECT_EQ(kStreamSuite7.ReleaseStream(stream), HOST_ERR_BAD_HANDLE);
   EXPECT_EQ(kKeyframeSuite3.EndKeyframeBatch(1, batch), HOST_ERR_BAD_HANDLE);
-  EXPECT_EQ(plugin.host().project().layers()[0].findStream(1)->keyCount(), 0U);
+  EXPECT_EQ(plugin.host().project().layers()[0].findStream(HOST_STREAM_POSITION)->keyCount(), 0U);
   // Its batch was dropped with it, so the stream is free for another.
-  VOR_Stream* again = plugin.acquire(layer, 1);
+  VOR_Stream* again = plugin.acquire(layer, HOST_STREAM_POSITION);
   kKeyframeSuite3.EndKeyframeBatch(1, plugin.open(again));
   kStreamSuite7.ReleaseStream(again);
   EXPECT_THAT(plugin.leave().leftovers, IsEmpty());
@@ -196,7 +196,8 @@ TEST(Ledger, OtherStreamsWhoseValueWasRefusedAreLeaks) {
   VOR_CompItem* comp = plugin.makeComp();
   VOR_Layer* null = plugin.makeNull(comp);
   VOR_Layer* camera = plugin.makeCamera(comp);
-  for (VOR_Stream* stream : {plugin.acquire(null, 1), plugin.acquire(camera, 0)}) {
+  for (VOR_Stream* stream :
+       {plugin.acquire(null, HOST_STREAM_POSITION), plugin.acquire(camera, HOST_STREAM_ANCHOR_POINT)}) {
     const StreamValueRecord record{stream, {HUGE_VAL, 0.0, 0.0, 0.0}};
     EXPECT_EQ(kStreamSuite8.SetStreamValue(kPluginId, stream, &record), HOST_ERR_BAD_VALUE);
   }

@@ -101,9 +101,11 @@ TEST(Refusals, NullPointers) {
       {3002, "AddLayerFromItem: the place for the layer is a null pointer",
        [](Scene& s) { return kLayerSuite10.AddLayerFromItem(s.compItem, s.otherComp, nullptr); }},
       {3002, "SetCameraFilmSize: the film size is a null pointer",
-       [](Scene& s) { return kCameraSuite2.SetCameraFilmSize(s.camera, 1, nullptr); }},
+       [](Scene& s) { return kCameraSuite2.SetCameraFilmSize(s.camera, HOST_FILM_HORIZONTAL, nullptr); }},
       {3002, "AcquireLayerStream: the place for the stream is a null pointer",
-       [](Scene& s) { return kStreamSuite7.AcquireLayerStream(kPluginId, s.parent, 1, nullptr); }},
+       [](Scene& s) {
+         return kStreamSuite7.AcquireLayerStream(kPluginId, s.parent, HOST_STREAM_POSITION, nullptr);
+       }},
       {3002, "SetStreamValue: the value record is a null pointer",
        [](Scene& s) { return kStreamSuite8.SetStreamValue(kPluginId, s.rotation, nullptr); }},
       {3002, "GetStreamKeyframeCount: the place for the count is a null pointer",

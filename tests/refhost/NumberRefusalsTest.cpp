@@ -80,7 +80,8 @@ TEST(Refusals, RefusedCallChangesNothing) {
     EXPECT_EQ(project.compositions().size(), compositions) << refusal.sentence;
     EXPECT_EQ(project.layers().size(), layers) << refusal.sentence;
     EXPECT_EQ(project.layers()[2].filmDirection, 0) << refusal.sentence;
-    EXPECT_DOUBLE_EQ(project.layers()[0].findStream(3)->value[0], 0.0) << refusal.sentence;
+    EXPECT_DOUBLE_EQ(project.layers()[0].findStream(HOST_STREAM_ROTATION_Z)->value[0], 0.0)
+        << refusal.sentence;
   }
 }
 

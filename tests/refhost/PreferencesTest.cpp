@@ -7,6 +7,7 @@
 #include <fstream>
 #include <sstream>
 
+#include "hostapi/PersistentDataSuite.h"
 #include "tests/support/TemporaryFolder.h"
 
 namespace refhost {
@@ -20,7 +21,7 @@ TEST(Preferences, MissingFileCountsAsEmpty) {
   const TemporaryFolder folder;
   const Preferences preferences(folder.path() / "none");
   EXPECT_FALSE(preferences.fileExists());
-  EXPECT_FALSE(preferences.find("Maya Camera", "Use Linear Units").has_value());
+  EXPECT_FALSE(preferences.find(HOST_PREF_SECTION, HOST_PREF_LINEAR_UNITS).has_value());
 }
 
 TEST(Preferences, EntriesBelongToTheirSection) {
@@ -58,13 +59,13 @@ TEST(Preferences, WhatIsWrittenIsReadAgain) {
   const TemporaryFolder folder;
   const fs::path file = folder.path() / "deep" / "er" / "store";
   Preferences written(file);
-  written.set("Maya Camera", "Use Linear Units", 1);
+  written.set(HOST_PREF_SECTION, HOST_PREF_LINEAR_UNITS, 1);
   written.set("Other [x]", "k", -2);
   std::string failure;
   ASSERT_TRUE(written.write(&failure)) << failure;
   EXPECT_EQ(folder.read("deep/er/store"), "[Maya Camera]\nUse Linear Units=1\n[Other [x]]\nk=-2\n");
   const Preferences read(file);
-  EXPECT_EQ(read.find("Maya Camera", "Use Linear Units"), 1);
+  EXPECT_EQ(read.find(HOST_PREF_SECTION, HOST_PREF_LINEAR_UNITS), 1);
   EXPECT_EQ(read.find("Other [x]", "k"), -2);
 }
 

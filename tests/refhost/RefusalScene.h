@@ -30,22 +30,22 @@ struct Scene {
   }
 
   StandIn plugin;
-  VOR_CompItem* comp = plugin.makeComp();               // comp:1
-  VOR_CompItem* otherComp = plugin.makeComp();          // comp:2
-  VOR_Layer* parent = plugin.makeNull(comp);            // layer:1
-  VOR_Layer* child = plugin.makeNull(comp);             // layer:2
-  VOR_Layer* camera = plugin.makeCamera(comp);          // layer:3
-  VOR_Layer* elsewhere = plugin.makeNull(otherComp);    // layer:4
-  VOR_Stream* rotation = plugin.acquire(parent, 3);     // stream:1
-  VOR_Stream* position = plugin.acquire(parent, 1);     // stream:2
-  VOR_Stream* released = plugin.acquire(parent, 2);     // stream:3
-  VOR_AddKeyframesInfo* ended = plugin.open(position);  // batch:1
-  VOR_AddKeyframesInfo* batch = plugin.open(rotation);  // batch:2, with one key
-  VOR_Item* compItem = nullptr;                         // item:2
-  HostMemHandle* memory = nullptr;                      // mem:1
-  HostMemHandle* freed = nullptr;                       // mem:2
-  HostPrefsStore* store = nullptr;                      // store:1
-  HostImporterId importer = 0;                          // importer:1
+  VOR_CompItem* comp = plugin.makeComp();                                 // comp:1
+  VOR_CompItem* otherComp = plugin.makeComp();                            // comp:2
+  VOR_Layer* parent = plugin.makeNull(comp);                              // layer:1
+  VOR_Layer* child = plugin.makeNull(comp);                               // layer:2
+  VOR_Layer* camera = plugin.makeCamera(comp);                            // layer:3
+  VOR_Layer* elsewhere = plugin.makeNull(otherComp);                      // layer:4
+  VOR_Stream* rotation = plugin.acquire(parent, HOST_STREAM_ROTATION_Z);  // stream:1
+  VOR_Stream* position = plugin.acquire(parent, HOST_STREAM_POSITION);    // stream:2
+  VOR_Stream* released = plugin.acquire(parent, HOST_STREAM_SCALE);       // stream:3
+  VOR_AddKeyframesInfo* ended = plugin.open(position);                    // batch:1
+  VOR_AddKeyframesInfo* batch = plugin.open(rotation);                    // batch:2, with one key
+  VOR_Item* compItem = nullptr;                                           // item:2
+  HostMemHandle* memory = nullptr;                                        // mem:1
+  HostMemHandle* freed = nullptr;                                         // mem:2
+  HostPrefsStore* store = nullptr;                                        // store:1
+  HostImporterId importer = 0;                                            // importer:1
 
   HostRatio aspect{1, 1};
   T_Time duration{10, 1};

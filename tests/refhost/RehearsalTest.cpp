@@ -119,10 +119,10 @@ TEST(Rehearsal, NullPointerForWhatIsHandedOutIsLeftAlone) {
 TEST(Rehearsal, NumberOfAHandleThatWasNotHandedOutIsTheNextOnes) {
   StandIn plugin(withFailure(codeFailure("AcquireLayerStream", 2, 5)));
   VOR_Layer* layer = plugin.makeNull(plugin.makeComp());
-  plugin.acquire(layer, 1);
+  plugin.acquire(layer, HOST_STREAM_POSITION);
   VOR_Stream* none = nullptr;
-  EXPECT_EQ(kStreamSuite7.AcquireLayerStream(kPluginId, layer, 1, &none), 5);
-  plugin.acquire(layer, 1);
+  EXPECT_EQ(kStreamSuite7.AcquireLayerStream(kPluginId, layer, HOST_STREAM_POSITION, &none), 5);
+  plugin.acquire(layer, HOST_STREAM_POSITION);
   EXPECT_THAT(plugin.lastLine(), ::testing::HasSubstr("\"stream\":\"stream:2\""));
 }
 

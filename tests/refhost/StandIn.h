@@ -10,6 +10,7 @@
 #include <vector>
 
 #include "hostapi/ErrorCodes.h"
+#include "hostapi/LayerStreams.h"
 #include "refhost/Host.h"
 #include "refhost/SuiteShelf.h"
 

@@ -13,7 +13,7 @@ TEST(Refusals, PluginIdThatIsNotTheCallers) {
       {3003, "RegisterDeathHook: the plug-in id -7 is not 7",
        [](Scene&) { return kRegisterSuite6.RegisterDeathHook(-7, someHook, 0); }},
       {3003, "AcquireLayerStream: the plug-in id 9 is not 7",
-       [](Scene& s) { return s.acquire(9, s.parent, 1); }},
+       [](Scene& s) { return s.acquire(9, s.parent, HOST_STREAM_POSITION); }},
       {3003, "SetStreamValue: the plug-in id 10 is not 7",
        [](Scene& s) {
          const StreamValueRecord record{s.rotation, {}};

@@ -91,7 +91,7 @@ TEST(Trace, RegistrationCalls) {
   const HostImporterExtension extension{{'.', 'm', 'a', '\0'}};
   const HostImporterCallbacks callbacks{nullptr, ignoredImport, ignoredVerify};
   kPersistentDataSuite3.GetAppPrefsBlob(&store);
-  kPersistentDataSuite3.GetPrefLong(store, "Maya Camera", "Use Linear Units", 0, &value);
+  kPersistentDataSuite3.GetPrefLong(store, HOST_PREF_SECTION, HOST_PREF_LINEAR_UNITS, 0, &value);
   kRegisterSuite6.RegisterDeathHook(kPluginId, ignoredHook, 0);
   kFileImportManagerSuite3.RegisterImporterName("Maya Scene", &importer);
   kFileImportManagerSuite3.RegisterImporterTypes(importer, 1, &type, 1, &extension);
@@ -136,9 +136,9 @@ TEST(Trace, CompositionAndLayerCalls) {
   kCompSuite9.GetItemFromComp(comp, &item);
   kLayerSuite10.AddLayerFromItem(item, other, &nested);
   kCompSuite9.NewCameraLayer("cam\xFFShape", comp, -2147483648.0, 1.5, &camera);
-  kCameraSuite2.SetCameraFilmSize(camera, 1, &filmSize);
+  kCameraSuite2.SetCameraFilmSize(camera, HOST_FILM_HORIZONTAL, &filmSize);
   kCompSuite9.NewNullLayer("rig", comp, &wholeLength, &null);
-  kLayerSuite10.SetLayerFlag(null, 0x800, 1);
+  kLayerSuite10.SetLayerFlag(null, HOST_LAYER_FLAG_3D, 1);
   kLayerSuite10.SetLayerParent(camera, null);
   EXPECT_THAT(
       plugin.lines(),
@@ -158,14 +158,14 @@ TEST(Trace, StreamAndKeyframeCalls) {
   StandIn plugin;
   VOR_Layer* layer = plugin.makeNull(plugin.makeComp());
   const std::size_t before = plugin.lines().size();
-  VOR_Stream* stream = plugin.acquire(layer, 1);
+  VOR_Stream* stream = plugin.acquire(layer, HOST_STREAM_POSITION);
   const StreamValueRecord record{stream, {636.3812, -0.0, 3.0, 4.0}};
   kStreamSuite8.SetStreamValue(kPluginId, stream, &record);
   std::int32_t count = -1;
   kKeyframeSuite3.GetStreamKeyframeCount(stream, &count);
   VOR_AddKeyframesInfo* batch = plugin.open(stream);
   kStreamSuite7.ReleaseStream(stream);
-  VOR_Stream* again = plugin.acquire(layer, 1);
+  VOR_Stream* again = plugin.acquire(layer, HOST_STREAM_POSITION);
   plugin.addKey(batch, again, {500, 24000}, 1.0, 2.0, 1e-7);
   kKeyframeSuite3.EndKeyframeBatch(1, batch);
   std::vector<std::string> lines = plugin.lines();
@@ -207,7 +207,7 @@ TEST(Trace, NullArgumentsOfEveryCallAreWrittenAsNull) {
   plugin.host().basicSuite()->AcquireSuite(nullptr, 3, nullptr);
   kCompSuite21.CreateComp(plugin.folder(), nullptr, 1, 2, nullptr, nullptr, nullptr, nullptr);
   kFileImportManagerSuite3.RegisterImporterTypes(0, 1, nullptr, 1, nullptr);
-  kCameraSuite2.SetCameraFilmSize(nullptr, 1, nullptr);
+  kCameraSuite2.SetCameraFilmSize(nullptr, HOST_FILM_HORIZONTAL, nullptr);
   kUtilitySuite7.ShowMessage(kPluginId, nullptr);
   EXPECT_THAT(
       plugin.lines(),
@@ -233,7 +233,7 @@ TEST(Trace, InfinitiesOfAPermissiveHostAreStrings) {
   options.permissive = true;
   StandIn plugin(options);
   VOR_Layer* camera = plugin.makeCamera(plugin.makeComp());
-  VOR_Stream* stream = plugin.acquire(camera, 11);
+  VOR_Stream* stream = plugin.acquire(camera, HOST_STREAM_ZOOM);
   const StreamValueRecord record{stream, {HUGE_VAL, -HUGE_VAL, std::nan(""), 0.0}};
   kStreamSuite8.SetStreamValue(kPluginId, stream, &record);
   EXPECT_EQ(

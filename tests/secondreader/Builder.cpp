@@ -3,15 +3,14 @@
 
 #include <utility>
 
+#include "hostapi/CameraSuite.h"
+#include "hostapi/LayerStreams.h"
+#include "hostapi/LayerSuite.h"
 #include "tests/secondreader/Numbers.h"
 
 namespace secondreader {
 namespace {
 
-constexpr std::int32_t kAimedFlag = 8192;
-constexpr std::int32_t kThreeDimensionalFlag = 0x800;
-constexpr std::int32_t kPosition = 1;
-constexpr std::int32_t kZoom = 11;
 constexpr int kSquareWord = 6;
 constexpr int kSquarePattern = 7;
 
@@ -112,7 +111,7 @@ void Builder::makeCamera(Handle comp, const Camera& camera) {
 void Builder::makeLocator(Handle comp, const Locator& locator) {
   Handle layer = 0;
   check(suites_.newNullLayer(locator.name, comp, &layer));
-  check(suites_.setLayerFlag(layer, kThreeDimensionalFlag, 1));
+  check(suites_.setLayerFlag(layer, HOST_LAYER_FLAG_3D, 1));
   const int transform = findNamed(scene_.transforms, locator.parent);
   if (transform >= 0) setTransformAndKeys(layer, scene_.transforms[static_cast<std::size_t>(transform)]);
   makeParents(comp, layer, transform);
@@ -129,7 +128,7 @@ void Builder::makeParents(Handle comp, Handle child, int transform) {
     if (transform >= 0 && used[static_cast<std::size_t>(transform)]) return;
     Handle null = 0;
     check(suites_.newNullLayer(name, comp, &null));
-    check(suites_.setLayerFlag(null, kThreeDimensionalFlag, 1));
+    check(suites_.setLayerFlag(null, HOST_LAYER_FLAG_3D, 1));
     check(suites_.setLayerParent(child, null));
     if (transform >= 0) setTransformAndKeys(null, scene_.transforms[static_cast<std::size_t>(transform)]);
     child = null;
@@ -142,13 +141,12 @@ void Builder::setTransformAndKeys(Handle layer, const Transform& transform) {
 }
 
 void Builder::setCamera(Handle layer, const Camera& camera) {
-  constexpr std::int32_t kHorizontal = 1;
-  constexpr std::int32_t kVertical = 2;
-  check(suites_.setLayerFlag(layer, kAimedFlag, 0));
-  setStreamUnguarded(layer, kPosition, {});
+  check(suites_.setLayerFlag(layer, HOST_LAYER_FLAG_AIMED, 0));
+  setStreamUnguarded(layer, HOST_STREAM_POSITION, {});
   const double film = convert_.filmSize(camera);
-  check(suites_.setCameraFilmSize(layer, camera.verticalFit ? kVertical : kHorizontal, film));
-  setStreamUnguarded(layer, kZoom, {convert_.zoom(camera, camera.focalLength)});
+  check(
+      suites_.setCameraFilmSize(layer, camera.verticalFit ? HOST_FILM_VERTICAL : HOST_FILM_HORIZONTAL, film));
+  setStreamUnguarded(layer, HOST_STREAM_ZOOM, {convert_.zoom(camera, camera.focalLength)});
   const int transform = findNamed(scene_.transforms, camera.parent);
   if (transform >= 0) setTransform(layer, scene_.transforms[static_cast<std::size_t>(transform)]);
 }
@@ -160,7 +158,7 @@ bool Builder::aim(Handle layer, const Camera& camera, const Transform& constrain
   };
   if (!same(linked(kConstrained).name, camera.parent)) return false;
   const Transform target = linked(kTarget);
-  check(suites_.setLayerFlag(layer, kAimedFlag, 1));
+  check(suites_.setLayerFlag(layer, HOST_LAYER_FLAG_AIMED, 1));
   setAnchor(layer, target);
   animateAnchor(layer, target);
   return true;

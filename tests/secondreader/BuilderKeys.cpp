@@ -1,6 +1,7 @@
 // Keys: counted, sampled one by one, and written.
 #include <array>
 
+#include "hostapi/LayerStreams.h"
 #include "tests/secondreader/AngleRounding.h"
 #include "tests/secondreader/Builder.h"
 #include "tests/secondreader/BuilderTemplates.h"
@@ -59,7 +60,12 @@ void Builder::sample(const Transform& node, std::size_t group, std::size_t key, 
 void Builder::animate(Handle layer, const Transform& node) {
   const int count = keyCount(node);
   if (count < 1) return;
-  withBatches(layer, {{2}, {8}, {9}, {3}, {1}}, [&](const std::vector<Batch>& batches) {
+  const std::vector<Batch> animated = {{HOST_STREAM_SCALE},
+                                       {HOST_STREAM_ROTATION_X},
+                                       {HOST_STREAM_ROTATION_Y},
+                                       {HOST_STREAM_ROTATION_Z},
+                                       {HOST_STREAM_POSITION}};
+  withBatches(layer, animated, [&](const std::vector<Batch>& batches) {
     Triple previous{};
     std::array<AngleRounding, 3> angleRoundings;
     for (std::size_t key = 0; key < static_cast<std::size_t>(count); ++key) {
@@ -90,7 +96,7 @@ void Builder::animate(Handle layer, const Transform& node) {
 void Builder::animateAnchor(Handle layer, const Transform& node) {
   const int count = keyCount(node);
   if (count < 1) return;
-  withBatches(layer, {{0}}, [&](const std::vector<Batch>& batches) {
+  withBatches(layer, {{HOST_STREAM_ANCHOR_POINT}}, [&](const std::vector<Batch>& batches) {
     for (std::size_t key = 0; key < static_cast<std::size_t>(count); ++key) {
       const T_Time time = keyTime(node, key);
       Triple point = node.translate;
@@ -113,15 +119,14 @@ void Builder::zoomKeys(Handle stream, Batch& batch, const Camera& camera, const 
 }
 
 void Builder::animateCamera(Handle layer, const Camera& camera) {
-  constexpr std::int32_t kZoom = 11;
   const int curve = camera.focalLengthCurve;
   const auto keys = curve < 0 ? nullptr : scene_.curves[static_cast<std::size_t>(curve)].keys;
   if (keys != nullptr && !keys->empty()) {
     Handle stream = 0;
-    Batch batch{kZoom};
+    Batch batch{HOST_STREAM_ZOOM};
     bool held = false;
     HostError kept = suites_.host().guarded([&] {
-      check(suites_.acquireLayerStream(layer, kZoom, &stream));
+      check(suites_.acquireLayerStream(layer, HOST_STREAM_ZOOM, &stream));
       std::int32_t count = 0;
       check(suites_.getStreamKeyframeCount(stream, &count));
       held = count > 0;

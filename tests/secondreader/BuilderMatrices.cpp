@@ -1,4 +1,5 @@
 // Static transforms, and the matrix that keys use too.
+#include "hostapi/LayerStreams.h"
 #include "tests/secondreader/AngleRounding.h"
 #include "tests/secondreader/Builder.h"
 
@@ -49,18 +50,19 @@ void Builder::setTransform(Handle layer, const Transform& transform) {
   const auto setAngle = [&](std::int32_t stream, double angle) {
     setStream(layer, stream, {angle * kDegreesPerRadian, 0.0, 0.0, AngleRounding().first(angle)});
   };
-  setStream(layer, 0, {});
-  setStream(layer, 2,
+  setStream(layer, HOST_STREAM_ANCHOR_POINT, {});
+  setStream(layer, HOST_STREAM_SCALE,
             {parts.scale[0] * kPercent, parts.scale[1] * kPercent, parts.scale[2] * kPercent, rounding});
-  setAngle(8, parts.rotation[0]);
-  setAngle(9, parts.rotation[1]);
-  setAngle(3, parts.rotation[2]);
-  setStream(layer, 1, {parts.translation[0], parts.translation[1], parts.translation[2], rounding});
+  setAngle(HOST_STREAM_ROTATION_X, parts.rotation[0]);
+  setAngle(HOST_STREAM_ROTATION_Y, parts.rotation[1]);
+  setAngle(HOST_STREAM_ROTATION_Z, parts.rotation[2]);
+  setStream(layer, HOST_STREAM_POSITION,
+            {parts.translation[0], parts.translation[1], parts.translation[2], rounding});
 }
 
 void Builder::setAnchor(Handle layer, const Transform& transform) {
   const Triple point = hostPoint(transform.translate);
-  setStream(layer, 0, {point[0], point[1], point[2]});
+  setStream(layer, HOST_STREAM_ANCHOR_POINT, {point[0], point[1], point[2]});
 }
 
 }  // namespace secondreader

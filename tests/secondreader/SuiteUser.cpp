@@ -1,6 +1,8 @@
 // The suites themselves, and those of the plug-in's own life: messages, memory, preferences, registration.
 #include "tests/secondreader/SuiteUser.h"
 
+#include "hostapi/PersistentDataSuite.h"
+
 namespace secondreader {
 namespace {
 
@@ -107,7 +109,10 @@ HostError SuiteUser::getPrefLong(bool store) {
   const bool rehearsed = !call.goesOn();
   if (!rehearsed && store) host_.linearUnits = host_.options.linearUnits.value_or(standard);
   call.line().handle("store", "store", store ? 1 : 0);
-  call.line().text("section", "Maya Camera").text("key", "Use Linear Units").integer("default", standard);
+  call.line()
+      .text("section", HOST_PREF_SECTION)
+      .text("key", HOST_PREF_LINEAR_UNITS)
+      .integer("default", standard);
   call.handedInteger("value", host_.linearUnits);
   const HostError code = call.finish();
   if (rehearsed && code == HOST_ERR_NONE) host_.linearUnits = 0;

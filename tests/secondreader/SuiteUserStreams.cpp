@@ -3,21 +3,24 @@
 #include <cmath>
 #include <vector>
 
+#include "hostapi/LayerStreams.h"
 #include "tests/secondreader/SuiteUser.h"
 
 namespace secondreader {
 namespace {
 
-constexpr std::int32_t kZoom = 11;
-constexpr std::int32_t kThreeDimensional[] = {0, 1, 2};
-constexpr std::int32_t kOneDimensional[] = {3, 8, 9};
+constexpr std::int32_t kThreeDimensional[] = {HOST_STREAM_ANCHOR_POINT, HOST_STREAM_POSITION,
+                                              HOST_STREAM_SCALE};
+constexpr std::int32_t kOneDimensional[] = {HOST_STREAM_ROTATION_Z, HOST_STREAM_ROTATION_X,
+                                            HOST_STREAM_ROTATION_Y};
 
 bool isOneOf(const std::int32_t (&ids)[3], std::int32_t id) {
   return std::find(std::begin(ids), std::end(ids), id) != std::end(ids);
 }
 
 bool hasStream(const PlayedLayer& layer, std::int32_t id) {
-  return isOneOf(kThreeDimensional, id) || isOneOf(kOneDimensional, id) || (id == kZoom && layer.camera);
+  return isOneOf(kThreeDimensional, id) || isOneOf(kOneDimensional, id) ||
+         (id == HOST_STREAM_ZOOM && layer.camera);
 }
 
 template <typename Object>

@@ -60,8 +60,10 @@ HandBuiltScene::HandBuiltScene() {
   camera->aimed = true;
   camera->filmDirection = HOST_FILM_VERTICAL;
   camera->filmSize = 36.0;
-  for (std::size_t i = 0; i < 3; ++i) streamIn(*camera, 0).value[i] = 1.5 + static_cast<double>(i);
-  for (std::size_t i = 0; i < 3; ++i) streamIn(*camera, 1).value[i] = -10.25 * static_cast<double>(i);
+  for (std::size_t i = 0; i < 3; ++i)
+    streamIn(*camera, HOST_STREAM_ANCHOR_POINT).value[i] = 1.5 + static_cast<double>(i);
+  for (std::size_t i = 0; i < 3; ++i)
+    streamIn(*camera, HOST_STREAM_POSITION).value[i] = -10.25 * static_cast<double>(i);
   streamIn(*camera, HOST_STREAM_ZOOM).value[0] = 2057.38625;
   streamIn(*camera, HOST_STREAM_ZOOM).keys = std::make_unique<refhost::KeyColumns>();
   streamIn(*camera, HOST_STREAM_ZOOM).keys->times = {{0, 24000}};
@@ -70,12 +72,12 @@ HandBuiltScene::HandBuiltScene() {
   Layer* arm = add(LayerKind::Null, "arm", nullptr);
   camera->parent = arm;
   arm->threeDimensional = true;
-  streamIn(*arm, 8).value[0] = 12.0;
-  streamIn(*arm, 9).value[0] = -34.5;
-  streamIn(*arm, 3).value[0] = 56.0;
-  streamIn(*arm, 1).keys = std::make_unique<refhost::KeyColumns>();
-  streamIn(*arm, 1).keys->times = {{0, 24000}, {24000, 24000}, {47000, 24000}};
-  streamIn(*arm, 1).keys->values = {0, 1, 2, 3, 4, 5, 6, 7, 0.1};
+  streamIn(*arm, HOST_STREAM_ROTATION_X).value[0] = 12.0;
+  streamIn(*arm, HOST_STREAM_ROTATION_Y).value[0] = -34.5;
+  streamIn(*arm, HOST_STREAM_ROTATION_Z).value[0] = 56.0;
+  streamIn(*arm, HOST_STREAM_POSITION).keys = std::make_unique<refhost::KeyColumns>();
+  streamIn(*arm, HOST_STREAM_POSITION).keys->times = {{0, 24000}, {24000, 24000}, {47000, 24000}};
+  streamIn(*arm, HOST_STREAM_POSITION).keys->values = {0, 1, 2, 3, 4, 5, 6, 7, 0.1};
 
   add(LayerKind::Null, "base", nullptr);
   arm->parent = &layers.back();
