@@ -12,6 +12,7 @@
 #include "diag/Collector.h"
 #include "motion/Camera.h"
 #include "motion/Evaluator.h"
+#include "motion/SceneCamera.h"
 #include "scene/Scene.h"
 
 namespace bake {
@@ -44,10 +45,8 @@ class Sampler {
     bool scaled = true;
     motion::Vector angles;  // of the frame before, in radians
   };
-  // Where a lens' values come from, in the order of its table.
-  static constexpr std::size_t kLensNumbers = 24;
   struct LensSource {
-    std::array<motion::NumberId, kLensNumbers> numbers{};
+    motion::SceneCamera camera;
     double window = 0.0;  // of the first frame, along the side that fills the picture: inches
   };
 

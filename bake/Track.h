@@ -53,12 +53,9 @@ struct LensTrack {
   bool usable = true;     // at all frames: finite, and not 0
 
   // What is not said, or said in another way, at any frame.
-  bool offset = false;          // the film offset
-  bool squeezed = false;        // the lens squeeze is in the aperture
-  bool otherEffects = false;    // changes of the picture after the projection
-  bool resolvedFit = false;     // fill or overscan has become horizontal or vertical
-  bool scaled = false;          // the camera scale is in the focal length
-  bool movingAperture = false;  // the aperture's motion is in the focal length
+  bool offset = false;        // the film offset
+  bool squeezed = false;      // the lens squeeze is in the aperture
+  bool otherEffects = false;  // changes of the picture after the projection
 };
 
 // The channel as it is written: with one value where all are the same, or nearer to each other than

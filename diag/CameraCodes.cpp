@@ -35,8 +35,10 @@ constexpr Entry kCameraCodes[] = {
      .severity = Severity::Warning,
      .symbol = "PictureEffectLost",
      .sentence = "changes of the finished picture of \"{0}\" are lost",
-     .meaning = "The camera scales, moves or rolls the film after the projection, or pans and zooms the "
-                "rendered picture. A composition has no such values.",
+     .meaning =
+         "The camera scales, moves or rolls the film after the projection, moves it within the picture "
+         "by a film fit offset, or pans and zooms the rendered picture. A composition has no such "
+         "values.",
      .example = "createNode camera -n \"shotCamShape\";\nsetAttr \".ptsc\" 2;",
      .help = "Make the same change of the picture in the composition: scale, position or rotation of the "
              "footage."},

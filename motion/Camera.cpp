@@ -25,8 +25,10 @@ double PixelAspect(const Picture& picture) {
 
 double DeviceAspect(const Picture& picture) { return PixelAspect(picture) * picture.width / picture.height; }
 
+double FilmAspect(const Camera& camera) { return FilmWidth(camera) / FilmHeight(camera); }
+
 int ResolvedFit(const Camera& camera, const Picture& picture) {
-  const bool filmIsWider = FilmWidth(camera) / FilmHeight(camera) > DeviceAspect(picture);
+  const bool filmIsWider = FilmAspect(camera) > DeviceAspect(picture);
   switch (camera.filmFit) {
     case filmfit::kFill:
       return filmIsWider ? filmfit::kVertical : filmfit::kHorizontal;

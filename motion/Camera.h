@@ -44,6 +44,9 @@ struct Picture {
 double PixelAspect(const Picture& picture);
 double DeviceAspect(const Picture& picture);
 
+// Width by height of the film, the squeeze of the lens taken in.
+double FilmAspect(const Camera& camera);
+
 // kHorizontal or kVertical: which side of the film back fills the picture.
 int ResolvedFit(const Camera& camera, const Picture& picture);
 

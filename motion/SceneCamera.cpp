@@ -1,5 +1,7 @@
 #include "motion/SceneCamera.h"
 
+#include <cmath>
+
 #include "motion/ConstraintBinding.h"
 
 namespace motion {
@@ -19,13 +21,30 @@ enum Attribute : std::size_t {
   kVerticalShake,
   kShakeOverscanEnabled,
   kShakeOverscan,
+  kFilmFitOffset,
+  kPreScale,
+  kPostScale,
+  kFilmTranslateH,
+  kFilmTranslateV,
+  kFilmRoll,
+  kFilmRollControl,
+  kPanZoomEnabled,
+  kRenderPanZoom,
+  kHorizontalPan,
+  kVerticalPan,
+  kZoom,
 };
 
 constexpr std::string_view kNames[] = {
-    "focalLength",   "horizontalFilmAperture", "verticalFilmAperture", "filmFit",      "lensSqueezeRatio",
-    "cameraScale",   "horizontalFilmOffset",   "verticalFilmOffset",   "shakeEnabled", "horizontalShake",
-    "verticalShake", "shakeOverscanEnabled",   "shakeOverscan",
+    "focalLength",    "horizontalFilmAperture", "verticalFilmAperture", "filmFit",       "lensSqueezeRatio",
+    "cameraScale",    "horizontalFilmOffset",   "verticalFilmOffset",   "shakeEnabled",  "horizontalShake",
+    "verticalShake",  "shakeOverscanEnabled",   "shakeOverscan",        "filmFitOffset", "preScale",
+    "postScale",      "filmTranslateH",         "filmTranslateV",       "filmRollValue", "filmRollControl",
+    "panZoomEnabled", "renderPanZoom",          "horizontalPan",        "verticalPan",   "zoom",
 };
+
+// Nearer to each other than this two ratios are the same.
+constexpr double kSameRatio = 1e-9;
 
 }  // namespace
 
@@ -50,6 +69,17 @@ Camera SceneCamera::Now() const {
   camera.hasShakeOverscan = Value(kShakeOverscanEnabled) != 0.0;
   camera.shakeOverscan = Value(kShakeOverscan);
   return camera;
+}
+
+bool SceneCamera::HasFurtherChanges(const Picture& picture) const {
+  const bool scaled = Value(kPreScale) != 1.0 || Value(kPostScale) != 1.0;
+  const bool moved = Value(kFilmTranslateH) != 0.0 || Value(kFilmTranslateV) != 0.0;
+  const bool rolled = Value(kFilmRoll) != 0.0 || Value(kFilmRollControl) != 0.0;
+  const bool panned = Value(kHorizontalPan) != 0.0 || Value(kVerticalPan) != 0.0 || Value(kZoom) != 1.0;
+  const bool panIsRendered = Value(kPanZoomEnabled) != 0.0 && Value(kRenderPanZoom) != 0.0;
+  const bool gatesDiffer = std::fabs(FilmAspect(Now()) / DeviceAspect(picture) - 1.0) > kSameRatio;
+  const bool offset = Value(kFilmFitOffset) != 0.0 && gatesDiffer;
+  return scaled || moved || rolled || (panned && panIsRendered) || offset;
 }
 
 bool SceneCamera::Moves() const {

@@ -20,6 +20,11 @@ class SceneCamera {
   // The camera at the frame that the evaluator stands at.
   Camera Now() const;
 
+  // Whether something changes the picture at that frame that a Camera does not know: the film fit offset
+  // where the film is not as wide as the picture, what is done to the film after the projection, and the pan
+  // and zoom of the view where they are rendered.
+  bool HasFurtherChanges(const Picture& picture) const;
+
   // Whether anything of it can change from frame to frame.
   bool Moves() const;
 
@@ -27,7 +32,7 @@ class SceneCamera {
   std::vector<NumberId> Numbers() const { return {numbers_.begin(), numbers_.end()}; }
 
  private:
-  static constexpr std::size_t kNumbers = 13;
+  static constexpr std::size_t kNumbers = 25;
 
   double Value(std::size_t attribute) const { return evaluator_->Value(numbers_[attribute]); }
 

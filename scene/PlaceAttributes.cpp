@@ -108,6 +108,7 @@ constexpr AttributeRow kCamera[] = {
     Compound("ct", "filmTranslate", 2),
     Single("fth", "filmTranslateH", 0),
     Single("ftv", "filmTranslateV", 0),
+    Single("frc", "filmRollControl", 0),
     Single("frv", "filmRollValue", 0),
     Single("ptsc", "postScale", 1),
     Single("ovr", "overscan", 1),

@@ -69,10 +69,20 @@ TEST(Lens, TheFilmOffsetAndChangesOfThePictureAreWarnings) {
   const Baked offset(CameraScene("", "\tsetAttr \".fio\" -type \"double2\" 0.1 0 ;\n"));
   EXPECT_EQ(offset.CountOf(diag::Code::FilmOffsetLost), 1u);
   EXPECT_EQ(offset.CountOf(diag::Code::PictureEffectLost), 0u);
-  for (const char* effect : {".psc", ".ptsc"}) {
+  for (const char* effect : {".psc", ".ptsc", ".fth", ".ftv", ".frv", ".frc", ".ffo"}) {
     const Baked baked(CameraScene("", "\tsetAttr \"" + std::string(effect) + "\" 1.5;\n"));
     EXPECT_EQ(baked.CountOf(diag::Code::PictureEffectLost), 1u) << effect;
   }
+}
+
+TEST(Lens, AFilmFitOffsetChangesNothingWhereTheFilmIsAsWideAsThePicture) {
+  const std::string film = "\tsetAttr \".cap\" -type \"double2\" 1.6 0.9 ;\n\tsetAttr \".ffo\" 1;\n";
+  const std::string picture =
+      "select -ne :defaultResolution;\n\tsetAttr \".w\" 1600;\n\tsetAttr \".h\" 900;\n";
+  EXPECT_EQ(Baked(CameraScene("", film, picture)).CountOf(diag::Code::PictureEffectLost), 0u);
+  EXPECT_EQ(Baked(CameraScene("", film + "\tsetAttr \".lsr\" 2;\n", picture))
+                .CountOf(diag::Code::PictureEffectLost),
+            1u);
 }
 
 TEST(Lens, APanOfTheViewCountsWhereItIsRendered) {

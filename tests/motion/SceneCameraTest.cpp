@@ -33,7 +33,7 @@ TEST_F(SceneCameraTest, EveryAttributeIsTaken) {
   EXPECT_TRUE(camera.hasShakeOverscan);
   EXPECT_EQ(camera.shakeOverscan, 1.1);
   EXPECT_FALSE(shot.Moves());
-  EXPECT_EQ(shot.Numbers().size(), 13u);
+  EXPECT_EQ(shot.Numbers().size(), 25u);
 }
 
 TEST_F(SceneCameraTest, WhereTheSceneIsSilentTheDefaultsHold) {
@@ -48,6 +48,24 @@ TEST_F(SceneCameraTest, WhereTheSceneIsSilentTheDefaultsHold) {
   EXPECT_EQ(camera.cameraScale, plain.cameraScale);
   EXPECT_FALSE(camera.hasShake);
   EXPECT_FALSE(camera.hasShakeOverscan);
+}
+
+TEST_F(SceneCameraTest, WhatChangesThePictureFurtherIsKnown) {
+  const auto changes = [this](const std::string& lines) {
+    Read("createNode camera -n \"shot\";\n" + lines);
+    return SceneCamera(&evaluator(), At("shot")).HasFurtherChanges({});
+  };
+  EXPECT_FALSE(changes(""));
+  for (const char* name : {"psc", "ptsc", "fth", "ftv", "frv", "frc", "ffo"}) {
+    EXPECT_TRUE(changes("setAttr \"." + std::string(name) + "\" 0.5;\n")) << name;
+  }
+  const std::string rendered = "setAttr \".pze\" yes;\nsetAttr \".rpz\" yes;\n";
+  EXPECT_FALSE(changes(rendered));
+  for (const char* name : {"hpn", "vpn", "zom"}) {
+    const std::string value = "setAttr \"." + std::string(name) + "\" 0.5;\n";
+    EXPECT_FALSE(changes(value)) << name;
+    EXPECT_TRUE(changes(value + rendered)) << name;
+  }
 }
 
 TEST_F(SceneCameraTest, AnApertureMoves) {
