@@ -21,12 +21,6 @@ bool IsOneOf(std::string_view word, const List& list) {
 
 bool IsStartupCamera(const scene::Node& node) { return node.shared && IsOneOf(node.name, kStartupCameras); }
 
-bool IsSetUp(const scene::Scene& scene, NodeId id) {
-  const scene::Node& node = scene.node(id);
-  if (node.origin != scene::Origin::Created || !IsOneOf(node.type, kCameraTypes)) return false;
-  return !IsStartupCamera(node) && scene.Number(id, "orthographic").value_or(0.0) == 0.0;
-}
-
 // A name of the command line: a node's own name, or its whole path.
 bool Names(const scene::Scene& scene, NodeId id, std::string_view wanted) {
   if (id == scene::kNoNode) return false;
@@ -53,6 +47,12 @@ void SelectLocator(NodeId id, std::string_view name, const Options& options, Sel
 }
 
 }  // namespace
+
+bool IsSetUp(const scene::Scene& scene, NodeId id) {
+  const scene::Node& node = scene.node(id);
+  if (node.origin != scene::Origin::Created || !IsOneOf(node.type, kCameraTypes)) return false;
+  return !IsStartupCamera(node) && scene.Number(id, "orthographic").value_or(0.0) == 0.0;
+}
 
 bool IsMarked(std::string_view name) {
   return std::any_of(kMarks.begin(), kMarks.end(),

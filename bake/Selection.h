@@ -18,11 +18,14 @@ struct Selection {
   std::size_t locatorsLeftOut = 0;  // without a mark, where only marked ones are wanted
 };
 
+// Whether the node is a camera that somebody set up: no orthographic one, and none that every scene begins
+// with.
+bool IsSetUp(const scene::Scene& scene, scene::NodeId id);
+
 // Whether the importer takes a locator of the name.
 bool IsMarked(std::string_view name);
 
-// The cameras that somebody set up: no orthographic ones, and not those that every scene begins with. Reports
-// each name of the options that fits none of them.
+// The cameras that somebody set up, and locators. Reports each name of the options that fits none of them.
 Selection Select(const scene::Scene& scene, const Options& options, diag::Collector* diagnostics);
 
 }  // namespace bake

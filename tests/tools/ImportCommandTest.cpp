@@ -141,14 +141,21 @@ TEST_F(ImportCommand, AFailureOfTheTextIsToldWithItsLine) {
       run({"import", "--quiet", "byte.ma"}).err,
       "mayascene: byte.ma: message: Error reading Maya file.\n"
       "mayascene: byte.ma: error 1289985 (MAYA_SYNTAX): the scene holds a character that cannot start a word "
-      "there, line 5\n");
+      "there, line 5\n"
+      "mayascene: byte.ma: line 5: a character that no word can begin with ends the import. To bring it "
+      "over: "
+      "mayascene import --bake byte.ma\n");
   EXPECT_EQ(
       run({"import", "--quiet", "end.ma"}).err,
       "mayascene: end.ma: message: Unexpected end of maya file.\n"
       "mayascene: end.ma: error 1289986 (MAYA_UNEXPECTED_END): the scene ends inside a string, a comment, a "
-      "word or a command, line 4\n");
+      "word or a command, line 4\n"
+      "mayascene: end.ma: line 4: a string without its closing quote ends the import. To bring it over: "
+      "mayascene import --bake end.ma\n");
   EXPECT_EQ(run({"import", "--quiet", "number.ma"}).err,
-            "mayascene: number.ma: error 2002 (NUMBER_RANGE): a number is too large to be held, line 3\n");
+            "mayascene: number.ma: error 2002 (NUMBER_RANGE): a number is too large to be held, line 3\n"
+            "mayascene: number.ma: line 3: a number that cannot be read ends the import. To bring it over: "
+            "mayascene import --bake number.ma\n");
   const ToolResult both = run({"import", "--quiet", "--json", "-", "byte.ma", "number.ma"});
   const auto scenes = nlohmann::json::parse(both.out)["scenes"];
   EXPECT_EQ(scenes[0]["error"]["line"], 5);

@@ -30,6 +30,10 @@ void Diagnostics::remark(std::string_view subject, std::string_view sentence) {
   if (!quiet_) line(subject, sentence, false);
 }
 
+void Diagnostics::close(std::string_view subject, std::string_view sentence) {
+  line(subject, sentence, false);
+}
+
 void Diagnostics::show(std::string_view file, const diag::Diagnostic& diagnostic) {
   const bool error = diag::EntryOf(diagnostic.code).severity == diag::Severity::Error;
   if (quiet_ && !error) return;

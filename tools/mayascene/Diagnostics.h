@@ -21,6 +21,9 @@ class Diagnostics {
   void complain(std::string_view subject, std::string_view sentence);
   void remark(std::string_view subject, std::string_view sentence);  // not when quiet
 
+  // The last line about a scene; also when quiet.
+  void close(std::string_view subject, std::string_view sentence);
+
   // A diagnostic of a scene in the form "file:line:column: warning: sentence [code]", and what to do. When
   // quiet, errors only.
   void show(std::string_view file, const diag::Diagnostic& diagnostic);

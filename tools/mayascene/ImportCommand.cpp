@@ -8,6 +8,7 @@
 #include <utility>
 
 #include "tools/mayascene/BakeReportJson.h"
+#include "tools/mayascene/ClosingLine.h"
 #include "tools/mayascene/CompositionJson.h"
 #include "tools/mayascene/HostSession.h"
 #include "tools/mayascene/Outline.h"
@@ -176,7 +177,11 @@ ExitStatus runImport(const ImportArguments& arguments, Diagnostics& diagnostics)
   }
   if (outputs.json) writeCompositionJson(outputs.json->stream(), run);
   if (outputs.report) writeBakeReport(outputs.report->stream(), run.bakes);
-  return worse(status, outputs.commit(diagnostics));
+  status = worse(status, outputs.commit(diagnostics));
+  // Last, when what was asked for is there.
+  if (arguments.bake) return status;
+  for (const SceneReport& scene : run.scenes) closeWithLoss(scene, arguments.quiet, diagnostics);
+  return status;
 }
 
 }  // namespace mayascene

@@ -1,0 +1,35 @@
+// A channel that a curve drives directly, as an import finds it.
+#pragma once
+
+#include <array>
+#include <cstddef>
+#include <optional>
+#include <string>
+#include <string_view>
+
+#include "motion/CurveData.h"
+#include "motion/Measures.h"
+#include "scene/Scene.h"
+
+namespace bake {
+
+constexpr std::array<std::string_view, 9> kPlaceChannels = {
+    "translateX", "translateY", "translateZ", "rotateX", "rotateY", "rotateZ", "scaleX", "scaleY", "scaleZ"};
+
+struct KeyedChannel {
+  std::string_view attribute;  // of the node that is driven
+  scene::NodeId node;          // the curve's
+  motion::CurveData curve;     // with a key at least
+};
+
+// None where something else drives the channel, or nothing.
+std::optional<KeyedChannel> FindKeys(const scene::Scene& scene, scene::NodeId node,
+                                     std::string_view attribute, const motion::Measures& measures);
+
+// Whether a straight line from key to key leaves the curve at some frame.
+bool IsCurvedBetweenFrames(const motion::CurveData& curve, double framesPerSecond);
+
+// The node's own name between quotes, harmless on a terminal; of a very long one the beginning.
+std::string ShownNode(const scene::Scene& scene, scene::NodeId node);
+
+}  // namespace bake
