@@ -182,7 +182,7 @@ def main():
         if (shots / "cube_a.uv").exists():
             judged.append(("cube_a.ma", *hold_truth(tool, shots)))
         else:
-            print("LEFT OUT: 808 points that were seen in a real shot: the folder of shots is not there")
+            print("LEFT OUT: 808 points of ../shared/shots seen in a bake, beside the source folder")
         tool.run("bake", "-q", *map(str, examples), "-o", "bakes", "--report", "report.json")
         schema = json.loads((given.root / "docs" / "bake-report.schema.json").read_text(encoding="utf-8"))
         report = json.loads((pathlib.Path(folder) / "report.json").read_text(encoding="utf-8"))
