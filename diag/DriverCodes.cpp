@@ -29,8 +29,8 @@ constexpr Entry kDriverCodes[] = {
      .severity = Severity::Warning,
      .symbol = "DriverCircle",
      .sentence = "\"{0}\" drives itself",
-     .meaning = "What the channel depends on leads back to it. The circle is cut there, and the value that "
-                "the scene stores is used.",
+     .meaning = "What the channel depends on leads back to it. Each channel of the circle keeps the value "
+                "that the scene stores for it.",
      .example = "createNode transform -n \"a\";\ncreateNode transform -n \"b\";\nconnectAttr \"a.tx\" "
                 "\"b.tx\";\nconnectAttr \"b.tx\" \"a.tx\";",
      .help = "Bake \"{0}\" into keys where the scene was made, if it moves."},

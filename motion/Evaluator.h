@@ -17,6 +17,7 @@
 #include <cmath>
 #include <cstdint>
 #include <memory>
+#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -24,6 +25,7 @@
 #include "diag/Collector.h"
 #include "motion/Graph.h"
 #include "motion/Measures.h"
+#include "motion/Ordering.h"
 #include "motion/Transform.h"
 #include "scene/FlatMap.h"
 #include "scene/Scene.h"
@@ -94,7 +96,7 @@ class Evaluator {
 
  private:
   friend class Binder;
-  static constexpr std::uint32_t kNone = 0xffffffff;
+  static constexpr std::uint32_t kNone = Ordering::kNone;
 
   struct NumberCell {
     scene::Plug plug;
@@ -105,6 +107,11 @@ class Evaluator {
     scene::Plug plug;
     std::uint32_t step = kNone;
     Standing standing = Standing::kStored;
+  };
+  // The cell of a step that passes on what is connected.
+  struct Written {
+    std::uint32_t number = kNone;
+    std::uint32_t matrix = kNone;
   };
   struct CellOfPlug {
     std::uint32_t plusOne = 0;  // 0: none
@@ -133,12 +140,10 @@ class Evaluator {
 
   // ---- the order of the steps: EvaluatorOrder.cpp ----
 
-  enum class State : std::uint8_t { kNew, kOpen, kPlaced };
-
+  Ordering::Graph GraphOfSteps();
   void Order();
-  void OrderFrom(std::uint32_t root);
   std::uint32_t StepOfInput(const Step& step, std::size_t input) const;
-  void CutCircle(Step* step, std::size_t input);
+  void CutCircle(std::span<const std::uint32_t> circle);
   void Place(std::uint32_t step);
   void ReportFailures();
 
@@ -150,13 +155,15 @@ class Evaluator {
   scene::FlatMap<CellOfPlug> numberOfPlug_;
   scene::FlatMap<CellOfPlug> matrixOfPlug_;
   std::vector<std::unique_ptr<Step>> steps_;
-  std::vector<State> states_;             // by step
+  std::vector<Written> written_;          // by step
   std::vector<bool> moves_;               // by step
   std::vector<const LocalStep*> locals_;  // by matrix; null where it is no local one
   std::vector<std::uint32_t> moving_;     // in the order in which they are run
   std::vector<NumberId> pendingNumbers_;
   std::vector<MatrixId> pendingMatrices_;
-  std::size_t ordered_ = 0;  // the steps before it are in order
+  Ordering ordering_{GraphOfSteps()};
+  std::size_t ordered_ = 0;            // the steps before it are in order
+  std::vector<std::uint32_t> placed_;  // each after those that it reads
   Values values_;
 };
 

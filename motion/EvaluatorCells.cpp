@@ -20,7 +20,7 @@ std::uint64_t KeyOf(const Plug& plug) {
 
 std::uint32_t Evaluator::AddStep(std::unique_ptr<Step> step) {
   steps_.push_back(std::move(step));
-  states_.push_back(State::kNew);
+  written_.emplace_back();
   moves_.push_back(false);
   return static_cast<std::uint32_t>(steps_.size() - 1);
 }
@@ -138,8 +138,10 @@ void Evaluator::Expand(NumberId id) {
   step->output = id;
   const double factor = from == to ? 1.0 : InternalUnits(measures_, from) / InternalUnits(measures_, to);
   step->numberInputs.push_back({Reserve(driver->plug), &step->input, factor});
-  numbers_[static_cast<std::size_t>(id)].step = AddStep(std::move(step));
-  numbers_[static_cast<std::size_t>(id)].standing = Standing::kDriven;
+  NumberCell& cell = numbers_[static_cast<std::size_t>(id)];
+  cell.step = AddStep(std::move(step));
+  cell.standing = Standing::kDriven;
+  written_[cell.step].number = static_cast<std::uint32_t>(id);
 }
 
 // ---- matrices ----
@@ -192,6 +194,7 @@ void Evaluator::ExpandMatrix(MatrixId id) {
   step->matrixInputs.push_back({ReserveMatrix(driver->plug), &step->input});
   matrices_[cell].step = AddStep(std::move(step));
   matrices_[cell].standing = Standing::kDriven;
+  written_[matrices_[cell].step].matrix = static_cast<std::uint32_t>(id);
 }
 
 // ---- reports ----

@@ -1,12 +1,23 @@
-// The order of an evaluator's steps: each after those that it reads. A circle is cut where it closes.
-#include <utility>
+// The order of an evaluator's steps: each after those that it reads. Nothing that is connected in a circle
+// counts.
+#include <tuple>
 
 #include "motion/Evaluator.h"
 
 namespace motion {
 
+Ordering::Graph Evaluator::GraphOfSteps() {
+  return {.inputCount =
+              [this](std::uint32_t at) {
+                return steps_[at]->numberInputs.size() + steps_[at]->matrixInputs.size();
+              },
+          .input = [this](std::uint32_t at, std::size_t input) { return StepOfInput(*steps_[at], input); },
+          .place = [this](std::uint32_t at) { Place(at); },
+          .placeCircle = [this](std::span<const std::uint32_t> circle) { CutCircle(circle); }};
+}
+
 void Evaluator::Order() {
-  for (; ordered_ < steps_.size(); ++ordered_) OrderFrom(static_cast<std::uint32_t>(ordered_));
+  for (; ordered_ < steps_.size(); ++ordered_) ordering_.Place(static_cast<std::uint32_t>(ordered_));
   ReportFailures();
 }
 
@@ -17,53 +28,32 @@ std::uint32_t Evaluator::StepOfInput(const Step& step, std::size_t input) const 
   return matrices_[static_cast<std::size_t>(step.matrixInputs[input - numbers].cell)].step;
 }
 
-void Evaluator::OrderFrom(std::uint32_t root) {
-  if (states_[root] != State::kNew) return;
-  std::vector<std::pair<std::uint32_t, std::size_t>> open = {{root, 0}};  // steps and the next input of each
-  states_[root] = State::kOpen;
-  while (!open.empty()) {
-    const std::uint32_t at = open.back().first;
-    Step& step = *steps_[at];
-    if (open.back().second == step.numberInputs.size() + step.matrixInputs.size()) {
-      Place(at);
-      open.pop_back();
-      continue;
+// Every channel of the circle keeps the value that the scene holds for it. A circle always passes
+// connections, for the parents of a node form none. It is reported once, by the first of its channels in the
+// scene.
+void Evaluator::CutCircle(std::span<const std::uint32_t> circle) {
+  const scene::Plug* first = nullptr;
+  const auto take = [&first](const scene::Plug& plug) {
+    const auto key = [](const scene::Plug& one) { return std::tie(one.node, one.attribute, one.index); };
+    if (first == nullptr || key(plug) < key(*first)) first = &plug;
+  };
+  for (const std::uint32_t at : circle) {
+    if (!steps_[at]->Cut()) continue;
+    const Written& written = written_[at];
+    if (written.number != kNone) {
+      NumberCell& cell = numbers_[written.number];
+      if (IsInput(cell.plug)) continue;
+      cell.standing = Standing::kCircle;
+      take(cell.plug);
+    } else {
+      matrices_[written.matrix].standing = Standing::kCircle;
+      take(matrices_[written.matrix].plug);
     }
-    const std::size_t input = open.back().second++;
-    const std::uint32_t before = StepOfInput(step, input);
-    if (before == kNone || states_[before] == State::kPlaced) continue;
-    if (states_[before] == State::kOpen) {
-      CutCircle(&step, input);
-      continue;
-    }
-    states_[before] = State::kOpen;
-    open.push_back({before, 0});
   }
-}
-
-// Makes the input one that is not known, so that the next channel which the scene holds a value for keeps it.
-void Evaluator::CutCircle(Step* step, std::size_t input) {
-  scene::Plug plug;
-  const std::size_t numbers = step->numberInputs.size();
-  if (input < numbers) {
-    NumberId& cell = step->numberInputs[input].cell;
-    NumberCell& closing = numbers_[static_cast<std::size_t>(cell)];
-    closing.standing = Standing::kCircle;
-    plug = closing.plug;
-    cell = static_cast<NumberId>(numbers_.size());
-    numbers_.push_back({plug, kNone, Standing::kCircle});
-    values_.numbers.push_back(StoredNumber(plug));
-  } else {
-    MatrixId& cell = step->matrixInputs[input - numbers].cell;
-    MatrixCell& closing = matrices_[static_cast<std::size_t>(cell)];
-    closing.standing = Standing::kCircle;
-    plug = closing.plug;
-    cell = static_cast<MatrixId>(matrices_.size());
-    matrices_.push_back({plug, kNone, Standing::kCircle});
-    values_.matrices.push_back(UnknownMatrix());
-    locals_.push_back(nullptr);
+  if (first != nullptr) {
+    diagnostics_->Report(diag::Code::DriverCircle, scene_.node(first->node).place, {NameOf(*first)});
   }
-  diagnostics_->Report(diag::Code::DriverCircle, scene_.node(plug.node).place, {NameOf(plug)});
+  ordering_.PlaceOpened(circle);
 }
 
 // Everything that the step reads is placed.
@@ -75,7 +65,7 @@ void Evaluator::Place(std::uint32_t at) {
     moves = moves || (before != kNone && moves_[before]);
   }
   moves_[at] = moves;
-  states_[at] = State::kPlaced;
+  placed_.push_back(at);
   if (moves) {
     moving_.push_back(at);
   } else {

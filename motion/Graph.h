@@ -55,6 +55,10 @@ class Step {
 
   virtual void Run(Values* values) = 0;
 
+  // Of a step that passes on what is connected: from now on it gives what the scene holds instead, and reads
+  // nothing. False for others, which stay as they are.
+  virtual bool Cut() { return false; }
+
   std::vector<NumberInput> numberInputs;
   std::vector<MatrixInput> matrixInputs;
   bool readsFrame = false;

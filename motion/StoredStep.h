@@ -19,6 +19,12 @@ class StoredStep final : public Step {
     (*values)[output] = known ? input : stored_;
   }
 
+  bool Cut() override {
+    numberInputs.clear();
+    input = stored_;
+    return true;
+  }
+
   double input = 0.0;
   NumberId output{};
 
@@ -32,6 +38,12 @@ class StoredMatrixStep final : public Step {
   explicit StoredMatrixStep(const Matrix& stored) : stored_(stored) {}
 
   void Run(Values* values) override { (*values)[output] = Load(*values) ? input : stored_; }
+
+  bool Cut() override {
+    matrixInputs.clear();
+    input = stored_;
+    return true;
+  }
 
   Matrix input;
   MatrixId output{};

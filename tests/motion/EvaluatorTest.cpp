@@ -280,15 +280,29 @@ TEST_F(EvaluatorTest, ItKnowsWhatWasKeptBelowAValue) {
   EXPECT_THAT(evaluator().KeptBelow({}, {free}), IsEmpty());
 }
 
-TEST_F(EvaluatorTest, ACircleEndsWithTheStoredValue) {
-  Read(
-      "createNode transform -n \"a\";\nsetAttr \".tx\" 1;\ncreateNode transform -n \"b\";\nsetAttr \".tx\" "
-      "2;\n"
-      "connectAttr \"a.tx\" \"b.tx\";\nconnectAttr \"b.tx\" \"a.tx\";\n");
-  EXPECT_EQ(Number("a", "tx"), 1.0);
-  EXPECT_EQ(Number("b", "tx"), 1.0);
-  EXPECT_THAT(Diagnostics(), ElementsAre(HasSubstr("\"|a.translateX\" drives itself [MA0403]")));
-  EXPECT_EQ(evaluator().KeptBelow({evaluator().Number(At("b"), "tx")}, {}).size(), 1u);
+TEST_F(EvaluatorTest, ACircleIsTheSameWhicheverChannelIsAskedForFirst) {
+  // Two circles that share c, and one channel after them.
+  for (const std::string order : {"abcde", "edcba", "cabde", "debac"}) {
+    std::string text;
+    for (const char* name : {"a", "b", "c", "d", "e"}) {
+      text += "createNode transform -n \"" + std::string(name) + "\";\nsetAttr \".tx\" " +
+              std::to_string(name[0]) + ";\n";
+    }
+    text +=
+        "connectAttr \"a.tx\" \"b.tx\";\nconnectAttr \"b.tx\" \"c.tx\";\nconnectAttr \"c.tx\" \"a.tx\";\n"
+        "createNode blendWeighted -n \"sum\";\nconnectAttr \"c.tx\" \"sum.i[0]\";\n"
+        "connectAttr \"sum.o\" \"d.tx\";\nconnectAttr \"d.tx\" \"sum.i[1]\";\n"
+        "connectAttr \"d.tx\" \"e.tx\";\n";
+    Read(text);
+    for (const char name : order) (void)evaluator().Number(At(std::string(1, name)), "tx");
+    for (const char* name : {"a", "b", "c", "d"}) EXPECT_EQ(Number(name, "tx"), name[0]) << order;
+    EXPECT_EQ(Number("e", "tx"), 'd') << order;
+    EXPECT_THAT(Diagnostics(),
+                testing::UnorderedElementsAre(HasSubstr("1: \"|a.translateX\" drives itself [MA0403]"),
+                                              HasSubstr("7: \"|d.translateX\" drives itself [MA0403]")))
+        << order;
+    EXPECT_EQ(evaluator().KeptBelow({evaluator().Number(At("e"), "tx")}, {}).size(), 1u) << order;
+  }
 }
 
 TEST_F(EvaluatorTest, AChannelThatDrivesItselfKeepsItsValue) {
