@@ -5,6 +5,7 @@
 //   100  reading the text            400  what drives a channel
 //   200  nodes, names, units         500  cameras and locators
 //   300  curves                      600  what a bake writes
+//   700  what stops an import
 #pragma once
 
 #include <cstdint>
@@ -73,6 +74,9 @@ enum class Code : std::uint16_t {
   TooManyFrames = 602,
   ClockTimeUnit = 603,
   CameraInWorldSpace = 604,
+  // What stops an import: diag/StopCodes.cpp
+  ImportStopped = 701,
+  NotMayaAscii = 702,
 };
 
 // Ordered: a later one is worse.

@@ -34,13 +34,22 @@ std::string HelpOf(const Diagnostic& diagnostic) {
   return Fill(EntryOf(diagnostic.code).help, diagnostic.arguments);
 }
 
-std::string Render(std::string_view file, const Diagnostic& diagnostic) {
-  std::string text = ShownText(file);
-  text += ':' + std::to_string(diagnostic.place.line) + ':' + std::to_string(diagnostic.place.column) + ": ";
+bool IsOfWholeFile(const Diagnostic& diagnostic) { return diagnostic.range == Range{}; }
+
+std::string HeadLineOf(std::string_view file, const Diagnostic& diagnostic) {
+  std::string text = ShownText(file) + ": ";
+  if (!IsOfWholeFile(diagnostic)) {
+    text.pop_back();
+    text += std::to_string(diagnostic.place.line) + ':' + std::to_string(diagnostic.place.column) + ": ";
+  }
   text += NameOf(EntryOf(diagnostic.code).severity);
-  text += ": " + SentenceOf(diagnostic) + " [" + NameOf(diagnostic.code) + "]\n";
-  text += "help: " + HelpOf(diagnostic) + '\n';
-  return text;
+  return text + ": " + SentenceOf(diagnostic) + " [" + NameOf(diagnostic.code) + ']';
+}
+
+std::string HelpLineOf(const Diagnostic& diagnostic) { return "help: " + HelpOf(diagnostic); }
+
+std::string Render(std::string_view file, const Diagnostic& diagnostic) {
+  return HeadLineOf(file, diagnostic) + '\n' + HelpLineOf(diagnostic) + '\n';
 }
 
 }  // namespace diag

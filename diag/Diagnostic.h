@@ -32,8 +32,15 @@ struct Diagnostic {
 std::string SentenceOf(const Diagnostic& diagnostic);
 std::string HelpOf(const Diagnostic& diagnostic);
 
-// "file:line:column: warning: sentence [MA0101]" and "help: …", a line each, with line ends. The file's name
-// may hold any bytes.
+// Whether it is about the file as a whole: its range is that of no byte at all.
+bool IsOfWholeFile(const Diagnostic& diagnostic);
+
+// "file:line:column: warning: sentence [MA0101]", and "help: …": a line each, without line ends. Of one about
+// the whole file, no line and no column. The file's name may hold any bytes.
+std::string HeadLineOf(std::string_view file, const Diagnostic& diagnostic);
+std::string HelpLineOf(const Diagnostic& diagnostic);
+
+// Both lines, with line ends.
 std::string Render(std::string_view file, const Diagnostic& diagnostic);
 
 }  // namespace diag

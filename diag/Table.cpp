@@ -14,7 +14,7 @@ namespace {
 std::vector<Entry> WholeTable() {
   std::vector<Entry> table;
   for (const std::span<const Entry> part :
-       {ReadingCodes(), NodeCodes(), CurveCodes(), DriverCodes(), CameraCodes(), BakeCodes()}) {
+       {ReadingCodes(), NodeCodes(), CurveCodes(), DriverCodes(), CameraCodes(), BakeCodes(), StopCodes()}) {
     table.insert(table.end(), part.begin(), part.end());
   }
   return table;

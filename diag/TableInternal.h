@@ -13,5 +13,6 @@ std::span<const Entry> CurveCodes();
 std::span<const Entry> DriverCodes();
 std::span<const Entry> CameraCodes();
 std::span<const Entry> BakeCodes();
+std::span<const Entry> StopCodes();
 
 }  // namespace diag

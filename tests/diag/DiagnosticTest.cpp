@@ -20,16 +20,23 @@ TEST(DiagnosticTest, HasTheFormOfACompilers) {
 }
 
 TEST(DiagnosticTest, TheSeverityIsTheTables) {
-  EXPECT_THAT(Render("a", {.code = Code::NameTaken, .arguments = {"b", "c"}}),
+  EXPECT_THAT(Render("a", {.code = Code::NameTaken, .range = {0, 1}, .arguments = {"b", "c"}}),
               testing::StartsWith("a:1:1: note: "));
   EXPECT_THAT(Render("a", {.code = Code::TextTooLong, .arguments = {"5"}}),
-              testing::StartsWith("a:1:1: error: "));
+              testing::StartsWith("a: error: "));
+}
+
+TEST(DiagnosticTest, ThatOfTheWholeFileHasNoLine) {
+  EXPECT_EQ(HeadLineOf("a", {.code = Code::NoCamera}),
+            "a: warning: the scene has no camera that somebody set up [MA0601]");
+  EXPECT_TRUE(IsOfWholeFile({.code = Code::NoCamera}));
+  EXPECT_FALSE(IsOfWholeFile({.code = Code::NoCamera, .range = {0, 1}}));
 }
 
 TEST(DiagnosticTest, HostileNamesAreHarmless) {
   const Diagnostic diagnostic{.code = Code::CommandCutOff, .arguments = {"a\n\x1b[2J\xff"}};
   EXPECT_EQ(SentenceOf(diagnostic), "the file ends inside the command \"a\\n\\x1b[2J\\xff\"");
-  EXPECT_THAT(Render("x\ny", diagnostic), testing::StartsWith("x\\ny:1:1: "));
+  EXPECT_THAT(Render("x\ny", diagnostic), testing::StartsWith("x\\ny: "));
 }
 
 TEST(DiagnosticTest, AnArgumentIsNotLookedThroughForPlaceholders) {

@@ -62,13 +62,17 @@ void addPreferences(CLI::App* verb, std::string* file) {
       ->option_text("FILE");
 }
 
-void addHostOptions(CLI::App* verb, HostArguments* host, Words* words) {
+void addUnits(CLI::App* verb, HostArguments* host) {
   verb->add_option(
           "--linear-units", host->linearUnits,
           "for this run: 1 converts distances from the scene's\nlinear unit to points, 0 takes them as "
           "they stand")
       ->option_text("N");
   addPreferences(verb, &host->preferences);
+}
+
+void addHostOptions(CLI::App* verb, HostArguments* host, Words* words) {
+  addUnits(verb, host);
   verb->add_option("--translations", host->translations, "the host's translations, lines of KEY=TEXT")
       ->option_text("FILE");
   verb->add_option("--module", host->module, "the import module, instead of the one beside the tool")
@@ -117,6 +121,19 @@ void addCeilings(CLI::App* verb, HostArguments* host) {
       ->option_text("N")
       ->check(CLI::Range(std::int64_t{0}, kMostMemory))
       ->group(group);
+}
+
+// "MA0701", in capitals or not.
+std::vector<diag::Code> codesOf(const std::vector<std::string>& words) {
+  std::vector<diag::Code> codes;
+  for (const std::string& word : words) {
+    const auto entry = std::find_if(diag::Table().begin(), diag::Table().end(), [&](const diag::Entry& one) {
+      return CLI::detail::to_lower(diag::NameOf(one.code)) == CLI::detail::to_lower(word);
+    });
+    if (entry == diag::Table().end()) throw CLI::ValidationError("--only", word + ": no such code");
+    codes.push_back(entry->code);
+  }
+  return codes;
 }
 
 void translateWords(const Words& words, HostArguments* host) {
@@ -195,6 +212,8 @@ struct CommandLine {
   VerifyArguments verify;
   PrefsArguments prefs;
   BakeArguments bake;
+  CheckArguments check;
+  std::vector<std::string> onlyCodes;
   Words importWords, verifyWords;
   BakeWords importBakeWords, bakeWords;
   bool importBakes = false;
@@ -203,6 +222,7 @@ struct CommandLine {
   CLI::App* verifyVerb = nullptr;
   CLI::App* prefsVerb = nullptr;
   CLI::App* bakeVerb = nullptr;
+  CLI::App* checkVerb = nullptr;
   CLI::App* setVerb = nullptr;
 
   CommandLine() {
@@ -213,6 +233,7 @@ struct CommandLine {
     app.footer(kFooter);
     addImport();
     addBake();
+    addCheck();
     addVerify();
     addPrefs();
   }
@@ -245,6 +266,21 @@ struct CommandLine {
         ->option_text("OUT");
     bakeVerb->add_flag("-q,--quiet", bake.quiet, "print nothing but errors");
     addBakeOptions(bakeVerb, &bakeWords, "");
+  }
+
+  void addCheck() {
+    checkVerb = app.add_subcommand("check", "say what an import makes of scenes, what it does not, and why");
+    checkVerb->add_option("SCENE", check.scenes, "a Maya ASCII scene, in whatever state")
+        ->required()
+        ->option_text(" ");
+    checkVerb->add_option("--json", check.json, "write the reports; - is standard output")
+        ->option_text("FILE");
+    checkVerb->add_flag("--strict", check.strict, "warnings make the exit status 1");
+    addRepeated(checkVerb, "--only", &onlyCodes, "CODE", "this code alone, such as MA0701");
+    checkVerb->add_flag("--all", check.options.all, "show all diagnostics, not 20 of each code");
+    checkVerb->add_flag("-v,--verbose", check.verbose, "a line for each scene on standard error");
+    checkVerb->add_flag("-q,--quiet", check.quiet, "print nothing but errors");
+    addUnits(checkVerb, &check.host);
   }
 
   void addVerify() {
@@ -282,7 +318,7 @@ struct CommandLine {
 
   Arguments parse(std::vector<std::string> words) {
     app.parse(std::move(words));
-    for (const CLI::App* verb : {importVerb, bakeVerb, verifyVerb, prefsVerb, setVerb})
+    for (const CLI::App* verb : {importVerb, bakeVerb, checkVerb, verifyVerb, prefsVerb, setVerb})
       refuseEmptyValues(*verb);
     Arguments arguments;
     if (importVerb->parsed()) {
@@ -297,6 +333,10 @@ struct CommandLine {
       translateBakeWords(bakeWords, &bake);
       checkOutputs({{"--output", bake.output}, {"--report", bake.report}}, bake.scenes);
       arguments.bake = bake;
+    } else if (checkVerb->parsed()) {
+      check.options.only = codesOf(onlyCodes);
+      checkOutputs({{"--json", check.json}}, check.scenes);
+      arguments.check = check;
     } else if (verifyVerb->parsed()) {
       translateWords(verifyWords, &verify.host);
       checkOutputs({{"--trace", verify.host.trace}}, verify.scenes);

@@ -7,6 +7,7 @@
 #include <string>
 #include <vector>
 
+#include "check/Check.h"
 #include "refhost/Host.h"
 #include "tools/mayascene/BakeCommand.h"
 #include "tools/mayascene/ExitStatus.h"
@@ -45,17 +46,28 @@ struct VerifyArguments {
   bool quiet = false;
 };
 
+struct CheckArguments {
+  HostArguments host;
+  check::Options options;
+  std::vector<std::string> scenes;
+  std::string json;  // empty: none; "-": standard output
+  bool strict = false;
+  bool quiet = false;
+  bool verbose = false;
+};
+
 struct PrefsArguments {
   std::string preferences;                  // empty: the user's own store
   std::optional<std::int32_t> linearUnits;  // the value to set; none: show
 };
 
-// Exactly one of the four is there, or none and the run is over: help was shown, or usage was wrong.
+// Exactly one of the five is there, or none and the run is over: help was shown, or usage was wrong.
 struct Arguments {
   std::optional<ImportArguments> import;
   std::optional<VerifyArguments> verify;
   std::optional<PrefsArguments> prefs;
   std::optional<BakeArguments> bake;
+  std::optional<CheckArguments> check;
   ExitStatus over = ExitStatus::Done;
 };
 

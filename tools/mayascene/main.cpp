@@ -10,6 +10,7 @@
 #include "refhost/ProcessMemory.h"
 #include "tools/mayascene/Arguments.h"
 #include "tools/mayascene/BakeCommand.h"
+#include "tools/mayascene/CheckCommand.h"
 #include "tools/mayascene/Diagnostics.h"
 #include "tools/mayascene/ImportCommand.h"
 #include "tools/mayascene/Interruption.h"
@@ -26,10 +27,11 @@ ExitStatus run(int argc, const char* const* argv) {
   const Arguments arguments = mayascene::parseArguments(argc, argv, std::cout, std::cerr);
   const bool quiet = (arguments.import && arguments.import->quiet) ||
                      (arguments.verify && arguments.verify->quiet) ||
-                     (arguments.bake && arguments.bake->quiet);
+                     (arguments.bake && arguments.bake->quiet) || (arguments.check && arguments.check->quiet);
   Diagnostics diagnostics(std::cerr, mayascene::Style(mayascene::colourAllowed(STDERR_FILENO)), quiet);
   if (arguments.import) return mayascene::runImport(*arguments.import, diagnostics);
   if (arguments.bake) return mayascene::runBake(*arguments.bake, diagnostics);
+  if (arguments.check) return mayascene::runCheck(*arguments.check, diagnostics);
   if (arguments.verify) return mayascene::runVerify(*arguments.verify, diagnostics);
   if (arguments.prefs) return mayascene::runPrefs(*arguments.prefs, diagnostics);
   return arguments.over;

@@ -1,0 +1,72 @@
+#include "check/Cameras.h"
+
+#include <algorithm>
+#include <array>
+#include <cstddef>
+
+namespace check {
+namespace {
+
+// With its quotes a name has fewer bytes than this.
+constexpr std::size_t kQuotedName = 255;
+
+constexpr std::array<std::string_view, 4> kStartupCameras = {"perspShape", "topShape", "frontShape",
+                                                             "sideShape"};
+
+char Lower(char c) { return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c; }
+
+bool IsCamera(const scene::Node& node) {
+  return node.origin == scene::Origin::Created &&
+         (SameName(node.type, "camera") || SameName(node.type, "stereoRigCamera"));
+}
+
+// Whether the importer passes over the camera. It knows an orthographic one by the word "yes" alone.
+bool IsSkipped(const scene::Scene& scene, scene::NodeId id) {
+  if (SameName(ImportName(scene, scene.node(id)), "perspShape")) return true;
+  const std::optional<scene::Value> orthographic = scene.Written(id, "orthographic");
+  return orthographic && SameName(orthographic->text(), "yes");
+}
+
+}  // namespace
+
+bool SameName(std::string_view a, std::string_view b) {
+  return a.size() == b.size() &&
+         std::equal(a.begin(), a.end(), b.begin(), [](char x, char y) { return Lower(x) == Lower(y); });
+}
+
+std::string_view ImportName(const scene::Scene& scene, const scene::Node& node) {
+  const std::string_view text = scene.text();
+  const auto [offset, length] = node.place;
+  if (node.origin != scene::Origin::Created || offset == 0 || offset + length >= text.size()) return {};
+  if (text[offset - 1] != '"' || text[offset + length] != '"' || length + 2 >= kQuotedName) return {};
+  return text.substr(offset, length);
+}
+
+bool IsStartupCamera(const scene::Node& node) {
+  return node.shared &&
+         std::find(kStartupCameras.begin(), kStartupCameras.end(), node.name) != kStartupCameras.end();
+}
+
+std::vector<Camera> FindCameras(const scene::Scene& scene, const CameOver& cameOver) {
+  // The import makes the layers of the cameras in the order of the file, each under the camera's name.
+  auto layer = cameOver.layers.begin();
+  const auto nextCamera = [&] {
+    layer = std::find_if(layer, cameOver.layers.end(),
+                         [](const CameOverLayer& one) { return one.kind == LayerKind::Camera; });
+  };
+  nextCamera();
+  std::vector<Camera> cameras;
+  for (scene::NodeId id = 0; id < scene.nodes().size(); ++id) {
+    const scene::Node& node = scene.node(id);
+    if (!IsCamera(node)) continue;
+    Camera camera{.shape = id, .transform = node.parent, .layer = nullptr};
+    if (!IsSkipped(scene, id) && layer != cameOver.layers.end() && layer->name == ImportName(scene, node)) {
+      camera.layer = &*layer++;
+      nextCamera();
+    }
+    cameras.push_back(camera);
+  }
+  return cameras;
+}
+
+}  // namespace check

@@ -1,0 +1,65 @@
+#include "check/Check.h"
+
+#include <algorithm>
+#include <limits>
+#include <utility>
+
+#include "check/HeadInternal.h"
+#include "check/RulesInternal.h"
+#include "diag/Excerpt.h"
+#include "scene/Scene.h"
+
+namespace check {
+namespace {
+
+diag::Severity SeverityOf(const Finding& finding) { return diag::EntryOf(finding.diagnostic.code).severity; }
+
+bool IsWanted(diag::Code code, const Options& options) {
+  return options.only.empty() ||
+         std::find(options.only.begin(), options.only.end(), code) != options.only.end();
+}
+
+std::uint64_t* CountOf(diag::Severity severity, Report* report) {
+  if (severity == diag::Severity::Error) return &report->errors;
+  return severity == diag::Severity::Warning ? &report->warnings : &report->notes;
+}
+
+void Gather(std::string_view text, const Options& options, diag::Collector* collector, Report* report) {
+  for (const diag::Diagnostic& diagnostic : collector->kept()) {
+    if (!IsWanted(diagnostic.code, options)) continue;
+    Finding finding{diagnostic, collector->lines().At(diagnostic.range.offset + diagnostic.range.length), {}};
+    if (!diag::IsOfWholeFile(diagnostic)) finding.excerpt = diag::Excerpt(text, diagnostic.range);
+    report->findings.push_back(std::move(finding));
+    ++*CountOf(diag::EntryOf(diagnostic.code).severity, report);
+  }
+  std::stable_sort(report->findings.begin(), report->findings.end(), [](const Finding& a, const Finding& b) {
+    if (SeverityOf(a) != SeverityOf(b)) return SeverityOf(a) > SeverityOf(b);
+    return a.diagnostic.range.offset < b.diagnostic.range.offset;
+  });
+  for (const auto& [code, times] : collector->NotKept()) {
+    if (!IsWanted(code, options)) continue;
+    report->notInFull[code] = times;
+    *CountOf(diag::EntryOf(code).severity, report) += times;
+  }
+}
+
+void CheckScene(std::string_view text, const CameOver& cameOver, diag::Collector* collector, Head* head) {
+  const scene::Scene scene = scene::Read(text, *collector);
+  const scene::Settings settings = scene::ReadSettings(scene, *collector);
+  const std::vector<Camera> cameras = FindCameras(scene, cameOver);
+  *head = ReadHead(scene, settings, cameOver, cameras, collector->lines());
+}
+
+}  // namespace
+
+Report Check(std::string_view text, const CameOver& cameOver, const Options& options) {
+  constexpr std::size_t kAll = std::numeric_limits<std::size_t>::max();
+  diag::Collector collector(text, options.all ? kAll : diag::Collector::kFullPerCode);
+  Report report;
+  ReportStop(text, cameOver, &collector);
+  if (cameOver.stop != Stop::NotAScene) CheckScene(text, cameOver, &collector, &report.head);
+  Gather(text, options, &collector, &report);
+  return report;
+}
+
+}  // namespace check

@@ -1,0 +1,44 @@
+// Says what an import makes of a scene: for every camera what came over, what did not, why, at which line,
+// and what to do.
+//
+// What came over is what the caller was given by the import itself. The scene is read and evaluated only to
+// explain it.
+#pragma once
+
+#include <cstdint>
+#include <map>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "check/CameOver.h"
+#include "check/Head.h"
+#include "diag/Diagnostic.h"
+
+namespace check {
+
+struct Options {
+  bool all = false;              // every diagnostic in full, however many there are of one code
+  std::vector<diag::Code> only;  // no others are reported, or counted; empty: all of them
+};
+
+// A diagnostic, with what is shown of the text.
+struct Finding {
+  diag::Diagnostic diagnostic;
+  diag::LineAndColumn end;  // after the range's last byte
+  std::string excerpt;      // the line and the mark under it; empty for one about the whole file
+};
+
+struct Report {
+  Head head;
+  std::vector<Finding> findings;                  // the worst first, then in the order of the file
+  std::map<diag::Code, std::uint64_t> notInFull;  // how many of a code were counted alone
+  std::uint64_t errors = 0;                       // counted alone or in full; so are the next two
+  std::uint64_t warnings = 0;
+  std::uint64_t notes = 0;
+};
+
+// Takes any bytes. Time and memory grow with the text, what came over, and the frames that are looked at.
+Report Check(std::string_view text, const CameOver& cameOver, const Options& options = {});
+
+}  // namespace check

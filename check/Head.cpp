@@ -1,0 +1,67 @@
+#include "check/Head.h"
+
+#include <algorithm>
+
+#include "check/HeadInternal.h"
+
+namespace check {
+namespace {
+
+template <typename T>
+Given<T> GivenBy(const scene::Said<T>& said, diag::Lines& lines) {
+  Given<T> given{said.value};
+  if (said.place) given.where = WhereIs(*said.place, lines);
+  return given;
+}
+
+Given<std::string> UnitGivenBy(const scene::UnitWord& unit, const char* otherwise, diag::Lines& lines) {
+  if (unit.word.empty()) return {otherwise};
+  return {std::string(unit.word), WhereIs(unit.place, lines)};
+}
+
+void AddRange(const char* what, const std::optional<scene::Said<scene::FrameRange>>& said, diag::Lines& lines,
+              std::vector<Range>* ranges) {
+  if (!said || !said->place) return;
+  ranges->push_back({what, said->value.first, said->value.last, WhereIs(*said->place, lines)});
+}
+
+std::size_t CountOf(LayerKind kind, const CameOver& cameOver) {
+  return static_cast<std::size_t>(
+      std::count_if(cameOver.layers.begin(), cameOver.layers.end(),
+                    [kind](const CameOverLayer& layer) { return layer.kind == kind; }));
+}
+
+}  // namespace
+
+Where WhereIs(const diag::Range& range, diag::Lines& lines) { return {range, lines.At(range.offset)}; }
+
+Head ReadHead(const scene::Scene& scene, const scene::Settings& settings, const CameOver& cameOver,
+              const std::vector<Camera>& cameras, diag::Lines& lines) {
+  Head head;
+  head.isScene = true;
+  head.product = settings.product;
+  head.linearUnit = UnitGivenBy(scene.linearUnit(), "centimeter", lines);
+  head.angularUnit = UnitGivenBy(scene.angularUnit(), "degree", lines);
+  head.timeUnit = UnitGivenBy(scene.timeUnit(), "film", lines);
+  head.framesPerSecond = settings.rate.value.perSecond();
+  AddRange("playback", settings.playback, lines, &head.ranges);
+  AddRange("animation", settings.animation, lines, &head.ranges);
+  AddRange("render", settings.render, lines, &head.ranges);
+  head.width = GivenBy(settings.width, lines);
+  head.height = GivenBy(settings.height, lines);
+  head.pixelAspect = GivenBy(settings.deviceAspect, lines);
+  head.pixelAspect.value = settings.pixelAspect();
+  for (const Camera& camera : cameras) {
+    if (IsStartupCamera(scene.node(camera.shape)) && camera.layer == nullptr) continue;
+    if (head.cameras.size() == Head::kMostCameras) {
+      ++head.camerasNotShown;
+    } else {
+      head.cameras.push_back(DescribeCamera(scene, settings, cameOver, camera, lines));
+    }
+  }
+  head.camerasThatCame = CountOf(LayerKind::Camera, cameOver);
+  head.nullsThatCame = CountOf(LayerKind::Null, cameOver);
+  return head;
+}
+
+}  // namespace check

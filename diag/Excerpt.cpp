@@ -1,0 +1,75 @@
+#include "diag/Excerpt.h"
+
+#include <algorithm>
+#include <cstddef>
+
+#include "diag/ShownText.h"
+
+namespace diag {
+namespace {
+
+// Of a long line so many bytes are shown before the mark, and so many in all.
+constexpr std::size_t kBefore = 40;
+constexpr std::size_t kMost = 100;
+
+constexpr std::string_view kCut = "...";
+
+bool IsInsideCharacter(char c) { return (static_cast<unsigned char>(c) & 0xc0) == 0x80; }
+
+// How many columns a terminal gives to a text that is harmless: one for each character, nearly.
+std::size_t ColumnsOf(std::string_view shown) {
+  return static_cast<std::size_t>(
+      std::count_if(shown.begin(), shown.end(), [](char c) { return !IsInsideCharacter(c); }));
+}
+
+// Tabs are shown as single blanks, so that the mark stands under its text everywhere.
+std::string Shown(std::string_view bytes) {
+  std::string blanks(bytes);
+  std::replace(blanks.begin(), blanks.end(), '\t', ' ');
+  return ShownText(blanks);
+}
+
+// Moves a place to the beginning of the character that it is in, within a few bytes.
+std::size_t AtCharacter(std::string_view line, std::size_t at) {
+  for (int steps = 0; steps < 3 && at > 0 && at < line.size() && IsInsideCharacter(line[at]); ++steps) --at;
+  return at;
+}
+
+}  // namespace
+
+std::string Excerpt(std::string_view text, const Range& range) {
+  if (range.offset > text.size()) return {};
+  const auto offset = static_cast<std::size_t>(range.offset);
+  // Only as much of the line is looked for as can be shown.
+  const std::size_t earliest = offset > kMost ? offset - kMost : 0;
+  const std::size_t feed = text.substr(earliest, offset - earliest).rfind('\n');
+  std::size_t start = feed == std::string_view::npos ? earliest : earliest + feed + 1;
+  const bool wholeStart = start == 0 || text[start - 1] == '\n';
+  const std::string_view rest = text.substr(start, offset - start + kMost);
+  const std::string_view line =
+      rest.substr(0, std::min(rest.find_first_of("\r\n", offset - start), rest.size()));
+  const std::size_t lineEnd = start + line.size();
+  const bool wholeEnd = lineEnd == text.size() || text[lineEnd] == '\n' || text[lineEnd] == '\r';
+  if (line.empty()) return {};
+
+  const std::size_t mark = offset - start;
+  std::size_t first = 0;
+  if (!wholeStart || (line.size() > kMost && mark > kBefore)) first = mark > kBefore ? mark - kBefore : 0;
+  first = AtCharacter(line, first);
+  const std::size_t last = AtCharacter(line, std::min(line.size(), first + kMost));
+  const bool cutBefore = !wholeStart || first != 0;
+  const bool cutAfter = !wholeEnd || last != line.size();
+  const std::size_t markEnd = std::min<std::size_t>(
+      last, mark + static_cast<std::size_t>(std::min<std::uint64_t>(range.length, kMost)));
+
+  std::string shown = cutBefore ? std::string(kCut) : std::string();
+  shown += Shown(line.substr(first, mark - first));
+  const std::size_t column = ColumnsOf(shown);
+  const std::string marked = Shown(line.substr(mark, markEnd - mark));
+  shown += marked + Shown(line.substr(markEnd, last - markEnd));
+  if (cutAfter) shown += kCut;
+  const std::size_t width = std::max<std::size_t>(1, ColumnsOf(marked));
+  return shown + '\n' + std::string(column, ' ') + '^' + std::string(width - 1, '~') + '\n';
+}
+
+}  // namespace diag

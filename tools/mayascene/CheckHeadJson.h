@@ -1,0 +1,16 @@
+// The head of a check's report as JSON.
+#pragma once
+
+#include "check/Head.h"
+#include "tools/mayascene/JsonWriter.h"
+
+namespace mayascene {
+
+// Null where the file is no scene.
+void writeHead(JsonWriter& json, const check::Head& head);
+
+// Bytes, and lines and columns of the first byte and after the last one.
+void writeRange(JsonWriter& json, const diag::Range& range, const diag::LineAndColumn& begin,
+                const diag::LineAndColumn& end);
+
+}  // namespace mayascene

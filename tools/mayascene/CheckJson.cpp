@@ -1,0 +1,86 @@
+#include "tools/mayascene/CheckJson.h"
+
+#include <string_view>
+
+#include "tools/mayascene/CheckHeadJson.h"
+
+namespace mayascene {
+namespace {
+
+constexpr std::string_view kFormat = "mayascene-check-report";
+constexpr std::int64_t kVersionOfForm = 1;
+
+void writeText(JsonWriter& json, std::string_view key, std::string_view text) {
+  json.key(key);
+  json.text(text);
+}
+
+void writeCount(JsonWriter& json, std::string_view key, std::uint64_t count) {
+  json.key(key);
+  json.integer(static_cast<std::int64_t>(count));
+}
+
+void writeFinding(JsonWriter& json, const check::Finding& finding) {
+  const diag::Diagnostic& diagnostic = finding.diagnostic;
+  json.beginObject();
+  writeText(json, "code", diag::NameOf(diagnostic.code));
+  writeText(json, "severity", diag::NameOf(diag::EntryOf(diagnostic.code).severity));
+  writeText(json, "sentence", diag::SentenceOf(diagnostic));
+  writeText(json, "help", diag::HelpOf(diagnostic));
+  json.key("arguments");
+  json.beginArray();
+  for (const std::string& argument : diagnostic.arguments) json.text(argument);
+  json.endArray();
+  json.key("range");
+  if (diag::IsOfWholeFile(diagnostic)) {
+    json.null();
+  } else {
+    writeRange(json, diagnostic.range, diagnostic.place, finding.end);
+  }
+  json.endObject();
+}
+
+void writeReport(JsonWriter& json, const check::Report& report) {
+  writeCount(json, "errors", report.errors);
+  writeCount(json, "warnings", report.warnings);
+  writeCount(json, "notes", report.notes);
+  json.key("head");
+  writeHead(json, report.head);
+  json.key("diagnostics");
+  json.beginArray();
+  for (const check::Finding& finding : report.findings) writeFinding(json, finding);
+  json.endArray();
+  json.key("notInFull");
+  json.beginObject();
+  for (const auto& [code, times] : report.notInFull) writeCount(json, diag::NameOf(code), times);
+  json.endObject();
+}
+
+}  // namespace
+
+void writeCheckedScene(JsonWriter& json, const CheckedScene& scene) {
+  json.beginObject();
+  writeText(json, "path", scene.path);
+  writeCount(json, "status", static_cast<std::uint64_t>(scene.status));
+  json.key("failure");
+  scene.failure.empty() ? json.null() : json.text(scene.failure);
+  writeReport(json, scene.report);
+  json.endObject();
+}
+
+CheckJson::CheckJson(std::ostream& out) : out_(out), json_(out) {
+  json_.beginObject();
+  writeText(json_, "format", kFormat);
+  json_.key("version");
+  json_.integer(kVersionOfForm);
+  json_.key("scenes");
+  json_.beginArray();
+}
+
+void CheckJson::end() {
+  json_.endArray();
+  json_.endObject();
+  out_ << '\n';
+}
+
+}  // namespace mayascene

@@ -1,0 +1,18 @@
+// The report of a check, for a person to read.
+#pragma once
+
+#include <ostream>
+
+#include "tools/mayascene/SceneCheck.h"
+#include "tools/mayascene/TerminalText.h"
+
+namespace mayascene {
+
+// The head, the diagnostics in the form that compilers use, and a last line with totals. Of a quiet report
+// the errors alone. Nothing for a file that could not be read. What comes out of the scene is made harmless.
+void printCheck(std::ostream& out, const CheckedScene& scene, bool quiet, const Style& style);
+
+// "2 errors, 1 warning, no notes"
+std::string totalsText(const check::Report& report);
+
+}  // namespace mayascene

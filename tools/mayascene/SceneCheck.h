@@ -1,0 +1,25 @@
+// One scene's check: imported, read, explained.
+#pragma once
+
+#include <string>
+
+#include "check/Check.h"
+#include "tools/mayascene/Diagnostics.h"
+#include "tools/mayascene/ExitStatus.h"
+#include "tools/mayascene/HostSession.h"
+
+namespace mayascene {
+
+struct CheckedScene {
+  std::string path;  // as the user named it; bytes
+  ExitStatus status = ExitStatus::Unreadable;
+  std::string failure;   // why the file cannot be read; empty: it could
+  check::Report report;  // of a file that could be read
+};
+
+// Imports the scene and reports what became of it. Complains of a file that cannot be read, and of what the
+// import left behind.
+CheckedScene checkScene(const std::string& path, const check::Options& options, HostSession& session,
+                        Diagnostics& diagnostics);
+
+}  // namespace mayascene
