@@ -1,0 +1,53 @@
+// A child process whose two output streams are caught.
+#pragma once
+
+#include <sys/types.h>
+
+#include <cstddef>
+#include <cstdint>
+#include <memory>
+#include <optional>
+#include <string>
+#include <vector>
+
+namespace mayascene {
+
+class ChildProcess {
+ public:
+  // One of the two streams, as far as it has come.
+  struct Stream {
+    int descriptor = -1;  // not blocking; -1 once it has ended
+    std::string text;
+  };
+
+  // Runs the program command[0], a path, with the words. It reads nothing, may take so many bytes of address
+  // space (0: as many as this process), and ends when this process does, however that ends. The three
+  // standard descriptors of this process are open. Null with an errno in *failure when it cannot be started.
+  static std::unique_ptr<ChildProcess> start(const std::vector<std::string>& command, std::uint64_t memory,
+                                             int* failure);
+
+  // A child that has not ended is killed, and waited for.
+  ~ChildProcess();
+  ChildProcess(const ChildProcess&) = delete;
+  ChildProcess& operator=(const ChildProcess&) = delete;
+
+  Stream& out() { return out_; }
+  Stream& err() { return err_; }
+
+  // Takes what has come, at most some hundred kilobytes of each stream. Never waits.
+  void read();
+
+  void kill();  // what cannot be refused; ended() still has to see the end
+
+  // How it ended, in the form of waitpid; nothing while it runs.
+  std::optional<int> ended();
+
+ private:
+  ChildProcess() = default;
+
+  pid_t process_ = -1;
+  std::optional<int> status_;
+  Stream out_, err_;
+};
+
+}  // namespace mayascene
