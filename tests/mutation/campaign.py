@@ -1,7 +1,7 @@
 """Changes the importer one token at a time, and looks whether the tests notice.
 
 usage: scripts/mutate [--count N] [--seed N] [--only FOLDER] [--headers] [--quick | --own] [--jobs N] [--again]
-       scripts/mutate --named [WORD...]
+       scripts/mutate --named [WORD...] [--by PROGRAM]
 
 Chooses mutants of the sources of plugin, maya, comp, hostutil and scan, as many of each: comparisons that take in their
 limit or lose it, arithmetic and logic turned round, constants replaced by their neighbours, conditions negated. Each
@@ -11,7 +11,8 @@ not compile is replaced by another one. Prints those that no test catches, and t
 tests/mutation/equivalents.txt names changes nothing that can be seen: it is counted by itself.
 
 --named applies the sixty faults of tests/mutation/faults.py instead, or those with one of the words in their names,
-and shows which tests catch each; it ends with 0 when each is caught, 1 when one is not.
+and shows which tests catch each; it ends with 0 when each is caught, 1 when one is not. --by leaves it to one program
+of tests to catch them: with second_reader_test, to the second reader alone.
 
 Ends with 0 when at least 95 % were caught, 1 when fewer were, 2 for a wrong command line, 10 when the machine could not
 be set up or the unchanged sources do not pass.
@@ -31,7 +32,7 @@ from pathlib import Path
 
 import named
 from mutants import Mutant, mutants_of
-from workspace import FIRST_STAGE, LAST_STAGE, QUICK_STAGES, STAGES, Workspace, WorkspaceError
+from workspace import FIRST_STAGE, LAST_STAGE, PROGRAMS, QUICK_STAGES, STAGES, Workspace, WorkspaceError
 
 ROOT = Path(__file__).resolve().parents[2]
 PLACE = ROOT / "build" / "mutate"
@@ -177,9 +178,12 @@ def arguments():
     parser.add_argument("--jobs", type=int, default=1, metavar="N", help="how many are tried at a time (1)")
     parser.add_argument("--again", action="store_true", help="only those that survived when it ran last")
     parser.add_argument("--named", nargs="*", metavar="WORD", help="the faults of tests/mutation/faults.py")
+    parser.add_argument("--by", choices=PROGRAMS, metavar="PROGRAM", help="the faults by this program of tests alone")
     options = parser.parse_args()
     if options.count < 1 or options.jobs < 1:
         parser.error("--count and --jobs are at least 1")
+    if options.by and options.named is None:
+        parser.error("--by goes with --named")
     if options.again and not RESULTS.exists():
         parser.error("there are no survivors to try again")
     return options
@@ -205,9 +209,9 @@ def write_survivors(survivors):
     RESULTS.write_text(json.dumps(entries, indent=1) + "\n", encoding="utf-8")
 
 
-def try_named(words):
+def try_named(words, program):
     try:
-        return named.run(Workspace(ROOT, PLACE / "named"), words)
+        return named.run(Workspace(ROOT, PLACE / "named"), words, program)
     except (WorkspaceError, OSError, subprocess.SubprocessError) as error:
         print(f"scripts/mutate: {error}", file=sys.stderr)
         return SETUP_FAILED
@@ -216,7 +220,7 @@ def try_named(words):
 def main():
     options = arguments()
     if options.named is not None:
-        return try_named(options.named)
+        return try_named(options.named, options.by)
     folders = (options.only,) if options.only else FOLDERS
     suffixes = (".h", ".cpp") if options.headers else (".cpp",)
     campaign = Campaign(survivors_of_last_run() if options.again

@@ -5,8 +5,8 @@ from collections import Counter
 
 from campaign import ROOT
 from faults import FAULTS
-from named import FAILED, chosen, row
-from workspace import OWN_TESTS
+from named import FAILED, STAGES, chosen, row, stages_by
+from workspace import OWN_TESTS, PROGRAMS
 
 
 class Faults(unittest.TestCase):
@@ -32,6 +32,13 @@ class Words(unittest.TestCase):
         self.assertEqual([fault.name for fault in chosen(["second NUL", "growth step is"])],
                          ["the growth step is ignored", "the second NUL is missing"])
         self.assertEqual(chosen(["no such words"]), [])
+
+    def test_one_program_can_be_left_to_catch_all(self):
+        self.assertIn("second_reader_test", PROGRAMS)
+        (alone,) = stages_by("second_reader_test")
+        for fault in FAULTS:
+            self.assertEqual((alone.programs(fault.file), alone.targets(fault.file)), (("second_reader_test",),) * 2)
+        self.assertEqual(stages_by(None), STAGES)
 
     def test_failing_tests_are_found_in_what_a_program_prints(self):
         text = ("[  FAILED  ] A.B (3 ms)\n[  FAILED  ] Shares/C.D/2, where GetParam() = 2 (0 ms)\n"

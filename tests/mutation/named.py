@@ -3,13 +3,17 @@
 Each is built and tested by itself in a copy of the sources: by the tests of its room; where those pass, by whole
 imports; where those pass too, by everything. Each program runs to its end, so that all its tests that fail are known.
 Prints a row of a table for each fault.
+
+So a row names the nearest tests that notice a fault, and says nothing of the others. What one program notices by
+itself is shown with --by. scripts/mutate --named "every rotation" --by second_reader_test shows that the second
+reader, which shares no code with the product, notices rotations that turn the other way, without any other test.
 """
 
 import re
 import tempfile
 
 from faults import FAULTS
-from workspace import FIRST_STAGE, LAST_STAGE, QUICK_STAGES
+from workspace import LAST_STAGE, QUICK_STAGES, OneProgram
 
 STAGES = (*QUICK_STAGES, LAST_STAGE)
 SHOWN_TESTS = 2
@@ -67,14 +71,19 @@ def row(fault, found):
     return f"| {fault.name} | {'; '.join(cells)} |"
 
 
-def run(workspace, words):
+def stages_by(program):
+    """What each fault goes through: the one program, or all stages without one."""
+    return (OneProgram(program),) if program else STAGES
+
+
+def run(workspace, words, program):
     """Tries those that are chosen; 0 when each is caught."""
     waiting = chosen(words)
     if not waiting:
         print("no fault has such a name")
         return 2
     count, caught = len(waiting), 0
-    for stage in STAGES:
+    for stage in stages_by(program):
         rooms = sorted({room_of(fault) for fault in waiting})
         workspace.prepare((stage,), rooms)
         workspace.measure((stage,), rooms)

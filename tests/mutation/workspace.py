@@ -50,6 +50,15 @@ class Stage:
         return (*self.programs(file), *(OTHER_TARGETS if self.name == ALL else ()))
 
 
+@dataclass(frozen=True)
+class OneProgram(Stage):
+    """A stage of one program, whatever file is changed."""
+
+    def programs(self, file):
+        return (self.name,)
+
+
+PROGRAMS = sorted({*WHOLE_IMPORTS, *EVERYTHING, *(program for own in OWN_TESTS.values() for program in own)})
 OWN, IMPORTS, ALL = "own tests", "whole imports", "everything"
 FIRST_STAGE = Stage(OWN)
 QUICK_STAGES = (FIRST_STAGE, Stage(IMPORTS))
