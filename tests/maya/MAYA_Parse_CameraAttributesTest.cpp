@@ -163,6 +163,22 @@ TEST_F(CameraAttributesTest, ACommandWithoutAValueKeepsAConnectionMadeMeanwhile)
   for (const char* const command : kWithValue) EXPECT_EQ(curveAfter(command), -1) << command;
 }
 
+TEST_F(CameraAttributesTest, ACommandWithoutAValueLeavesNothingForTheNextToWrite) {
+  for (const char* const command : kWithoutValue) {
+    SCOPED_TRACE(command);
+    const MAYA_Camera camera = CameraWith("setAttr \".fl\" 50; setAttr \".ff\" 2; setAttr \".cap\" 3 4;\n" +
+                                          std::string(command) + "\nsetAttr \".wci\" 5 6 7;");
+    EXPECT_DOUBLE_EQ(camera.focalLength, 50.0);
+    EXPECT_EQ(camera.filmFit, 1);
+    EXPECT_THAT(Values(camera.cameraAperture), ElementsAre(3, 4));
+    EXPECT_THAT(Values(camera.worldCenterOfInterest), ElementsAre(5, 6, 7));
+    EXPECT_EQ(camera.orthographic, 0);
+    const MAYA_Camera aimed =
+        CameraWith("setAttr \".wci\" 5 6 7;\n" + std::string(command) + "\nsetAttr \".fl\" 50;");
+    EXPECT_THAT(Values(aimed.worldCenterOfInterest), ElementsAre(5, 6, 7));
+  }
+}
+
 TEST_F(CameraAttributesTest, OfTwoCamerasOfANameTheFirstKeepsItsParentWithoutAValue) {
   const auto parentAfter = [this](const char* command) {
     EXPECT_EQ(Read("createNode camera -n \"c\" -p \"one\";\ncreateNode camera -n \"c\" -p \"two\";\n" +
