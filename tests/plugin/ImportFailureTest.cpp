@@ -149,6 +149,7 @@ TEST_F(ImportFailureTest, AnUnknownExceptionLeavesTheTextLockedAndReleasesThePar
   const refhost::CallbackResult result =
       Import(path_, {ThrowCall("CreateComp", 1, refhost::Failure::Kind::Other)});
   EXPECT_EQ(result.code, HOST_ERR_EXCEPTION_OTHER);
+  EXPECT_TRUE(result.refusals.empty()) << "the host stops what leaves the callback, and says so";
   EXPECT_THAT(result.messages, IsEmpty());
   EXPECT_EQ(CallsNamed("UnlockMemHandle"), 0u);
   EXPECT_EQ(CallsNamed("FreeMemHandle"), 0u);
@@ -164,6 +165,7 @@ TEST_F(ImportFailureTest, AnUnknownExceptionPassesTheOpenBatchesButReleasesTheSt
   const refhost::CallbackResult result =
       Import(path_, {ThrowCall("SetBatchKeyframeValue", 3, refhost::Failure::Kind::Other)});
   EXPECT_EQ(result.code, HOST_ERR_EXCEPTION_OTHER);
+  EXPECT_TRUE(result.refusals.empty()) << "the host stops what leaves the callback, and says so";
   std::size_t batches = 0;
   for (const refhost::Leftover& left : result.leftovers) {
     EXPECT_FALSE(left.description.starts_with("stream:")) << left.description;
