@@ -1,5 +1,6 @@
 #include "tests/support/BuilderFixture.h"
 #include "tests/support/BuilderRun.h"
+#include "tests/support/ThrowsOther.h"
 
 namespace testsupport {
 namespace {
@@ -51,33 +52,6 @@ std::string Ended(int batch, HostError error = 0) {
          "\"batch\":\"batch:" +
          std::to_string(batch) + "\",\"error\":" + std::to_string(error) + "}";
 }
-
-// The host's suites, with one operation that throws what is no standard exception.
-class OddlyThrowingSuites {
- public:
-  explicit OddlyThrowingSuites(const WNBasicSuite* host) { host_ = host; }
-  const WNBasicSuite* basicSuite() const { return &kRoot; }
-
- private:
-  static HostError Acquire(const char* name, std::int32_t version, const void** suite) {
-    const HostError code = host_->AcquireSuite(name, version, suite);
-    if (code != 0 || std::string_view(name) != QZGP_STREAM_SUITE || version != QZGP_STREAM_SUITE_8)
-      return code;
-    changed_ = *static_cast<const QZGP_StreamSuite8*>(*suite);
-    changed_.SetStreamValue = [](std::int32_t, VOR_Stream*, const StreamValueRecord*) -> HostError {
-      throw "neither an integer nor a standard exception";
-    };
-    *suite = &changed_;
-    return 0;
-  }
-  static HostError Release(const char* name, std::int32_t version) {
-    return host_->ReleaseSuiteByName(name, version);
-  }
-
-  static constexpr WNBasicSuite kRoot{Acquire, Release};
-  static inline const WNBasicSuite* host_ = nullptr;
-  static inline QZGP_StreamSuite8 changed_{};
-};
 
 refhost::HostOptions Failing(const std::string& operation, HostError code, std::int64_t nth = 1) {
   refhost::Failure failure;
@@ -187,15 +161,20 @@ TEST_F(StreamsTest, AStandardExceptionFromTheHostIsReportedAndBecomesItsCode) {
 }
 
 TEST_F(StreamsTest, AnyOtherExceptionPassesThroughAndTheStreamIsReleased) {
-  Begin();
+  Begin("", Throwing("SetStreamValue", refhost::Failure::Kind::Other));
   VOR_Layer* const layer = NewNull();
-  TakeTrace();
-  const OddlyThrowingSuites odd(host().basicSuite());
-  MAYA_Parse parser(odd.basicSuite(), "");
-  EXPECT_THROW(parser.SetOneDStream(layer, kXRotation, 1.0), const char*);
-  const std::vector<std::string> trace = TakeTrace();
-  EXPECT_EQ(CallsOf(trace, "AcquireLayerStream").size(), 1u);
-  EXPECT_EQ(CallsOf(trace, "ReleaseStream").size(), 1u);
+  EXPECT_TRUE(ThrowsOther([&] { parser().SetOneDStream(layer, kXRotation, 1.0); }));
+  EXPECT_THAT(TakeTrace(), ElementsAre(Acquired(1, 8, 1), Set(1, "[1,0,0,0]", "\"other\""), Released(1)));
+  EXPECT_THAT(End().messages, IsEmpty());
+}
+
+TEST_F(StreamsTest, AnyOtherExceptionPassesThroughAlsoWhereTheReleaseThrowsToo) {
+  refhost::HostOptions options = Throwing("SetStreamValue", refhost::Failure::Kind::Other);
+  options.failures.push_back(Throwing("ReleaseStream", refhost::Failure::Kind::Other).failures[0]);
+  Begin("", options);
+  VOR_Layer* const layer = NewNull();
+  EXPECT_TRUE(ThrowsOther([&] { parser().SetOneDStream(layer, kXRotation, 1.0); }));
+  EXPECT_EQ(CallsOf(TakeTrace(), "ReleaseStream").size(), 1u);
 }
 
 TEST_F(StreamsTest, AMissingValueSuiteIsThirteenAndTheStreamIsReleased) {
