@@ -54,6 +54,12 @@ class Documents(unittest.TestCase):
                 if "/" in file:
                     self.assertTrue((ROOT / file).exists(), f"{name} names {file}")
 
+    def test_the_exit_statuses_are_those_of_the_help(self):
+        table = re.findall(r"^\| (\d) \| (.+) \|$", read("README.md"), re.MULTILINE)
+        helped = re.search(r"^Exit status:\n(.*?)^With", read("docs/mayascene.md"), re.MULTILINE | re.DOTALL)[1]
+        rows = re.findall(r"^  (\d)  (.+)$", re.sub(r"\n {5}", " ", helped), re.MULTILINE)
+        self.assertEqual([(number, text.replace("`", "")) for number, text in table], rows)
+
     def test_the_architecture_lists_every_file_of_the_builder(self):
         listed = set(re.findall(r"^\| `(MAYA_Parse_\w+\.cpp)` \|", read("docs/architecture.md"), re.MULTILINE))
         self.assertEqual(listed, {path.name for path in (ROOT / "comp").glob("MAYA_Parse_*.cpp")})

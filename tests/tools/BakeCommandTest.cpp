@@ -1,17 +1,22 @@
 // mayascene bake and import --bake, as a user runs them.
+#include <fcntl.h>
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 #include <signal.h>
+#include <sys/stat.h>
+#include <unistd.h>
 
+#include <algorithm>
 #include <filesystem>
 #include <string>
+#include <vector>
 
 #include "tests/tools/ToolRun.h"
 
 namespace mayascene_test {
 namespace {
 
-using testing::ElementsAre;
+using testing::AllOf;
 using testing::HasSubstr;
 using testing::IsEmpty;
 using testing::Not;
@@ -69,15 +74,82 @@ TEST_F(BakeCommand, TheTraceHasThePathThatWasPassed) {
 }
 
 TEST_F(BakeCommand, ASignalTakesTheTemporaryBakeAway) {
-  std::string scene = unbakedScene();
-  write("shot.ma", scene);
-  // Long enough that the signal comes while the bake is there.
-  const int process = start({"import", "--bake", "--quiet", "--frames", "1:1999999", "shot.ma"});
-  for (int i = 0; i < 3'000 && temporariesAreGone(); ++i) usleep(10'000);
-  ASSERT_FALSE(temporariesAreGone());
-  ASSERT_EQ(kill(process, SIGTERM), 0);
-  EXPECT_EQ(end(process).status, 128 + SIGTERM);
+  write("shot.ma", unbakedScene());
+  for (const int signal : {SIGINT, SIGTERM, SIGHUP}) {
+    // Long enough that the signal comes while the bake is there.
+    const int process = start({"import", "--bake", "--quiet", "--frames", "1:1999999", "shot.ma"});
+    for (int i = 0; i < 3'000 && temporariesAreGone(); ++i) usleep(10'000);
+    ASSERT_FALSE(temporariesAreGone());
+    ASSERT_EQ(kill(process, signal), 0);
+    EXPECT_EQ(end(process).status, 128 + signal);
+    EXPECT_TRUE(temporariesAreGone()) << signal;
+  }
+}
+
+TEST_F(BakeCommand, ASignalLeavesNoBakeThatIsNotWhole) {
+  write("shot.ma", unbakedScene());
+  for (const int signal : {SIGINT, SIGTERM, SIGHUP}) {
+    const std::vector<std::string> before = files();
+    const int process = start({"bake", "--quiet", "--frames", "1:1999999", "shot.ma", "-o", "baked.ma"});
+    for (int i = 0; i < 3'000 && files() == before; ++i) usleep(10'000);
+    ASSERT_NE(files(), before);
+    ASSERT_EQ(kill(process, signal), 0);
+    EXPECT_EQ(end(process).status, 128 + signal);
+    EXPECT_EQ(files(), before) << signal;
+  }
+}
+
+// The import of the bake waits for the reader of its trace: the folder is there to look at meanwhile.
+TEST_F(BakeCommand, OnlyTheUserCanEnterTheTemporaryFolder) {
+  namespace fs = std::filesystem;
+  write("shot.ma", unbakedScene());
+  ASSERT_EQ(mkfifo(path("trace").c_str(), 0600), 0);
+  const int process =
+      start({"import", "--bake", "--quiet", "--frames", "1:2000", "--trace", "trace", "shot.ma"});
+  const int trace = open(path("trace").c_str(), O_RDONLY | O_CLOEXEC);
+  ASSERT_GE(trace, 0);
+  const auto bakeIsThere = [&] {
+    const fs::recursive_directory_iterator all(path("tmp"));
+    return std::any_of(fs::begin(all), fs::end(all), [](const auto& one) { return one.is_regular_file(); });
+  };
+  for (int i = 0; i < 3'000 && !bakeIsThere(); ++i) usleep(1'000);
+  int seen = 0;
+  for (const auto& folder : fs::directory_iterator(path("tmp"))) {
+    EXPECT_EQ(folder.status().permissions(), fs::perms::owner_all);
+    for (const auto& file : fs::directory_iterator(folder)) {
+      EXPECT_EQ(file.path().filename(), "shot.ma");
+      ++seen;
+      EXPECT_EQ(file.status().permissions(), fs::perms::owner_read | fs::perms::owner_write);
+    }
+  }
+  EXPECT_EQ(seen, 1);
+  char text[4096];
+  while (::read(trace, text, sizeof text) > 0) {
+  }
+  close(trace);
+  EXPECT_EQ(end(process).status, 0);
   EXPECT_TRUE(temporariesAreGone());
+}
+
+TEST_F(BakeCommand, WhatIsShownNamesTheSceneAlsoWhereItIsHostile) {
+  for (const std::string name : {"dir/shot.ma", "dir/a\x1b[2Jb.ma", "dir/\xff.ma", "dir/new\nline.ma"}) {
+    std::filesystem::create_directories(path("dir"));
+    write(name, unbakedScene());
+    const ToolResult result = run({"import", "--bake", "--json", "out.json", "--report", "r.json", name});
+    EXPECT_EQ(result.status, 0) << result.err;
+    EXPECT_THAT(result.err, HasSubstr("kept by design: file dir/"));
+    const std::string all = result.out + result.err + read("out.json") + read("r.json");
+    EXPECT_THAT(all, Not(HasSubstr(path("tmp").string()))) << name;
+    EXPECT_EQ(all.find('\x1b'), std::string::npos);
+  }
+}
+
+TEST_F(BakeCommand, ATemporaryFolderThatCannotBeMadeIsStatus5) {
+  write("shot.ma", unbakedScene());
+  environment["TMPDIR"] = path("missing").string();
+  const ToolResult result = run({"import", "--bake", "--json", "out.json", "shot.ma"});
+  EXPECT_EQ(result.status, 5);
+  EXPECT_THAT(result.err, HasSubstr("mayascene: shot.ma: a temporary folder cannot be written"));
 }
 
 TEST_F(BakeCommand, SeveralScenesGoIntoAFolderAndNamesThatAreTheSameAreNumbered) {
@@ -98,6 +170,100 @@ TEST_F(BakeCommand, ASceneIsNeverOverwritten) {
   EXPECT_EQ(run({"bake", "shot.ma", "-o", "."}).status, 2);
   EXPECT_EQ(run({"bake", "shot.ma", "-o", "baked.ma", "--report", "shot.ma"}).status, 2);
   EXPECT_EQ(read("shot.ma"), scene);
+}
+
+TEST_F(BakeCommand, ASceneIsNotOverwrittenThroughALinkEither) {
+  namespace fs = std::filesystem;
+  const std::string scene = unbakedScene();
+  write("shot.ma", scene);
+  fs::create_directory(path("out"));
+  fs::create_symlink(path("shot.ma"), path("soft.ma"));
+  fs::create_symlink("../shot.ma", path("out/shot.ma"));
+  fs::create_hard_link(path("shot.ma"), path("hard.ma"));
+  fs::create_directory_symlink(".", path("here"));
+  const std::string whole = path("shot.ma").string();
+  for (const std::string output : {"soft.ma", "hard.ma", "here/shot.ma", "here/./here/soft.ma", "out", "out/",
+                                   "here", ".//shot.ma", whole.c_str()}) {
+    const ToolResult result = run({"bake", "shot.ma", "-o", output});
+    EXPECT_EQ(result.status, 2) << output;
+    EXPECT_THAT(result.err, HasSubstr("would be overwritten")) << output;
+    EXPECT_EQ(run({"import", "--bake", "--report", output, "shot.ma"}).status == 0, false) << output;
+  }
+  EXPECT_EQ(read("shot.ma"), scene);
+}
+
+TEST_F(BakeCommand, TheReportIsNotOneOfTheBakes) {
+  write("shot.ma", unbakedScene());
+  EXPECT_EQ(run({"bake", "shot.ma", "-o", "baked.ma", "--report", "./baked.ma"}).status, 2);
+  EXPECT_EQ(run({"bake", "shot.ma", "-o", "out/", "--report", "out/shot.ma"}).status, 2);
+}
+
+TEST_F(BakeCommand, SeveralScenesNeedAFolder) {
+  write("a.ma", unbakedScene());
+  write("b.ma", unbakedScene());
+  write("file", "");
+  EXPECT_EQ(run({"bake", "a.ma", "b.ma", "-o", "-"}).status, 2);
+  const ToolResult result = run({"bake", "a.ma", "b.ma", "-o", "file"});
+  EXPECT_EQ(result.status, 2);
+  EXPECT_THAT(result.err, HasSubstr("file is no folder: the bakes of several scenes need one"));
+  EXPECT_FALSE(std::filesystem::exists(path("-")));
+}
+
+TEST_F(BakeCommand, AFolderIsMadeAlsoForOneScene) {
+  write("a.ma", unbakedScene());
+  EXPECT_EQ(run({"bake", "-q", "a.ma", "-o", "new/deep/"}).status, 0);
+  EXPECT_TRUE(std::filesystem::exists(path("new/deep/a.ma")));
+}
+
+TEST_F(BakeCommand, ASceneThatFailsLeavesWhatLiesAtItsPlace) {
+  write("notes.ma", "hello\n");
+  write("baked.ma", "before");
+  EXPECT_EQ(run({"bake", "-q", "notes.ma", "-o", "baked.ma"}).status, 1);
+  EXPECT_EQ(run({"bake", "-q", "missing.ma", "-o", "baked.ma"}).status, 3);
+  write("shot.ma", unbakedScene());
+  EXPECT_EQ(run({"bake", "-q", "--camera", "nobody", "shot.ma", "-o", "baked.ma"}).status, 1);
+  EXPECT_EQ(read("baked.ma"), "before");
+}
+
+TEST_F(BakeCommand, TheSameInputGivesTheSameBytes) {
+  write("shot.ma", unbakedScene());
+  for (const char* output : {"one.ma", "two.ma"}) {
+    EXPECT_EQ(run({"bake", "-q", "--step", "0.25", "shot.ma", "-o", output}).status, 0);
+  }
+  EXPECT_EQ(read("one.ma"), read("two.ma"));
+  environment["TZ"] = "Asia/Tokyo";
+  environment["LC_ALL"] = "de_DE.UTF-8";
+  EXPECT_EQ(run({"bake", "-q", "--step", "0.25", "shot.ma", "-o", "three.ma"}).status, 0);
+  EXPECT_EQ(read("one.ma"), read("three.ma"));
+}
+
+TEST_F(BakeCommand, FramesAndAStepOfAFractionOfAFrameAreWhatIsWritten) {
+  write("shot.ma", unbakedScene());
+  EXPECT_EQ(run({"bake", "-q", "--frames", "1001:1002", "--step", "0.25", "shot.ma", "-o", "b.ma"}).status,
+            0);
+  EXPECT_THAT(read("b.ma"), AllOf(HasSubstr("-s 5 \".ktv[0:4]\"  0 0 0.25 0.2"), HasSubstr(" 0.75 0.7")));
+  EXPECT_THAT(read("b.ma"),
+              HasSubstr("// Frame 0 is frame 1001 of that scene; its last one, 1, is frame 1002."));
+  EXPECT_EQ(run({"bake", "-q", "--frames", "1005", "shot.ma", "-o", "b.ma"}).status, 0);
+  EXPECT_THAT(read("b.ma"), Not(HasSubstr("animCurve")));
+  EXPECT_THAT(read("b.ma"), HasSubstr("setAttr \".t\" -type \"double3\" 3.99999"));
+  EXPECT_EQ(run({"bake", "-q", "--frames=-3:-1.5", "--step=.5", "shot.ma", "-o", "b.ma"}).status, 0);
+  EXPECT_THAT(read("b.ma"),
+              HasSubstr("// Frame 0 is frame -3 of that scene; its last one, 1.5, is frame -1.5."));
+}
+
+TEST_F(BakeCommand, OneOfSeveralNamesThatIsNotThereIsStatus1AndTheOthersAreWritten) {
+  write("shot.ma", unbakedScene());
+  const ToolResult result =
+      run({"bake", "--camera", "shotcam", "--camera", "nobody", "shot.ma", "-o", "baked.ma"});
+  EXPECT_EQ(result.status, 1);
+  EXPECT_THAT(read("baked.ma"), HasSubstr("createNode camera -n \"shotcamShape\""));
+  for (const char* name : {"shotcam", "shotcamShape", "|shotcam", "|shotcam|shotcamShape"}) {
+    EXPECT_EQ(run({"bake", "-q", "--camera", name, "shot.ma", "-o", "one.ma"}).status, 0) << name;
+  }
+  for (const char* name : {"SHOTCAM", "shot", "shotcam|shotcamShape|", "cam"}) {
+    EXPECT_EQ(run({"bake", "-q", "--camera", name, "shot.ma", "-o", "one.ma"}).status, 1) << name;
+  }
 }
 
 TEST_F(BakeCommand, ACameraThatIsNotThereIsStatus1AndNothingIsWritten) {

@@ -2,8 +2,10 @@
 #include <gtest/gtest.h>
 #include <sys/stat.h>
 
+#include <cstdlib>
 #include <filesystem>
 #include <string>
+#include <vector>
 
 #include "tests/tools/ToolRun.h"
 
@@ -128,6 +130,101 @@ TEST_F(ExitStatusTest, AnOutputThatIsFullIsFive) {
   const ToolResult result = run({"import", "good.ma", "--quiet", "--json", "/dev/full"});
   EXPECT_EQ(result.status, 5);
   EXPECT_EQ(result.err, "mayascene: /dev/full cannot be written: No space left on device\n");
+}
+
+// Every verb ends by the one table. What a verb cannot meet is left out: only an import and a verification
+// load a module, and the preference reads no scene.
+struct Ending {
+  int status;
+  std::vector<std::string> arguments;
+};
+
+TEST_F(ExitStatusTest, EveryVerbEndsByTheOneTable) {
+  write("film.ma", sceneText("createNode transform -n \"a\";\ncreateNode camera -n \"aShape\" -p \"a\";\n"
+                             "\tsetAttr \".fio\" -type \"double2\" 0.1 0 ;\n"));
+  write("far.ma", sceneText(std::string(stillCamera()) +
+                            "createNode animCurveTL -n \"c\";\n\tsetAttr \".ktv[0:1]\" 1 0 1000000000 1;\n"
+                            "connectAttr \"c.o\" \"shotcam.tx\";\n"));
+  const std::vector<Ending> endings = {
+      {0, {"import", "good.ma"}},
+      {0, {"import", "--bake", "film.ma"}},
+      {0, {"verify", "good.ma"}},
+      {0, {"bake", "good.ma", "-o", "out.ma"}},
+      {0, {"bake", "film.ma", "-o", "out.ma"}},  // with a warning
+      {0, {"prefs", "--preferences", "p"}},
+      {0, {"prefs", "set", "linear-units", "0", "--preferences", "p"}},
+      {1, {"import", "notes.txt"}},
+      {1, {"import", "broken.ma"}},
+      {1, {"import", "--bake", "notes.txt"}},
+      {1, {"import", "--bake", "far.ma"}},
+      {1, {"import", "--bake", "--camera", "nobody", "good.ma"}},
+      {1, {"import", "--bake", "--strict", "film.ma"}},
+      {1, {"import", "--bake", "good.ma", "--fail", "CreateComp:1=77"}},
+      {1, {"verify", "notes.txt"}},
+      {1, {"bake", "notes.txt", "-o", "out.ma"}},
+      {1, {"bake", "far.ma", "-o", "out.ma"}},
+      {1, {"bake", "--camera", "nobody", "good.ma", "-o", "out.ma"}},
+      {1, {"bake", "--strict", "film.ma", "-o", "out.ma"}},
+      {2, {}},
+      {2, {"import"}},
+      {2, {"import", "--world", "good.ma"}},
+      {2, {"verify", "--world", "good.ma"}},
+      {2, {"bake", "good.ma"}},
+      {2, {"bake", "good.ma", "-o", "good.ma"}},
+      {2, {"bake", "good.ma", "film.ma", "-o", "notes.txt"}},
+      {2, {"prefs", "set", "linear-units", "2"}},
+      {3, {"import", "missing.ma"}},
+      {3, {"import", "--bake", "missing.ma"}},
+      {3, {"import", "--bake", "."}},
+      {3, {"import", "--bake", ".."}},
+      {3, {"verify", "missing.ma"}},
+      {3, {"bake", "missing.ma", "-o", "out.ma"}},
+      {4, {"import", "good.ma", "--module", "missing.so"}},
+      {4, {"import", "--bake", "good.ma", "--module", "missing.so"}},
+      {4, {"verify", "good.ma", "--module", "missing.so"}},
+      {5, {"import", "good.ma", "--json", "no/x.json"}},
+      {5, {"import", "--bake", "good.ma", "--report", "no/x.json"}},
+      {5, {"verify", "good.ma", "--trace", "no/x"}},
+      {5, {"bake", "good.ma", "-o", "no/out.ma"}},
+      {5, {"bake", "good.ma", "film.ma", "-o", "notes.txt/folder"}},
+      {5, {"prefs", "set", "linear-units", "0", "--preferences", "notes.txt/p"}},
+  };
+  for (const Ending& ending : endings) {
+    const ToolResult result = run(ending.arguments);
+    EXPECT_EQ(result.status, ending.status) << testing::PrintToString(ending.arguments) << '\n' << result.err;
+  }
+}
+
+TEST_F(ExitStatusTest, TheHighestOfSeveralBakesWins) {
+  EXPECT_EQ(run({"bake", "-q", "good.ma", "notes.txt", "-o", "out"}).status, 1);
+  EXPECT_EQ(run({"bake", "-q", "missing.ma", "notes.txt", "good.ma", "-o", "out"}).status, 3);
+  EXPECT_EQ(run({"import", "--bake", "-q", "missing.ma", "notes.txt", "good.ma"}).status, 3);
+}
+
+TEST_F(ExitStatusTest, TheHelpShowsTheTable) {
+  const std::string help = run({"--help"}).out;
+  EXPECT_NE(
+      help.find("Exit status:\n"
+                "  0  done, warnings included\n"
+                "  1  an error in a scene, a file that is not taken, something asked for that was not done, "
+                "something\n"
+                "     left behind, or warnings with --strict\n"
+                "  2  wrong usage\n"
+                "  3  a file cannot be read\n"
+                "  4  the import module cannot be loaded\n"
+                "  5  an output cannot be written, or the memory is exhausted\n"
+                "With several scenes it is the highest of theirs. A run that a signal ends has 128 and the "
+                "number\nof the signal.\n"),
+      std::string::npos)
+      << help;
+}
+
+TEST_F(ExitStatusTest, MemoryThatIsExhaustedIsFive) {
+  write("many.ma", sceneText(std::string(stillCamera()) + std::string(64 << 20, ' ')));
+  const std::string tool =
+      std::string("cd '") + path("").string() + "' && ulimit -v 60000 && exec '" + MAYASCENE_TOOL;
+  EXPECT_EQ(std::system(("sh -c \"" + tool + "' bake many.ma -o out.ma\" 2>/dev/null").c_str()) >> 8, 5);
+  EXPECT_FALSE(std::filesystem::exists(path("out.ma")));
 }
 
 }  // namespace

@@ -22,15 +22,28 @@ constexpr std::int32_t kMostZoomKeys = 1'000'000;
 constexpr std::int64_t kMostMemory = INT64_MAX - 1;  // a number that is too large is read as the largest one
 constexpr std::size_t kNameColumn = 36;
 
-constexpr const char* kFooter =
-    "Exit status:\n"
-    "  0  all imported, all taken, or shown\n"
-    "  1  a scene was refused, its import returned a code, or it left something behind\n"
-    "  2  wrong usage\n"
-    "  3  a file cannot be read\n"
-    "  4  the import module cannot be loaded\n"
-    "  5  an output cannot be written, or the memory is exhausted\n"
-    "With several scenes it is the highest of theirs. An interrupted run ends with 130.";
+// A text in lines of at most `width`, all but the first behind `indent` blanks.
+std::string wrapped(std::string_view text, std::size_t indent, std::size_t width) {
+  std::string lines;
+  while (indent + text.size() > width) {
+    const std::size_t blank = text.rfind(' ', width - indent);
+    lines.append(text.substr(0, blank)).append("\n").append(indent, ' ');
+    text.remove_prefix(blank + 1);
+  }
+  return lines.append(text);
+}
+
+// The table of exit statuses, as help shows it.
+std::string exitStatuses() {
+  constexpr std::size_t kIndent = 5, kWidth = 100;
+  std::string text = "Exit status:\n";
+  for (const ExitMeaning& row : kExitMeanings) {
+    text += "  " + std::to_string(static_cast<int>(row.status)) + "  " +
+            wrapped(row.meaning, kIndent, kWidth) + '\n';
+  }
+  return text + "With several scenes it is the highest of theirs. A run that a signal ends has " +
+         std::to_string(kSignalStatus) + " and the number\nof the signal.";
+}
 
 // The words of the command line before they are turned into what the host takes.
 struct Words {
@@ -230,7 +243,7 @@ struct CommandLine {
     app.set_version_flag("--version", std::string("mayascene ") + kVersion, "show the version and leave");
     app.set_help_flag("-h,--help", "show this help and leave");
     app.require_subcommand(1);
-    app.footer(kFooter);
+    app.footer(exitStatuses());
     addImport();
     addBake();
     addCheck();

@@ -22,7 +22,7 @@ BakedScene bakeTo(const std::string& path, const std::string& place, const BakeA
     unwritten.status = ExitStatus::CannotWrite;
     return unwritten;
   }
-  BakedScene baked = bakeScene(path, arguments.options, arguments.words, diagnostics, output->stream());
+  BakedScene baked = bakeScene(path, arguments, diagnostics, output->stream());
   if (!isWorthKeeping(baked, arguments.options)) return baked;
   if (output->commit(&failure)) {
     baked.output = place;
@@ -45,10 +45,12 @@ ExitStatus writeReport(OutputFile* report, const std::vector<BakedScene>& scenes
 
 ExitStatus runBake(const BakeArguments& arguments, Diagnostics& diagnostics) {
   std::string failure;
-  const std::vector<std::string> places = placeBakes(arguments.scenes, arguments.output, &failure);
-  if (places.empty()) {
+  std::vector<std::string> places;
+  const ExitStatus placed =
+      placeBakes(arguments.scenes, arguments.output, arguments.report, &places, &failure);
+  if (placed != ExitStatus::Done) {
     diagnostics.complain("", failure);
-    return ExitStatus::WrongUsage;
+    return placed;
   }
   std::unique_ptr<OutputFile> report;
   if (!arguments.report.empty()) {
@@ -62,7 +64,6 @@ ExitStatus runBake(const BakeArguments& arguments, Diagnostics& diagnostics) {
   std::vector<BakedScene> scenes;
   for (std::size_t i = 0; i < places.size(); ++i) {
     BakedScene scene = bakeTo(arguments.scenes[i], places[i], arguments, diagnostics);
-    if (arguments.strict && scene.warnings != 0) scene.status = worse(scene.status, ExitStatus::Refused);
     showBake(scene, diagnostics);
     status = worse(status, scene.status);
     scenes.push_back(std::move(scene));

@@ -1,9 +1,10 @@
 #include "tools/mayascene/BakeOutputs.h"
 
-#include <algorithm>
 #include <filesystem>
 #include <set>
 #include <system_error>
+
+#include "tools/mayascene/OutputFile.h"
 
 namespace mayascene {
 namespace {
@@ -27,39 +28,55 @@ std::string freeName(const fs::path& scene, std::set<std::string>* taken) {
   return name;
 }
 
-bool isOneOf(const fs::path& file, const std::vector<std::string>& scenes) {
+bool isSameFile(const fs::path& a, const fs::path& b) {
   std::error_code ignored;
-  return std::any_of(scenes.begin(), scenes.end(), [&](const std::string& scene) {
-    return file.lexically_normal() == fs::path(scene).lexically_normal() ||
-           fs::equivalent(file, scene, ignored);
-  });
+  return a.lexically_normal() == b.lexically_normal() || fs::equivalent(a, b, ignored);
+}
+
+// The folder `output`, made where it is not there.
+ExitStatus makeFolder(const std::string& output, std::string* failure) {
+  std::error_code error;
+  if (fs::exists(output, error) || output == kStandardOutput) {
+    *failure = output + " is no folder: the bakes of several scenes need one";
+    return ExitStatus::WrongUsage;
+  }
+  if (fs::create_directories(output, error) || fs::is_directory(output)) return ExitStatus::Done;
+  *failure = output + " cannot be made: " + error.message();
+  return ExitStatus::CannotWrite;
+}
+
+ExitStatus refuse(const std::string& place, const char* why, std::string* failure) {
+  *failure = place + why;
+  return ExitStatus::WrongUsage;
 }
 
 }  // namespace
 
-std::vector<std::string> placeBakes(const std::vector<std::string>& scenes, const std::string& output,
-                                    std::string* failure) {
+ExitStatus placeBakes(const std::vector<std::string>& scenes, const std::string& output,
+                      const std::string& report, std::vector<std::string>* places, std::string* failure) {
   std::error_code error;
-  const bool folder = fs::is_directory(output, error);
-  std::vector<std::string> places;
-  if (scenes.size() == 1 && !folder) {
-    places.push_back(output);
+  const bool folder = output != kStandardOutput && fs::is_directory(output, error);
+  if (scenes.size() == 1 && !folder && !output.ends_with('/')) {
+    places->push_back(output);
   } else {
-    if (!folder && !fs::create_directories(output, error)) {
-      *failure = output + " is no folder and cannot be made: " + error.message();
-      return {};
+    if (!folder) {
+      const ExitStatus made = makeFolder(output, failure);
+      if (made != ExitStatus::Done) return made;
     }
     std::set<std::string> taken;
     for (const std::string& scene : scenes) {
-      places.push_back((fs::path(output) / freeName(scene, &taken)).string());
+      places->push_back((fs::path(output) / freeName(scene, &taken)).string());
     }
   }
-  for (const std::string& place : places) {
-    if (!isOneOf(place, scenes)) continue;
-    *failure = place + " is one of the scenes and would be overwritten";
-    return {};
+  for (const std::string& place : *places) {
+    if (place == kStandardOutput) continue;
+    for (const std::string& scene : scenes) {
+      if (isSameFile(place, scene))
+        return refuse(place, " is one of the scenes and would be overwritten", failure);
+    }
+    if (!report.empty() && isSameFile(place, report)) return refuse(place, " is the report, too", failure);
   }
-  return places;
+  return ExitStatus::Done;
 }
 
 }  // namespace mayascene

@@ -4,13 +4,17 @@
 #include <string>
 #include <vector>
 
+#include "tools/mayascene/ExitStatus.h"
+
 namespace mayascene {
 
-// A file for each scene. One scene's is `output`, unless that is a folder; those of several lie in the folder
-// `output`, under the scenes' own names, with _2, _3 … where two are the same without regard to case. Empty,
-// with a sentence in *failure, where a bake would be written over one of the scenes, or where `output` is no
-// folder and cannot be made one.
-std::vector<std::string> placeBakes(const std::vector<std::string>& scenes, const std::string& output,
-                                    std::string* failure);
+// A file for each scene, and Done. One scene's is `output`, unless that is a folder, or ends with a "/";
+// those of several lie in the folder `output`, under the scenes' own names, with _2, _3 … where two are the
+// same without regard to case. The folder is made where it is not there.
+//
+// WrongUsage, with a sentence in *failure, where a bake would be written over one of the scenes or over
+// `report`, and where several have no folder to go to. CannotWrite where the folder cannot be made.
+ExitStatus placeBakes(const std::vector<std::string>& scenes, const std::string& output,
+                      const std::string& report, std::vector<std::string>* places, std::string* failure);
 
 }  // namespace mayascene

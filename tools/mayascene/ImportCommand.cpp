@@ -74,11 +74,15 @@ SceneReport importOne(const std::string& path, HostSession& session, Diagnostics
   return report;
 }
 
-// The host knows the bake's path alone; what it says is shown with the scene's.
-void nameScene(const std::string& bake, const std::string& scene, refhost::CallbackResult* result) {
+// The host knows the bake's path alone; what it says is shown with the scene's. Both have one file name.
+void nameScene(const std::filesystem::path& bake, const std::string& scene, refhost::CallbackResult* result) {
+  const std::string bakeFolder = bake.parent_path().string() + '/';
+  const std::string sceneFolder = scene.substr(0, scene.rfind('/') + 1);
   const auto replace = [&](std::string* text) {
-    const std::size_t at = text->find(bake);
-    if (at != std::string::npos) text->replace(at, bake.size(), scene);
+    for (std::size_t at = text->find(bakeFolder); at != std::string::npos; at = text->find(bakeFolder, at)) {
+      text->replace(at, bakeFolder.size(), sceneFolder);
+      at += sceneFolder.size();
+    }
   };
   for (refhost::Leftover& leftover : result->leftovers) replace(&leftover.description);
   for (std::string& refusal : result->refusals) replace(&refusal);
@@ -90,15 +94,22 @@ SceneReport importBaked(const std::string& path, const BakeArguments& arguments,
                         Diagnostics& diagnostics, BakedScene* baked) {
   SceneReport report;
   report.path = path;
+  baked->path = path;
+  // A path that leads to no file need not have a name that a bake could have.
+  const SceneLook look = lookAtScene(path);
+  if (!look.readable) {
+    diagnostics.complain(path, look.failure);
+    return report;
+  }
   std::string failure;
   const auto bake = TemporaryBake::make(std::filesystem::path(path).filename().string(), &failure);
   if (bake != nullptr) {
-    *baked = bakeScene(path, arguments.options, arguments.words, diagnostics, bake->stream());
+    *baked = bakeScene(path, arguments, diagnostics, bake->stream());
     showBake(*baked, diagnostics);
   }
   if (bake == nullptr || !bake->finish(&failure)) {
     diagnostics.complain(path, failure);
-    report.status = ExitStatus::CannotWrite;
+    report.status = baked->status = ExitStatus::CannotWrite;
     return report;
   }
   report.status = baked->status;
@@ -110,7 +121,6 @@ SceneReport importBaked(const std::string& path, const BakeArguments& arguments,
   report.result = session.host().importScene(bake->path());
   nameScene(bake->path(), path, &report.result);
   report.outcome = outcomeOf(lookAtScene(bake->path()), report.result);
-  if (arguments.strict && baked->warnings != 0) report.status = worse(report.status, ExitStatus::Refused);
   return report;
 }
 

@@ -11,10 +11,11 @@
 #include <streambuf>
 #include <string_view>
 
+#include "tools/mayascene/ExitStatus.h"
+
 namespace mayascene {
 namespace {
 
-constexpr int kSignalBase = 128;
 constexpr std::array kSignals = {SIGINT, SIGTERM, SIGHUP, SIGPIPE};
 
 // As many as there can be outputs at a time, and to spare.
@@ -52,7 +53,7 @@ void removeUnfinished() noexcept {
 extern "C" void endInterrupted(int signal) {
   endChildren();
   removeUnfinished();
-  ::_exit(kSignalBase + signal);
+  ::_exit(kSignalStatus + signal);
 }
 
 // The importer ends the process where an exception leaves the release of a suite.

@@ -58,8 +58,8 @@ void gather(const diag::Collector& collector, BakedScene* scene) {
 
 }  // namespace
 
-BakedScene bakeScene(const std::string& path, const bake::Options& options, const std::string& words,
-                     Diagnostics& diagnostics, std::ostream& out) {
+BakedScene bakeScene(const std::string& path, const BakeArguments& arguments, Diagnostics& diagnostics,
+                     std::ostream& out) {
   BakedScene baked;
   baked.path = path;
   std::string failure;
@@ -76,12 +76,13 @@ BakedScene bakeScene(const std::string& path, const bake::Options& options, cons
   diag::Collector collector(text->text());
   const scene::Scene scene = scene::Read(text->text(), collector);
   const bake::Origin origin{std::string("mayascene ") + kVersion,
-                            std::filesystem::path(path).filename().string(), words};
-  baked.report = bake::Bake(scene, options, origin, &collector, out);
+                            std::filesystem::path(path).filename().string(), arguments.words};
+  baked.report = bake::Bake(scene, arguments.options, origin, &collector, out);
   gather(collector, &baked);
   const bool allWritten = std::all_of(baked.report.cameras.begin(), baked.report.cameras.end(),
                                       [](const bake::CameraReport& camera) { return camera.written; });
-  baked.status = allWritten && baked.errors == 0 ? ExitStatus::Done : ExitStatus::Refused;
+  const bool warned = arguments.strict && baked.warnings != 0;
+  baked.status = allWritten && baked.errors == 0 && !warned ? ExitStatus::Done : ExitStatus::Refused;
   return baked;
 }
 

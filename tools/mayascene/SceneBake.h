@@ -8,6 +8,7 @@
 
 #include "bake/Bake.h"
 #include "diag/Collector.h"
+#include "tools/mayascene/BakeCommand.h"
 #include "tools/mayascene/Diagnostics.h"
 #include "tools/mayascene/ExitStatus.h"
 
@@ -27,9 +28,9 @@ struct BakedScene {
 
 // Reads the scene and writes its bake. A file that cannot be read, or that is no Maya ASCII scene, is said at
 // once, and nothing is written: Unreadable, Refused. Else Done, or Refused where something that was asked for
-// could not be written.
-BakedScene bakeScene(const std::string& path, const bake::Options& options, const std::string& words,
-                     Diagnostics& diagnostics, std::ostream& out);
+// could not be written, and where there are warnings and they count.
+BakedScene bakeScene(const std::string& path, const BakeArguments& arguments, Diagnostics& diagnostics,
+                     std::ostream& out);
 
 // Whether the bake holds what was asked for: it has frames, and one of the cameras where some are named.
 bool isWorthKeeping(const BakedScene& scene, const bake::Options& options);

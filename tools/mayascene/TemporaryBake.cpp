@@ -41,12 +41,15 @@ std::unique_ptr<TemporaryBake> TemporaryBake::make(const std::string& name, std:
   const std::filesystem::path place = std::filesystem::temp_directory_path(error);
   std::unique_ptr<TemporaryBake> bake(new TemporaryBake);
   std::string folder = (place / "mayascene-XXXXXX").string();
-  if (error || ::mkdtemp(folder.data()) == nullptr) {
-    *failure = sentence("a temporary folder", error ? error.value() : errno);
-    return nullptr;
+  {
+    const HeldSignals held;
+    if (error || ::mkdtemp(folder.data()) == nullptr) {
+      *failure = sentence("a temporary folder", error ? error.value() : errno);
+      return nullptr;
+    }
+    bake->folder_ = std::move(folder);
+    rememberUnfinished(bake->folder_.c_str());
   }
-  bake->folder_ = std::move(folder);
-  rememberUnfinished(bake->folder_.c_str());
   bake->file_ = (std::filesystem::path(bake->folder_) / name).string();
   rememberUnfinished(bake->file_.c_str());
   const int descriptor = ::open(bake->file_.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, kOwnerOnly);
