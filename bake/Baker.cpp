@@ -13,10 +13,12 @@ Baker::Baker(const scene::Scene& scene, const Options& options, diag::Collector*
 
 Report Baker::Run(const Origin& origin, std::ostream& out) {
   Choose();
+  AskForHierarchy();
+  if (options_.world) AskForWorld();
   if (!FindRange()) return report_;
   SampleHierarchy();
-  DecideMethods();
-  SampleWorld();
+  if (!options_.world) AskForWorld();
+  world_->Run(*report_.frames);
   Write(origin, out);
   return report_;
 }
@@ -41,20 +43,21 @@ void Baker::Choose() {
   if (cameras_.empty() && options_.cameras.empty()) diagnostics_->Report(diag::Code::NoCamera, {});
 }
 
+// All that can move what is written is asked for before the range is looked for.
+void Baker::AskForHierarchy() {
+  local_.emplace(&evaluator_, head_.picture, head_.unitsPerFrame);
+  if (!options_.world) chains_.AskFor(&*local_);
+  for (Item& camera : cameras_) camera.lens = local_->AddLens(camera.shape);
+}
+
 bool Baker::FindRange() {
-  std::vector<scene::NodeId> nodes;
-  for (const Item& camera : cameras_) nodes.push_back(camera.shape);
-  for (const Link& link : chains_.links()) nodes.push_back(link.node);
   report_.frames =
-      FindFrames(scene_, nodes, options_, head_.unitsPerFrame, evaluator_.measures(), diagnostics_);
+      FindFrames(scene_, evaluator_.computingNodes(), options_, head_, evaluator_.measures(), diagnostics_);
   return report_.frames.has_value();
 }
 
 void Baker::SampleHierarchy() {
-  local_.emplace(&evaluator_, head_.picture, *report_.frames, head_.unitsPerFrame);
-  if (!options_.world) chains_.AskFor(&*local_);
-  for (Item& camera : cameras_) camera.lens = local_->AddLens(camera.shape);
-  local_->Run();
+  local_->Run(*report_.frames);
   if (!options_.world) chains_.Judge(&*local_);
 }
 
@@ -66,22 +69,16 @@ bool Baker::ComesInHierarchy(const Item& item, bool camera) const {
   return link.finite && link.square && !link.cutOff && (link.unscaled || !camera);
 }
 
-void Baker::DecideMethods() {
-  for (Item& item : cameras_)
-    item.method = ComesInHierarchy(item, true) ? Method::kHierarchy : Method::kWorld;
-  for (Item& item : locators_)
-    item.method = ComesInHierarchy(item, false) ? Method::kHierarchy : Method::kWorld;
-}
-
-void Baker::SampleWorld() {
-  world_.emplace(&evaluator_, head_.picture, *report_.frames, head_.unitsPerFrame);
-  for (Item& item : cameras_) {
-    if (item.method == Method::kWorld) item.world = world_->AddWorld(scene_.node(item.shape).parent, false);
-  }
-  for (Item& item : locators_) {
-    if (item.method == Method::kWorld) item.world = world_->AddWorld(scene_.node(item.shape).parent, true);
-  }
-  world_->Run();
+// What does not come in its hierarchy is asked for against the world.
+void Baker::AskForWorld() {
+  world_.emplace(&evaluator_, head_.picture, head_.unitsPerFrame);
+  const auto decide = [this](Item* item, bool camera) {
+    if (ComesInHierarchy(*item, camera)) return;
+    item->method = Method::kWorld;
+    item->world = world_->AddWorld(scene_.node(item->shape).parent, !camera);
+  };
+  for (Item& item : cameras_) decide(&item, true);
+  for (Item& item : locators_) decide(&item, false);
 }
 
 Report Bake(const scene::Scene& scene, const Options& options, const Origin& origin,

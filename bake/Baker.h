@@ -34,11 +34,11 @@ class Baker {
 
  private:
   void Choose();
+  void AskForHierarchy();
   bool FindRange();
   void SampleHierarchy();
-  void DecideMethods();
+  void AskForWorld();
   bool ComesInHierarchy(const Item& item, bool camera) const;
-  void SampleWorld();
 
   void Write(const Origin& origin, std::ostream& out);
   void WriteCamera(const Item& item, Writer* writer);

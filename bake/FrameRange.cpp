@@ -31,69 +31,6 @@ struct Ends {
   }
 };
 
-// The number that follows a word of a script, " -min 1".
-std::optional<double> NumberAfter(std::string_view script, std::string_view option) {
-  std::size_t at = script.find(option);
-  if (at == std::string_view::npos) return std::nullopt;
-  at = script.find_first_not_of(" \t", at + option.size());
-  if (at == std::string_view::npos) return std::nullopt;
-  return scene::NumberOf(script.substr(at, script.find_first_of(" \t;\n", at) - at));
-}
-
-// What the scene plays: it is written in a script.
-void TakeInPlayback(const scene::Scene& scene, double unitsPerFrame, Ends* ends) {
-  constexpr std::string_view kPlayback = "playbackOptions";
-  for (NodeId id = 0; id < scene.nodes().size(); ++id) {
-    if (scene.node(id).type != "script") continue;
-    const auto before = scene.Written(id, "before");
-    const auto script = before ? before->String() : std::nullopt;
-    if (!script || script->find(kPlayback) == std::string::npos) continue;
-    const auto least = NumberAfter(*script, "-min ");
-    const auto most = NumberAfter(*script, "-max ");
-    if (!least || !most || *least > *most) continue;
-    ends->TakeIn(*least / unitsPerFrame);
-    ends->TakeIn(*most / unitsPerFrame);
-    return;
-  }
-}
-
-// Finds the curves that move nodes, by way of whatever stands between.
-class CurveSearch {
- public:
-  explicit CurveSearch(const scene::Scene& scene) : scene_(scene), seen_(scene.nodes().size(), false) {}
-
-  std::vector<NodeId> Run(const std::vector<NodeId>& nodes) {
-    for (const NodeId node : nodes) Enter(node);
-    while (!pending_.empty()) {
-      const NodeId node = pending_.back();
-      pending_.pop_back();
-      for (const scene::Connection* connection : scene_.ConnectionsInto(node)) {
-        const NodeId source = connection->source.node;
-        Enter(source);
-        // A matrix of a node depends on all that stands above it.
-        for (NodeId above = scene_.node(source).parent; above != scene::kNoNode && !seen_[above];
-             above = scene_.node(above).parent) {
-          Enter(above);
-        }
-      }
-    }
-    return curves_;
-  }
-
- private:
-  void Enter(NodeId node) {
-    if (seen_[node]) return;
-    seen_[node] = true;
-    pending_.push_back(node);
-    if (scene_.node(node).type.starts_with("animCurveT")) curves_.push_back(node);
-  }
-
-  const scene::Scene& scene_;
-  std::vector<bool> seen_;
-  std::vector<NodeId> pending_;
-  std::vector<NodeId> curves_;
-};
-
 std::string TextOf(double number) {
   char text[32];
   return {text, std::to_chars(text, text + sizeof text, number).ptr};
@@ -112,17 +49,22 @@ std::optional<FrameRange> RangeOf(double first, double last, double step, bool b
 
 }  // namespace
 
-std::optional<FrameRange> FindFrames(const scene::Scene& scene, const std::vector<NodeId>& written,
-                                     const Options& options, double unitsPerFrame,
+std::optional<FrameRange> FindFrames(const scene::Scene& scene, const std::vector<NodeId>& nodes,
+                                     const Options& options, const Head& head,
                                      const motion::Measures& measures, diag::Collector* diagnostics) {
   if (options.frames) {
     return RangeOf(options.frames->first, options.frames->last, options.step, false, diagnostics);
   }
   Ends ends;
-  TakeInPlayback(scene, unitsPerFrame, &ends);
-  for (const NodeId curve : CurveSearch(scene).Run(written)) {
-    for (const motion::CurveKey& key : motion::ReadCurve(scene, curve, measures).keys) {
-      ends.TakeIn(key.time * measures.framesPerSecond / unitsPerFrame);
+  if (head.playback) {
+    ends.TakeIn(head.playback->first);
+    ends.TakeIn(head.playback->last);
+  }
+  for (const NodeId node : nodes) {
+    // Driven keys have no time.
+    if (!scene.node(node).type.starts_with("animCurveT")) continue;
+    for (const motion::CurveKey& key : motion::ReadCurve(scene, node, measures).keys) {
+      ends.TakeIn(key.time * measures.framesPerSecond / head.unitsPerFrame);
     }
   }
   if (!ends.known()) return FrameRange{};

@@ -5,6 +5,7 @@
 #include <optional>
 #include <vector>
 
+#include "bake/Head.h"
 #include "bake/Options.h"
 #include "diag/Collector.h"
 #include "motion/Measures.h"
@@ -25,11 +26,11 @@ struct FrameRange {
 // The most frames that a scene may have where nobody says which ones.
 inline constexpr std::size_t kMostFrames = 100'000;
 
-// The range of the options; else what the scene plays and all keys that move the nodes or what drives them,
-// outward to whole frames; with neither, frame 1. `unitsPerFrame` is one frame in the scene's time unit. None
-// after an error: too many frames, or more than a composition's time can hold.
-std::optional<FrameRange> FindFrames(const scene::Scene& scene, const std::vector<scene::NodeId>& written,
-                                     const Options& options, double unitsPerFrame,
+// The range of the options; else what the scene plays and all keys of the curves among the nodes, outward to
+// whole frames; with neither, frame 1. `nodes` are those that compute what is written. None after an error:
+// too many frames, or more than a composition's time can hold.
+std::optional<FrameRange> FindFrames(const scene::Scene& scene, const std::vector<scene::NodeId>& nodes,
+                                     const Options& options, const Head& head,
                                      const motion::Measures& measures, diag::Collector* diagnostics);
 
 }  // namespace bake

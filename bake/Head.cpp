@@ -6,6 +6,8 @@
 #include <string_view>
 
 #include "motion/Measures.h"
+#include "motion/SceneCamera.h"
+#include "scene/Settings.h"
 #include "scene/Units.h"
 
 namespace bake {
@@ -36,23 +38,8 @@ void ReadTimeUnit(const scene::Scene& scene, Head* head, diag::Collector* diagno
   }
 }
 
-motion::Picture ReadPicture(const scene::Scene& scene) {
-  motion::Picture picture;
-  const scene::NodeId node = scene.Find("defaultResolution");
-  if (node == scene::kNoNode) return picture;
-  const auto positive = [&](std::string_view attribute, double* value) {
-    const auto written = scene.Written(node, attribute);
-    const auto number = written ? written->Number() : std::nullopt;
-    if (number && std::isfinite(*number) && *number > 0.0) *value = *number;
-  };
-  positive("width", &picture.width);
-  positive("height", &picture.height);
-  positive("deviceAspectRatio", &picture.deviceAspect);
-  // The importer takes whole pixels.
-  picture.width = std::clamp(std::trunc(picture.width), 1.0, 2147483647.0);
-  picture.height = std::clamp(std::trunc(picture.height), 1.0, 2147483647.0);
-  return picture;
-}
+// The importer takes whole pixels.
+double WholePixels(double size) { return std::clamp(std::trunc(size), 1.0, 2147483647.0); }
 
 }  // namespace
 
@@ -61,7 +48,14 @@ Head ReadHead(const scene::Scene& scene, diag::Collector* diagnostics) {
   const std::string_view length = scene.linearUnit().word;
   head.linearUnit = scene::LinearUnitOf(length) ? length : kDefaultLength;
   ReadTimeUnit(scene, &head, diagnostics);
-  head.picture = ReadPicture(scene);
+  const scene::Settings settings = scene::ReadSettings(scene, *diagnostics);
+  head.picture = motion::PictureOf(settings);
+  head.picture.width = WholePixels(head.picture.width);
+  head.picture.height = WholePixels(head.picture.height);
+  if (settings.playback && settings.playback->value.first <= settings.playback->value.last) {
+    const scene::FrameRange& range = settings.playback->value;
+    head.playback = FrameSpan{range.first / head.unitsPerFrame, range.last / head.unitsPerFrame};
+  }
   return head;
 }
 

@@ -32,10 +32,6 @@ bool AllFinite(const Channel& channel) {
 
 }  // namespace
 
-Sampler::Sampler(motion::Evaluator* evaluator, const motion::Picture& picture, const FrameRange& frames,
-                 double unitsPerFrame)
-    : evaluator_(evaluator), picture_(picture), frames_(frames), unitsPerFrame_(unitsPerFrame) {}
-
 std::size_t Sampler::AddLocal(scene::NodeId node) {
   Source source;
   if (IsPlain(evaluator_->scene(), node)) {
@@ -59,21 +55,10 @@ std::size_t Sampler::AddWorld(scene::NodeId node, bool scaled) {
   return tracks_.size() - 1;
 }
 
-void Sampler::Run() {
-  for (Track& track : tracks_) {
-    for (Channel& channel : track.channels) channel.values.reserve(frames_.count);
-  }
-  for (LensTrack& lens : lenses_) lens.focalLength.values.reserve(frames_.count);
-  for (std::size_t frame = 0; frame < frames_.count; ++frame) {
-    evaluator_->MoveTo(frames_.Frame(frame) * unitsPerFrame_);
-    for (std::size_t i = 0; i < tracks_.size(); ++i) {
-      if (sources_[i].matrix) {
-        SampleMatrix(&sources_[i], &tracks_[i]);
-      } else {
-        SampleNumbers(sources_[i], &tracks_[i]);
-      }
-    }
-    for (std::size_t i = 0; i < lenses_.size(); ++i) SampleLens(&lensSources_[i], &lenses_[i]);
+void Sampler::Run(const FrameRange& frames) {
+  for (std::size_t frame = 0; frame < frames.count; ++frame) {
+    evaluator_->MoveTo(frames.Frame(frame) * unitsPerFrame_);
+    SampleFrame(frame == 0);
   }
   for (std::size_t i = 0; i < tracks_.size(); ++i) {
     for (Channel& channel : tracks_[i].channels) {
@@ -84,10 +69,24 @@ void Sampler::Run() {
   for (LensTrack& lens : lenses_) Settle(&lens.focalLength);
 }
 
-void Sampler::SampleNumbers(const Source& source, Track* track) {
+void Sampler::SampleFrame(bool first) {
+  for (std::size_t i = 0; i < tracks_.size(); ++i) {
+    if (!sources_[i].matrix) {
+      SampleNumbers(sources_[i], first, &tracks_[i]);
+    } else if (first || evaluator_->Moves(*sources_[i].matrix)) {
+      SampleMatrix(&sources_[i], &tracks_[i]);
+    }
+  }
+  for (std::size_t i = 0; i < lenses_.size(); ++i) {
+    if (first || lensSources_[i].camera.Moves()) SampleLens(&lensSources_[i], &lenses_[i]);
+  }
+}
+
+void Sampler::SampleNumbers(const Source& source, bool first, Track* track) {
   const double degrees = evaluator_->measures().radians * kDegrees;
   const bool inDegrees = std::fabs(degrees - 1.0) < kMatrixRounding;
   for (std::size_t slot = 0; slot < kSlotCount; ++slot) {
+    if (!first && !evaluator_->Moves(source.numbers[slot])) continue;
     const double value = evaluator_->Value(source.numbers[slot]);
     track->channels[slot].values.push_back(IsRotation(slot) && !inDegrees ? value * degrees : value);
   }

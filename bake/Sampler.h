@@ -20,9 +20,9 @@ namespace bake {
 // Ask for tracks, run once, then take the tracks by the numbers that were given for them.
 class Sampler {
  public:
-  // All must outlive the sampler. `unitsPerFrame` is one frame in the scene's time unit.
-  Sampler(motion::Evaluator* evaluator, const motion::Picture& picture, const FrameRange& frames,
-          double unitsPerFrame);
+  // The evaluator must outlive the sampler. `unitsPerFrame` is one frame in the scene's time unit.
+  Sampler(motion::Evaluator* evaluator, const motion::Picture& picture, double unitsPerFrame)
+      : evaluator_(evaluator), picture_(picture), unitsPerFrame_(unitsPerFrame) {}
 
   // The node against its parent: its own channels to the bit where they say all.
   std::size_t AddLocal(scene::NodeId node);
@@ -32,7 +32,8 @@ class Sampler {
 
   std::size_t AddLens(scene::NodeId camera);
 
-  void Run();
+  // What does not move is looked at once.
+  void Run(const FrameRange& frames);
 
   Track& track(std::size_t number) { return tracks_[number]; }
   LensTrack& lens(std::size_t number) { return lenses_[number]; }
@@ -50,13 +51,13 @@ class Sampler {
     double window = 0.0;  // of the first frame, along the side that fills the picture: inches
   };
 
-  void SampleNumbers(const Source& source, Track* track);
+  void SampleFrame(bool first);
+  void SampleNumbers(const Source& source, bool first, Track* track);
   void SampleMatrix(Source* source, Track* track);
   void SampleLens(LensSource* source, LensTrack* lens);
 
   motion::Evaluator* evaluator_;
   motion::Picture picture_;
-  FrameRange frames_;
   double unitsPerFrame_;
   std::vector<Source> sources_;
   std::vector<Track> tracks_;

@@ -73,6 +73,9 @@ class Evaluator {
   bool Moves(NumberId number) const;
   bool Moves(MatrixId matrix) const;
 
+  // The nodes that compute what was asked for so far, and what that depends on: curves, constraints …
+  const std::vector<scene::NodeId>& computingNodes() const { return computingNodes_; }
+
   // What of all that these values depend on is not as it is driven, each once.
   std::vector<Kept> KeptBelow(const std::vector<NumberId>& numbers,
                               const std::vector<MatrixId>& matrices) const;
@@ -159,6 +162,7 @@ class Evaluator {
   std::vector<bool> moves_;               // by step
   std::vector<const LocalStep*> locals_;  // by matrix; null where it is no local one
   std::vector<std::uint32_t> moving_;     // in the order in which they are run
+  std::vector<scene::NodeId> computingNodes_;
   std::vector<NumberId> pendingNumbers_;
   std::vector<MatrixId> pendingMatrices_;
   Ordering ordering_{GraphOfSteps()};

@@ -60,6 +60,7 @@ void Evaluator::MakeNode(const NodeType& type, NodeId node) {
   step->firstOutput = static_cast<NumberId>(numbers_.size());
   step->outputCount = static_cast<std::uint32_t>(type.outputs.size());
   const std::uint32_t index = AddStep(std::move(step));
+  computingNodes_.push_back(node);
   for (const std::string_view output : type.outputs) {
     NumberCell& cell = numbers_[static_cast<std::size_t>(AddNumber({node, output}))];
     cell.step = index;

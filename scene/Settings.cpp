@@ -51,10 +51,24 @@ std::string_view TakeWord(std::string_view* text) {
   return word;
 }
 
-// "playbackOptions -min 1 -max 24 -ast 1 -aet 48" in the script that a scene keeps its settings in.
+// What a script runs when its scene is opened, where it sets the playback.
+std::optional<Value> PlaybackOf(const Scene& scene, NodeId script) {
+  if (script == kNoNode || scene.node(script).type != "script") return std::nullopt;
+  const std::optional<Value> body = scene.Written(script, "before");
+  const bool plays = body && body->text().find("playbackOptions") != std::string_view::npos;
+  return plays ? body : std::nullopt;
+}
+
+// The script that a scene keeps its settings in; where it has another name, the first that sets the playback.
+std::optional<Value> FindPlayback(const Scene& scene) {
+  std::optional<Value> body = PlaybackOf(scene, scene.Find("sceneConfigurationScriptNode"));
+  for (NodeId id = 0; id < scene.nodes().size() && !body; ++id) body = PlaybackOf(scene, id);
+  return body;
+}
+
+// "playbackOptions -min 1 -max 24 -ast 1 -aet 48"
 void ReadPlayback(const Scene& scene, Settings& settings, diag::Collector& diagnostics) {
-  const NodeId script = scene.Find("sceneConfigurationScriptNode");
-  const std::optional<Value> body = script == kNoNode ? std::nullopt : scene.Written(script, "before");
+  const std::optional<Value> body = FindPlayback(scene);
   if (!body) return;
   const std::string text = body->String().value_or(std::string());
   std::optional<double> first, last, wholeFirst, wholeLast;
@@ -109,8 +123,14 @@ void ReadResolution(const Scene& scene, Settings& settings, diag::Collector& dia
     settings.deviceAspect = {kNarrowAspect};
   }
   const auto read = [&](std::string_view attribute, Said<double>& target) {
-    if (const auto number = WrittenNumber(scene, "defaultResolution", attribute, diagnostics))
+    const auto number = WrittenNumber(scene, "defaultResolution", attribute, diagnostics);
+    if (!number) return;
+    if (number->value > 0.0) {
       target = *number;
+    } else {
+      const std::string_view text = scene.text().substr(number->place->offset, number->place->length);
+      diagnostics.Report(diag::Code::UnreadableValue, *number->place, {text, attribute});
+    }
   };
   read("width", settings.width);
   read("height", settings.height);

@@ -41,6 +41,25 @@ TEST(FrameRange, KeysThatMoveNothingThatIsWrittenDoNotCount) {
   ExpectFrames(Baked(CameraScene("", "", other + Playback("-min 5 -max 6"))), 5, 6);
 }
 
+TEST(FrameRange, KeysOfWhatIsNotInThePictureDoNotCount) {
+  const std::string curves = CurveOf("animCurveTU", "a", "1 0 900 1", "shotCam.v") +
+                             CurveOf("animCurveTL", "b", "1 0 901 1", "shotCamShape.fd") +
+                             CurveOf("animCurveTU", "c", "1 0 902 1", "screen.fo") +
+                             "createNode imagePlane -n \"screen\";\nconnectAttr \"screen.msg\" "
+                             "\"shotCamShape.ip[0]\";\n";
+  ExpectFrames(Baked(CameraScene("", "", curves + Playback("-min 5 -max 6"))), 5, 6);
+}
+
+TEST(FrameRange, InTheWorldKeysOfWhatStandsAboveCount) {
+  const std::string text = "createNode transform -n \"rig\";\n" +
+                           CurveOf("animCurveTL", "c", "7 1 9 2", "rig.ty") +
+                           "createNode transform -n \"shotCam\" -p \"rig\";\ncreateNode camera -n "
+                           "\"shotCamShape\" -p \"shotCam\";\n";
+  bake::Options options;
+  options.world = true;
+  ExpectFrames(Baked(text, options), 7, 9);
+}
+
 TEST(FrameRange, KeysOfWhatDrivesAChannelCount) {
   const std::string driver = "createNode transform -n \"driver\";\n" +
                              CurveOf("animCurveTL", "c", "7 1 9 2", "driver.ty") +

@@ -76,4 +76,22 @@ TEST(Head, AResolutionThatIsNoneHasTheDefault) {
   EXPECT_EQ(read.head.picture.deviceAspect, 1.7777777);
 }
 
+TEST(Head, ASceneOfAnEarlierVersionHasItsResolution) {
+  const Read read("requires maya \"2012\";\n");
+  EXPECT_EQ(read.head.picture.width, 640);
+  EXPECT_EQ(read.head.picture.height, 480);
+  EXPECT_EQ(read.head.picture.deviceAspect, 1.3333333);
+}
+
+TEST(Head, WhatPlaysIsCountedInFramesOfTheBake) {
+  const std::string script =
+      "createNode script -n \"sceneConfigurationScriptNode\";\n\tsetAttr \".b\" -type \"string\" "
+      "\"playbackOptions -min ";
+  const Read read("currentUnit -t sec;\n" + script + "0.5 -max 2 \";\n");
+  ASSERT_TRUE(read.head.playback.has_value());
+  EXPECT_DOUBLE_EQ(read.head.playback->first, 12);
+  EXPECT_DOUBLE_EQ(read.head.playback->last, 48);
+  EXPECT_FALSE(Read(script + "2 -max 1 \";\n").head.playback.has_value());
+}
+
 }  // namespace

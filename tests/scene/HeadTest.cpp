@@ -113,6 +113,15 @@ TEST_F(HeadTest, RangesInLongOptionsAndUnreadableOnes) {
   EXPECT_THAT(Diagnostics(), ElementsAre("1:81: \"x\" is no value that animationEndTime can have [MA0109]"));
 }
 
+TEST_F(HeadTest, AScriptOfAnotherNameMaySetTheRange) {
+  const Settings settings = SettingsOf(
+      "createNode script -n \"note\";setAttr \".b\" -type \"string\" \"print 1\";\n"
+      "createNode script -n \"shot:sceneConfigurationScriptNode\";setAttr \".b\" -type \"string\" "
+      "\"playbackOptions -min 3 -max 4\";");
+  ASSERT_TRUE(settings.playback);
+  EXPECT_EQ(settings.playback->value, (FrameRange{3, 4}));
+}
+
 TEST_F(HeadTest, WithoutAScriptThereIsNoRange) {
   const Settings settings = SettingsOf("createNode script -n \"sceneConfigurationScriptNode\";");
   EXPECT_FALSE(settings.playback);
@@ -160,8 +169,9 @@ TEST_F(HeadTest, AResolutionThatCannotBeReadIsReported) {
       SettingsOf("select -ne :defaultResolution;\n\tsetAttr \".w\" 1e999;setAttr \".h\" 0;");
   EXPECT_EQ(settings.width.value, 960.0);
   EXPECT_EQ(settings.pixelAspect(), 1.0);
-  EXPECT_EQ(settings.pictureAspect(), 1.0);
-  EXPECT_THAT(Diagnostics(), ElementsAre("2:15: \"1e999\" is no value that width can have [MA0109]"));
+  EXPECT_EQ(settings.height.value, 540.0);
+  EXPECT_THAT(Diagnostics(), ElementsAre("2:15: \"1e999\" is no value that width can have [MA0109]",
+                                         "2:34: \"0\" is no value that height can have [MA0109]"));
 }
 
 }  // namespace
