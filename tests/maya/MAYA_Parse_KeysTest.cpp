@@ -1,4 +1,6 @@
 // Keys of animation curves, and who owns them.
+#include <algorithm>
+
 #include "hostapi/ErrorCodes.h"
 #include "hostutil/HostSetup.h"
 #include "plugin/ErrorCodes.h"
@@ -28,6 +30,24 @@ class KeysTest : public ReaderTest {
 TEST_F(KeysTest, NumbersArePairedInOrder) {
   EXPECT_EQ(KeysWith("setAttr -s 2 \".ktv[0:1]\" 1 0 10 100;"), (Keys{{1, 0}, {10, 100}}));
   EXPECT_EQ(KeysWith("setAttr -s 3 \".ktv[0:2]\"  1 0 2 5.5 3 10;"), (Keys{{1, 0}, {2, 5.5}, {3, 10}}));
+}
+
+TEST_F(KeysTest, LinesAmongTheNumbersAreCounted) {
+  for (const std::string numbers : {"1\n0\n\n10 100", "1 0\r\n\t2\n5.5\n", "\n1\n0\n7", "1\n0 x\n2\n3\n"}) {
+    const std::string text = "createNode animCurveTL;\nsetAttr \".ktv\" " + numbers + ";\n \n";
+    ASSERT_EQ(Read(text), 0);
+    EXPECT_EQ(scene().line, std::count(text.begin(), text.end(), '\n')) << numbers;
+  }
+  std::string many = "setAttr \".ktv\"";
+  for (int number = 0; number < 1500; ++number) many += " \n" + std::to_string(number);
+  ASSERT_EQ(ReadWith(many + ";"), 0);
+  EXPECT_EQ(scene().line, 1502);
+}
+
+TEST_F(KeysTest, LinesAreCountedUpToANumberThatFails) {
+  const UtilityRehearsal failing(HOST_UTILITY_NumberScan, 3, 77);
+  EXPECT_EQ(ReadWith("setAttr \".ktv\" 1\n0\n\n10\n100;"), 77);
+  EXPECT_EQ(scene().line, 4);
 }
 
 TEST_F(KeysTest, AnOddLastNumberIsAKeyOfValueZero) {
