@@ -9,8 +9,8 @@
 
 // Reads the file and builds its composition in the folder. The path is NUL-terminated UTF-16; null counts as
 // empty. Returns the code of the first failure in parsing or building, else of the first one in reading, else
-// 0; what was built before a failure stays. For a file that is no Maya ASCII scene the user sees a message; it
-// is no failure.
+// 0; what was built before a failure stays. For a file that is no Maya ASCII scene the user sees a message;
+// it is no failure.
 HostError ImportFileCallback(const HostUTF16Unit* path, void* ignored1, void* ignored2, VOR_Item* folder);
 
 // Sets *canImport to 1 when the file begins as a Maya ASCII scene does, without showing anything. Returns 3
