@@ -1,5 +1,6 @@
 #include "bake/Writer.h"
 
+#include <algorithm>
 #include <charconv>
 
 #include "diag/ShownText.h"
@@ -9,7 +10,9 @@ namespace {
 
 constexpr std::size_t kFullBuffer = std::size_t{1} << 20;
 constexpr std::size_t kKeysOnALine = 8;
+constexpr std::size_t kKeysAtATime = 4096;  // in the buffer
 constexpr std::size_t kAxes = 3;
+constexpr std::size_t kLongestNumber = 32;  // bytes of a double's text, at most
 
 struct ChannelText {
   const char* plug;
@@ -29,7 +32,7 @@ constexpr ChannelText kChannels[kSlotCount] = {
 Writer::Writer(std::ostream& out, const FrameRange& frames) : out_(out), frames_(frames) {}
 
 void Writer::Number(double value) {
-  char text[32];
+  char text[kLongestNumber];
   buffer_.append(text, std::to_chars(text, text + sizeof text, value).ptr);
 }
 
@@ -128,14 +131,42 @@ void Writer::Curves(const std::string& node, const std::vector<Moving>& channels
   }
 }
 
+// The times are the same on every channel: their texts are made once.
+void Writer::MakeTimes() {
+  timeEnds_.reserve(frames_.count);
+  for (std::size_t frame = 0; frame < frames_.count; ++frame) {
+    char text[kLongestNumber];
+    const double time = static_cast<double>(frame) * frames_.step;
+    times_ += frame % kKeysOnALine == 0 && frame != 0 ? "\n\t\t" : " ";
+    times_.append(text, std::to_chars(text, text + sizeof text, time).ptr);
+    times_ += ' ';
+    timeEnds_.push_back(static_cast<std::uint32_t>(times_.size()));
+  }
+}
+
+// The keys first to last - 1.
+void Writer::AppendKeys(const Channel& channel, std::size_t first, std::size_t last) {
+  const char* time = times_.data() + (first == 0 ? 0 : timeEnds_[first - 1]);
+  const std::size_t start = buffer_.size();
+  const auto timeBytes = static_cast<std::size_t>(times_.data() + timeEnds_[last - 1] - time);
+  buffer_.resize(start + timeBytes + (last - first) * kLongestNumber);
+  char* at = buffer_.data() + start;
+  for (std::size_t frame = first; frame < last; ++frame) {
+    const char* const timeEnd = times_.data() + timeEnds_[frame];
+    at = std::copy(time, timeEnd, at);
+    at = std::to_chars(at, at + kLongestNumber, channel.At(frame)).ptr;
+    time = timeEnd;
+  }
+  buffer_.resize(static_cast<std::size_t>(at - buffer_.data()));
+}
+
 void Writer::Keys(const Channel& channel) {
+  if (timeEnds_.empty()) MakeTimes();
   Text("\tsetAttr -s " + std::to_string(frames_.count) + " \".ktv[0:" + std::to_string(frames_.count - 1) +
        "]\" ");
-  for (std::size_t frame = 0; frame < frames_.count; ++frame) {
-    Text(frame % kKeysOnALine == 0 && frame != 0 ? "\n\t\t" : " ");
-    Number(static_cast<double>(frame) * frames_.step);
-    Text(" ");
-    Number(channel.At(frame));
+  for (std::size_t first = 0; first < frames_.count; first += kKeysAtATime) {
+    AppendKeys(channel, first, std::min(first + kKeysAtATime, frames_.count));
+    if (buffer_.size() >= kFullBuffer) Flush();
   }
   Text(";\n");
 }

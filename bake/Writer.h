@@ -2,6 +2,7 @@
 #pragma once
 
 #include <cstddef>
+#include <cstdint>
 #include <ostream>
 #include <string>
 #include <string_view>
@@ -50,6 +51,8 @@ class Writer {
   void Triple(const char* attribute, const Track& track, std::size_t firstSlot);
   void Curves(const std::string& node, const std::vector<Moving>& channels);
   void Keys(const Channel& channel);
+  void AppendKeys(const Channel& channel, std::size_t first, std::size_t last);
+  void MakeTimes();
   void Number(double value);
   void Text(std::string_view text) { buffer_ += text; }
   void Flush();
@@ -59,6 +62,8 @@ class Writer {
   UniqueNames names_;
   std::string buffer_;
   std::string connections_;
+  std::string times_;                    // of all keys, each after what parts it from the key before
+  std::vector<std::uint32_t> timeEnds_;  // in times_, by key
 };
 
 }  // namespace bake
