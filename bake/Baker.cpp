@@ -58,7 +58,7 @@ bool Baker::FindRange() {
 
 void Baker::SampleHierarchy() {
   local_->Run(*report_.frames);
-  if (!options_.world) chains_.Judge(&*local_);
+  if (!options_.world) chains_.Judge(&*local_, motion::KeptBelow(evaluator_));
 }
 
 // A camera's picture depends on what its chain does to it; a null only has to say its place.

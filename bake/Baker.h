@@ -46,8 +46,10 @@ class Baker {
   std::string WriteTransform(const Item& item, Writer* writer);
   std::string WriteChain(std::uint32_t link, Writer* writer);
 
+  std::string PathText(scene::NodeId node) const;
   bool IsWritable(const Item& item, const LensTrack& lens, const std::string& path);
   void ReportDifferences(const Item& item, const LensTrack& lens, CameraReport* report);
+  void ReportKept(const Item& item, CameraReport* report) const;
   void Differ(diag::Code code, const Item& item, const std::string& path, CameraReport* report);
 
   const scene::Scene& scene_;
@@ -60,6 +62,7 @@ class Baker {
   motion::Evaluator evaluator_;
   std::optional<Sampler> local_;
   std::optional<Sampler> world_;
+  std::optional<motion::KeptBelow> kept_;  // after all frames
   Report report_;
 };
 

@@ -3,7 +3,6 @@
 #include <string_view>
 
 #include "bake/Baker.h"
-#include "bake/PathText.h"
 #include "diag/Diagnostic.h"
 
 namespace bake {
@@ -11,9 +10,15 @@ namespace {
 
 constexpr std::string_view kMark = "null_";
 
+// Of a path in comments and reports.
+constexpr std::size_t kLongestPath = 1'000;
+
 }  // namespace
 
+std::string Baker::PathText(scene::NodeId node) const { return scene_.PathOf(node, kLongestPath); }
+
 void Baker::Write(const Origin& origin, std::ostream& out) {
+  kept_.emplace(evaluator_);
   Writer writer(out, *report_.frames);
   writer.Begin(origin, head_);
   for (const Item& camera : cameras_) WriteCamera(camera, &writer);
@@ -32,7 +37,7 @@ std::string Baker::WriteChain(std::uint32_t link, Writer* writer) {
     Link& one = chains_.link(*at);
     const std::string parent = one.above == Link::kNone ? "" : chains_.link(one.above).name;
     one.name = writer->TakeName(scene_.node(one.node).name);
-    writer->Transform(one.name, parent, PathText(scene_, one.node), local_->track(one.track));
+    writer->Transform(one.name, parent, PathText(one.node), local_->track(one.track));
   }
   return chains_.link(link).name;
 }
@@ -43,7 +48,7 @@ std::string Baker::WriteTransform(const Item& item, Writer* writer) {
   if (item.method == Method::kHierarchy) return WriteChain(item.link, writer);
   const scene::NodeId transform = chains_.link(item.link).node;
   const std::string name = writer->TakeName(scene_.node(transform).name);
-  writer->Transform(name, "", PathText(scene_, transform), world_->track(item.world));
+  writer->Transform(name, "", PathText(transform), world_->track(item.world));
   return name;
 }
 
@@ -62,7 +67,7 @@ bool Baker::IsWritable(const Item& item, const LensTrack& lens, const std::strin
 
 void Baker::WriteCamera(const Item& item, Writer* writer) {
   CameraReport report;
-  report.path = PathText(scene_, item.shape);
+  report.path = PathText(item.shape);
   report.method = item.method;
   const LensTrack& lens = local_->lens(item.lens);
   if (IsWritable(item, lens, report.path)) {
@@ -86,7 +91,19 @@ void Baker::Differ(diag::Code code, const Item& item, const std::string& path, C
   report->differences.push_back(diag::SentenceOf({.code = code, .arguments = {path}}));
 }
 
+// The channels that keep their stored values: each is a diagnostic already, once for all cameras.
+void Baker::ReportKept(const Item& item, CameraReport* report) const {
+  std::vector<motion::Kept> kept = local_->KeptOfLens(item.lens, *kept_);
+  if (item.method == Method::kWorld) {
+    motion::KeptBelow::Merge(world_->KeptOfTrack(item.world, *kept_), &kept);
+  } else if (item.link != Link::kNone) {
+    motion::KeptBelow::Merge(chains_.links()[item.link].kept, &kept);
+  }
+  for (const motion::Kept& one : kept) report->differences.push_back(motion::SentenceOf(evaluator_, one));
+}
+
 void Baker::ReportDifferences(const Item& item, const LensTrack& lens, CameraReport* report) {
+  ReportKept(item, report);
   if (lens.offset) Differ(diag::Code::FilmOffsetLost, item, report->path, report);
   if (lens.squeezed) Differ(diag::Code::LensSqueezeInAperture, item, report->path, report);
   if (lens.otherEffects) Differ(diag::Code::PictureEffectLost, item, report->path, report);
@@ -98,7 +115,7 @@ void Baker::ReportDifferences(const Item& item, const LensTrack& lens, CameraRep
 }
 
 void Baker::WriteLocator(const Item& item, Writer* writer) {
-  const std::string path = PathText(scene_, item.shape);
+  const std::string path = PathText(item.shape);
   const diag::Range place = scene_.node(item.shape).place;
   if (item.method == Method::kWorld) {
     const Track& track = world_->track(item.world);

@@ -38,19 +38,21 @@ void Chains::AskFor(Sampler* sampler) {
   for (Link& link : links_) link.track = sampler->AddLocal(link.node);
 }
 
-void Chains::Judge(Sampler* sampler) {
+void Chains::Judge(Sampler* sampler, const motion::KeptBelow& below) {
   for (Link& link : links_) {
     const Track& track = sampler->track(link.track);
     link.finite = track.finite;
     link.square = !track.IsSheared();
     link.unscaled = !track.mirrors && !track.IsScaled();
     link.moves = track.moves();
+    link.kept = sampler->KeptOfTrack(link.track, below);
     if (link.above == Link::kNone) continue;
     const Link& above = links_[link.above];
     link.finite = link.finite && above.finite;
     link.square = link.square && above.square;
     link.unscaled = link.unscaled && above.unscaled;
     link.moves = link.moves || above.moves;
+    motion::KeptBelow::Merge(above.kept, &link.kept);
   }
 }
 

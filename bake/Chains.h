@@ -26,7 +26,8 @@ struct Link {
   bool square = true;    // without shear
   bool unscaled = true;  // scale 1, and not mirrored
 
-  bool moves = false;  // it, or one above it. Known after Judge.
+  bool moves = false;              // it, or one above it. Known after Judge.
+  std::vector<motion::Kept> kept;  // of it and of all those above it, as KeptBelow counts. Known after Judge.
 
   std::string name;  // in the bake; empty until it is written
 };
@@ -43,7 +44,7 @@ class Chains {
   void AskFor(Sampler* sampler);
 
   // Looks at the tracks, after the sampler has run.
-  void Judge(Sampler* sampler);
+  void Judge(Sampler* sampler, const motion::KeptBelow& below);
 
   Link& link(std::uint32_t index) { return links_[index]; }
   const std::vector<Link>& links() const { return links_; }

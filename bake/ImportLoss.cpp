@@ -11,6 +11,7 @@
 #include "bake/Selection.h"
 #include "diag/ShownText.h"
 #include "motion/Evaluator.h"
+#include "motion/KeptBelow.h"
 #include "motion/SceneCamera.h"
 
 namespace bake {
@@ -161,7 +162,7 @@ class LossSearch {
     const double stored = scene_.Number(node, attribute).value_or(0.0);
     if (evaluator_.Moves(number) || Differ(evaluator_.Value(number), stored)) {
       Lose(place, "what" + by);
-    } else if (!evaluator_.KeptBelow({number}, {}).empty()) {
+    } else if (!motion::KeptBelow(evaluator_).Of({number}, {}).empty()) {
       LoseForGood(place, "what" + by + ", and a bake cannot evaluate it either");
     }
   }

@@ -111,4 +111,14 @@ void Sampler::SampleMatrix(Source* source, Track* track) {
   }
 }
 
+std::vector<motion::Kept> Sampler::KeptOfTrack(std::size_t number, const motion::KeptBelow& below) const {
+  const Source& source = sources_[number];
+  if (source.matrix) return below.Of({}, {*source.matrix});
+  return below.Of({source.numbers.begin(), source.numbers.end()}, {});
+}
+
+std::vector<motion::Kept> Sampler::KeptOfLens(std::size_t number, const motion::KeptBelow& below) const {
+  return below.Of(lensSources_[number].camera.Numbers(), {});
+}
+
 }  // namespace bake

@@ -12,6 +12,7 @@
 #include "diag/Collector.h"
 #include "motion/Camera.h"
 #include "motion/Evaluator.h"
+#include "motion/KeptBelow.h"
 #include "motion/SceneCamera.h"
 #include "scene/Scene.h"
 
@@ -34,6 +35,10 @@ class Sampler {
 
   // What does not move is looked at once.
   void Run(const FrameRange& frames);
+
+  // What of a track or a lens keeps its stored value instead of what drives it.
+  std::vector<motion::Kept> KeptOfTrack(std::size_t number, const motion::KeptBelow& below) const;
+  std::vector<motion::Kept> KeptOfLens(std::size_t number, const motion::KeptBelow& below) const;
 
   Track& track(std::size_t number) { return tracks_[number]; }
   LensTrack& lens(std::size_t number) { return lenses_[number]; }

@@ -21,10 +21,13 @@ bool IsOneOf(std::string_view word, const List& list) {
 
 bool IsStartupCamera(const scene::Node& node) { return node.shared && IsOneOf(node.name, kStartupCameras); }
 
-// A name of the command line: a node's own name, or its whole path.
+// A name of the command line: a node's own name, or its whole path. The topmost node of a path that begins
+// without a "|" is from elsewhere.
 bool Names(const scene::Scene& scene, NodeId id, std::string_view wanted) {
   if (id == scene::kNoNode) return false;
-  return scene.node(id).name == wanted || (wanted.starts_with('|') && scene.PathOf(id) == wanted);
+  if (scene.node(id).name == wanted) return true;
+  if (wanted.find('|') == std::string_view::npos || !wanted.ends_with(scene.node(id).name)) return false;
+  return scene.PathOf(id, wanted.size()) == wanted;
 }
 
 bool IsWanted(const scene::Scene& scene, NodeId camera, const Options& options, std::vector<bool>* found) {

@@ -12,6 +12,7 @@
 #include "fuzz/Require.h"
 #include "fuzz/Target.h"
 #include "motion/Evaluator.h"
+#include "motion/KeptBelow.h"
 #include "scene/Scene.h"
 
 namespace {
@@ -75,7 +76,9 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     fuzz::Require(Digest(evaluator, asked) == digests[i - 1],
                   "a frame has its values in any order of frames");
   }
-  (void)evaluator.KeptBelow(asked.numbers, asked.places);
+  for (const motion::Kept& kept : motion::KeptBelow(evaluator).Of(asked.numbers, asked.places)) {
+    fuzz::Require(!motion::SentenceOf(evaluator, kept).empty(), "what is kept can be said");
+  }
   for (const diag::Diagnostic& diagnostic : diagnostics.kept()) (void)diag::Render("fuzz", diagnostic);
   return 0;
 }

@@ -62,7 +62,8 @@ void Binder::WorldOf(scene::NodeId node, Matrix* field) {
 }
 
 void Binder::ReportNode(diag::Code code) {
-  evaluator_->diagnostics_->Report(code, scene().node(node_).place, {scene().PathOf(node_)});
+  evaluator_->diagnostics_->Report(code, scene().node(node_).place,
+                                   {scene().PathOf(node_, diag::Collector::kLongestArgument)});
 }
 
 std::vector<std::int32_t> Binder::Indices(std::span<const std::string_view> attributes) const {

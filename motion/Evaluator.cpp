@@ -1,7 +1,6 @@
 #include "motion/Evaluator.h"
 
 #include <optional>
-#include <unordered_set>
 
 #include "motion/NodeTypes.h"
 #include "motion/PlaceSteps.h"
@@ -64,13 +63,14 @@ void Evaluator::MoveTo(double frame) {
 
 void Evaluator::ReportFailures() {
   for (const NumberId number : values_.failed) {
-    NumberCell& cell = numbers_[static_cast<std::size_t>(number)];
+    Cell& cell = numbers_[static_cast<std::size_t>(number)];
     if (IsInput(cell.plug)) continue;
     cell.standing = Standing::kFailed;
     const std::optional<scene::Driver> driver = scene_.SourceOf(cell.plug);
     if (!driver) continue;
+    const std::vector<std::string> names = NamesOfDriver(cell.plug, *driver);
     diagnostics_->Report(diag::Code::DriverWithoutAnswer, driver->connection->destinationPlace,
-                         {NameOf(cell.plug), NameOf(driver->plug)});
+                         {names[0], names[1]});
   }
   values_.failed.clear();
 }
@@ -80,30 +80,6 @@ void Evaluator::ReportFailures() {
 bool Evaluator::IsInput(const scene::Plug& plug) const {
   const bool channel = scene::FindAttribute("transform", plug.attribute) != nullptr;
   return !channel && FindNodeType(scene_.node(plug.node).type) != nullptr && std::isnan(StoredNumber(plug));
-}
-
-std::vector<Kept> Evaluator::KeptBelow(const std::vector<NumberId>& numbers,
-                                       const std::vector<MatrixId>& matrices) const {
-  std::vector<Kept> kept;
-  std::unordered_set<const void*> seen;  // cells and steps
-  std::vector<std::uint32_t> open;
-  const auto visit = [&](const auto& cell) {
-    if (!seen.insert(&cell).second) return;
-    const bool asDriven = cell.standing == Standing::kStored || cell.standing == Standing::kDriven;
-    if (!asDriven) kept.push_back({cell.plug, cell.standing});
-    if (cell.step != kNone && seen.insert(steps_[cell.step].get()).second) open.push_back(cell.step);
-  };
-  const auto visitNumber = [&](NumberId id) { visit(numbers_[static_cast<std::size_t>(id)]); };
-  const auto visitMatrix = [&](MatrixId id) { visit(matrices_[static_cast<std::size_t>(id)]); };
-  for (const NumberId id : numbers) visitNumber(id);
-  for (const MatrixId id : matrices) visitMatrix(id);
-  while (!open.empty()) {
-    const Step& step = *steps_[open.back()];
-    open.pop_back();
-    for (const NumberInput& input : step.numberInputs) visitNumber(input.cell);
-    for (const MatrixInput& input : step.matrixInputs) visitMatrix(input.cell);
-  }
-  return kept;
 }
 
 }  // namespace motion

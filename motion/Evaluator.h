@@ -76,10 +76,6 @@ class Evaluator {
   // The nodes that compute what was asked for so far, and what that depends on: curves, constraints …
   const std::vector<scene::NodeId>& computingNodes() const { return computingNodes_; }
 
-  // What of all that these values depend on is not as it is driven, each once.
-  std::vector<Kept> KeptBelow(const std::vector<NumberId>& numbers,
-                              const std::vector<MatrixId>& matrices) const;
-
   // ---- frames ----
 
   // Any frame after any other; ascending ones are fastest.
@@ -99,17 +95,17 @@ class Evaluator {
 
  private:
   friend class Binder;
+  friend class KeptBelow;
+  friend std::string SentenceOf(const Evaluator& evaluator, const Kept& kept);
   static constexpr std::uint32_t kNone = Ordering::kNone;
 
-  struct NumberCell {
-    scene::Plug plug;
-    std::uint32_t step = kNone;  // that writes it
-    Standing standing = Standing::kStored;
-  };
-  struct MatrixCell {
+  // A value, and the step that writes it.
+  struct Cell {
     scene::Plug plug;
     std::uint32_t step = kNone;
     Standing standing = Standing::kStored;
+
+    bool AsDriven() const { return standing == Standing::kStored || standing == Standing::kDriven; }
   };
   // The cell of a step that passes on what is connected.
   struct Written {
@@ -140,6 +136,10 @@ class Evaluator {
   std::uint32_t AddStep(std::unique_ptr<Step> step);
   NumberId AddNumber(const scene::Plug& plug);
   std::string NameOf(const scene::Plug& plug) const;
+  // The plug, what drives it, and the type of that node.
+  std::vector<std::string> NamesOfDriver(const scene::Plug& plug, const scene::Driver& driver) const;
+  const Cell& CellOf(NumberId id) const { return numbers_[static_cast<std::size_t>(id)]; }
+  const Cell& CellOf(MatrixId id) const { return matrices_[static_cast<std::size_t>(id)]; }
 
   // ---- the order of the steps: EvaluatorOrder.cpp ----
 
@@ -153,8 +153,8 @@ class Evaluator {
   const scene::Scene& scene_;
   diag::Collector* diagnostics_;
   Measures measures_;
-  std::vector<NumberCell> numbers_;
-  std::vector<MatrixCell> matrices_;
+  std::vector<Cell> numbers_;
+  std::vector<Cell> matrices_;
   scene::FlatMap<CellOfPlug> numberOfPlug_;
   scene::FlatMap<CellOfPlug> matrixOfPlug_;
   std::vector<std::unique_ptr<Step>> steps_;

@@ -62,7 +62,7 @@ void Evaluator::MakeNode(const NodeType& type, NodeId node) {
   const std::uint32_t index = AddStep(std::move(step));
   computingNodes_.push_back(node);
   for (const std::string_view output : type.outputs) {
-    NumberCell& cell = numbers_[static_cast<std::size_t>(AddNumber({node, output}))];
+    Cell& cell = numbers_[static_cast<std::size_t>(AddNumber({node, output}))];
     cell.step = index;
     cell.standing = Standing::kDriven;
   }
@@ -139,7 +139,7 @@ void Evaluator::Expand(NumberId id) {
   step->output = id;
   const double factor = from == to ? 1.0 : InternalUnits(measures_, from) / InternalUnits(measures_, to);
   step->numberInputs.push_back({Reserve(driver->plug), &step->input, factor});
-  NumberCell& cell = numbers_[static_cast<std::size_t>(id)];
+  Cell& cell = numbers_[static_cast<std::size_t>(id)];
   cell.step = AddStep(std::move(step));
   cell.standing = Standing::kDriven;
   written_[cell.step].number = static_cast<std::uint32_t>(id);
@@ -201,18 +201,22 @@ void Evaluator::ExpandMatrix(MatrixId id) {
 // ---- reports ----
 
 std::string Evaluator::NameOf(const Plug& plug) const {
-  std::string name = scene_.PathOf(plug.node);
+  std::string name = scene_.PathOf(plug.node, diag::Collector::kLongestArgument);
   name += '.';
   name += plug.attribute;
   if (plug.index != scene::kNoIndex) name += '[' + std::to_string(plug.index) + ']';
   return name;
 }
 
+std::vector<std::string> Evaluator::NamesOfDriver(const Plug& plug, const scene::Driver& driver) const {
+  const std::string_view type = scene_.node(driver.plug.node).type;
+  return {NameOf(plug), NameOf(driver.plug), type.empty() ? "unknown" : std::string(type)};
+}
+
 void Evaluator::ReportUnsupported(const Plug& plug, const scene::Driver& driver) {
-  const scene::Node& source = scene_.node(driver.plug.node);
-  const std::string_view type = source.type.empty() ? "unknown" : source.type;
+  const std::vector<std::string> names = NamesOfDriver(plug, driver);
   diagnostics_->Report(diag::Code::UnsupportedDriver, driver.connection->destinationPlace,
-                       {NameOf(plug), NameOf(driver.plug), type});
+                       {names[0], names[1], names[2]});
 }
 
 }  // namespace motion

@@ -41,7 +41,7 @@ void Evaluator::CutCircle(std::span<const std::uint32_t> circle) {
     if (!steps_[at]->Cut()) continue;
     const Written& written = written_[at];
     if (written.number != kNone) {
-      NumberCell& cell = numbers_[written.number];
+      Cell& cell = numbers_[written.number];
       if (IsInput(cell.plug)) continue;
       cell.standing = Standing::kCircle;
       take(cell.plug);

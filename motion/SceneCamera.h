@@ -28,7 +28,7 @@ class SceneCamera {
   // Whether anything of it can change from frame to frame.
   bool Moves() const;
 
-  // What is asked for, for Evaluator::KeptBelow.
+  // What is asked for, for KeptBelow.
   std::vector<NumberId> Numbers() const { return {numbers_.begin(), numbers_.end()}; }
 
  private:

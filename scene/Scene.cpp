@@ -11,14 +11,22 @@ std::uint64_t KeyOf(NodeId node, std::int32_t index) {
 
 }  // namespace
 
-std::string Scene::PathOf(NodeId id) const {
+std::string Scene::PathOf(NodeId id, std::size_t longest) const {
+  constexpr std::string_view kRest = "...";
   std::vector<NodeId> chain;
-  for (; id != kNoNode; id = nodes_[id].parent) chain.push_back(id);
-  std::string path;
-  for (auto at = chain.rbegin(); at != chain.rend(); ++at) {
-    const Node& node = nodes_[*at];
+  std::size_t length = 0;
+  NodeId at = id;
+  for (; at != kNoNode; at = nodes_[at].parent) {
+    const std::size_t own = nodes_[at].name.size() + 1;
+    if (own > longest - length && !chain.empty()) break;
+    length = own > longest - length ? longest : length + own;
+    chain.push_back(at);
+  }
+  std::string path(at == kNoNode ? "" : kRest);
+  for (auto one = chain.rbegin(); one != chain.rend(); ++one) {
+    const Node& node = nodes_[*one];
     if (!path.empty() || node.origin == Origin::Created) path += '|';
-    path += node.name;
+    path += node.name.substr(0, longest);
   }
   return path;
 }

@@ -111,8 +111,9 @@ class Scene {
   // By name or path; kNoNode where there is none. Of several the first is found.
   NodeId Find(std::string_view nameOrPath) const { return names_.Find(nameOrPath).node; }
 
-  // "|rig|cam". Without the first "|" where the topmost node is from elsewhere.
-  std::string PathOf(NodeId id) const;
+  // "|rig|cam". Without the first "|" where the topmost node is from elsewhere. Of a path of more than
+  // `longest` bytes the names at its end that fit, after "...": a rig can be as deep as its file is long.
+  std::string PathOf(NodeId id, std::size_t longest = static_cast<std::size_t>(-1)) const;
 
   // A plug by a long or a short name, or a path of attributes ("tg[0].tt").
   Plug PlugOf(NodeId node, std::string_view attribute) const;

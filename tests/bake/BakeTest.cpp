@@ -199,6 +199,30 @@ TEST(Bake, NodesOfOneNameGetNumbersAndTheirPathsStandInComments) {
   EXPECT_THAT(baked.text(), HasSubstr("// |b|cam|camShape\n"));
 }
 
+TEST(Bake, ACameraSaysWhichChannelsKeepTheirStoredValues) {
+  const Baked baked(
+      "createNode expression -n \"shake\";\ncreateNode transform -n \"rig\";\n"
+      "connectAttr \"shake.out[0]\" \"rig.tx\";\n"
+      "createNode transform -n \"left\" -p \"rig\";\ncreateNode camera -n \"leftShape\" -p \"left\";\n"
+      "connectAttr \"shake.out[1]\" \"leftShape.fl\";\n"
+      "createNode transform -n \"free\";\ncreateNode camera -n \"freeShape\" -p \"free\";\n"
+      "createNode transform -n \"large\" -p \"rig\";\n\tsetAttr \".sx\" 2;\n"
+      "createNode camera -n \"largeShape\" -p \"large\";\n");
+  const auto differences = [&baked](std::size_t camera) {
+    return baked.report().cameras.at(camera).differences;
+  };
+  EXPECT_THAT(
+      differences(0),
+      ElementsAre("\"|rig|left|leftShape.focalLength\" is driven by \"|shake.out[1]\" (expression), which "
+                  "cannot be computed here",
+                  "\"|rig.translateX\" is driven by \"|shake.out[0]\" (expression), which cannot be "
+                  "computed here"));
+  EXPECT_THAT(differences(1), testing::IsEmpty());
+  EXPECT_THAT(differences(2),
+              ElementsAre(testing::HasSubstr("|rig.translateX"), testing::HasSubstr("comes without")));
+  EXPECT_EQ(baked.CountOf(diag::Code::UnsupportedDriver), 2u);
+}
+
 TEST(Bake, ABakeOfABakeDiffersInCommentsAlone) {
   const std::string curve = CurveOf("animCurveTL", "shotCam_translateX", "11 0.1 14 0.9", "shotCam.tx");
   const std::string turn = CurveOf("animCurveTA", "turn", "10 0 15 300", "shotCam.rz");

@@ -3,6 +3,7 @@
 
 #include <cmath>
 
+#include "motion/KeptBelow.h"
 #include "tests/motion/EvaluatorFixture.h"
 
 namespace {
@@ -14,10 +15,17 @@ using motion::Vector;
 using testing::ElementsAre;
 using testing::HasSubstr;
 using testing::IsEmpty;
-using testmotion::EvaluatorTest;
 using testmotion::VectorNear;
 
 constexpr double kRounding = 1e-13;
+
+class EvaluatorTest : public testmotion::EvaluatorTest {
+ protected:
+  std::vector<Kept> KeptOf(const std::vector<NumberId>& numbers,
+                           const std::vector<motion::MatrixId>& matrices) {
+    return motion::KeptBelow(evaluator()).Of(numbers, matrices);
+  }
+};
 
 // A straight line from 0 at frame 0 to 24 at frame 24, whatever a channel measures.
 constexpr char kLine[] =
@@ -271,13 +279,12 @@ TEST_F(EvaluatorTest, ItKnowsWhatWasKeptBelowAValue) {
   const NumberId ty = evaluator().Number(At("b"), "ty");
   const motion::MatrixId world = evaluator().World(At("b"));
   const motion::MatrixId free = evaluator().World(At("free"));
-  for (const auto& kept : {evaluator().KeptBelow({ty}, {}), evaluator().KeptBelow({}, {world}),
-                           evaluator().KeptBelow({ty}, {world})}) {
+  for (const auto& kept : {KeptOf({ty}, {}), KeptOf({}, {world}), KeptOf({ty}, {world})}) {
     ASSERT_EQ(kept.size(), 1u);
     EXPECT_EQ(kept[0].plug, scene().PlugOf(At("a"), "tx"));
     EXPECT_EQ(kept[0].standing, Standing::kUnsupported);
   }
-  EXPECT_THAT(evaluator().KeptBelow({}, {free}), IsEmpty());
+  EXPECT_THAT(KeptOf({}, {free}), IsEmpty());
 }
 
 TEST_F(EvaluatorTest, ACircleIsTheSameWhicheverChannelIsAskedForFirst) {
@@ -301,7 +308,7 @@ TEST_F(EvaluatorTest, ACircleIsTheSameWhicheverChannelIsAskedForFirst) {
                 testing::UnorderedElementsAre(HasSubstr("1: \"|a.translateX\" drives itself [MA0403]"),
                                               HasSubstr("7: \"|d.translateX\" drives itself [MA0403]")))
         << order;
-    EXPECT_EQ(evaluator().KeptBelow({evaluator().Number(At("e"), "tx")}, {}).size(), 1u) << order;
+    EXPECT_EQ(KeptOf({evaluator().Number(At("e"), "tx")}, {}).size(), 1u) << order;
   }
 }
 
@@ -333,8 +340,8 @@ TEST_F(EvaluatorTest, AConstraintWithoutAnAnswerAtSomeFramesKeepsTheStoredValueT
     EXPECT_EQ(evaluator().Value(tx), value);
   }
   EXPECT_THAT(Diagnostics(), ElementsAre(HasSubstr("gives \"|rig.translateX\" no value")));
-  ASSERT_EQ(evaluator().KeptBelow({tx}, {}).size(), 1u);
-  EXPECT_EQ(evaluator().KeptBelow({tx}, {})[0].standing, Standing::kFailed);
+  ASSERT_EQ(KeptOf({tx}, {}).size(), 1u);
+  EXPECT_EQ(KeptOf({tx}, {})[0].standing, Standing::kFailed);
 }
 
 // ---- bounds ----

@@ -2,6 +2,7 @@
 #include <cmath>
 
 #include "motion/Evaluator.h"
+#include "motion/KeptBelow.h"
 #include "motion/Rotation.h"
 #include "motion/Transform.h"
 #include "tests/motion/EvaluatorFixture.h"
@@ -113,7 +114,8 @@ TEST_F(PlacesTest, AnOffsetParentMatrixThatCannotBeComputedIsTheStoredOne) {
       "createNode multMatrix -n \"product\";\nconnectAttr \"product.o\" \"leaf.opm\";\n");
   EXPECT_EQ(World("leaf").origin, (Vector{7.0, 8.0, 9.0}));
   EXPECT_EQ(Diagnostics().size(), 1u);
-  EXPECT_EQ(evaluator().KeptBelow({}, {evaluator().World(At("leaf"))}).size(), 1u);
+  const motion::MatrixId leaf = evaluator().World(At("leaf"));
+  EXPECT_EQ(motion::KeptBelow(evaluator()).Of({}, {leaf}).size(), 1u);
 }
 
 TEST_F(PlacesTest, WhatItWasMadeFromIsThereAtEveryFrame) {
