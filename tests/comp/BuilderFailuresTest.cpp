@@ -145,6 +145,14 @@ TEST(BuilderFailuresTest, BatchesAreClosedAfterAFailedFetchOfTheKeysOfAChannel) 
   EXPECT_THAT(BatchesClosedAfterAFailedRun(TenKeys() + Animation("rig.ry", {{1, 77}})), ElementsAre(5, 5));
 }
 
+TEST(BuilderFailuresTest, TheBatchOfAPointOfInterestIsClosedAfterAFailedFetchToo) {
+  const std::string scene = Scene(TransformText("rig") + TransformText("target") + ConstraintText("aim") +
+                                  CameraText("lens", "rig") + Aim("aim", "rig", "target"));
+  EXPECT_THAT(BatchesClosedAfterAFailedRun(scene + Animation("target.tx", kTenKeys) +
+                                           Animation("target.ry", {{1, 77}})),
+              ElementsAre(1, 1));
+}
+
 TEST(BuilderFailuresTest, AFailureAfterTheFirstStreamLeavesTheEarlierStreamsSet) {
   // The lens sets two values, the anchor point is the third and the scale the fourth.
   const ImportRun run = ImportText(Scene(TransformText("rig") + Triple(".s", 2, 3, 4) +
