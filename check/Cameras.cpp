@@ -59,8 +59,8 @@ std::vector<Camera> FindCameras(const scene::Scene& scene, const CameOver& cameO
   for (scene::NodeId id = 0; id < scene.nodes().size(); ++id) {
     const scene::Node& node = scene.node(id);
     if (!IsCamera(node)) continue;
-    Camera camera{.shape = id, .transform = node.parent, .layer = nullptr};
-    if (!IsSkipped(scene, id) && layer != cameOver.layers.end() && layer->name == ImportName(scene, node)) {
+    Camera camera{.shape = id, .transform = node.parent, .layer = nullptr, .taken = !IsSkipped(scene, id)};
+    if (camera.taken && layer != cameOver.layers.end() && layer->name == ImportName(scene, node)) {
       camera.layer = &*layer++;
       nextCamera();
     }

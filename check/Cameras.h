@@ -14,6 +14,7 @@ struct Camera {
   scene::NodeId shape = scene::kNoNode;
   scene::NodeId transform = scene::kNoNode;  // kNoNode: nothing stands above the camera
   const CameOverLayer* layer = nullptr;      // null: none came over
+  bool taken = false;                        // the importer makes a layer of such a camera
 };
 
 // Each camera that the file creates, in its order.

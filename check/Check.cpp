@@ -24,9 +24,24 @@ std::uint64_t* CountOf(diag::Severity severity, Report* report) {
   return severity == diag::Severity::Warning ? &report->warnings : &report->notes;
 }
 
+// The line at which the import stops reading; 0 where it does not.
+std::uint32_t StopLine(const diag::Collector& collector) {
+  for (const diag::Diagnostic& one : collector.kept()) {
+    const bool stops = one.code >= diag::Code::UnquotedPath && one.code <= diag::Code::CutOffInCommand;
+    if (stops) return one.place.line;
+  }
+  return 0;
+}
+
+// Whether the reader of the whole scene passed over what the import stops at.
+bool IsTheStopAgain(const diag::Diagnostic& diagnostic, std::uint32_t stopLine) {
+  return diagnostic.code <= diag::Code::UnexpectedByte && diagnostic.place.line == stopLine;
+}
+
 void Gather(std::string_view text, const Options& options, diag::Collector* collector, Report* report) {
+  const std::uint32_t stopLine = StopLine(*collector);
   for (const diag::Diagnostic& diagnostic : collector->kept()) {
-    if (!IsWanted(diagnostic.code, options)) continue;
+    if (!IsWanted(diagnostic.code, options) || IsTheStopAgain(diagnostic, stopLine)) continue;
     Finding finding{diagnostic, collector->lines().At(diagnostic.range.offset + diagnostic.range.length), {}};
     if (!diag::IsOfWholeFile(diagnostic)) finding.excerpt = diag::Excerpt(text, diagnostic.range);
     report->findings.push_back(std::move(finding));
@@ -48,6 +63,15 @@ void CheckScene(std::string_view text, const CameOver& cameOver, diag::Collector
   const scene::Settings settings = scene::ReadSettings(scene, *collector);
   const std::vector<Camera> cameras = FindCameras(scene, cameOver);
   *head = ReadHead(scene, settings, cameOver, cameras, collector->lines());
+  const motion::Measures measures = motion::MeasuresOf(scene);
+  const std::vector<Link> links = FindLinks(scene, cameras);
+  const Subject subject{scene, settings, measures, cameOver, cameras, links, *collector};
+  if (cameOver.stop == Stop::UnequalKeys) ReportKeyCounts(subject);
+  for (const auto rule :
+       {ReportLostCameras, ReportLostParents, ReportLostChannels, ReportLostLookAts, ReportNames,
+        ReportLenses, ReportTransforms, ReportTimes, ReportPicture, ReportShifts}) {
+    rule(subject);
+  }
 }
 
 }  // namespace
@@ -56,7 +80,19 @@ Report Check(std::string_view text, const CameOver& cameOver, const Options& opt
   constexpr std::size_t kAll = std::numeric_limits<std::size_t>::max();
   diag::Collector collector(text, options.all ? kAll : diag::Collector::kFullPerCode);
   Report report;
-  ReportStop(text, cameOver, &collector);
+  switch (cameOver.stop) {
+    case Stop::NotAScene:
+      ReportFileKind(text, &collector);
+      break;
+    case Stop::None:
+    case Stop::UnequalKeys:
+      break;
+    case Stop::Other:
+      ReportOtherStop(text, cameOver, &collector);
+      break;
+    default:
+      ReportStopInText(text, cameOver, &collector);
+  }
   if (cameOver.stop != Stop::NotAScene) CheckScene(text, cameOver, &collector, &report.head);
   Gather(text, options, &collector, &report);
   return report;

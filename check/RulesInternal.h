@@ -7,6 +7,7 @@
 
 #include "check/CameOver.h"
 #include "check/Cameras.h"
+#include "check/Links.h"
 #include "diag/Collector.h"
 #include "motion/Measures.h"
 #include "scene/Scene.h"
@@ -20,10 +21,38 @@ struct Subject {
   const motion::Measures& measures;
   const CameOver& cameOver;
   const std::vector<Camera>& cameras;
+  const std::vector<Link>& links;
   diag::Collector& diagnostics;
 };
 
-// Why the import stopped, and where: Stops.cpp. Needs no scene: the file may be none.
-void ReportStop(std::string_view text, const CameOver& cameOver, diag::Collector* diagnostics);
+// ---- why the import stopped, and where ----
+
+// The file is no scene: FileKind.cpp.
+void ReportFileKind(std::string_view text, diag::Collector* diagnostics);
+
+// A byte, a number, or the end of the text: Stops.cpp.
+void ReportStopInText(std::string_view text, const CameOver& cameOver, diag::Collector* diagnostics);
+
+// Keys of a node: KeyCounts.cpp.
+void ReportKeyCounts(const Subject& subject);
+
+// The code and its sentence, where there is nothing to show: Stops.cpp.
+void ReportOtherStop(std::string_view text, const CameOver& cameOver, diag::Collector* diagnostics);
+
+// ---- what does not come over ----
+
+void ReportLostCameras(const Subject& subject);   // LostCameras.cpp
+void ReportLostParents(const Subject& subject);   // LostParents.cpp
+void ReportLostChannels(const Subject& subject);  // LostChannels.cpp
+void ReportLostLookAts(const Subject& subject);   // LostLookAts.cpp
+void ReportNames(const Subject& subject);         // Names.cpp
+
+// ---- where the picture differs ----
+
+void ReportLenses(const Subject& subject);      // Lenses.cpp
+void ReportTransforms(const Subject& subject);  // Transforms.cpp
+void ReportTimes(const Subject& subject);       // Times.cpp
+void ReportPicture(const Subject& subject);     // PictureSize.cpp
+void ReportShifts(const Subject& subject);      // PictureShift.cpp
 
 }  // namespace check

@@ -5,7 +5,8 @@
 //   100  reading the text            400  what drives a channel
 //   200  nodes, names, units         500  cameras and locators
 //   300  curves                      600  what a bake writes
-//   700  what stops an import
+//   700  what stops an import          800  what does not come over
+//   900  where the picture differs
 #pragma once
 
 #include <cstdint>
@@ -39,6 +40,11 @@ enum class Code : std::uint16_t {
   UnknownUnit = 209,
   SecondUnit = 210,
   ReferenceNotRead = 211,
+  SameNames = 212,
+  NamesDifferInCase = 213,
+  NameTooLong = 214,
+  NodeWithoutName = 215,
+  TextAfterNul = 216,
   // Curves: diag/CurveCodes.cpp
   UnknownTangentType = 301,
   StepIntoKey = 302,
@@ -77,6 +83,56 @@ enum class Code : std::uint16_t {
   // What stops an import: diag/StopCodes.cpp
   ImportStopped = 701,
   NotMayaAscii = 702,
+  MayaBinary = 703,
+  CompressedFile = 704,
+  EmptyFile = 705,
+  MarkBeforeHeader = 706,
+  UnquotedPath = 711,
+  AliasList = 712,
+  ConflictMarkStops = 713,
+  TemplateFieldStops = 714,
+  RefusedByte = 715,
+  LastCommentOpen = 716,
+  CutOffInString = 717,
+  CutOffInComment = 718,
+  CutOffInCommand = 719,
+  UnequalKeys = 720,
+  NumberTooLarge = 721,
+  NumberUnreadable = 722,
+  // What does not come over: diag/LossCodes.cpp
+  OrthographicCamera = 801,
+  StartupCameras = 802,
+  CameraNotImported = 803,
+  ParentIsPath = 804,
+  ParentNotImported = 805,
+  ChannelsOfOneKey = 806,
+  DrivenByNoCurve = 807,
+  CurveThroughNode = 808,
+  ConnectionToPath = 809,
+  FocalLengthElsewhere = 810,
+  LookAtShortNames = 811,
+  LookAtWeightLast = 812,
+  LookAtNotTaken = 813,
+  AttributesWithoutPlace = 814,
+  // Where the picture differs: diag/PictureCodes.cpp
+  PictureShifts = 901,
+  KeysAreNoBake = 902,
+  RotateOrderLost = 903,
+  RotateAxisLost = 904,
+  ShearLost = 905,
+  PivotTranslationLost = 906,
+  InheritanceOff = 907,
+  FitDiffers = 908,
+  LensSqueezeLost = 909,
+  CameraScaleLost = 910,
+  ChainScaled = 911,
+  PictureSizeAssumed = 912,
+  KeysStartApart = 913,
+  OtherLengthUnit = 914,
+  BeyondCompositionTime = 915,
+  NegativeFrames = 916,
+  FractionalFrames = 917,
+  RateDiffers = 918,
 };
 
 // Ordered: a later one is worse.

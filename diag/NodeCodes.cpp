@@ -102,6 +102,50 @@ constexpr Entry kNodeCodes[] = {
      .help =
          "Nothing, unless a camera or its parent stands in that file: then import the referenced file into "
          "the scene before the export."},
+    {.code = Code::SameNames,
+     .severity = Severity::Warning,
+     .symbol = "SameNames",
+     .sentence = "this is a second node called \"{0}\" for the importer",
+     .meaning = "The importer knows nodes by their names alone, wherever they stand. Of several transforms, "
+                "cameras, "
+                "curves or locators of one name, the first gets the values and the curves of all of them.",
+     .example =
+         "createNode transform -n \"shotCam\" -p \"rigA\";\ncreateNode transform -n \"shotCam\" -p \"rigB\";",
+     .help = "Give the nodes different names, or write the scene anew: mayascene bake SCENE -o OUT."},
+    {.code = Code::NamesDifferInCase,
+     .severity = Severity::Warning,
+     .symbol = "NamesDifferInCase",
+     .sentence = "\"{0}\" and \"{1}\" are one name for the importer",
+     .meaning =
+         "The importer does not look at upper and lower case. The first of the nodes gets the values and the "
+         "curves of both.",
+     .example = "createNode transform -n \"shotCam\";\ncreateNode transform -n \"ShotCam\";",
+     .help = "Give the nodes different names, or write the scene anew: mayascene bake SCENE -o OUT."},
+    {.code = Code::NameTooLong,
+     .severity = Severity::Warning,
+     .symbol = "NameTooLong",
+     .sentence = "the importer does not take this name of {0} bytes",
+     .meaning =
+         "A name of more than 252 bytes is empty for the importer. The node gets no values and no curves.",
+     .example = "",
+     .help = "Give the node a shorter name, or write the scene anew: mayascene bake SCENE -o OUT."},
+    {.code = Code::NodeWithoutName,
+     .severity = Severity::Warning,
+     .symbol = "NodeWithoutName",
+     .sentence = "this {0} has no name that the importer takes",
+     .meaning = "The node has no name, or one without quotes. Of several such nodes the first gets the "
+                "values of all.",
+     .example = "createNode transform -n shotCam;",
+     .help = "Write the name in quotes, or write the scene anew: mayascene bake SCENE -o OUT."},
+    {.code = Code::TextAfterNul,
+     .severity = Severity::Warning,
+     .symbol = "TextAfterNul",
+     .sentence = "the importer reads nothing of the {0} bytes after this zero byte",
+     .meaning =
+         "A byte of value 0 ends the text for the importer, and text follows it. The file is damaged, or was "
+         "put together from several.",
+     .example = "",
+     .help = "Copy or export the file again. A bake reads on after the byte: mayascene bake SCENE -o OUT."},
 };
 
 }  // namespace

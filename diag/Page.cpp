@@ -15,9 +15,15 @@ struct Topic {
 };
 
 constexpr std::array kTopics = {
-    Topic{100, "Reading the file"},      Topic{200, "Nodes, names, units"},  Topic{300, "Curves"},
-    Topic{400, "What drives a channel"}, Topic{500, "Cameras and locators"}, Topic{600, "What a bake writes"},
+    Topic{100, "Reading the file"},
+    Topic{200, "Nodes, names, units"},
+    Topic{300, "Curves"},
+    Topic{400, "What drives a channel"},
+    Topic{500, "Cameras and locators"},
+    Topic{600, "What a bake writes"},
     Topic{700, "What stops an import"},
+    Topic{800, "What does not come over"},
+    Topic{900, "Where the picture differs"},
 };
 
 constexpr std::string_view kIntroduction =

@@ -14,7 +14,8 @@ namespace {
 std::vector<Entry> WholeTable() {
   std::vector<Entry> table;
   for (const std::span<const Entry> part :
-       {ReadingCodes(), NodeCodes(), CurveCodes(), DriverCodes(), CameraCodes(), BakeCodes(), StopCodes()}) {
+       {ReadingCodes(), NodeCodes(), CurveCodes(), DriverCodes(), CameraCodes(), BakeCodes(), StopCodes(),
+        LossCodes(), PictureCodes()}) {
     table.insert(table.end(), part.begin(), part.end());
   }
   return table;

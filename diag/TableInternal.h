@@ -14,5 +14,7 @@ std::span<const Entry> DriverCodes();
 std::span<const Entry> CameraCodes();
 std::span<const Entry> BakeCodes();
 std::span<const Entry> StopCodes();
+std::span<const Entry> LossCodes();
+std::span<const Entry> PictureCodes();
 
 }  // namespace diag

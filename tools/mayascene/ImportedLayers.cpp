@@ -13,12 +13,12 @@ namespace {
 
 // Several codes are one kind of stop.
 check::Stop stopOf(const SceneLook& look, const refhost::CallbackResult& result) {
+  const bool made = result.folder != nullptr && !result.folder->compositions.empty();
+  // A file that is shorter than the header fails to be read.
+  if (!made && !look.mayaHeader) return check::Stop::NotAScene;
   switch (result.code) {
-    case 0: {
-      const bool made = result.folder != nullptr && !result.folder->compositions.empty();
-      return made || (look.mayaHeader && result.messages.empty()) ? check::Stop::None
-                                                                  : check::Stop::NotAScene;
-    }
+    case 0:
+      return made || result.messages.empty() ? check::Stop::None : check::Stop::NotAScene;
     case HOST_ERR_MAYA_SYNTAX:
       return check::Stop::RefusedByte;
     case HOST_ERR_MAYA_UNEXPECTED_END:

@@ -1,0 +1,65 @@
+#include "check/Curves.h"
+
+#include <array>
+#include <cmath>
+
+#include "check/Cameras.h"
+
+namespace check {
+namespace {
+
+constexpr std::array<std::string_view, 9> kPlaceChannels = {
+    "translateX", "translateY", "translateZ", "rotateX", "rotateY", "rotateZ", "scaleX", "scaleY", "scaleZ"};
+
+void TakeInTime(double time, KeyedChannel* channel) {
+  if (channel->keys == 0) channel->first = time;
+  if (channel->keys != 0 && std::fabs(time - channel->last - 1.0) > 1e-6) channel->whole = false;
+  if (!channel->fractional && std::fabs(time - std::round(time)) > 1e-3) {
+    channel->fractional = true;
+    channel->fraction = time;
+  }
+  channel->last = time;
+  ++channel->keys;
+}
+
+void ReadKeys(const scene::Scene& scene, KeyedChannel* channel) {
+  for (const scene::Piece& piece : scene.Pieces(channel->curve, "keyTimeValue")) {
+    const std::vector<double> numbers = piece.value.Numbers();
+    if (channel->keys == 0) {
+      channel->place = piece.value.range();
+      channel->firstValue = numbers.size() > 1 ? numbers[1] : 0.0;
+    }
+    for (std::size_t i = 0; i < numbers.size(); i += 2) TakeInTime(numbers[i], channel);
+  }
+}
+
+}  // namespace
+
+std::span<const std::string_view> PlaceChannels() { return kPlaceChannels; }
+
+bool IsImportedCurve(std::string_view type) {
+  return SameName(type, "animCurveTL") || SameName(type, "animCurveTA") || SameName(type, "animCurveTU");
+}
+
+bool IsPath(const scene::Scene& scene, const diag::Range& plug) {
+  const std::string_view text =
+      scene.text().substr(static_cast<std::size_t>(plug.offset), static_cast<std::size_t>(plug.length));
+  return text.substr(0, text.find('.')).find_first_of("|:") == 0 ||
+         text.substr(0, text.find('.')).find('|') != std::string_view::npos;
+}
+
+std::vector<KeyedChannel> FindKeyedChannels(const scene::Scene& scene, scene::NodeId node,
+                                            std::span<const std::string_view> channels) {
+  std::vector<KeyedChannel> found;
+  for (const std::string_view channel : channels) {
+    const std::optional<scene::Driver> driver = scene.SourceOf(scene.PlugOf(node, channel));
+    if (!driver || !IsImportedCurve(scene.node(driver->plug.node).type)) continue;
+    if (IsPath(scene, driver->connection->destinationPlace)) continue;
+    KeyedChannel keyed{.channel = channel, .curve = driver->plug.node, .place = {}};
+    ReadKeys(scene, &keyed);
+    found.push_back(keyed);
+  }
+  return found;
+}
+
+}  // namespace check

@@ -1,0 +1,99 @@
+// What of a camera's lens and film the importer does not take.
+#include <array>
+#include <cmath>
+#include <string>
+
+#include "check/NumberText.h"
+#include "check/RulesInternal.h"
+#include "motion/Camera.h"
+#include "motion/SceneCamera.h"
+
+namespace check {
+namespace {
+
+using diag::Code;
+using scene::NodeId;
+
+struct Field {
+  std::string_view attribute;
+  double neutral;
+};
+
+constexpr std::array kOffsets = {Field{"horizontalFilmOffset", 0.0}, Field{"verticalFilmOffset", 0.0}};
+constexpr std::array kEffects = {Field{"postScale", 1.0}, Field{"preScale", 1.0},
+                                 Field{"filmTranslateH", 0.0}, Field{"filmTranslateV", 0.0},
+                                 Field{"filmRollValue", 0.0}};
+
+class Lens {
+ public:
+  Lens(const Subject& subject, NodeId camera) : subject_(subject), camera_(camera) {}
+
+  void Report() {
+    if (const auto place = FirstThatDiffers(kOffsets)) Say(Code::FilmOffsetLost, *place);
+    if (const auto place = FirstThatDiffers(kEffects)) Say(Code::PictureEffectLost, *place);
+    ReportFactor("lensSqueezeRatio", Code::LensSqueezeLost);
+    ReportFactor("cameraScale", Code::CameraScaleLost);
+    ReportFit();
+  }
+
+ private:
+  const scene::Scene& scene() const { return subject_.scene; }
+  std::string_view name() const { return scene().node(camera_).name; }
+  double Number(std::string_view attribute, double otherwise) const {
+    return scene().Number(camera_, attribute).value_or(otherwise);
+  }
+
+  void Say(Code code, const diag::Range& place) { subject_.diagnostics.Report(code, place, {name()}); }
+
+  // Where the file gives the attribute another value, or has something drive it.
+  std::optional<diag::Range> Differs(const Field& field) const {
+    if (const auto driver = scene().SourceOf(scene().PlugOf(camera_, field.attribute))) {
+      return driver->connection->destinationPlace;
+    }
+    const auto written = scene().Written(camera_, field.attribute);
+    const auto number = written ? written->Number() : std::nullopt;
+    if (!number || *number == field.neutral) return std::nullopt;
+    return written->range();
+  }
+
+  template <std::size_t kCount>
+  std::optional<diag::Range> FirstThatDiffers(const std::array<Field, kCount>& fields) const {
+    for (const Field& field : fields) {
+      if (const auto place = Differs(field)) return place;
+    }
+    return std::nullopt;
+  }
+
+  void ReportFactor(std::string_view attribute, Code code) {
+    if (const auto place = Differs({attribute, 1.0})) {
+      subject_.diagnostics.Report(code, *place, {name(), NumberText(Number(attribute, 1.0))});
+    }
+  }
+
+  void ReportFit() {
+    motion::Camera camera;
+    camera.horizontalAperture = Number("horizontalFilmAperture", camera.horizontalAperture);
+    camera.verticalAperture = Number("verticalFilmAperture", camera.verticalAperture);
+    camera.lensSqueeze = Number("lensSqueezeRatio", 1.0);
+    camera.filmFit = static_cast<int>(Number("filmFit", motion::filmfit::kHorizontal));
+    if (camera.filmFit != motion::filmfit::kFill && camera.filmFit != motion::filmfit::kOverscan) return;
+    if (motion::ResolvedFit(camera, motion::PictureOf(subject_.settings)) != motion::filmfit::kVertical)
+      return;
+    const auto written = scene().Written(camera_, "filmFit");
+    subject_.diagnostics.Report(Code::FitDiffers, written ? written->range() : scene().node(camera_).place,
+                                {name(), camera.filmFit == motion::filmfit::kFill ? "fill" : "overscan"});
+  }
+
+  const Subject& subject_;
+  NodeId camera_;
+};
+
+}  // namespace
+
+void ReportLenses(const Subject& subject) {
+  for (const Camera& camera : subject.cameras) {
+    if (camera.taken) Lens(subject, camera.shape).Report();
+  }
+}
+
+}  // namespace check

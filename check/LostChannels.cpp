@@ -1,0 +1,132 @@
+// Channels whose motion does not come over.
+#include <array>
+#include <cmath>
+#include <map>
+#include <set>
+#include <string>
+#include <utility>
+#include <vector>
+
+#include "check/Curves.h"
+#include "check/RulesInternal.h"
+
+namespace check {
+namespace {
+
+using diag::Code;
+using scene::NodeId;
+
+constexpr std::array<std::string_view, 1> kFocalLength = {"focalLength"};
+
+std::string_view WrittenAt(const scene::Scene& scene, const diag::Range& range) {
+  return scene.text().substr(static_cast<std::size_t>(range.offset), static_cast<std::size_t>(range.length));
+}
+
+// Has a place in the scene: what such a node computes comes from more than its curves.
+bool IsPlaced(const scene::Scene& scene, NodeId node) {
+  const scene::Node& one = scene.node(node);
+  return one.parent != scene::kNoNode || one.firstChild != scene::kNoNode || one.type == "transform";
+}
+
+// Whether a curve is behind the node, by way of nodes that have no place of their own.
+bool ComesFromCurve(const scene::Scene& scene, NodeId from) {
+  constexpr std::size_t kMostNodes = 64;
+  if (IsPlaced(scene, from)) return false;
+  std::vector<NodeId> pending{from};
+  std::set<NodeId> seen{from};
+  while (!pending.empty() && seen.size() < kMostNodes) {
+    const NodeId node = pending.back();
+    pending.pop_back();
+    for (const scene::Connection* const connection : scene.ConnectionsInto(node)) {
+      const NodeId source = connection->source.node;
+      if (IsImportedCurve(scene.node(source).type)) return true;
+      if (seen.size() < kMostNodes && !IsPlaced(scene, source) && seen.insert(source).second)
+        pending.push_back(source);
+    }
+  }
+  return false;
+}
+
+bool IsLookAt(std::string_view type) { return SameName(type, "lookAt") || SameName(type, "aimConstraint"); }
+
+struct Driven {
+  std::string channels;
+  diag::Range place;
+};
+
+void Add(std::string_view channel, std::string* channels) {
+  if (!channels->empty()) *channels += ", ";
+  *channels += channel;
+}
+
+// What else than curves drives the node, a diagnostic for each driver.
+void ReportDrivers(const Subject& subject, const Link& link) {
+  const scene::Scene& scene = subject.scene;
+  std::map<NodeId, Driven> drivers;
+  for (const std::string_view channel : PlaceChannels()) {
+    const auto driver = scene.SourceOf(scene.PlugOf(link.node, channel));
+    if (!driver) continue;
+    const std::string_view type = scene.node(driver->plug.node).type;
+    const diag::Range place = driver->connection->destinationPlace;
+    if (IsImportedCurve(type)) {
+      if (IsPath(scene, place))
+        subject.diagnostics.Report(Code::ConnectionToPath, place, {WrittenAt(scene, place)});
+      continue;
+    }
+    // Of a camera's look-at its own rule says what became of it.
+    if (link.own && link.ofCamera && IsLookAt(type) && channel.starts_with("rotate")) continue;
+    Driven& driven = drivers.try_emplace(driver->plug.node, Driven{{}, place}).first->second;
+    Add(channel, &driven.channels);
+  }
+  for (const auto& [id, driven] : drivers) {
+    const scene::Node& driver = scene.node(id);
+    const Code code = ComesFromCurve(scene, id) ? Code::CurveThroughNode : Code::DrivenByNoCurve;
+    subject.diagnostics.Report(code, driven.place,
+                               {scene.node(link.node).name, driven.channels, driver.name,
+                                driver.type.empty() ? "in another file" : driver.type});
+  }
+}
+
+// A node whose curves have one key each is not animated for the importer, and keeps its stored values.
+void ReportOneKey(const Subject& subject, const Link& link) {
+  std::string channels;
+  diag::Range place;
+  for (const KeyedChannel& keyed : FindKeyedChannels(subject.scene, link.node, PlaceChannels())) {
+    if (keyed.keys > 1) return;
+    const double stored = subject.scene.Number(link.node, keyed.channel).value_or(0.0);
+    if (keyed.keys == 0 || std::fabs(stored - keyed.firstValue) <= 1e-9 * (1.0 + std::fabs(stored))) continue;
+    if (channels.empty()) place = keyed.place;
+    Add(keyed.channel, &channels);
+  }
+  if (channels.empty()) return;
+  subject.diagnostics.Report(Code::ChannelsOfOneKey, place, {subject.scene.node(link.node).name, channels});
+}
+
+void ReportFocalLength(const Subject& subject, NodeId camera) {
+  const scene::Scene& scene = subject.scene;
+  const auto driver = scene.SourceOf(scene.PlugOf(camera, kFocalLength[0]));
+  if (!driver) return;
+  const scene::Node& source = scene.node(driver->plug.node);
+  const diag::Range place = driver->connection->destinationPlace;
+  if (!IsImportedCurve(source.type)) {
+    subject.diagnostics.Report(
+        Code::FocalLengthElsewhere, place,
+        {scene.node(camera).name, source.name, source.type.empty() ? "in another file" : source.type});
+  } else if (IsPath(scene, place)) {
+    subject.diagnostics.Report(Code::ConnectionToPath, place, {WrittenAt(scene, place)});
+  }
+}
+
+}  // namespace
+
+void ReportLostChannels(const Subject& subject) {
+  for (const Link& link : subject.links) {
+    ReportDrivers(subject, link);
+    ReportOneKey(subject, link);
+  }
+  for (const Camera& camera : subject.cameras) {
+    if (camera.taken) ReportFocalLength(subject, camera.shape);
+  }
+}
+
+}  // namespace check

@@ -1,0 +1,79 @@
+// Nodes above a camera that the importer does not find.
+#include <algorithm>
+#include <array>
+#include <string>
+
+#include "check/RulesInternal.h"
+
+namespace check {
+namespace {
+
+using diag::Code;
+using diag::Range;
+
+// The types that the importer keeps as transforms.
+constexpr std::array<std::string_view, 4> kTransformTypes = {"transform", "stereoRigTransform", "lookAt",
+                                                             "aimConstraint"};
+
+bool IsImportedTransform(std::string_view type) {
+  return std::any_of(kTransformTypes.begin(), kTransformTypes.end(),
+                     [type](std::string_view one) { return SameName(one, type); });
+}
+
+// What stands in quotes after "-p" in the command that created the node; empty where it is not found.
+Range WrittenParent(std::string_view text, const scene::Node& node) {
+  constexpr std::size_t kLongestCommand = 4000;
+  constexpr std::string_view kOptions[] = {"-p \"", "-parent \""};
+  const auto name = static_cast<std::size_t>(node.place.offset);
+  const std::size_t earliest = name > kLongestCommand ? name - kLongestCommand : 0;
+  const std::size_t begin = text.substr(earliest, name - earliest).rfind("createNode");
+  if (begin == std::string_view::npos) return {};
+  const std::string_view rest = text.substr(earliest + begin, 2 * kLongestCommand);
+  const std::string_view command = rest.substr(0, std::min(rest.find(';'), rest.size()));
+  for (const std::string_view option : kOptions) {
+    const std::size_t at = command.find(option);
+    if (at == std::string_view::npos) continue;
+    const std::size_t start = at + option.size();
+    const std::size_t end = std::min(command.find('"', start), command.size());
+    return {earliest + begin + start, end - start};
+  }
+  return {};
+}
+
+std::string WhereItIs(const scene::Scene& scene, const scene::Node& parent) {
+  if (parent.origin == scene::Origin::Created) return ", a node of the type " + std::string(parent.type);
+  for (const scene::Reference& reference : scene.references()) {
+    const std::string prefix = std::string(reference.nameSpace) + ':';
+    if (prefix.size() > 1 && parent.name.starts_with(prefix)) {
+      return ", which stands in \"" + std::string(reference.file.substr(0, 200)) + '"';
+    }
+  }
+  return ", which stands in no file that is known";
+}
+
+void ReportParent(const Subject& subject, const scene::Node& node) {
+  if (node.parent == scene::kNoNode) return;
+  const scene::Scene& scene = subject.scene;
+  const Range written = WrittenParent(scene.text(), node);
+  const std::string_view path =
+      scene.text().substr(static_cast<std::size_t>(written.offset), static_cast<std::size_t>(written.length));
+  const scene::Node& parent = scene.node(node.parent);
+  const Range place = written == Range{} ? node.place : written;
+  if (path.find('|') != std::string_view::npos) {
+    subject.diagnostics.Report(Code::ParentIsPath, place, {node.name, path});
+  } else if (parent.origin != scene::Origin::Created || !IsImportedTransform(parent.type)) {
+    subject.diagnostics.Report(Code::ParentNotImported, place,
+                               {node.name, parent.name, WhereItIs(scene, parent)});
+  }
+}
+
+}  // namespace
+
+void ReportLostParents(const Subject& subject) {
+  for (const Camera& camera : subject.cameras) {
+    if (camera.taken) ReportParent(subject, subject.scene.node(camera.shape));
+  }
+  for (const Link& link : subject.links) ReportParent(subject, subject.scene.node(link.node));
+}
+
+}  // namespace check

@@ -1,0 +1,172 @@
+// Keys, and where they land in time.
+#include <algorithm>
+#include <array>
+#include <cmath>
+#include <numbers>
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "check/Curves.h"
+#include "check/NumberText.h"
+#include "check/RulesInternal.h"
+#include "check/Times.h"
+#include "motion/Curve.h"
+#include "motion/CurveReader.h"
+
+namespace check {
+namespace {
+
+using diag::Code;
+using scene::NodeId;
+
+constexpr std::array<std::string_view, 1> kFocalLength = {"focalLength"};
+
+// A time of a composition is a thousand times the frame, in 31 bits.
+constexpr double kLastFrame = 2147483.647;
+
+// More frames of one curve are not looked at.
+constexpr double kMostFrames = 100'000;
+
+// Units of time that count frames for the importer: the first key of a node lands at time 0.
+constexpr std::array<std::string_view, 6> kFrameUnits = {"film", "pal", "ntsc", "show", "palf", "ntscf"};
+
+// The keys of one node as the importer takes them.
+struct NodeKeys {
+  NodeId node = scene::kNoNode;
+  std::vector<KeyedChannel> channels;
+  double first = 0.0;  // what its time begins with
+};
+
+std::optional<NodeKeys> KeysOf(const scene::Scene& scene, NodeId node,
+                               std::span<const std::string_view> channels, std::size_t fewest) {
+  NodeKeys keys{node, FindKeyedChannels(scene, node, channels), 0.0};
+  const auto animated = [fewest](const KeyedChannel& channel) { return channel.keys >= fewest; };
+  if (std::none_of(keys.channels.begin(), keys.channels.end(), animated)) return std::nullopt;
+  const auto source = std::find_if(keys.channels.begin(), keys.channels.end(),
+                                   [](const KeyedChannel& channel) { return channel.keys != 0; });
+  keys.first = source->first;
+  return keys;
+}
+
+// Whether a straight way from key to key leaves the curve at some frame.
+bool IsCurved(const Subject& subject, const KeyedChannel& channel) {
+  const motion::Curve curve(motion::ReadCurve(subject.scene, channel.curve, subject.measures));
+  const std::vector<motion::CurveKey>& keys = curve.Data().keys;
+  const double rate = subject.measures.framesPerSecond;
+  motion::CurveCursor cursor;
+  double looked = 0.0;
+  for (std::size_t i = 0; i + 1 < keys.size() && looked < kMostFrames; ++i) {
+    const motion::CurveKey& from = keys[i];
+    const motion::CurveKey& to = keys[i + 1];
+    const double tolerance = 1e-6 * (1.0 + std::fabs(from.value) + std::fabs(to.value));
+    for (double frame = std::floor(from.time * rate + 1e-6) + 1.0; frame < to.time * rate - 1e-6; ++frame) {
+      if (++looked > kMostFrames) break;
+      const double part = (frame / rate - from.time) / (to.time - from.time);
+      const double straight = from.value + part * (to.value - from.value);
+      if (std::fabs(curve.At(frame / rate, &cursor) - straight) > tolerance) return true;
+    }
+  }
+  return false;
+}
+
+// Whether the node turns by half a turn or more from one key to the next: the import takes the shorter way.
+bool TurnsFar(const Subject& subject, const KeyedChannel& channel) {
+  if (!channel.channel.starts_with("rotate")) return false;
+  const std::vector<motion::CurveKey> keys =
+      motion::ReadCurve(subject.scene, channel.curve, subject.measures).keys;
+  const double halfTurn = std::numbers::pi / subject.measures.radians;
+  for (std::size_t i = 1; i < keys.size(); ++i) {
+    if (std::fabs(keys[i].value - keys[i - 1].value) >= halfTurn) return true;
+  }
+  return false;
+}
+
+void ReportKeys(const Subject& subject, const NodeKeys& keys) {
+  const std::string_view name = subject.scene.node(keys.node).name;
+  const auto say = [&](Code code, const KeyedChannel& channel, double number) {
+    subject.diagnostics.Report(code, channel.place, {name, NumberText(number)});
+  };
+  const auto first = [&](const auto& holds) {
+    const auto found = std::find_if(keys.channels.begin(), keys.channels.end(), holds);
+    return found == keys.channels.end() ? nullptr : &*found;
+  };
+  if (const auto* const bad = first([&](const KeyedChannel& channel) {
+        return channel.keys > 1 && !channel.whole &&
+               (IsCurved(subject, channel) || TurnsFar(subject, channel));
+      })) {
+    subject.diagnostics.Report(Code::KeysAreNoBake, bad->place,
+                               {name, std::to_string(bad->keys), NumberText(bad->last - bad->first + 1.0)});
+  }
+  if (const auto* const bad = first([](const KeyedChannel& one) { return one.keys != 0 && one.first < 0.0; }))
+    say(Code::NegativeFrames, *bad, bad->first);
+  if (const auto* const bad = first([](const KeyedChannel& one) { return one.fractional; }))
+    say(Code::FractionalFrames, *bad, bad->fraction);
+  if (const auto* const bad =
+          first([](const KeyedChannel& one) { return one.keys != 0 && one.last - one.first > kLastFrame; }))
+    say(Code::BeyondCompositionTime, *bad, bad->last);
+}
+
+// Everything that is keyed above the shape, and its lens.
+std::vector<NodeKeys> ChainKeys(const Subject& subject, const Camera& camera) {
+  std::vector<NodeKeys> chain;
+  if (auto lens = KeysOf(subject.scene, camera.shape, kFocalLength, 1)) chain.push_back(std::move(*lens));
+  std::size_t length = 0;
+  for (NodeId id = camera.transform; id != scene::kNoNode && ++length <= kLongestChain;
+       id = subject.scene.node(id).parent) {
+    if (auto keys = KeysOf(subject.scene, id, PlaceChannels(), 2)) chain.push_back(std::move(*keys));
+  }
+  return chain;
+}
+
+void ReportStarts(const Subject& subject, const Camera& camera) {
+  const std::vector<NodeKeys> chain = ChainKeys(subject, camera);
+  if (chain.empty()) return;
+  const auto earliest = std::min_element(
+      chain.begin(), chain.end(), [](const NodeKeys& a, const NodeKeys& b) { return a.first < b.first; });
+  for (const NodeKeys& one : chain) {
+    if (one.first - earliest->first < 1e-3) continue;
+    subject.diagnostics.Report(Code::KeysStartApart, one.channels.front().place,
+                               {subject.scene.node(one.node).name, NumberText(one.first),
+                                subject.scene.node(earliest->node).name, NumberText(earliest->first)});
+  }
+}
+
+}  // namespace
+
+bool CountsFrames(const scene::Scene& scene) {
+  const std::string_view unit = scene.timeUnit().word;
+  if (!unit.empty() && unit.front() >= '0' && unit.front() <= '9') return true;
+  return std::any_of(kFrameUnits.begin(), kFrameUnits.end(),
+                     [unit](std::string_view one) { return SameName(one, unit); });
+}
+
+std::optional<double> FirstKey(const Subject& subject, const Camera& camera) {
+  std::optional<double> first;
+  for (const NodeKeys& keys : ChainKeys(subject, camera))
+    first = std::min(first.value_or(keys.first), keys.first);
+  return first;
+}
+
+std::optional<double> LastKey(const Subject& subject, const Camera& camera) {
+  std::optional<double> last;
+  for (const NodeKeys& keys : ChainKeys(subject, camera)) {
+    for (const KeyedChannel& channel : keys.channels) {
+      if (channel.keys != 0) last = std::max(last.value_or(channel.last), channel.last);
+    }
+  }
+  return last;
+}
+
+void ReportTimes(const Subject& subject) {
+  for (const Link& link : subject.links) {
+    if (const auto keys = KeysOf(subject.scene, link.node, PlaceChannels(), 2)) ReportKeys(subject, *keys);
+  }
+  for (const Camera& camera : subject.cameras) {
+    if (!camera.taken) continue;
+    if (const auto keys = KeysOf(subject.scene, camera.shape, kFocalLength, 1)) ReportKeys(subject, *keys);
+    if (CountsFrames(subject.scene)) ReportStarts(subject, camera);
+  }
+}
+
+}  // namespace check

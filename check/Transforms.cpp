@@ -1,0 +1,105 @@
+// What of a transform the importer does not take.
+#include <algorithm>
+#include <array>
+#include <optional>
+#include <string>
+#include <string_view>
+
+#include "check/RulesInternal.h"
+
+namespace check {
+namespace {
+
+using diag::Code;
+using scene::NodeId;
+
+constexpr std::array<std::string_view, 6> kOrders = {"xyz", "yzx", "zxy", "xzy", "yxz", "zyx"};
+constexpr std::array<std::string_view, 3> kRotate = {"rotateX", "rotateY", "rotateZ"};
+constexpr std::array<std::string_view, 3> kRotateAxis = {"rotateAxisX", "rotateAxisY", "rotateAxisZ"};
+constexpr std::array<std::string_view, 3> kShear = {"shearXY", "shearXZ", "shearYZ"};
+constexpr std::array<std::string_view, 6> kPivotTranslations = {
+    "rotatePivotTranslateX", "rotatePivotTranslateY", "rotatePivotTranslateZ",
+    "scalePivotTranslateX",  "scalePivotTranslateY",  "scalePivotTranslateZ"};
+constexpr std::array<std::string_view, 3> kScale = {"scaleX", "scaleY", "scaleZ"};
+
+class TransformRules {
+ public:
+  TransformRules(const Subject& subject, const Link& link) : subject_(subject), link_(link) {}
+
+  void Report() {
+    ReportOrder();
+    ReportFirst(Code::RotateAxisLost, kRotateAxis, 0.0);
+    ReportFirst(Code::ShearLost, kShear, 0.0);
+    ReportFirst(Code::PivotTranslationLost, kPivotTranslations, 0.0);
+    ReportInheritance();
+    ReportScale();
+  }
+
+ private:
+  const scene::Scene& scene() const { return subject_.scene; }
+  std::string_view name() const { return scene().node(link_.node).name; }
+
+  // Where the file gives the attribute another value, or has something drive it.
+  std::optional<diag::Range> Differs(std::string_view attribute, double neutral) const {
+    if (const auto driver = scene().SourceOf(scene().PlugOf(link_.node, attribute))) {
+      return driver->connection->destinationPlace;
+    }
+    const auto written = scene().Written(link_.node, attribute);
+    const auto number = written ? written->Number() : std::nullopt;
+    if (!number || *number == neutral) return std::nullopt;
+    return written->range();
+  }
+
+  template <std::size_t kCount>
+  std::optional<diag::Range> FirstOf(const std::array<std::string_view, kCount>& attributes,
+                                     double neutral) const {
+    for (const std::string_view attribute : attributes) {
+      if (const auto place = Differs(attribute, neutral)) return place;
+    }
+    return std::nullopt;
+  }
+
+  template <std::size_t kCount>
+  void ReportFirst(Code code, const std::array<std::string_view, kCount>& attributes, double neutral) {
+    if (const auto place = FirstOf(attributes, neutral)) subject_.diagnostics.Report(code, *place, {name()});
+  }
+
+  // An order matters where it turns about two axes in another sequence.
+  void ReportOrder() {
+    const auto written = scene().Written(link_.node, "rotateOrder");
+    const auto number = written ? written->Number() : std::nullopt;
+    if (!number || !(*number >= 1.0) || !(*number < static_cast<double>(kOrders.size()))) return;
+    const std::string_view order = kOrders[static_cast<std::size_t>(*number)];
+    std::string turns;  // the axes that it turns about, as they come in the order
+    for (const char axis : order) {
+      if (Differs(kRotate[static_cast<std::size_t>(axis - 'x')], 0.0)) turns += axis;
+    }
+    if (std::is_sorted(turns.begin(), turns.end())) return;
+    subject_.diagnostics.Report(Code::RotateOrderLost, written->range(), {name(), order});
+  }
+
+  void ReportInheritance() {
+    if (scene().node(link_.node).parent == scene::kNoNode) return;
+    if (const auto place = Differs("inheritsTransform", 1.0)) {
+      subject_.diagnostics.Report(Code::InheritanceOff, *place, {name()});
+    }
+  }
+
+  void ReportScale() {
+    if (link_.own || !link_.ofCamera) return;
+    if (const auto place = FirstOf(kScale, 1.0)) {
+      subject_.diagnostics.Report(Code::ChainScaled, *place, {name(), scene().node(link_.shape).name});
+    }
+  }
+
+  const Subject& subject_;
+  const Link& link_;
+};
+
+}  // namespace
+
+void ReportTransforms(const Subject& subject) {
+  for (const Link& link : subject.links) TransformRules(subject, link).Report();
+}
+
+}  // namespace check

@@ -1,0 +1,152 @@
+// MA0801 to MA0899: what does not come over.
+#include "diag/TableInternal.h"
+
+namespace diag {
+namespace {
+
+constexpr Entry kLossCodes[] = {
+    {.code = Code::OrthographicCamera,
+     .severity = Severity::Note,
+     .symbol = "OrthographicCamera",
+     .sentence = "the orthographic camera \"{0}\" does not come over",
+     .meaning = "A camera of a composition has a perspective. The importer leaves orthographic cameras out.",
+     .example = "createNode camera -n \"planShape\" -p \"plan\";\n  setAttr \".o\" yes;",
+     .help = "Nothing, unless the shot is seen through it: then give the camera a very long lens and move it "
+             "far away."},
+    {.code = Code::StartupCameras,
+     .severity = Severity::Note,
+     .symbol = "StartupCameras",
+     .sentence = "{0} of the cameras that every scene begins with do not come over",
+     .meaning =
+         "persp, top, front and side are the cameras of the viewports. The importer knows the first by its "
+         "name, and the others because they are orthographic.",
+     .example = "createNode camera -s -n \"perspShape\" -p \"persp\";",
+     .help = "Nothing, unless one of them is the camera of the shot: then duplicate it in Maya under another "
+             "name."},
+    {.code = Code::CameraNotImported,
+     .severity = Severity::Warning,
+     .symbol = "CameraNotImported",
+     .sentence = "the camera \"{0}\" does not come over",
+     .meaning = "The scene creates the camera, and the import made no layer of it.",
+     .example = "createNode camera -n \"perspShape\" -p \"shotCam\";",
+     .help = "Write the scene anew: mayascene bake SCENE -o OUT. A camera that is called perspShape needs "
+             "another name."},
+    {.code = Code::ParentIsPath,
+     .severity = Severity::Warning,
+     .symbol = "ParentIsPath",
+     .sentence = "\"{0}\" loses its place: its parent is given as the path \"{1}\"",
+     .meaning =
+         "The importer looks for a node's parent by its name. It finds none under a path, so what stands "
+         "there, and above it, has no effect.",
+     .example = "createNode camera -n \"shotCamShape\" -p \"|rig|shotCam\";",
+     .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
+    {.code = Code::ParentNotImported,
+     .severity = Severity::Warning,
+     .symbol = "ParentNotImported",
+     .sentence = "\"{0}\" loses its place: the import does not have its parent \"{1}\"{2}",
+     .meaning =
+         "A node above the camera is in a referenced file, or nowhere. Its place is not known, so the camera "
+         "comes over as if it stood at the origin.",
+     .example = "file -r -ns \"rig\" -rfn \"rigRN\" \"rig.ma\";\ncreateNode transform -n \"shotCam\" -p "
+                "\"rig:root\";",
+     .help = "Import the reference into the scene before the export, or export the camera with all that "
+             "stands above "
+             "it."},
+    {.code = Code::ChannelsOfOneKey,
+     .severity = Severity::Warning,
+     .symbol = "ChannelsOfOneKey",
+     .sentence = "\"{0}\" does not get the values of its keys: {1} have one key each",
+     .meaning = "The importer takes a node for animated when one of its curves has two keys. This node has "
+                "curves of "
+                "one key alone. It comes over with the values that the scene stores beside them, which are "
+                "others; often it lands at the origin.",
+     .example = "setAttr \".ktv[0]\" 1 12.5;\nconnectAttr \"shotCam_translateX.o\" \"shotCam.tx\";",
+     .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
+    {.code = Code::DrivenByNoCurve,
+     .severity = Severity::Warning,
+     .symbol = "DrivenByNoCurve",
+     .sentence = "\"{0}\" stands still in {1}: \"{2}\" ({3}) drives it, which is no curve",
+     .meaning = "A constraint, an expression or another node computes the channels. The importer follows "
+                "animation curves alone, and takes the values that the scene stores.",
+     .example = "connectAttr \"shotCam_pointConstraint1.ctx\" \"shotCam.tx\";",
+     .help =
+         "Write the scene anew, with a key at every frame: mayascene bake SCENE -o OUT, or mayascene import "
+         "--bake. What a bake cannot compute, bake in Maya (Edit, Keys, Bake Simulation)."},
+    {.code = Code::CurveThroughNode,
+     .severity = Severity::Warning,
+     .symbol = "CurveThroughNode",
+     .sentence = "\"{0}\" stands still in {1}: its curves go through \"{2}\" ({3})",
+     .meaning = "Between the curve and the channel stands another node: a blend, a conversion of units, an "
+                "animation layer. The importer follows curves that drive a channel directly.",
+     .example =
+         "connectAttr \"curve1.o\" \"pairBlend1.itx2\";\nconnectAttr \"pairBlend1.otx\" \"shotCam.tx\";",
+     .help =
+         "Write the scene anew, with a key at every frame: mayascene bake SCENE -o OUT, or mayascene import "
+         "--bake."},
+    {.code = Code::ConnectionToPath,
+     .severity = Severity::Warning,
+     .symbol = "ConnectionToPath",
+     .sentence = "the curve of \"{0}\" is lost: the connection names the node by a path",
+     .meaning = "The importer looks for the node of a connection by its name. It finds none under a path.",
+     .example = "connectAttr \"shotCam_translateX.o\" \"|rig|shotCam.tx\";",
+     .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake. Or give the "
+             "node a name "
+             "that no other node has, and export again."},
+    {.code = Code::FocalLengthElsewhere,
+     .severity = Severity::Warning,
+     .symbol = "FocalLengthElsewhere",
+     .sentence = "the focal length of \"{0}\" stands still: \"{1}\" ({2}) drives it",
+     .meaning =
+         "The focal length comes from another node, as a control of a rig. The importer follows a curve that "
+         "drives the focal length directly, and takes the value that the scene stores otherwise.",
+     .example = "connectAttr \"control.zoom\" \"shotCamShape.fl\";",
+     .help =
+         "Write the scene anew, with a key at every frame: mayascene bake SCENE -o OUT, or mayascene import "
+         "--bake."},
+    {.code = Code::LookAtShortNames,
+     .severity = Severity::Warning,
+     .symbol = "LookAtShortNames",
+     .sentence = "the look-at \"{0}\" is not recognised: the scene has the short names of attributes",
+     .meaning = "The importer knows the target of a look-at by the word \"target\" in the connection. A "
+                "scene that is "
+                "saved with short names says \"tg[0].tt\". The camera \"{1}\" is not aimed.",
+     .example = "connectAttr \"aim_point.t\" \"shotCam_aim.tg[0].tt\";",
+     .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake. The camera then "
+             "turns by "
+             "keys. Or save the scene with full attribute names."},
+    {.code = Code::LookAtWeightLast,
+     .severity = Severity::Warning,
+     .symbol = "LookAtWeightLast",
+     .sentence = "the camera \"{1}\" is aimed at its own look-at \"{0}\", not at the target",
+     .meaning =
+         "The last connection with the word \"target\" counts. Here it is the one of the weight, which comes "
+         "from the look-at itself.",
+     .example = "connectAttr \"aim_point.translate\" \"aim.target[0].targetTranslate\";\n"
+                "connectAttr \"aim.aim_pointW0\" \"aim.target[0].targetWeight\";",
+     .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
+    {.code = Code::LookAtNotTaken,
+     .severity = Severity::Warning,
+     .symbol = "LookAtNotTaken",
+     .sentence = "the look-at \"{0}\" is not recognised: the camera \"{1}\" is not aimed",
+     .meaning = "The importer needs three connections of a look-at: the place of what is turned, the target, "
+                "and the "
+                "rotation, each between two nodes that it knows. One is missing, or goes by a path.",
+     .example = "createNode lookAt -n \"shotCam_group\";\nconnectAttr \"shotCam_group.cr\" \"shotCam.r\";",
+     .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake. The camera then "
+             "turns by "
+             "keys."},
+    {.code = Code::AttributesWithoutPlace,
+     .severity = Severity::Note,
+     .symbol = "AttributesWithoutPlace",
+     .sentence = "a composition has no place for {1} of \"{0}\"",
+     .meaning = "The camera has settings that the importer does not take: depth of field, an image plane, "
+                "visibility.",
+     .example = "setAttr \".dof\" yes;",
+     .help = "Set the same in the composition, where it is wanted."},
+};
+
+}  // namespace
+
+std::span<const Entry> LossCodes() { return kLossCodes; }
+
+}  // namespace diag

@@ -1,0 +1,177 @@
+// MA0901 to MA0999: where the picture of an import differs from the scene's.
+#include "diag/TableInternal.h"
+
+namespace diag {
+namespace {
+
+constexpr Entry kPictureCodes[] = {
+    {.code = Code::PictureShifts,
+     .severity = Severity::Warning,
+     .symbol = "PictureShifts",
+     .sentence = "the picture of \"{0}\" shifts by {1}, most at frame {2}",
+     .meaning =
+         "Nine points of the picture, in three rows of three at the distance of the centre of interest (100 "
+         "units where "
+         "the scene has none), are followed over the frames of the scene. The shift is the largest way, "
+         "in pixels of the scene's resolution, between where the scene shows a point and where the "
+         "import does. Time 0 of the composition is the first key of the camera and of what stands "
+         "above it; between keys the import counts as straight. The other diagnostics of the camera name "
+         "the reasons.",
+     .example = "setAttr -s 2 \".ktv[0:1]\" 1 0 48 100;",
+     .help =
+         "Write the scene anew, with a key at every frame: mayascene bake SCENE -o OUT, or mayascene import "
+         "--bake."},
+    {.code = Code::KeysAreNoBake,
+     .severity = Severity::Warning,
+     .symbol = "KeysAreNoBake",
+     .sentence = "\"{0}\" loses its path between keys: {1} keys over {2} frames",
+     .meaning = "The importer takes the keys and none of their tangents. Between keys the composition has a "
+                "way of its "
+                "own.",
+     .example = "setAttr -s 2 \".ktv[0:1]\" 1 0 48 100;",
+     .help =
+         "Write the scene anew, with a key at every frame: mayascene bake SCENE -o OUT, or mayascene import "
+         "--bake."},
+    {.code = Code::RotateOrderLost,
+     .severity = Severity::Warning,
+     .symbol = "RotateOrderLost",
+     .sentence = "\"{0}\" is turned in another order: the import takes xyz, the scene has {1}",
+     .meaning = "The three angles of a rotation mean another direction in another order.",
+     .example = "setAttr \".ro\" 2;",
+     .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
+    {.code = Code::RotateAxisLost,
+     .severity = Severity::Warning,
+     .symbol = "RotateAxisLost",
+     .sentence = "the rotate axis of \"{0}\" is lost",
+     .meaning = "The node is turned once more, before its own rotation. The importer does not take that.",
+     .example = "setAttr \".ra\" -type \"double3\" 0 90 0 ;",
+     .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
+    {.code = Code::ShearLost,
+     .severity = Severity::Warning,
+     .symbol = "ShearLost",
+     .sentence = "the shear of \"{0}\" is lost",
+     .meaning = "The axes of the node are not square to each other. A layer has square axes.",
+     .example = "setAttr \".sh\" -type \"double3\" 0.5 0 0 ;",
+     .help = "Take the shear out of what stands above the camera."},
+    {.code = Code::PivotTranslationLost,
+     .severity = Severity::Warning,
+     .symbol = "PivotTranslationLost",
+     .sentence = "the pivot translations of \"{0}\" are lost",
+     .meaning = "Where a pivot was moved and the node was to stay in its place, the difference is kept in a "
+                "value of "
+                "its own. The importer takes the pivots alone.",
+     .example = "setAttr \".rpt\" -type \"double3\" 0 2 0 ;",
+     .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
+    {.code = Code::InheritanceOff,
+     .severity = Severity::Warning,
+     .symbol = "InheritanceOff",
+     .sentence = "\"{0}\" takes nothing over from above in the scene, and does in the import",
+     .meaning =
+         "The node does not inherit the transforms above it. The importer makes its layer a child of theirs.",
+     .example = "setAttr \".it\" no;",
+     .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
+    {.code = Code::FitDiffers,
+     .severity = Severity::Warning,
+     .symbol = "FitDiffers",
+     .sentence = "\"{0}\" shows another part of its film: the fit is {1}, the import takes horizontal",
+     .meaning =
+         "With fill and overscan the shapes of the film and of the picture decide which side fits. Here it "
+         "is the vertical one.",
+     .example = "setAttr \".ff\" 0;",
+     .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
+    {.code = Code::LensSqueezeLost,
+     .severity = Severity::Warning,
+     .symbol = "LensSqueezeLost",
+     .sentence = "the lens squeeze {1} of \"{0}\" is lost",
+     .meaning =
+         "The camera has an anamorphic lens, which takes in a wider picture. The importer does not read it.",
+     .example = "setAttr \".lsr\" 2;",
+     .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
+    {.code = Code::CameraScaleLost,
+     .severity = Severity::Warning,
+     .symbol = "CameraScaleLost",
+     .sentence = "the camera scale {1} of \"{0}\" is lost",
+     .meaning = "The camera scale makes the lens longer or shorter. The importer does not read it.",
+     .example = "setAttr \".cs\" 2;",
+     .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
+    {.code = Code::ChainScaled,
+     .severity = Severity::Warning,
+     .symbol = "ChainScaled",
+     .sentence = "\"{0}\" scales the camera \"{1}\" below it",
+     .meaning =
+         "A scale above a camera moves it. An uneven one also bends its axes, which no layer can show.",
+     .example = "setAttr \".s\" -type \"double3\" 2 2 2 ;",
+     .help =
+         "Take the scale out of the rig, or write the camera against the world: mayascene bake SCENE -o OUT "
+         "--world."},
+    {.code = Code::PictureSizeAssumed,
+     .severity = Severity::Warning,
+     .symbol = "PictureSizeAssumed",
+     .sentence = "the {0} of the composition is {1}, where the scene means {2}",
+     .meaning = "The file leaves a value of the render settings out, or derives it. The importer has "
+                "defaults of its "
+                "own: 720 by 486 pixels, pixel aspect 0.9091.",
+     .example = "select -ne :defaultResolution;\n  setAttr \".w\" 1920;\n  setAttr \".h\" 1080;",
+     .help = "Write the scene anew: mayascene bake SCENE -o OUT. Or set the composition by hand."},
+    {.code = Code::KeysStartApart,
+     .severity = Severity::Warning,
+     .symbol = "KeysStartApart",
+     .sentence = "\"{0}\" begins at frame {1}, \"{2}\" at frame {3}: the import lets both begin at once",
+     .meaning = "The importer puts the first key of each node at time 0 of the composition. Nodes that are "
+                "keyed from "
+                "different frames move against each other.",
+     .example = "setAttr -s 2 \".ktv[0:1]\" 1 0 24 10;\nsetAttr -s 2 \".ktv[0:1]\" 12 0 24 10;",
+     .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
+    {.code = Code::OtherLengthUnit,
+     .severity = Severity::Warning,
+     .symbol = "OtherLengthUnit",
+     .sentence = "the scene measures in {0}: a unit of length becomes a point of the composition",
+     .meaning =
+         "The importer takes distances as they stand in the file. Scenes in other units come over in another "
+         "size than one in centimetres.",
+     .example = "currentUnit -l meter -a degree -t film;",
+     .help = "Nothing, unless cameras from several scenes have to fit together: then set the same unit in "
+             "all of them, "
+             "or import with --linear-units 1."},
+    {.code = Code::BeyondCompositionTime,
+     .severity = Severity::Warning,
+     .symbol = "BeyondCompositionTime",
+     .sentence = "\"{0}\" has a key at {1}, later than a composition's time can be",
+     .meaning =
+         "A time of the composition is a whole number of thousandths of a frame, and has 31 bits. Later keys "
+         "land at the largest time.",
+     .example = "setAttr -s 2 \".ktv[0:1]\" 1 0 3000000 10;",
+     .help = "Take out the keys that are far away from the shot."},
+    {.code = Code::NegativeFrames,
+     .severity = Severity::Note,
+     .symbol = "NegativeFrames",
+     .sentence = "\"{0}\" has keys before frame 0, from frame {1} on",
+     .meaning =
+         "The first key lands at time 0 of the composition, so that all frames come over; their numbers are "
+         "others.",
+     .example = "setAttr -s 2 \".ktv[0:1]\" -10 0 24 10;",
+     .help = "Shift the layers in the composition to where the footage needs them."},
+    {.code = Code::FractionalFrames,
+     .severity = Severity::Note,
+     .symbol = "FractionalFrames",
+     .sentence = "\"{0}\" has keys between frames, the first at {1}",
+     .meaning = "Keys lie at fractions of a frame. They come over to a thousandth of a frame; a composition "
+                "shows whole "
+                "frames.",
+     .example = "setAttr -s 2 \".ktv[0:1]\" 1.5 0 24.5 10;",
+     .help = "Nothing has to be done where the motion is smooth."},
+    {.code = Code::RateDiffers,
+     .severity = Severity::Warning,
+     .symbol = "RateDiffers",
+     .sentence = "the composition has {1} frames a second, the scene {0}",
+     .meaning =
+         "The scene does not say a frame rate, or says a unit of time that the importer takes otherwise.",
+     .example = "currentUnit -l centimeter -a degree -t sec;",
+     .help = "Write the scene anew: mayascene bake SCENE -o OUT. Or set the frame rate in the scene."},
+};
+
+}  // namespace
+
+std::span<const Entry> PictureCodes() { return kPictureCodes; }
+
+}  // namespace diag

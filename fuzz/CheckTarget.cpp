@@ -1,0 +1,98 @@
+// The check of a scene over arbitrary bytes, imported first: that the report agrees with the import, that it
+// is bounded, and that nothing of the scene reaches a terminal or a document unescaped.
+#include <cstdint>
+#include <map>
+#include <nlohmann/json.hpp>
+#include <sstream>
+#include <string>
+#include <string_view>
+
+#include "check/Check.h"
+#include "fuzz/Bytes.h"
+#include "fuzz/GuardedMemory.h"
+#include "fuzz/MemoryFile.h"
+#include "fuzz/Require.h"
+#include "fuzz/Target.h"
+#include "refhost/Host.h"
+#include "refhost/ModuleLoader.h"
+#include "tests/check/Contradictions.h"
+#include "tools/mayascene/CheckJson.h"
+#include "tools/mayascene/CheckText.h"
+#include "tools/mayascene/ImportedLayers.h"
+
+namespace {
+
+using fuzz::Require;
+
+// An excerpt, two arguments of 200 bytes and a help, each escaped.
+constexpr std::size_t kLongestFinding = 8000;
+
+// The head grows with the cameras and their chains, which are bounded by the text.
+constexpr std::size_t kShortestReport = 20'000;
+
+HostPluginEntry LoadModule() {
+  // Never unloaded: what it counts for the fuzzer is looked at until the end.
+  static auto* const loader = new refhost::ModuleLoader;
+  std::string failure;
+  const HostPluginEntry entry = loader->load(MAYASCENE_MODULE, &failure);
+  Require(entry != nullptr, failure.c_str());
+  return entry;
+}
+
+check::CameOver Import(const std::filesystem::path& path) {
+  static const HostPluginEntry entry = LoadModule();
+  refhost::HostOptions options;
+  options.linearUnits = 0;
+  options.mostLayers = 10'000;
+  refhost::Host host(std::move(options));
+  refhost::CallbackResult loaded;
+  Require(host.load(entry, &loaded) && loaded.code == 0, "the module can be loaded");
+  const refhost::CallbackResult result = host.importScene(path);
+  return mayascene::whatCameOver(mayascene::lookAtScene(path), result, false);
+}
+
+void CheckBounds(const check::Report& report) {
+  std::map<diag::Code, std::size_t> counts;
+  for (const check::Finding& finding : report.findings) {
+    Require(++counts[finding.diagnostic.code] <= diag::Collector::kFullPerCode,
+            "at most 20 of one code in full");
+    Require(finding.excerpt.size() < kLongestFinding, "an excerpt is short");
+  }
+  for (const auto& [code, times] : report.notInFull) {
+    Require(times != 0 && counts[code] == diag::Collector::kFullPerCode, "the rest of a code is counted");
+  }
+}
+
+void CheckOutputs(const mayascene::CheckedScene& scene, std::size_t size) {
+  std::ostringstream text;
+  mayascene::printCheck(text, scene, false, mayascene::Style(false));
+  for (const char c : text.str()) {
+    const auto byte = static_cast<unsigned char>(c);
+    Require(byte == '\n' || (byte >= 0x20 && byte != 0x7f), "no control reaches a terminal");
+  }
+  Require(text.str().size() < kShortestReport + scene.report.findings.size() * kLongestFinding + 200 * size,
+          "a report does not grow faster than its scene");
+  std::ostringstream document;
+  mayascene::CheckJson json(document);
+  json.add(scene);
+  json.end();
+  Require(nlohmann::json::accept(document.str()), "the document is JSON");
+}
+
+}  // namespace
+
+int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
+  static fuzz::MemoryFile file;
+  static fuzz::GuardedMemory memory;
+  const std::string_view text(memory.Hold(fuzz::TextOf(data, size), 0), size);
+  file.Write(text);
+  const check::CameOver cameOver = Import(file.path());
+  mayascene::CheckedScene scene;
+  scene.path = "fuzz";
+  scene.report = check::Check(text, cameOver);
+  const std::string wrong = check_test::ContradictionIn(text, cameOver, scene.report, false);
+  Require(wrong.empty(), wrong.c_str());
+  CheckBounds(scene.report);
+  CheckOutputs(scene, size);
+  return 0;
+}

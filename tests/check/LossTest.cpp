@@ -1,0 +1,156 @@
+// What does not come over, and why.
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include "tests/check/CheckedText.h"
+
+namespace check_test {
+namespace {
+
+using diag::Code;
+using testing::HasSubstr;
+
+TEST(LossTest, CamerasThatAreLeftOut) {
+  const Checked checked(
+      CameraScene("") +
+      "createNode transform -s -n \"persp\";\ncreateNode camera -s -n \"perspShape\" -p \"persp\";\n"
+      "createNode transform -s -n \"top\";\ncreateNode camera -s -n \"topShape\" -p \"top\";\n"
+      "\tsetAttr \".o\" yes;\n"
+      "createNode transform -n \"plan\";\ncreateNode camera -n \"planShape\" -p \"plan\";\n"
+      "\tsetAttr \".o\" yes;\n"
+      "createNode transform -n \"other\";\ncreateNode camera -n \"PerspShape\" -p \"other\";\n");
+  EXPECT_THAT(checked.SentenceOf(Code::StartupCameras), HasSubstr("2 of the cameras"));
+  EXPECT_EQ(checked.MarkedBy(Code::OrthographicCamera), "planShape");
+  EXPECT_EQ(checked.MarkedBy(Code::CameraNotImported), "PerspShape");
+}
+
+TEST(LossTest, LocatorsWithoutAMarkAreCounted) {
+  const Checked checked(CameraScene("") +
+                        "createNode transform -n \"a\";\ncreateNode locator -n \"aShape\" -p \"a\";\n"
+                        "createNode locator -n \"nullShape\" -p \"a\";\n"
+                        "createNode locator -n \"bShape\" -p \"a\";\n");
+  EXPECT_THAT(checked.SentenceOf(Code::LocatorsLeftOut), HasSubstr("2 locators"));
+}
+
+TEST(LossTest, AParentThatIsGivenAsAPath) {
+  const Checked checked(kHead +
+                        "createNode transform -n \"rig\";\ncreateNode transform -n \"shotCam\" -p \"rig\";\n"
+                        "createNode camera -n \"shotCamShape\" -p \"|rig|shotCam\";\n" +
+                        kResolution);
+  EXPECT_EQ(checked.MarkedBy(Code::ParentIsPath), "|rig|shotCam");
+}
+
+TEST(LossTest, AParentInAReferenceIsSaidWithItsFile) {
+  const Checked checked(kHead +
+                        "file -r -ns \"rig\" -rfn \"rigRN\" \"set/rig.ma\";\n"
+                        "createNode transform -n \"shotCam\" -p \"rig:root\";\n"
+                        "createNode camera -n \"shotCamShape\" -p \"shotCam\";\n" +
+                        kResolution);
+  EXPECT_THAT(checked.SentenceOf(Code::ParentNotImported),
+              HasSubstr("\"rig:root\", which stands in \"set/rig.ma\""));
+}
+
+TEST(LossTest, AParentOfATypeThatTheImporterDoesNotKnow) {
+  const Checked checked(kHead +
+                        "createNode joint -n \"arm\";\ncreateNode transform -n \"shotCam\" -p \"arm\";\n"
+                        "createNode camera -n \"shotCamShape\" -p \"shotCam\";\n" +
+                        kResolution);
+  EXPECT_THAT(checked.SentenceOf(Code::ParentNotImported), HasSubstr("of the type joint"));
+}
+
+TEST(LossTest, ChannelsOfOneKeyEach) {
+  const Checked checked(CameraScene("", "",
+                                    CurveOf("moveX", "1 12.5", "shotCam.tx") +
+                                        CurveOf("moveY", "1 0", "shotCam.ty") +
+                                        CurveOf("turnZ", "1 30", "shotCam.rz", "animCurveTA")));
+  EXPECT_THAT(checked.SentenceOf(Code::ChannelsOfOneKey), HasSubstr("translateX, rotateZ have one key each"));
+}
+
+TEST(LossTest, AKeyThatIsTheStoredValueLosesNothing) {
+  const Checked checked(
+      CameraScene("\tsetAttr \".tx\" 12.5;\n\tsetAttr \".t\" -type \"double3\" 12.5 0 0 ;\n", "",
+                  CurveOf("moveX", "1 12.5", "shotCam.tx")));
+  EXPECT_EQ(checked.CountOf(Code::ChannelsOfOneKey), 0u);
+}
+
+TEST(LossTest, ChannelsThatAConstraintDrivesAreNamedTogether) {
+  const Checked checked(CameraScene("", "",
+                                    "createNode pointConstraint -n \"hold\" -p \"shotCam\";\n"
+                                    "connectAttr \"hold.ctx\" \"shotCam.tx\";\n"
+                                    "connectAttr \"hold.cty\" \"shotCam.ty\";\n"));
+  EXPECT_EQ(
+      checked.SentenceOf(Code::DrivenByNoCurve),
+      "\"shotCam\" stands still in translateX, translateY: \"hold\" (pointConstraint) drives it, which is no "
+      "curve");
+}
+
+TEST(LossTest, ACurveThatGoesThroughAnotherNode) {
+  const Checked checked(CameraScene("", "",
+                                    "createNode pairBlend -n \"blend\";\n" +
+                                        CurveOf("moveX", "1 0 24 5", "blend.itx2") +
+                                        "connectAttr \"blend.otx\" \"shotCam.tx\";\n"));
+  EXPECT_THAT(checked.SentenceOf(Code::CurveThroughNode), HasSubstr("\"blend\" (pairBlend)"));
+  EXPECT_EQ(checked.MarkedBy(Code::CurveThroughNode), "shotCam.tx");
+}
+
+TEST(LossTest, ACurveThatIsConnectedToAPath) {
+  const Checked checked(CameraScene("", "", CurveOf("moveX", "1 0 2 5", "|shotCam.tx")));
+  EXPECT_EQ(checked.MarkedBy(Code::ConnectionToPath), "|shotCam.tx");
+}
+
+TEST(LossTest, AFocalLengthFromAnotherNode) {
+  const Checked checked(
+      CameraScene("", "",
+                  "createNode transform -n \"control\";\n\taddAttr -ln \"zoom\" -at double;\n"
+                  "connectAttr \"control.zoom\" \"shotCamShape.fl\";\n"));
+  EXPECT_THAT(checked.SentenceOf(Code::FocalLengthElsewhere), HasSubstr("\"control\" (transform)"));
+}
+
+std::string LookAt(std::string_view connections) {
+  return "createNode transform -n \"point\";\n\tsetAttr \".t\" -type \"double3\" 5 0 0 ;\n"
+         "createNode aimConstraint -n \"aim\" -p \"shotCam\";\n"
+         "connectAttr \"aim.constraintRotate\" \"shotCam.rotate\";\n"
+         "connectAttr \"shotCam.translate\" \"aim.constraintTranslate\";\n" +
+         std::string(connections);
+}
+
+TEST(LossTest, ALookAtInShortNames) {
+  const Checked checked(CameraScene("", "", LookAt("connectAttr \"point.t\" \"aim.tg[0].tt\";\n")));
+  EXPECT_EQ(checked.MarkedBy(Code::LookAtShortNames), "aim");
+}
+
+TEST(LossTest, ALookAtWhoseWeightComesLast) {
+  const Checked checked(
+      CameraScene("", "",
+                  LookAt("connectAttr \"point.translate\" \"aim.target[0].targetTranslate\";\n"
+                         "connectAttr \"aim.pointW0\" \"aim.target[0].targetWeight\";\n")));
+  ASSERT_TRUE(checked.cameOver().layers[0].aimed);
+  EXPECT_EQ(checked.MarkedBy(Code::LookAtWeightLast), "aim.target[0].targetWeight");
+}
+
+TEST(LossTest, ALookAtThatComesOverIsNotComplainedOf) {
+  const Checked checked(
+      CameraScene("", "", LookAt("connectAttr \"point.translate\" \"aim.target[0].targetTranslate\";\n")));
+  ASSERT_TRUE(checked.cameOver().layers[0].aimed);
+  EXPECT_EQ(checked.CountOf(Code::LookAtWeightLast) + checked.CountOf(Code::LookAtShortNames) +
+                checked.CountOf(Code::LookAtNotTaken) + checked.CountOf(Code::DrivenByNoCurve),
+            0u);
+}
+
+TEST(LossTest, ALookAtWithoutAPlace) {
+  const Checked checked(
+      CameraScene("", "",
+                  "createNode transform -n \"point\";\ncreateNode aimConstraint -n \"aim\";\n"
+                  "connectAttr \"aim.constraintRotate\" \"shotCam.rotate\";\n"
+                  "connectAttr \"point.translate\" \"aim.target[0].targetTranslate\";\n"));
+  EXPECT_EQ(checked.MarkedBy(Code::LookAtNotTaken), "aim");
+}
+
+TEST(LossTest, SettingsThatACompositionHasNoPlaceFor) {
+  const Checked checked(CameraScene("", "\tsetAttr \".dof\" yes;\n"));
+  EXPECT_THAT(checked.SentenceOf(Code::AttributesWithoutPlace),
+              HasSubstr("the depth of field of \"shotCamShape\""));
+}
+
+}  // namespace
+}  // namespace check_test

@@ -1,0 +1,136 @@
+#!/usr/bin/env python3
+"""Runs checks and validates what they write against the JSON Schema; then checks that the schema refuses documents that
+are broken in one place each."""
+
+import argparse
+import copy
+import json
+import os
+import pathlib
+import subprocess
+import sys
+import tempfile
+
+import jsonschema
+
+HEADER = "//Maya ASCII 2018 scene\n"
+UNITS = HEADER + "currentUnit -l centimeter -a degree -t film;\n"
+CAMERA = UNITS + """fileInfo "product" "Maya 2018";
+createNode transform -n "rig\x1b";
+createNode transform -n "shotCam" -p "rig\x1b";
+createNode camera -n "shotCamShape" -p "shotCam";
+\tsetAttr ".fl" 50;
+createNode animCurveTL -n "moveX";
+\tsetAttr ".ktv[0:1]" 1 0 24 9;
+connectAttr "moveX.o" "shotCam.tx";
+createNode animCurveTU -n "zoom";
+\tsetAttr ".ktv[0]" 1 35;
+connectAttr "zoom.o" "shotCamShape.fl";
+createNode script -n "sceneConfigurationScriptNode";
+\tsetAttr ".b" -type "string" "playbackOptions -min 1 -max 24 -ast 1 -aet 48 ";
+"""
+
+BROKEN = {
+    "another format": lambda d: d.update(format="mayascene"),
+    "another version": lambda d: d.update(version=2),
+    "no scenes": lambda d: d.pop("scenes"),
+    "a scene without a status": lambda d: scene(d).pop("status"),
+    "a status of 6": lambda d: scene(d).update(status=6),
+    "a scene that is a word": lambda d: d.update(scenes=["shot.ma"]),
+    "errors in words": lambda d: scene(d).update(errors="none"),
+    "an unknown field": lambda d: scene(d).update(more=1),
+    "a head without units": lambda d: scene(d)["head"].pop("linearUnit"),
+    "a width without a value": lambda d: scene(d)["head"]["width"].pop("value"),
+    "a width without a place": lambda d: scene(d)["head"]["width"].pop("where"),
+    "another range": lambda d: scene(d)["head"]["ranges"][0].update(what="selection"),
+    "a camera without a path": lambda d: camera(d).pop("path"),
+    "a layer without keys": lambda d: camera(d)["layer"].pop("keys"),
+    "a driver without a type": lambda d: camera(d)["drivenBy"][0].pop("type"),
+    "a link without a name": lambda d: camera(d)["chain"][0].pop("name"),
+    "line 0": lambda d: camera(d)["where"].update(line=0),
+    "another severity": lambda d: diagnostic(d).update(severity="fatal"),
+    "another code": lambda d: diagnostic(d).update(code="E12"),
+    "a diagnostic without a range": lambda d: diagnostic(d).pop("range"),
+    "a range without an end": lambda d: diagnostic(d)["range"].pop("end"),
+    "an argument that is a number": lambda d: diagnostic(d).update(arguments=[1]),
+    "a count of 0 of a code": lambda d: scene(d)["notInFull"].update(MA0209=0),
+    "a count of no code": lambda d: scene(d)["notInFull"].update(units=3),
+}
+
+
+def scene(document):
+    return document["scenes"][0]
+
+
+def camera(document):
+    return scene(document)["head"]["cameras"][0]
+
+
+def diagnostic(document):
+    return next(one for one in scene(document)["diagnostics"] if one["range"] is not None)
+
+
+def main():
+    parser = argparse.ArgumentParser()
+    parser.add_argument("--tool", required=True)
+    parser.add_argument("--schema", required=True)
+    parser.add_argument("--scenes", nargs="+", required=True)
+    arguments = parser.parse_args()
+
+    with open(arguments.schema, encoding="utf-8") as file:
+        schema = json.load(file)
+    jsonschema.Draft7Validator.check_schema(schema)
+    validator = jsonschema.Draft7Validator(schema)
+    failures = []
+
+    with tempfile.TemporaryDirectory() as folder:
+        environment = dict(os.environ, XDG_CONFIG_HOME=folder)
+
+        def document_of(*words):
+            run = subprocess.run(
+                [arguments.tool, "check", "--json", "-", *words],
+                stdout=subprocess.PIPE, stderr=subprocess.PIPE, cwd=folder, env=environment, check=False)
+            return json.loads(run.stdout)
+
+        def write(name, text):
+            pathlib.Path(folder, name).write_text(text, encoding="utf-8")
+
+        write("camera.ma", CAMERA)
+        write("many.ma", UNITS + "currentUnit -t parsec;\n" * 30)
+        write("notes.txt", "just some notes\n")
+        write("broken.ma", HEADER + "createNode transform -n \"open;\n")
+        write("infinite.ma", CAMERA + "createNode camera -n \"c\";\n\tsetAttr \".fl\" 0;\n")
+        scenes = sorted(str(path) for place in arguments.scenes for path in pathlib.Path(place).glob("*.ma"))
+        if len(scenes) < 8:
+            failures.append(f"no scenes in {arguments.scenes}")
+        good = document_of("camera.ma")
+        documents = {
+            "a camera": good,
+            "every kind of file": document_of("many.ma", "notes.txt", "broken.ma", "missing.ma", "infinite.ma"),
+            "own scenes": document_of("--all", *scenes),
+        }
+
+    for name, document in documents.items():
+        for error in validator.iter_errors(document):
+            failures.append(f"{name}: {error.message} at {list(error.absolute_path)}")
+    if not documents["every kind of file"]["scenes"][0]["notInFull"]:
+        failures.append("nothing was counted alone")
+    if documents["every kind of file"]["scenes"][3]["failure"] is None:
+        failures.append("no file could not be read")
+
+    for name, damage in BROKEN.items():
+        broken = copy.deepcopy(good)
+        damage(broken)
+        if broken == good:
+            failures.append(f"{name}: nothing was broken")
+        if validator.is_valid(broken):
+            failures.append(f"{name}: the schema takes a broken document")
+
+    for failure in failures:
+        print(failure)
+    print(f"{len(documents)} documents, {len(BROKEN)} broken ones, {len(failures)} failures")
+    return 1 if failures else 0
+
+
+if __name__ == "__main__":
+    sys.exit(main())
