@@ -20,7 +20,7 @@ typedef struct HostImporterType {
   uint32_t creator;
 } HostImporterType;
 
-/* A file name extension behind its dot, NUL-terminated where it is shorter than four bytes. */
+/* A file name extension after its dot, NUL-terminated where it is shorter than four bytes. */
 typedef struct HostImporterExtension {
   char text[4];
 } HostImporterExtension;

@@ -85,7 +85,7 @@ bool ReadWhole(int descriptor, char* buffer, int64_t count) {
   return true;
 }
 
-// Behind the last slash.
+// After the last slash.
 std::vector<HostUTF16Unit> LastComponent(const std::vector<HostUTF16Unit>& path) {
   const auto slash = std::find(path.rbegin(), path.rend(), kSlash);
   return {slash.base(), path.end()};

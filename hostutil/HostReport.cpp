@@ -17,7 +17,7 @@ void* currentContext = nullptr;
 HostError notedCode = HOST_ERR_NONE;
 int64_t notedLine = 0;
 
-// The memory may be exhausted: the message is built in place, and cut behind its last character that fits.
+// The memory may be exhausted: the message is built in place, and cut after its last character that fits.
 constexpr int64_t kMessageCapacity = 1024;
 
 consteval const char* SentenceOf(HostError code) {

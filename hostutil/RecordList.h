@@ -1,6 +1,6 @@
 /* The host's growable list of fixed-size records.
  *
- * Records are plain data, copied by value in and out, and lie one behind the other in memory: the address
+ * Records are plain data, copied by value in and out, and lie one after the other in memory: the address
  * of a locked record is also that of the run of records that follows it. The list grows by at least its
  * growth step and geometrically, so that n appends cost O(n).
  *
@@ -32,7 +32,7 @@ HOSTUTIL_API HostError RecordListCreate(int64_t recordSize, int64_t growth, int6
  * cannot grow (it is then unchanged), HOST_ERR_LIST_LOCKED while any record is locked. */
 HOSTUTIL_API HostError RecordListAppend(RecordList* list, const void* record);
 
-/* Appends copies of `count` records (0 or more) that lie one behind the other, and not in the list itself;
+/* Appends copies of `count` records (0 or more) that lie one after the other, and not in the list itself;
  * all or, after a failure, none. Fails as RecordListAppend does; a rehearsal takes the whole run for one call
  * of it. */
 HOSTUTIL_API HostError RecordListAppendRun(RecordList* list, const void* records, int64_t count);
@@ -44,7 +44,7 @@ HOSTUTIL_API void RecordListReserve(RecordList* list, int64_t count);
 /* Copies record `index` (from 0) out. HOST_ERR_LIST_INDEX when there is none. */
 HOSTUTIL_API HostError RecordListGet(const RecordList* list, int64_t index, void* record);
 
-/* Hands out the address of `count` records (1 or more) from `index` on, which lie one behind the other, for
+/* Hands out the address of `count` records (1 or more) from `index` on, which lie one after the other, for
  * reading. It is valid until the list grows or ends. HOST_ERR_LIST_INDEX when there are not so many. A
  * rehearsal takes the whole run for one call of RecordListGet. */
 HOSTUTIL_API HostError RecordListGetRun(const RecordList* list, int64_t index, int64_t count,

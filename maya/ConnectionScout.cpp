@@ -10,7 +10,7 @@ constexpr std::string_view kCommand = "connectAttr \"";
 constexpr std::string_view kBetween = "\" \"";
 constexpr std::size_t kLongestName = kNameCapacity - 1;
 
-// The node's name in the plug at the beginning of the text, which then begins behind the plug. Empty where
+// The node's name in the plug at the beginning of the text, which then begins after the plug. Empty where
 // there is no plug.
 std::string_view TakePlug(std::string_view* text) {
   const std::size_t dot = text->substr(0, kLongestName).find('.');

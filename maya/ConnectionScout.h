@@ -9,7 +9,7 @@
 
 class ConnectionScout {
  public:
-  // Called once for every "connectAttr", with the place behind the keyword. Reads nothing from `end` on.
+  // Called once for every "connectAttr", with the place after the keyword. Reads nothing from `end` on.
   void LookAhead(const char* position, const char* end, const NameIndex& curves, const NameIndex& transforms);
 
  private:

@@ -89,7 +89,7 @@ MayaToken MAYA_Lex::GetNextToken(const char** start, const char** last) {
   switch (*position) {
     case '\0':
       kind = EndOfFile;
-      end_ = position;  // nothing behind this NUL is ever read
+      end_ = position;  // nothing after this NUL is ever read
       break;
     case '"':
       kind = ParseQuote();
@@ -186,7 +186,7 @@ void MAYA_Lex::ParseLineComment() {
 }
 
 void MAYA_Lex::ParseBlockComment() {
-  // Deliberate: after a "*" the byte behind it is consumed too, so that in "/***/" the closing pair is missed
+  // Deliberate: after a "*" the byte after it is consumed too, so that in "/***/" the closing pair is missed
   // and the comment runs on. Looking for the plain pair would bring text to life that is commented out today.
   ++position;
   for (;;) {
@@ -246,7 +246,7 @@ void MAYA_Lex::FailAtEnd() {
 // editors see it, with a line feed, a carriage return or both.
 void MAYA_Lex::NoteLine(std::int32_t code, const char* at) const {
   const char* place = std::min(at, end_);
-  if (place == end_) {  // behind the last line that holds something
+  if (place == end_) {  // after the last line that holds something
     while (place != buffer && scan::IsWhiteSpace(place[-1])) --place;
   }
   std::int64_t number = 1;

@@ -101,7 +101,7 @@ void MAYA_Parse::ParseCameraSetAttr() {
   const char* last = nullptr;
   MayaToken kind = GetNextToken(&first, &last);
   if (kind == Option) {
-    // Deliberate: one option and the token behind it are passed over, whatever that token is.
+    // Deliberate: one option and the token after it are passed over, whatever that token is.
     GetNextToken(&first, &last);
     kind = GetNextToken(&first, &last);
   }

@@ -13,7 +13,7 @@
 namespace {
 
 // Deliberate: the attribute's name is looked for with its case, anywhere in the text. ".KTV[0]" is no key
-// attribute, "curve.ktv[3]" is one, and the index range behind it is not read.
+// attribute, "curve.ktv[3]" is one, and the index range after it is not read.
 bool NamesKeys(std::string_view text) {
   return text.find(".ktv") != std::string_view::npos || text.find(".keyTimeValue") != std::string_view::npos;
 }
@@ -49,8 +49,8 @@ void MAYA_Parse::WriteBackCurve() {
   });
 }
 
-// Reads to behind the key attribute; hands out the last number before it, the key count as a rule. Numbers
-// behind another attribute are passed over, so that the count is then unknown, and no room is made before it
+// Reads to after the key attribute; hands out the last number before it, the key count as a rule. Numbers
+// after another attribute are passed over, so that the count is then unknown, and no room is made before it
 // is needed. False when the command ends without one.
 bool MAYA_Parse::FindKeyAttribute(std::string_view* lastNumber) {
   bool otherAttribute = false;
@@ -64,7 +64,7 @@ bool MAYA_Parse::FindKeyAttribute(std::string_view* lastNumber) {
         otherAttribute = true;
         break;
       case Option:
-        // Deliberate: any other option eats the token behind it, a ";" too; the command then runs on.
+        // Deliberate: any other option eats the token after it, a ";" too; the command then runs on.
         if (!SameWord(WordText(first, last), "-s")) GetNextToken(&first, &last);
         break;
       case Number:

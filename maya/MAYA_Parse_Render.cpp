@@ -40,7 +40,7 @@ void MAYA_Parse::ParseSelect() {
   for (;;) {
     MayaToken kind = NextInCommand(&first, &last);
     if (kind == Option) continue;
-    // Deliberate: what stands behind a colon and is not the render node clears nothing, a ";" included.
+    // Deliberate: what stands after a colon and is not the render node clears nothing, a ";" included.
     const bool afterColon = kind == Colon;
     if (afterColon) kind = NextInCommand(&first, &last);
     if (kind == Identifier && SameWord(WordText(first, last), kRenderNode)) {

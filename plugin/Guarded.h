@@ -37,7 +37,7 @@ HostError GuardedAtBorder(Work&& work) {
   }
 }
 
-// Runs work that may fail without anybody being told: a standard exception ends it, and that is all.
+// Runs work whose failure nobody reports: a standard exception ends it, and that is all.
 template <typename Work>
 void Unreported(Work&& work) {
   try {

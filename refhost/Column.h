@@ -43,7 +43,7 @@ class Column {
     capacity_ = room_.size();
   }
 
-  std::vector<Value> room_;  // the values, and zeros or old values behind them
+  std::vector<Value> room_;  // the values, and zeros or old values after them
   std::size_t size_ = 0;
   std::size_t capacity_ = 0;  // the size of `room_`, which is asked for with every value
 };

@@ -57,7 +57,7 @@ class ProjectEditor {
   static Stream* findStream(Layer& layer, int32_t id) {
     const std::size_t place = streamPlace(id);
     if (place == kNoStreamPlace) return nullptr;
-    Stream* const found = layer.streams.data() + place;  // or behind the last: a zoom is a camera's alone
+    Stream* const found = layer.streams.data() + place;  // or after the last: a zoom is a camera's alone
     return found != layer.streams.data() + layer.streams.size() ? found : nullptr;
   }
 

@@ -54,7 +54,7 @@ bool setKind(Failure* failure, std::string_view kind, std::string* complaint) {
   return complain(complaint, kind, "an exception is bad_alloc, runtime_error or other");
 }
 
-// What stands behind the equals sign.
+// What stands after the equals sign.
 struct Effect {
   const char* word;  // as the forms name it
   bool (*set)(Failure*, std::string_view, std::string*);

@@ -6,7 +6,7 @@ usage: scripts/mutate [--count N] [--seed N] [--only FOLDER] [--headers] [--quic
 Chooses mutants of the sources of plugin, maya, comp, hostutil and scan, as many of each: comparisons that take in their
 limit or lose it, arithmetic and logic turned round, constants replaced by their neighbours, conditions negated. Each
 is built and tested by itself, in a copy of the sources below build/mutate: by the folder's own tests, then by whole
-imports; and what both let by, by everything. It is caught when a test fails, crashes or does not come back; what does
+imports; and what neither notices, by everything. It is caught when a test fails, crashes or does not come back; what does
 not compile is replaced by another one. Prints those that no test catches, and the shares. What
 tests/mutation/equivalents.txt names changes nothing that can be seen: it is counted by itself.
 
@@ -79,7 +79,7 @@ class Campaign:
         for folder, (found, share) in wanted.items():
             self.waiting += found[:share]
             self.spares[folder] = found[share:]
-        # Those of one file behind each other: so each takes one compilation, not two.
+        # Those of one file after each other: so each takes one compilation, not two.
         self.waiting.sort(reverse=True)
         self.results = {}  # verdicts by mutant
         self.equivalents = equivalents()
