@@ -82,8 +82,10 @@ class SceneText {
     return real(x, decimals).text(" ").real(y, decimals).text(" ").real(z, decimals).text(" ;\n");
   }
 
-  // A curve of baked keys from frame 1 on: a motion that changes its speed a little from frame to frame.
-  void curve(std::string_view type, const std::string& name, int keys, int decimals, double range) {
+  // A curve of baked keys from frame 1 on: a motion that changes its speed a little from frame to frame, and
+  // begins within the range of the middle.
+  void curve(std::string_view type, const std::string& name, int keys, int decimals, double range,
+             double middle = 0.0) {
     node(type, name)
         .text("\tsetAttr \".tan\" 18;\n\tsetAttr -s ")
         .integer(keys)
@@ -92,7 +94,7 @@ class SceneText {
         .text("]\" ");
     constexpr double kDrag = 0.9;
     constexpr double kPush = 0.01;
-    double value = number(range);
+    double value = middle + number(range);
     double speed = 0.0;
     for (int k = 0; k < keys; ++k) {
       text(k % 8 == 7 ? "\n\t\t" : " ").integer(k + 1).text(" ").real(value, decimals);

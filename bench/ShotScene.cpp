@@ -65,7 +65,7 @@ Built trackers(SceneText& scene, const ShotSize& size) {
 Built cameraCurves(SceneText& scene) {
   constexpr std::size_t kPlaceAndRotation = 6;
   animate(scene, "shot_cam", kFrames, 14, 0, kPlaceAndRotation);
-  scene.curve("animCurveTU", "shot_camShape_focalLength", kFrames, 14, 5.0);
+  scene.curve("animCurveTU", "shot_camShape_focalLength", kFrames, 14, 5.0, 35.0);
   scene.connect("shot_camShape_focalLength.o", "shot_camShape.fl");
   for (std::size_t c = 0; c < kPlaceAndRotation; ++c) {
     const std::string curve = "shot_world_grp_" + std::string(kChannels[c].suffix);
