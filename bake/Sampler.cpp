@@ -55,11 +55,50 @@ std::size_t Sampler::AddWorld(scene::NodeId node, bool scaled) {
   return tracks_.size() - 1;
 }
 
-void Sampler::Run(const FrameRange& frames) {
-  for (std::size_t frame = 0; frame < frames.count; ++frame) {
-    evaluator_->MoveTo(frames.Frame(frame) * unitsPerFrame_);
-    SampleFrame(frame == 0);
+std::vector<motion::Evaluator::Wanted> Sampler::Wanted() const {
+  std::vector<motion::Evaluator::Wanted> wanted;
+  for (const Source& source : sources_) {
+    if (source.matrix) {
+      wanted.push_back({{}, {*source.matrix}});
+    } else {
+      wanted.push_back({{source.numbers.begin(), source.numbers.end()}, {}});
+    }
   }
+  for (const LensSource& source : lensSources_) wanted.push_back({source.camera.Numbers(), {}});
+  return wanted;
+}
+
+// All frames of one part, then those of the next one: what a part needs stays near the processor.
+void Sampler::Run(const FrameRange& frames) {
+  const std::vector<std::uint32_t> partOf = evaluator_->Split(Wanted());
+  std::vector<Part> parts(evaluator_->partCount());
+  for (std::size_t i = 0; i < tracks_.size(); ++i) parts[partOf[i]].tracks.push_back(i);
+  for (std::size_t i = 0; i < lenses_.size(); ++i) parts[partOf[tracks_.size() + i]].lenses.push_back(i);
+  for (std::uint32_t part = 0; part < parts.size(); ++part) {
+    const std::size_t count = part == motion::Evaluator::kStill ? 1 : frames.count;
+    MakeRoom(parts[part], count);
+    for (std::size_t frame = 0; frame < count; ++frame) {
+      evaluator_->MoveTo(frames.Frame(frame) * unitsPerFrame_, part);
+      SampleFrame(parts[part], frame == 0);
+    }
+  }
+  Finish();
+}
+
+void Sampler::MakeRoom(const Part& part, std::size_t frames) {
+  for (const std::size_t i : part.tracks) {
+    for (std::size_t slot = 0; slot < kSlotCount; ++slot) {
+      const bool moves = sources_[i].matrix ? evaluator_->Moves(*sources_[i].matrix)
+                                            : evaluator_->Moves(sources_[i].numbers[slot]);
+      if (moves) tracks_[i].channels[slot].values.reserve(frames);
+    }
+  }
+  for (const std::size_t i : part.lenses) {
+    if (lensSources_[i].camera.Moves()) lenses_[i].focalLength.values.reserve(frames);
+  }
+}
+
+void Sampler::Finish() {
   for (std::size_t i = 0; i < tracks_.size(); ++i) {
     for (Channel& channel : tracks_[i].channels) {
       tracks_[i].finite = tracks_[i].finite && AllFinite(channel);
@@ -69,15 +108,15 @@ void Sampler::Run(const FrameRange& frames) {
   for (LensTrack& lens : lenses_) Settle(&lens.focalLength);
 }
 
-void Sampler::SampleFrame(bool first) {
-  for (std::size_t i = 0; i < tracks_.size(); ++i) {
+void Sampler::SampleFrame(const Part& part, bool first) {
+  for (const std::size_t i : part.tracks) {
     if (!sources_[i].matrix) {
       SampleNumbers(sources_[i], first, &tracks_[i]);
     } else if (first || evaluator_->Moves(*sources_[i].matrix)) {
       SampleMatrix(&sources_[i], &tracks_[i]);
     }
   }
-  for (std::size_t i = 0; i < lenses_.size(); ++i) {
+  for (const std::size_t i : part.lenses) {
     if (first || lensSources_[i].camera.Moves()) SampleLens(&lensSources_[i], &lenses_[i]);
   }
 }

@@ -56,7 +56,16 @@ class Sampler {
     double window = 0.0;  // of the first frame, along the side that fills the picture: inches
   };
 
-  void SampleFrame(bool first);
+  // What of a track's or a lens' values is wanted together.
+  std::vector<motion::Evaluator::Wanted> Wanted() const;
+  // The tracks and the lenses of one part of what moves.
+  struct Part {
+    std::vector<std::size_t> tracks;
+    std::vector<std::size_t> lenses;
+  };
+  void MakeRoom(const Part& part, std::size_t frames);
+  void SampleFrame(const Part& part, bool first);
+  void Finish();
   void SampleNumbers(const Source& source, bool first, Track* track);
   void SampleMatrix(Source* source, Track* track);
   void SampleLens(LensSource* source, LensTrack* lens);

@@ -80,6 +80,19 @@ class Evaluator {
 
   // Any frame after any other; ascending ones are fastest.
   void MoveTo(double frame);
+
+  // The same in parts: of values that are looked at together, which part holds all that they depend on. What
+  // one part computes no other one needs. What does not move is in kStill. Holds until more is asked for.
+  struct Wanted {
+    std::vector<NumberId> numbers;
+    std::vector<MatrixId> matrices;
+  };
+  static constexpr std::uint32_t kStill = 0;
+  std::vector<std::uint32_t> Split(std::span<const Wanted> wanted);
+  std::size_t partCount() const { return parts_.size(); }
+  // The values of the other parts stay what they are.
+  void MoveTo(double frame, std::uint32_t part);
+
   // Of a number that is not known, the attribute's default, and 0 where it has none.
   double Value(NumberId number) const {
     const double value = values_[number];
@@ -158,10 +171,11 @@ class Evaluator {
   scene::FlatMap<CellOfPlug> numberOfPlug_;
   scene::FlatMap<CellOfPlug> matrixOfPlug_;
   std::vector<std::unique_ptr<Step>> steps_;
-  std::vector<Written> written_;          // by step
-  std::vector<bool> moves_;               // by step
-  std::vector<const LocalStep*> locals_;  // by matrix; null where it is no local one
-  std::vector<std::uint32_t> moving_;     // in the order in which they are run
+  std::vector<Written> written_;                   // by step
+  std::vector<bool> moves_;                        // by step
+  std::vector<const LocalStep*> locals_;           // by matrix; null where it is no local one
+  std::vector<std::uint32_t> moving_;              // in the order in which they are run
+  std::vector<std::vector<std::uint32_t>> parts_;  // the same by part
   std::vector<scene::NodeId> computingNodes_;
   std::vector<NumberId> pendingNumbers_;
   std::vector<MatrixId> pendingMatrices_;

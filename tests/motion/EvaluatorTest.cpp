@@ -358,4 +358,34 @@ TEST_F(EvaluatorTest, AHundredThousandChannelsInARowTakeNoDepth) {
   EXPECT_EQ(Number("n" + std::to_string(kCount - 1), "tx"), 4.0);
 }
 
+TEST_F(EvaluatorTest, WhatDependsOnNothingInCommonMovesPartByPart) {
+  Read(std::string(kLine) +
+       "createNode animCurveTL -n \"steep\";\nsetAttr \".tan\" 2;\nsetAttr \".wgt\" no;\n"
+       "setAttr -s 2 \".ktv[0:1]\"  0 0 24 240;\n"
+       "createNode transform -n \"a\";\nconnectAttr \"line.o\" \"a.tx\";\n"
+       "createNode transform -n \"b\" -p \"a\";\n"
+       "createNode transform -n \"c\";\nconnectAttr \"steep.o\" \"c.tx\";\n"
+       "createNode transform -n \"still\";\n");
+  motion::Evaluator& evaluator = this->evaluator();
+  const NumberId a = evaluator.Number(At("a"), "tx");
+  const NumberId c = evaluator.Number(At("c"), "tx");
+  const NumberId still = evaluator.Number(At("still"), "tx");
+  const motion::MatrixId b = evaluator.World(At("b"));
+  const std::vector<motion::Evaluator::Wanted> wanted = {{{still}, {}}, {{c}, {}}, {{}, {b}}, {{a}, {}}};
+  // "b" hangs under what "a" shows, and "c" has nothing to do with either.
+  EXPECT_THAT(evaluator.Split(wanted), ElementsAre(motion::Evaluator::kStill, 1, 2, 2));
+  EXPECT_EQ(evaluator.partCount(), 3u);
+  evaluator.MoveTo(0.0);
+  evaluator.MoveTo(6.0, 2);
+  EXPECT_NEAR(evaluator.Value(a), 6.0, kRounding);
+  EXPECT_NEAR(evaluator.Value(b).origin.x, 6.0, kRounding);
+  EXPECT_EQ(evaluator.Value(c), 0.0);
+  evaluator.MoveTo(12.0, 1);
+  EXPECT_NEAR(evaluator.Value(c), 120.0, 10 * kRounding);
+  EXPECT_NEAR(evaluator.Value(a), 6.0, kRounding);
+  // Values that are looked at together are in one part.
+  EXPECT_THAT(evaluator.Split(std::vector<motion::Evaluator::Wanted>{{{a, c}, {}}, {{}, {b}}}),
+              ElementsAre(1, 1));
+}
+
 }  // namespace
