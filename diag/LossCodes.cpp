@@ -16,7 +16,7 @@ constexpr Entry kLossCodes[] = {
     {.code = Code::StartupCameras,
      .severity = Severity::Note,
      .symbol = "StartupCameras",
-     .sentence = "{0} of the cameras that every scene begins with do not come over",
+     .sentence = "cameras that every scene begins with are left out: {0}",
      .meaning =
          "persp, top, front and side are the cameras of the viewports. The importer knows the first by its "
          "name, and the others because they are orthographic.",

@@ -19,7 +19,7 @@ TEST(LossTest, CamerasThatAreLeftOut) {
       "createNode transform -n \"plan\";\ncreateNode camera -n \"planShape\" -p \"plan\";\n"
       "\tsetAttr \".o\" yes;\n"
       "createNode transform -n \"other\";\ncreateNode camera -n \"PerspShape\" -p \"other\";\n");
-  EXPECT_THAT(checked.SentenceOf(Code::StartupCameras), HasSubstr("2 of the cameras"));
+  EXPECT_THAT(checked.SentenceOf(Code::StartupCameras), HasSubstr("left out: 2"));
   EXPECT_EQ(checked.MarkedBy(Code::OrthographicCamera), "planShape");
   EXPECT_EQ(checked.MarkedBy(Code::CameraNotImported), "PerspShape");
 }
