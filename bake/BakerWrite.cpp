@@ -111,7 +111,11 @@ void Baker::ReportDifferences(const Item& item, const LensTrack& lens, CameraRep
   const Track& track = world_->track(item.world);
   if (!options_.world) Differ(diag::Code::CameraInWorldSpace, item, report->path, report);
   if (track.mirrors) Differ(diag::Code::CameraMirrored, item, report->path, report);
-  if (track.IsSheared()) Differ(diag::Code::CameraSheared, item, report->path, report);
+  if (track.IsSheared()) {
+    Differ(diag::Code::CameraSheared, item, report->path, report);
+  } else if (track.IsUneven()) {
+    Differ(diag::Code::CameraUneven, item, report->path, report);
+  }
 }
 
 void Baker::WriteLocator(const Item& item, Writer* writer) {

@@ -139,9 +139,14 @@ void Sampler::SampleMatrix(Source* source, Track* track) {
   }
   track->mirrors = track->mirrors || motion::Determinant(motion::WithoutOrigin(matrix)) < 0.0;
   track->skew = std::max(track->skew, motion::Skew(matrix));
-  motion::MatrixParts parts = motion::TakeApart(matrix, source->angles);
+  motion::MatrixParts parts;
+  if (source->scaled) {
+    parts = motion::TakeApart(matrix, source->angles);
+  } else {
+    track->unevenness = std::max(track->unevenness, motion::Unevenness(matrix));
+    parts = {matrix.origin, motion::ViewAngles(matrix, source->angles), {1.0, 1.0, 1.0}, {}};
+  }
   source->angles = parts.rotate;
-  if (!source->scaled) parts.scale = {1.0, 1.0, 1.0};
   for (int axis = 0; axis < 3; ++axis) {
     const auto place = static_cast<std::size_t>(axis);
     track->channels[kTranslateX + place].values.push_back(parts.translate[axis]);

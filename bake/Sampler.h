@@ -28,7 +28,7 @@ class Sampler {
   // The node against its parent: its own channels to the bit where they say all.
   std::size_t AddLocal(scene::NodeId node);
 
-  // The node against the world; what is not `scaled` has scale 1.
+  // The node against the world. What is not `scaled` is a camera: it has scale 1 and keeps its direction.
   std::size_t AddWorld(scene::NodeId node, bool scaled);
 
   std::size_t AddLens(scene::NodeId camera);

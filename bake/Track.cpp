@@ -21,6 +21,8 @@ bool Track::moves() const {
 
 bool Track::IsSheared() const { return skew > kSquare; }
 
+bool Track::IsUneven() const { return unevenness > 1.0 + kScaleTolerance; }
+
 bool Track::IsScaled() const {
   for (const std::size_t slot : {kScaleX, kScaleY, kScaleZ}) {
     for (const double value : channels[slot].values) {

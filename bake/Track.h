@@ -31,14 +31,18 @@ enum ChannelSlot : std::size_t {
 // Translation in the scene's unit, rotation in degrees, XYZ, and scale.
 struct Track {
   std::array<Channel, kSlotCount> channels;
-  double skew = 0.0;     // the largest of any frame: what the channels cannot say
-  bool mirrors = false;  // at some frame
-  bool finite = true;    // at all frames
+  double skew = 0.0;        // the largest of any frame: what the channels cannot say
+  double unevenness = 1.0;  // of a camera in the world: how much more one axis is scaled than another
+  bool mirrors = false;     // at some frame
+  bool finite = true;       // at all frames
 
   bool moves() const;
 
   // Whether two axes of any frame are not square to each other.
   bool IsSheared() const;
+
+  // Whether one axis is scaled more than another.
+  bool IsUneven() const;
 
   // Whether any frame has another scale than 1.
   bool IsScaled() const;

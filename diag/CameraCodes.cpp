@@ -96,6 +96,14 @@ constexpr Entry kCameraCodes[] = {
                 "\"Null\". No other locator comes over.",
      .example = "createNode locator -n \"pointShape\" -p \"point\";",
      .help = "Use --locators all to have all of them."},
+    {.code = Code::CameraUneven,
+     .severity = Severity::Warning,
+     .symbol = "CameraUneven",
+     .sentence = "\"{0}\" is scaled more along one axis than along another, which a composition cannot show",
+     .meaning = "Such a scale stretches the picture of the camera. The bake has its place and its direction, "
+                "without the stretch.",
+     .example = "createNode transform -n \"shotCam\";\nsetAttr \".s\" -type \"double3\" 2 1 1 ;",
+     .help = "Give the camera, and what stands above it, the same scale along all axes."},
 };
 
 }  // namespace

@@ -75,6 +75,7 @@ enum class Code : std::uint16_t {
   NullSheared = 509,
   NullNotFinite = 510,
   LocatorsLeftOut = 511,
+  CameraUneven = 512,
   // What a bake writes: diag/BakeCodes.cpp
   NoCamera = 601,
   TooManyFrames = 602,

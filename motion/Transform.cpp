@@ -93,6 +93,17 @@ MatrixParts TakeApart(const Matrix& matrix, const Vector& near) {
   return parts;
 }
 
+Vector ViewAngles(const Matrix& matrix, const Vector& near) {
+  const Matrix turned = RotationOf({matrix.z, matrix.y, -matrix.x, {}});
+  const Matrix view = {Cross(turned.y, turned.x), turned.y, turned.x, {}};
+  return NearestAngles(AnglesOf(view, RotateOrder::kXYZ, near), RotateOrder::kXYZ, near);
+}
+
+double Unevenness(const Matrix& matrix) {
+  const auto [least, most] = std::minmax({Length(matrix.x), Length(matrix.y), Length(matrix.z)});
+  return most == 0.0 ? INFINITY : most / least;
+}
+
 double Skew(const Matrix& matrix) {
   return std::max({Cosine(matrix.x, matrix.y), Cosine(matrix.y, matrix.z), Cosine(matrix.z, matrix.x)});
 }

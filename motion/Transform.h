@@ -69,6 +69,13 @@ struct MatrixParts {
 // angles of the previous frame, which the new ones follow. The matrix is finite.
 MatrixParts TakeApart(const Matrix& matrix, const Vector& near = {});
 
+// The angles of a camera, in XYZ order. It looks along its third axis, also where the axes are not square to
+// each other, and its second one keeps its plane. `near` as above.
+Vector ViewAngles(const Matrix& matrix, const Vector& near = {});
+
+// The length of the longest axis over that of the shortest; infinite where one has none.
+double Unevenness(const Matrix& matrix);
+
 // The largest cosine between two axes of a matrix: what no translation, rotation and scale can say. 0 where
 // they are square.
 double Skew(const Matrix& matrix);

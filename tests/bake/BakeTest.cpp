@@ -118,6 +118,23 @@ TEST(Bake, ACameraUnderAScaleComesInWorldSpace) {
   EXPECT_EQ(baked.CountOf(diag::Code::CameraInWorldSpace), 1u);
 }
 
+TEST(Bake, AShearedCameraLooksWhereItsThirdAxisPoints) {
+  const Baked baked(CameraScene("\tsetAttr \".sh\" -type \"double3\" 0 1 0 ;\n"));
+  EXPECT_THAT(baked.Number("shotCam", "rotateX"), DoubleNear(0.0, kRounding));
+  EXPECT_THAT(baked.Number("shotCam", "rotateY"), DoubleNear(45.0, kRounding));
+  EXPECT_THAT(baked.Number("shotCam", "rotateZ"), DoubleNear(0.0, kRounding));
+  EXPECT_EQ(baked.CountOf(diag::Code::CameraSheared), 1u);
+  EXPECT_EQ(baked.CountOf(diag::Code::CameraUneven), 0u);
+}
+
+TEST(Bake, ACameraThatIsScaledUnevenlyIsReported) {
+  const Baked baked(CameraScene("\tsetAttr \".s\" -type \"double3\" 2 2 3 ;\n"));
+  EXPECT_EQ(baked.CountOf(diag::Code::CameraUneven), 1u);
+  EXPECT_EQ(baked.CountOf(diag::Code::CameraSheared), 0u);
+  const Baked even(CameraScene("\tsetAttr \".s\" -type \"double3\" 2 2 2 ;\n"));
+  EXPECT_EQ(even.CountOf(diag::Code::CameraUneven), 0u);
+}
+
 TEST(Bake, ANullUnderAScaleStaysInTheHierarchy) {
   const Baked baked(
       "createNode transform -n \"rig\";\n\tsetAttr \".s\" -type \"double3\" 2 2 2 ;\n"
@@ -206,7 +223,7 @@ TEST(Bake, ACameraSaysWhichChannelsKeepTheirStoredValues) {
       "createNode transform -n \"left\" -p \"rig\";\ncreateNode camera -n \"leftShape\" -p \"left\";\n"
       "connectAttr \"shake.out[1]\" \"leftShape.fl\";\n"
       "createNode transform -n \"free\";\ncreateNode camera -n \"freeShape\" -p \"free\";\n"
-      "createNode transform -n \"large\" -p \"rig\";\n\tsetAttr \".sx\" 2;\n"
+      "createNode transform -n \"large\" -p \"rig\";\n\tsetAttr \".s\" -type \"double3\" 2 2 2 ;\n"
       "createNode camera -n \"largeShape\" -p \"large\";\n");
   const auto differences = [&baked](std::size_t camera) {
     return baked.report().cameras.at(camera).differences;

@@ -224,6 +224,32 @@ TEST(TakeApart, AnAxisOfNoLengthHasScaleZero) {
   EXPECT_THAT(TakeApart(motion::Scaling({0.0, 0.0, 0.0})).rotate, VectorNear(Vector{}, 0.0));
 }
 
+TEST(ViewAngles, AreThoseOfARotation) {
+  const Vector angles{0.3, -1.2, 2.5};
+  const Matrix matrix =
+      motion::RotationMatrix(angles, motion::RotateOrder::kXYZ) * motion::Scaling({2.0, 2.0, 2.0});
+  EXPECT_THAT(motion::ViewAngles(matrix), VectorNear(angles, 1e-14));
+}
+
+TEST(ViewAngles, KeepTheThirdAxisAndThePlaneOfTheSecond) {
+  testmotion::Chance chance(5);
+  for (int round = 0; round < 200; ++round) {
+    const Matrix matrix = LocalMatrix(AnyTransform(&chance));
+    const Matrix view = motion::RotationMatrix(motion::ViewAngles(matrix), motion::RotateOrder::kXYZ);
+    EXPECT_THAT(view.z, VectorNear(matrix.z * (1.0 / motion::Length(matrix.z)), 1e-12));
+    EXPECT_NEAR(motion::Dot(view.x, matrix.y) / motion::Length(matrix.y), 0.0, 1e-12);
+    EXPECT_GT(motion::Dot(view.y, matrix.y), 0.0);
+  }
+}
+
+TEST(Unevenness, IsTheLongestAxisOverTheShortest) {
+  Transform transform;
+  transform.rotate = {0.3, 0.4, 0.5};
+  transform.scale = {3.0, -12.0, 4.0};
+  EXPECT_NEAR(motion::Unevenness(LocalMatrix(transform)), 4.0, 1e-14);
+  EXPECT_EQ(motion::Unevenness(motion::Scaling({0.0, 0.0, 0.0})), INFINITY);
+}
+
 TEST(Skew, IsTheCosineBetweenAxes) {
   Transform transform;
   transform.rotate = {0.3, 0.4, 0.5};
