@@ -110,6 +110,7 @@ bool Evaluator::CanGive(const scene::Driver& driver) const {
   if (driver.component >= 0 || plug.attribute == "distanceBetween") return false;
   if (TypeOfOutput(plug) != nullptr) return true;
   if (scene_.Written(plug.node, plug.attribute, plug.index) || scene_.SourceOf(plug)) return true;
+  if (scene_.Added(plug.node, plug.attribute) != nullptr) return true;
   return node.origin != scene::Origin::Elsewhere && IsPlaced(plug.node) &&
          scene_.Default(plug.node, plug.attribute).has_value();
 }

@@ -110,12 +110,22 @@ Kind KindOfBlend(std::string_view type, std::string_view attribute) {
   return EndsWith(type, "DA") || EndsWith(type, "FA") ? Kind::kAngle : Kind::kPlain;
 }
 
+// What addAttr's types measure.
+Kind KindOfAdded(std::string_view type) {
+  if (type == "doubleAngle" || type == "floatAngle") return Kind::kAngle;
+  if (type == "doubleLinear" || type == "floatLinear") return Kind::kLength;
+  return type == "time" ? Kind::kTime : Kind::kPlain;
+}
+
 // The inputs of these measure whatever drives them.
 bool TakesAnything(std::string_view type) { return type == "unitConversion" || type == "blendWeighted"; }
 
 Kind KindByName(const scene::Scene& scene, const scene::Plug& plug) {
   const std::string_view type = scene.node(plug.node).type;
   const std::string_view attribute = WithoutAxis(plug.attribute);
+  if (const scene::AddedAttribute* const added = scene.Added(plug.node, plug.attribute)) {
+    return KindOfAdded(added->type);
+  }
   if (type.starts_with("animCurve")) return KindOfCurve(type, plug.attribute);
   if (type.starts_with("animBlendNodeAdditive")) return KindOfBlend(type, plug.attribute);
   if (type == "time") return plug.attribute == "outTime" ? Kind::kTime : Kind::kPlain;

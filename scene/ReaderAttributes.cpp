@@ -68,7 +68,8 @@ void Reader::ReadSetAttr() {
   builder_.Set(node, path, value, end - value);
 }
 
-// addAttr -ln LONG -sn SHORT -dv DEFAULT ...: of the current node, or of those that are named.
+// addAttr -ln LONG -sn SHORT -at TYPE -p COMPOUND -dv DEFAULT ...: of the current node, or of those that are
+// named.
 void Reader::ReadAddAttr() {
   if (!ReadArguments()) return;
   AddedAttribute added;
@@ -90,6 +91,10 @@ void Reader::ReadAddAttr() {
       if (added.longName.empty()) added.place = NameOf(value).place;
     } else if (Is(token, "dv", "defaultValue")) {
       added.fallback = NumberOf(value.text);
+    } else if (Is(token, "at", "attributeType")) {
+      added.type = value.text;
+    } else if (Is(token, "p", "parent")) {
+      added.compound = value.text;
     }
   }
   if (added.longName.empty()) added.longName = added.shortName;

@@ -24,15 +24,17 @@ void Reader::ReadConnectAttr() {
   builder_.Connect(plugs[0], plugs[1], how);
 }
 
-// disconnectAttr SOURCE DESTINATION
+// disconnectAttr SOURCE DESTINATION [-na]
 void Reader::ReadDisconnectAttr() {
   if (!ReadArguments()) return;
   std::vector<Named> plugs;
+  bool nextAvailable = false;
   for (const Token& token : arguments_) {
+    nextAvailable = nextAvailable || Is(token, "na", "nextAvailable");
     if (IsValue(token)) plugs.push_back(NameOf(token));
   }
   if (plugs.size() < 2) return Lacks(plugs.empty() ? "two attributes" : "a second attribute");
-  builder_.Disconnect(plugs[0], plugs[1]);
+  builder_.Disconnect(plugs[0], plugs[1], nextAvailable);
 }
 
 }  // namespace scene

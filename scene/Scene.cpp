@@ -31,7 +31,7 @@ std::string Scene::PathOf(NodeId id, std::size_t longest) const {
   return path;
 }
 
-const AddedAttribute* Scene::FindAdded(NodeId node, std::string_view name) const {
+const AddedAttribute* Scene::Added(NodeId node, std::string_view name) const {
   const IndexOfOne* const found = addedByName_.Find(node, name);
   return found == nullptr || found->plusOne == 0 ? nullptr : &added_[found->plusOne - 1];
 }
@@ -45,8 +45,31 @@ Plug Scene::PlugOf(NodeId node, std::string_view attribute, std::int32_t index) 
   if (const AttributeInfo* const info = FindAttribute(nodes_[node].type, attribute)) {
     return {node, info->longName, index};
   }
-  if (const AddedAttribute* const added = FindAdded(node, attribute)) return {node, added->longName, index};
+  if (const AddedAttribute* const added = Added(node, attribute)) return {node, added->longName, index};
   return {node, attribute, index};
+}
+
+Scene::Form Scene::FormOf(NodeId node, std::string_view attribute) const {
+  if (const AttributeInfo* const info = FindAttribute(nodes_[node].type, attribute)) {
+    const std::string_view compound =
+        info->compound == nullptr ? std::string_view() : info->compound->longName;
+    return {compound, info->component, std::max<std::size_t>(1, info->components.size())};
+  }
+  const AddedAttribute* const added = Added(node, attribute);
+  if (added == nullptr) return {};
+  return {added->compound, added->component, std::max<std::size_t>(1, added->components.size())};
+}
+
+// The name of a component; empty where the components are not known.
+std::string_view Scene::ComponentOf(NodeId node, std::string_view compound, int component) const {
+  const auto place = static_cast<std::size_t>(component);
+  if (const AttributeInfo* const info = FindAttribute(nodes_[node].type, compound)) {
+    return place < info->components.size() ? std::string_view(info->components[place]->longName)
+                                           : std::string_view();
+  }
+  const AddedAttribute* const added = Added(node, compound);
+  const bool known = added != nullptr && place < added->components.size();
+  return known ? added_[added->components[place]].longName : std::string_view();
 }
 
 // ---- values ----
@@ -57,19 +80,18 @@ Value Scene::ValueOf(const Setting& setting, std::size_t component) const {
 
 std::optional<Value> Scene::Written(NodeId node, std::string_view attribute, std::int32_t index) const {
   const Plug plug = PlugOf(node, attribute, index);
-  const AttributeInfo* const info = FindAttribute(nodes_[node].type, plug.attribute);
-  const AttributeInfo* const compound = info == nullptr ? nullptr : info->compound;
+  const Form form = FormOf(node, plug.attribute);
+  const std::size_t compoundWidth = form.compound.empty() ? 1 : FormOf(node, form.compound).width;
   std::optional<Value> value;
   for (std::uint32_t at = lists_[node].firstSetting; at != kNone; at = settings_[at].next) {
     const Setting& setting = settings_[at];
     const bool own = setting.attribute == plug.attribute;
-    if (!own && (compound == nullptr || setting.attribute != compound->longName)) continue;
+    if (!own && (form.compound.empty() || setting.attribute != form.compound)) continue;
     if (index < setting.first || index > setting.last) continue;
     // How many numbers an element has, and which of them is asked for.
-    const AttributeInfo* const whole = own ? info : compound;
-    const std::size_t width = whole == nullptr ? 1 : std::max<std::size_t>(1, whole->components.size());
+    const std::size_t width = own ? form.width : compoundWidth;
     const auto element = static_cast<std::size_t>(index - setting.first);
-    value = ValueOf(setting, element * width + static_cast<std::size_t>(own ? 0 : info->component));
+    value = ValueOf(setting, element * width + static_cast<std::size_t>(own ? 0 : form.component));
   }
   return value;
 }
@@ -87,7 +109,7 @@ std::vector<std::string_view> Scene::TouchedAttributes(NodeId node) const {
 
 std::optional<double> Scene::Default(NodeId node, std::string_view attribute) const {
   if (const AttributeInfo* const info = FindAttribute(nodes_[node].type, attribute)) return info->fallback;
-  const AddedAttribute* const added = FindAdded(node, attribute);
+  const AddedAttribute* const added = Added(node, attribute);
   return added == nullptr ? std::nullopt : added->fallback;
 }
 
@@ -117,38 +139,32 @@ const Connection* Scene::ConnectionTo(const Plug& plug) const {
 
 std::optional<Driver> Scene::SourceOf(const Plug& plug) const {
   if (const Connection* const own = ConnectionTo(plug)) return Driver{own->source, -1, own};
-  const AttributeInfo* const info = FindAttribute(nodes_[plug.node].type, plug.attribute);
-  if (info == nullptr || info->compound == nullptr) return std::nullopt;
-  const Connection* const whole = ConnectionTo({plug.node, info->compound->longName, plug.index});
+  const Form form = FormOf(plug.node, plug.attribute);
+  if (form.compound.empty()) return std::nullopt;
+  const Connection* const whole = ConnectionTo({plug.node, form.compound, plug.index});
   if (whole == nullptr) return std::nullopt;
-  Driver driver{whole->source, info->component, whole};
-  const AttributeInfo* const source = FindAttribute(nodes_[driver.plug.node].type, driver.plug.attribute);
-  const auto component = static_cast<std::size_t>(info->component);
-  if (source != nullptr && component < source->components.size()) {
-    driver.plug.attribute = source->components[component]->longName;
+  Driver driver{whole->source, form.component, whole};
+  const std::string_view component = ComponentOf(driver.plug.node, driver.plug.attribute, form.component);
+  if (!component.empty()) {
+    driver.plug.attribute = component;
     driver.component = -1;
   }
   return driver;
 }
 
 std::vector<Plug> Scene::DestinationsOf(const Plug& plug) const {
-  const AttributeInfo* const info = FindAttribute(nodes_[plug.node].type, plug.attribute);
+  const Form form = FormOf(plug.node, plug.attribute);
   std::vector<Plug> destinations;
   for (const Connection* const connection : ConnectionsFrom(plug.node)) {
-    if (connection->source.index != plug.index) continue;
-    const AttributeInfo* const source = FindAttribute(nodes_[plug.node].type, connection->source.attribute);
+    const Plug& source = connection->source;
+    if (source.index != plug.index) continue;
     Plug destination = connection->destination;
-    if (connection->source.attribute != plug.attribute) {
-      if (info == nullptr || source == nullptr) continue;
-      if (info->compound == source) {
-        const AttributeInfo* const whole =
-            FindAttribute(nodes_[destination.node].type, destination.attribute);
-        const auto component = static_cast<std::size_t>(info->component);
-        if (whole == nullptr || component >= whole->components.size()) continue;
-        destination.attribute = whole->components[component]->longName;
-      } else if (source->compound != info) {
-        continue;
-      }
+    if (source.attribute == form.compound) {
+      destination.attribute = ComponentOf(destination.node, destination.attribute, form.component);
+      if (destination.attribute.empty()) continue;
+    } else if (source.attribute != plug.attribute &&
+               FormOf(plug.node, source.attribute).compound != plug.attribute) {
+      continue;
     }
     destinations.push_back(destination);
   }

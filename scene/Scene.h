@@ -60,8 +60,12 @@ struct AddedAttribute {
   NodeId node = kNoNode;
   std::string_view longName;
   std::string_view shortName;
+  std::string_view type = {};      // -at: "double", "doubleAngle", "double3" …; empty where it is not said
+  std::string_view compound = {};  // -p: the long name of the attribute of which it is a component
+  int component = 0;               // which, from 0
   std::optional<double> fallback;  // -dv
   diag::Range place;
+  std::vector<std::uint32_t> components = {};  // of a compound, in order: in Scene::addedAttributes()
 };
 
 // A piece of an array: the values of the elements first to last.
@@ -148,6 +152,10 @@ class Scene {
   std::vector<const Connection*> ConnectionsFrom(NodeId node) const;
 
   std::span<const AddedAttribute> addedAttributes() const { return added_; }
+
+  // By its long or short name; null where addAttr made none of the name.
+  const AddedAttribute* Added(NodeId node, std::string_view name) const;
+
   std::span<const Reference> references() const { return references_; }
   std::span<const Requirement> requirements() const { return requirements_; }
   std::span<const FileInfo> fileInfo() const { return fileInfo_; }
@@ -188,7 +196,14 @@ class Scene {
     std::uint32_t plusOne = 0;  // 0: none
   };
 
-  const AddedAttribute* FindAdded(NodeId node, std::string_view name) const;
+  // How an attribute is made up, whether its type has it or addAttr made it.
+  struct Form {
+    std::string_view compound = {};  // of which it is a component; empty where it is none
+    int component = 0;
+    std::size_t width = 1;  // how many numbers an element has
+  };
+  Form FormOf(NodeId node, std::string_view attribute) const;
+  std::string_view ComponentOf(NodeId node, std::string_view compound, int component) const;
   Value ValueOf(const Setting& setting, std::size_t component) const;
   const Connection* ConnectionTo(const Plug& plug) const;
 

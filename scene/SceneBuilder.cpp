@@ -1,10 +1,16 @@
 // Attributes, connections and the head of the file.
 #include "scene/SceneBuilder.h"
 
+#include <algorithm>
+#include <utility>
+
 #include "scene/ByteClasses.h"
 
 namespace scene {
 namespace {
+
+// No array is longer.
+constexpr std::uint32_t kLastElement = 0x7ffffffe;
 
 std::uint64_t KeyOf(const Plug& plug) {
   return std::uint64_t{plug.node} << 32 | static_cast<std::uint32_t>(plug.index);
@@ -14,7 +20,8 @@ std::uint64_t KeyOf(const Plug& plug) {
 
 bool SceneBuilder::Keeps(NodeId node, std::string_view attribute) const {
   const std::string_view type = scene_.nodes_[node].type;
-  return KeepsAttributes(type) || FindAttribute(type, attribute) != nullptr;
+  return KeepsAttributes(type) || FindAttribute(type, attribute) != nullptr ||
+         scene_.Added(node, attribute) != nullptr;
 }
 
 void SceneBuilder::Set(NodeId node, const AttributePath& path, std::uint32_t value,
@@ -29,13 +36,23 @@ void SceneBuilder::Set(NodeId node, const AttributePath& path, std::uint32_t val
                               .last = path.last});
 }
 
+// An attribute of a name that its type has already is that one.
 void SceneBuilder::AddAttribute(AddedAttribute attribute, NodeId node) {
-  if (!KeepsAttributes(scene_.nodes_[node].type)) return;
+  if (FindAttribute(scene_.nodes_[node].type, attribute.longName) != nullptr) return;
   attribute.node = node;
-  scene_.added_.push_back(attribute);
-  const auto plusOne = static_cast<std::uint32_t>(scene_.added_.size());
-  scene_.addedByName_.At(attribute.node, attribute.longName).plusOne = plusOne;
-  scene_.addedByName_.At(attribute.node, attribute.shortName).plusOne = plusOne;
+  const auto index = static_cast<std::uint32_t>(scene_.added_.size());
+  const AddedAttribute* const compound =
+      attribute.compound.empty() ? nullptr : scene_.Added(node, attribute.compound);
+  attribute.compound = {};
+  if (compound != nullptr) {
+    AddedAttribute& whole = scene_.added_[static_cast<std::size_t>(compound - scene_.added_.data())];
+    attribute.compound = whole.longName;
+    attribute.component = static_cast<int>(whole.components.size());
+    whole.components.push_back(index);
+  }
+  scene_.addedByName_.At(node, attribute.longName).plusOne = index + 1;
+  scene_.addedByName_.At(node, attribute.shortName).plusOne = index + 1;
+  scene_.added_.push_back(std::move(attribute));
 }
 
 Plug SceneBuilder::PlugOf(Named plug) {
@@ -48,33 +65,56 @@ void SceneBuilder::Index(std::uint32_t connection) {
   scene_.connectionByName_.At(KeyOf(plug), plug.attribute).plusOne = connection + 1;
 }
 
+// The connection that was made last from the one to an element of the other by -na.
+Scene::IndexOfOne& SceneBuilder::Appended(const Plug& source, const Plug& destination) {
+  const std::uint64_t from = HashOf(source.attribute, KeyOf(source));
+  return appended_.At(from ^ HashOf({}, destination.node), destination.attribute);
+}
+
 void SceneBuilder::Connect(Named source, Named destination, ConnectHow how) {
   Connection connection{PlugOf(source), PlugOf(destination), source.place, destination.place};
-  if (how != ConnectHow::NextAvailable) {
-    if (const Connection* const there = scene_.ConnectionTo(connection.destination)) {
-      if (there->source == connection.source) return;
-      const auto at = static_cast<std::size_t>(there - scene_.connections_.data());
-      if (how == ConnectHow::Plain) {
-        const std::string_view driver =
-            scene_.text_.substr(there->sourcePlace.offset, there->sourcePlace.length);
-        diagnostics_->Report(diag::Code::AlreadyConnected, destination.place, {destination.text, driver});
-        return;
-      }
-      scene_.connectionLinks_[at].cut = true;
+  Plug& to = connection.destination;
+  const bool appends = how == ConnectHow::NextAvailable && to.index == kNoIndex;
+  if (appends || to.index != kNoIndex) {
+    std::uint32_t& next = nextElements_.At(to.node, to.attribute).next;
+    if (appends) to.index = static_cast<std::int32_t>(std::min(next, kLastElement));
+    next = std::max(next, static_cast<std::uint32_t>(to.index) + 1);
+  }
+  if (const Connection* const there = scene_.ConnectionTo(to)) {
+    if (there->source == connection.source) return;
+    if (how != ConnectHow::Force) {
+      const std::string_view driver =
+          scene_.text_.substr(there->sourcePlace.offset, there->sourcePlace.length);
+      diagnostics_->Report(diag::Code::AlreadyConnected, destination.place, {destination.text, driver});
+      return;
     }
+    Cut(static_cast<std::uint32_t>(there - scene_.connections_.data()));
   }
   scene_.connections_.push_back(connection);
   scene_.connectionLinks_.emplace_back();
-  if (how != ConnectHow::NextAvailable) Index(static_cast<std::uint32_t>(scene_.connections_.size() - 1));
+  const auto made = static_cast<std::uint32_t>(scene_.connections_.size() - 1);
+  Index(made);
+  if (appends) Appended(connection.source, to).plusOne = made + 1;
 }
 
-void SceneBuilder::Disconnect(const Named& source, const Named& destination) {
+void SceneBuilder::Cut(std::uint32_t connection) {
+  const Plug& to = scene_.connections_[connection].destination;
+  scene_.connectionLinks_[connection].cut = true;
+  scene_.connectionByName_.At(KeyOf(to), to.attribute).plusOne = 0;
+}
+
+void SceneBuilder::Disconnect(const Named& source, const Named& destination, bool nextAvailable) {
   const Plug from = PlugOf(source);
-  const Plug to = PlugOf(destination);
+  Plug to = PlugOf(destination);
+  if (nextAvailable && to.index == kNoIndex) {
+    Scene::IndexOfOne& appended = Appended(from, to);
+    if (appended.plusOne == 0) return;
+    to.index = scene_.connections_[appended.plusOne - 1].destination.index;
+    appended.plusOne = 0;
+  }
   const Connection* const there = scene_.ConnectionTo(to);
   if (there == nullptr || there->source != from) return;
-  scene_.connectionLinks_[static_cast<std::size_t>(there - scene_.connections_.data())].cut = true;
-  scene_.connectionByName_.At(KeyOf(to), to.attribute).plusOne = 0;
+  Cut(static_cast<std::uint32_t>(there - scene_.connections_.data()));
 }
 
 void SceneBuilder::AddReference(const Reference& reference, bool read) {

@@ -50,7 +50,7 @@ class SceneBuilder {
 
   enum class ConnectHow { Plain, Force, NextAvailable };
   void Connect(Named source, Named destination, ConnectHow how);
-  void Disconnect(const Named& source, const Named& destination);
+  void Disconnect(const Named& source, const Named& destination, bool nextAvailable);
 
   // ---- the head of the file ----
 
@@ -79,6 +79,8 @@ class SceneBuilder {
   bool IsElsewhere(NodeId id, diag::Range place, std::string_view command);
   Plug PlugOf(Named plug);
   void Index(std::uint32_t connection);
+  Scene::IndexOfOne& Appended(const Plug& source, const Plug& destination);
+  void Cut(std::uint32_t connection);
 
   // ---- the end: SceneBuilderFinish.cpp ----
 
@@ -96,6 +98,8 @@ class SceneBuilder {
   std::string_view nameSpace_;
   FlatMap<Scene::IndexOfOne> fromElsewhere_;  // nodes by the name they are called
   FlatMap<Counter> counters_;                 // by parent and name without its number
+  FlatMap<Counter> nextElements_;             // of arrays: the index that nothing is connected to yet
+  FlatMap<Scene::IndexOfOne> appended_;       // connections made with -na, by both ends
   FlatMap<Scene::IndexOfOne> referenceByName_;
   FlatMap<Scene::IndexOfOne> referenceBySpace_;
 };

@@ -139,6 +139,22 @@ TEST_F(EvaluatorTest, AnAttributeThatWasAddedDrivesAFocalLength) {
   EXPECT_EQ(Number("shape", "focalLength"), 50.0);
 }
 
+TEST_F(EvaluatorTest, AnAddedAttributeMeasuresWhatItsTypeSays) {
+  Read(
+      "currentUnit -l meter -a degree -t film;\ncreateNode network -n \"ctrl\";\n"
+      "addAttr -ln \"reach\" -at \"doubleLinear\";\naddAttr -ln \"turn\" -at \"doubleAngle\";\n"
+      "addAttr -ln \"plain\" -at \"double\" -dv 3;\nsetAttr \".reach\" 2;\nsetAttr \".turn\" 180;\n"
+      "createNode transform -n \"a\";\nconnectAttr \"ctrl.reach\" \"a.tx\";\n"
+      "connectAttr \"ctrl.reach\" \"a.sx\";\nconnectAttr \"ctrl.turn\" \"a.rx\";\n"
+      "connectAttr \"ctrl.turn\" \"a.sy\";\nconnectAttr \"ctrl.plain\" \"a.ty\";\n");
+  EXPECT_EQ(Number("a", "tx"), 2.0);
+  EXPECT_EQ(Number("a", "sx"), 200.0);
+  EXPECT_EQ(Number("a", "rx"), 180.0);
+  EXPECT_NEAR(Number("a", "sy"), 3.141592653589793, kRounding);
+  EXPECT_NEAR(Number("a", "ty"), 0.03, kRounding);
+  EXPECT_THAT(Diagnostics(), IsEmpty());
+}
+
 TEST_F(EvaluatorTest, ADrivenKeyGoesByItsNumber) {
   Read(std::string(kLine) +
        "createNode transform -n \"a\";\nconnectAttr \"line.o\" \"a.tx\";\n"

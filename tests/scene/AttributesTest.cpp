@@ -138,6 +138,22 @@ TEST_F(AttributesTest, AddedAttributesHaveTheirNamesAndDefaults) {
   EXPECT_THAT(Diagnostics(), ElementsAre("3:98: the command \"addAttr\" lacks a name [MA0108]"));
 }
 
+TEST_F(AttributesTest, ComponentsOfAnAddedCompoundAreItsNumbers) {
+  Read(
+      "createNode network -n \"a\";addAttr -ln \"shake\" -sn \"shk\" -at \"double3\" -nc 3;"
+      "addAttr -ln \"shakeX\" -sn \"shkx\" -at \"double\" -p \"shake\";"
+      "addAttr -ln \"turn\" -sn \"shky\" -at \"doubleAngle\" -p \"shk\";"
+      "addAttr -ln \"shakeZ\" -sn \"shkz\" -at \"double\" -p \"shake\" -dv 9;"
+      "setAttr \".shk\" -type \"double3\" 1 2 3;setAttr \".shake.turn\" 20;setAttr \".other\" 5;");
+  EXPECT_EQ(scene_.Number(0, "shkx"), 1.0);
+  EXPECT_EQ(scene_.Number(0, "turn"), 20.0);
+  EXPECT_EQ(scene_.Number(0, "shakeZ"), 3.0);
+  EXPECT_EQ(scene_.Added(0, "shky")->type, "doubleAngle");
+  EXPECT_EQ(scene_.Added(0, "shky")->component, 1);
+  EXPECT_EQ(scene_.Added(0, "shake")->components.size(), 3u);
+  EXPECT_FALSE(scene_.Written(0, "other").has_value());
+}
+
 TEST_F(AttributesTest, AWrittenValueOfAnAddedAttributeIsFoundByEitherName) {
   Read(
       "createNode transform -n \"a\";addAttr -sn \"foc\" -ln \"focal\" -dv 1 -at \"double\";"

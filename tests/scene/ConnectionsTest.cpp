@@ -93,10 +93,35 @@ TEST_F(ConnectionsTest, WithForceTheSecondOneTakesItsPlace) {
 }
 
 TEST_F(ConnectionsTest, NextAvailableAppends) {
-  ReadAfterNodes("connectAttr \"k.o\" \":set.dsm\" -na;connectAttr \"l.o\" \":set.dsm\" -nextAvailable;");
-  EXPECT_EQ(scene_.ConnectionsInto(At("set")).size(), 2u);
-  EXPECT_THAT(DestinationsOf("l", "o"), ElementsAre("set.dsm"));
+  ReadAfterNodes(
+      "connectAttr \"k.o\" \":set.dsm\" -na;connectAttr \"l.o\" \":set.dsm[6]\";"
+      "connectAttr \"l.o\" \":set.dsm\" -nextAvailable;");
+  EXPECT_EQ(scene_.ConnectionsInto(At("set")).size(), 3u);
+  EXPECT_THAT(DestinationsOf("k", "o"), ElementsAre("set.dsm[0]"));
+  EXPECT_THAT(DestinationsOf("l", "o"), ElementsAre("set.dsm[6]", "set.dsm[7]"));
   EXPECT_THAT(Diagnostics(), IsEmpty());
+}
+
+TEST_F(ConnectionsTest, DisconnectFromTheNextAvailableFindsTheElement) {
+  ReadAfterNodes(
+      "connectAttr \"k.o\" \":set.dsm\" -na;connectAttr \"l.o\" \":set.dsm\" -na;"
+      "disconnectAttr \"k.o\" \":set.dsm\" -na;disconnectAttr \"a.tx\" \":set.dsm\" -na;");
+  EXPECT_THAT(DestinationsOf("k", "o"), IsEmpty());
+  EXPECT_THAT(DestinationsOf("l", "o"), ElementsAre("set.dsm[1]"));
+  EXPECT_EQ(SourceOf("set", "dsm[0]"), "");
+}
+
+TEST_F(ConnectionsTest, ComponentsOfAddedCompoundsAreDrivenAndDrive) {
+  ReadAfterNodes(
+      "createNode transform -n \"ctrl\";addAttr -ln \"shake\" -sn \"shk\" -at \"double3\" -nc 3;"
+      "addAttr -ln \"shakeX\" -sn \"shkx\" -at \"double\" -p \"shake\";"
+      "addAttr -ln \"shakeY\" -sn \"shky\" -at \"double\" -p \"shk\";"
+      "addAttr -ln \"shakeZ\" -sn \"shkz\" -at \"double\" -p \"shake\";"
+      "connectAttr \"ctrl.shk\" \"a.t\";connectAttr \"b.t\" \"ctrl.shake\";");
+  EXPECT_EQ(SourceOf("a", "ty"), "ctrl.shakeY");
+  EXPECT_EQ(SourceOf("ctrl", "shkz"), "b.translateZ");
+  EXPECT_THAT(DestinationsOf("ctrl", "shakeX"), ElementsAre("a.translateX"));
+  EXPECT_THAT(DestinationsOf("b", "tz"), ElementsAre("ctrl.shakeZ"));
 }
 
 TEST_F(ConnectionsTest, DisconnectTakesAConnectionOut) {
