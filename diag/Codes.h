@@ -6,7 +6,7 @@
 //   200  nodes, names, units         500  cameras and locators
 //   300  curves                      600  what a bake writes
 //   700  what stops an import          800  what does not come over
-//   900  where the picture differs
+//   900  where the picture differs   1000  what keeps a check from its end
 #pragma once
 
 #include <cstdint>
@@ -134,6 +134,12 @@ enum class Code : std::uint16_t {
   NegativeFrames = 916,
   FractionalFrames = 917,
   RateDiffers = 918,
+  // What keeps a check from its end: diag/ProcessCodes.cpp
+  CheckTimedOut = 1001,
+  CheckBrokeOff = 1002,
+  CheckOutOfMemory = 1003,
+  ReportTooLarge = 1004,
+  CheckNotStarted = 1005,
 };
 
 // Ordered: a later one is worse.

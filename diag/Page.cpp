@@ -24,6 +24,7 @@ constexpr std::array kTopics = {
     Topic{700, "What stops an import"},
     Topic{800, "What does not come over"},
     Topic{900, "Where the picture differs"},
+    Topic{1000, "What keeps a check from its end"},
 };
 
 constexpr std::string_view kIntroduction =

@@ -15,7 +15,7 @@ std::vector<Entry> WholeTable() {
   std::vector<Entry> table;
   for (const std::span<const Entry> part :
        {ReadingCodes(), NodeCodes(), CurveCodes(), DriverCodes(), CameraCodes(), BakeCodes(), StopCodes(),
-        LossCodes(), PictureCodes()}) {
+        LossCodes(), PictureCodes(), ProcessCodes()}) {
     table.insert(table.end(), part.begin(), part.end());
   }
   return table;

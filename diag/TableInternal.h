@@ -16,5 +16,6 @@ std::span<const Entry> BakeCodes();
 std::span<const Entry> StopCodes();
 std::span<const Entry> LossCodes();
 std::span<const Entry> PictureCodes();
+std::span<const Entry> ProcessCodes();
 
 }  // namespace diag

@@ -59,6 +59,40 @@ TEST(JsonWriter, ObjectsAreSpreadOverLinesAndRowsAreNot) {
       "{\n \"a\": 1,\n \"rows\": [\n  [0, [true, null]],\n  [1, [true, null]]\n ],\n \"none\": []\n}\n");
 }
 
+// A document that is put into another one looks as if it had been written there.
+TEST(JsonWriter, AWrittenValueIsMovedInToItsLevel) {
+  const auto value = [](JsonWriter& json) {
+    json.beginObject();
+    json.key("a\nb");
+    json.beginArray();
+    json.text("c\nd");
+    json.beginRow();
+    json.integer(1);
+    json.endArray();
+    json.endArray();
+    json.endObject();
+  };
+  std::ostringstream alone, direct, moved;
+  JsonWriter first(alone);
+  value(first);
+  JsonWriter second(direct), third(moved);
+  for (JsonWriter* json : {&second, &third}) {
+    json->beginObject();
+    json->key("values");
+    json->beginArray();
+  }
+  for (int i = 0; i < 2; ++i) {
+    value(second);
+    third.written(alone.str());
+  }
+  for (JsonWriter* json : {&second, &third}) {
+    json->endArray();
+    json->endObject();
+  }
+  EXPECT_EQ(moved.str(), direct.str());
+  EXPECT_EQ(nlohmann::json::parse(moved.str())["values"].size(), 2u);
+}
+
 TEST(JsonWriter, DoublesAreShortAndGiveTheSameBitsBack) {
   const std::vector<double> values = {0.1,      1.0 / 3.0, 1e22,  5e-324, 1.7976931348623157e308,
                                       636.3812, -2.5e7,    100.0, -0.0,   0.0};

@@ -47,7 +47,7 @@ class PoolInterruption : public ::testing::Test {
         [this](std::size_t number) {
           return Words{MISBEHAVING_CHILD, "process", idFile(number), "hang"};
         },
-        [](std::size_t, mayascene::ChildEnd) {}, [](const mayascene::PoolState&) {});
+        [](std::size_t, mayascene::ChildEnd) { return true; }, [](const mayascene::PoolState&) {});
     ::_exit(EXIT_SUCCESS);
   }
 
@@ -118,7 +118,7 @@ TEST_F(PoolInterruption, ASignalAtAnyMomentLeavesNoChild) {
           [](std::size_t number) {
             return Words{MISBEHAVING_CHILD, "say", std::to_string(number)};
           },
-          [](std::size_t, mayascene::ChildEnd) {}, [](const mayascene::PoolState&) {});
+          [](std::size_t, mayascene::ChildEnd) { return true; }, [](const mayascene::PoolState&) {});
       ::_exit(EXIT_SUCCESS);
     }
     ::setpgid(runner, runner);

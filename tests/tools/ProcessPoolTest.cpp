@@ -59,6 +59,7 @@ class Pool : public ::testing::Test {
         [&](std::size_t number, ChildEnd end) {
           numbers_.push_back(number);
           ends.push_back(std::move(end));
+          return ends.size() < wanted_;
         },
         [&](const PoolState& state) {
           states_.push_back(state);
@@ -72,6 +73,7 @@ class Pool : public ::testing::Test {
   testsupport::TemporaryFolder folder_;
   std::string program_ = MISBEHAVING_CHILD;
   PoolLimits limits_;
+  std::size_t wanted_ = 1000;         // results, after which no more are taken
   std::vector<std::size_t> numbers_;  // of the ends
   std::vector<PoolState> states_;
   std::function<void(const PoolState&, std::size_t handedOut)> watch_;
@@ -259,6 +261,15 @@ TEST_F(Pool, AnExceptionOfAFunctionEndsTheChildren) {
     if (std::filesystem::exists(path("id"))) throw std::runtime_error("enough");
   };
   EXPECT_THROW(run({{"process", path("id"), "hang"}, {"hang"}}), std::runtime_error);
+  EXPECT_EQ(::waitpid(-1, nullptr, WNOHANG), -1);
+  EXPECT_EQ(errno, ECHILD);
+}
+
+TEST_F(Pool, NothingRunsAnyMoreOnceNoMoreResultsAreWanted) {
+  limits_.jobs = 3;
+  wanted_ = 2;
+  const auto ends = run({{"say", "a"}, {"say", "b"}, {"hang"}, {"hang"}, {"hang"}});
+  EXPECT_EQ(ends.size(), 2u);
   EXPECT_EQ(::waitpid(-1, nullptr, WNOHANG), -1);
   EXPECT_EQ(errno, ECHILD);
 }

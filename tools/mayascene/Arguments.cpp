@@ -11,6 +11,7 @@
 
 #include "refhost/Rehearsal.h"
 #include "tools/mayascene/BakeWords.h"
+#include "tools/mayascene/Interruption.h"
 #include "tools/mayascene/OutputFile.h"
 #include "tools/mayascene/TerminalText.h"
 #include "tools/mayascene/Version.h"
@@ -20,6 +21,8 @@ namespace {
 
 constexpr std::int32_t kMostZoomKeys = 1'000'000;
 constexpr std::int64_t kMostMemory = INT64_MAX - 1;  // a number that is too large is read as the largest one
+constexpr double kLeastTimeout = 0.001;
+constexpr double kMostTimeout = 1e6;
 constexpr std::size_t kNameColumn = 36;
 
 // A text in lines of at most `width`, all but the first behind `indent` blanks.
@@ -134,6 +137,17 @@ void addCeilings(CLI::App* verb, HostArguments* host) {
       ->option_text("N")
       ->check(CLI::Range(std::int64_t{0}, kMostMemory))
       ->group(group);
+}
+
+// The library's own range takes "nan" for a number in it.
+CLI::Validator timeoutWord() {
+  const auto check = [](const std::string& word) -> std::string {
+    double seconds = 0.0;
+    const bool taken =
+        CLI::detail::lexical_cast(word, seconds) && seconds >= kLeastTimeout && seconds <= kMostTimeout;
+    return taken ? "" : word + " is no time between a thousandth of a second and a million seconds";
+  };
+  return CLI::Validator(check, "");
 }
 
 // "MA0701", in capitals or not.
@@ -283,7 +297,9 @@ struct CommandLine {
 
   void addCheck() {
     checkVerb = app.add_subcommand("check", "say what an import makes of scenes, what it does not, and why");
-    checkVerb->add_option("SCENE", check.scenes, "a Maya ASCII scene, in whatever state")
+    checkVerb
+        ->add_option("SCENE", check.scenes,
+                     "a Maya ASCII scene, in whatever state, or a folder\nthat is searched for *.ma")
         ->required()
         ->option_text(" ");
     checkVerb->add_option("--json", check.json, "write the reports; - is standard output")
@@ -293,7 +309,21 @@ struct CommandLine {
     checkVerb->add_flag("--all", check.options.all, "show all diagnostics, not 20 of each code");
     checkVerb->add_flag("-v,--verbose", check.verbose, "a line for each scene on standard error");
     checkVerb->add_flag("-q,--quiet", check.quiet, "print nothing but errors");
+    checkVerb->add_option("--jobs", check.jobs, "scenes that are checked at a time (the processors)")
+        ->option_text("N")
+        ->check(CLI::Range(std::size_t{1}, kMostChildren));
+    checkVerb->add_option("--timeout", check.timeout, "seconds that each scene may take (60)")
+        ->option_text("S")
+        ->check(timeoutWord());
     addUnits(checkVerb, &check.host);
+    addChildOptions();
+  }
+
+  // What the tool says to itself: no help shows it.
+  void addChildOptions() {
+    checkVerb->add_flag("--child", check.child)->group("");
+    checkVerb->add_flag("--colour-report", check.colourReport)->group("");
+    checkVerb->add_flag("--colour-complaints", check.colourComplaints)->group("");
   }
 
   void addVerify() {

@@ -49,11 +49,17 @@ struct VerifyArguments {
 struct CheckArguments {
   HostArguments host;
   check::Options options;
-  std::vector<std::string> scenes;
-  std::string json;  // empty: none; "-": standard output
+  std::vector<std::string> scenes;  // and folders of scenes
+  std::string json;                 // empty: none; "-": standard output
   bool strict = false;
   bool quiet = false;
   bool verbose = false;
+  std::optional<std::size_t> jobs;  // scenes at a time; none: as many as there are processors
+  double timeout = 60.0;            // seconds for each scene
+  // Of a run that is the child of another one, and checks a single scene for it.
+  bool child = false;
+  bool colourReport = false;  // the parent shows them on a terminal
+  bool colourComplaints = false;
 };
 
 struct PrefsArguments {

@@ -44,7 +44,7 @@ std::string totalsText(const check::Report& report) {
 void printCheck(std::ostream& out, const CheckedScene& scene, bool quiet, const Style& style) {
   if (!scene.failure.empty()) return;
   const check::Report& report = scene.report;
-  if (!quiet) printHead(out, scene, style);
+  if (!quiet && !scene.unfinished) printHead(out, scene, style);
   for (const check::Finding& finding : report.findings) {
     const bool error = diag::EntryOf(finding.diagnostic.code).severity == diag::Severity::Error;
     if (error || !quiet) printFinding(out, scene.path, finding, style);

@@ -50,6 +50,18 @@ void JsonWriter::boolean(bool value) { literal(value ? "true" : "false"); }
 
 void JsonWriter::null() { literal("null"); }
 
+// A line end is never part of a text: there it is escaped.
+void JsonWriter::written(std::string_view value) {
+  separate();
+  while (value.ends_with('\n')) value.remove_suffix(1);
+  for (std::size_t end = value.find('\n'); end != std::string_view::npos; end = value.find('\n')) {
+    out_ << value.substr(0, end);
+    newLine();
+    value.remove_prefix(end + 1);
+  }
+  out_ << value;
+}
+
 void JsonWriter::literal(std::string_view word) {
   separate();
   out_ << word;

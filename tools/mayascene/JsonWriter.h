@@ -28,6 +28,9 @@ class JsonWriter {
   void boolean(bool value);
   void null();
 
+  // A value that a writer wrote at the level of a document: it is moved in to this level.
+  void written(std::string_view value);
+
  private:
   struct Level {
     bool oneLine;

@@ -51,7 +51,7 @@ class Run {
   void all() {
     while (taken_ < count_) {
       startMore();
-      handOut();
+      if (!handOut()) return;
       if (running_.empty()) continue;
       wait();
       look();
@@ -79,13 +79,14 @@ class Run {
     }
   }
 
-  void handOut() {
+  bool handOut() {
     for (auto first = results_.find(taken_); first != results_.end(); first = results_.find(taken_)) {
       ChildEnd end = std::move(first->second);
       results_.erase(first);
       waitingBytes_ -= end.out.size() + end.err.size();
-      take_(taken_++, std::move(end));
+      if (!take_(taken_++, std::move(end))) return false;
     }
+    return true;
   }
 
   // Until a child has written something or has closed its streams, or it is time to look.

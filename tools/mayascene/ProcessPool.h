@@ -45,8 +45,8 @@ class ProcessPool {
  public:
   // The words of a child; the first is the path of the program.
   using Command = std::function<std::vector<std::string>(std::size_t number)>;
-  // Gets each result, from child 0 on.
-  using Take = std::function<void(std::size_t number, ChildEnd end)>;
+  // Gets each result, from child 0 on. False: no more, all children are ended.
+  using Take = std::function<bool(std::size_t number, ChildEnd end)>;
   // Is called about ten times a second, and when a child has ended.
   using Watch = std::function<void(const PoolState& state)>;
 

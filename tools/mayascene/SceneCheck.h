@@ -13,8 +13,9 @@ namespace mayascene {
 struct CheckedScene {
   std::string path;  // as the user named it; bytes
   ExitStatus status = ExitStatus::Unreadable;
-  std::string failure;   // why the file cannot be read; empty: it could
-  check::Report report;  // of a file that could be read
+  std::string failure;      // why the file cannot be read; empty: it could
+  check::Report report;     // of a file that could be read
+  bool unfinished = false;  // the check did not come to its end: the report has no head, and says why
 };
 
 // Imports the scene and reports what became of it. Complains of a file that cannot be read, and of what the

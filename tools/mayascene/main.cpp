@@ -28,7 +28,9 @@ ExitStatus run(int argc, const char* const* argv) {
   const bool quiet = (arguments.import && arguments.import->quiet) ||
                      (arguments.verify && arguments.verify->quiet) ||
                      (arguments.bake && arguments.bake->quiet) || (arguments.check && arguments.check->quiet);
-  Diagnostics diagnostics(std::cerr, mayascene::Style(mayascene::colourAllowed(STDERR_FILENO)), quiet);
+  const bool colour =
+      mayascene::colourAllowed(STDERR_FILENO) || (arguments.check && arguments.check->colourComplaints);
+  Diagnostics diagnostics(std::cerr, mayascene::Style(colour), quiet);
   if (arguments.import) return mayascene::runImport(*arguments.import, diagnostics);
   if (arguments.bake) return mayascene::runBake(*arguments.bake, diagnostics);
   if (arguments.check) return mayascene::runCheck(*arguments.check, diagnostics);
