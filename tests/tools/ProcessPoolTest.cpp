@@ -207,8 +207,9 @@ TEST_F(Pool, AProgramThatIsNotThereIsNotStarted) {
 }
 
 TEST_F(Pool, AProcessThatAChildLeavesBehindIsNotWaitedFor) {
-  const auto ends = run({{"say", "a", "leave", path("made")}});
-  std::ofstream(path("made")).flush();
+  folder_.write("held", "");
+  const auto ends = run({{"say", "a", "leave", path("held")}});
+  std::filesystem::remove(path("held"));
   EXPECT_EQ(ends.at(0).kind, Kind::Exited);
   EXPECT_EQ(ends.at(0).out, "a");
 }

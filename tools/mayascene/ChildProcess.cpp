@@ -36,7 +36,6 @@ struct Pipe {
 
   bool open() { return ::pipe2(ends.data(), O_CLOEXEC) == 0; }
   int takeReading() { return std::exchange(ends[0], -1); }
-  void closeWriting() { ::close(std::exchange(ends[1], -1)); }
 };
 
 // What the child needs, made before it is there: between fork and exec nothing may take memory.
@@ -73,17 +72,6 @@ bool redirect(const Preparation& prepared) {
   const int failure = errno;
   const ssize_t written = ::write(prepared.failure, &failure, sizeof failure);
   ::_exit(written == sizeof failure ? kNotRun : kNotRun + 1);
-}
-
-// What kept the child from running the program; 0: nothing.
-int failureOf(Pipe* failure) {
-  failure->closeWriting();
-  int number = 0;
-  ssize_t count = -1;
-  do {
-    count = ::read(failure->ends[0], &number, sizeof number);
-  } while (count < 0 && errno == EINTR);
-  return count == sizeof number ? number : 0;
 }
 
 void readStream(ChildProcess::Stream* stream) {
@@ -127,17 +115,16 @@ std::unique_ptr<ChildProcess> ChildProcess::start(const std::vector<std::string>
     rememberChild(process);
     child->process_ = process;
   }
-  *failure = failureOf(&starting);
-  if (*failure != 0) return nullptr;
-  for (const Pipe* pipe : {&out, &err}) ::fcntl(pipe->ends[0], F_SETFL, O_NONBLOCK);
+  for (const Pipe* pipe : {&out, &err, &starting}) ::fcntl(pipe->ends[0], F_SETFL, O_NONBLOCK);
+  child->starting_ = starting.takeReading();
   child->out_.descriptor = out.takeReading();
   child->err_.descriptor = err.takeReading();
   return child;
 }
 
 ChildProcess::~ChildProcess() {
-  for (const Stream* stream : {&out_, &err_}) {
-    if (stream->descriptor >= 0) ::close(stream->descriptor);
+  for (const int descriptor : {out_.descriptor, err_.descriptor, starting_}) {
+    if (descriptor >= 0) ::close(descriptor);
   }
   if (process_ < 0 || status_) return;
   kill();
@@ -165,6 +152,11 @@ std::optional<int> ChildProcess::ended() {
     status_ = status;
   }
   return status_;
+}
+
+int ChildProcess::notRun() {
+  int number = 0;
+  return ::read(starting_, &number, sizeof number) == sizeof number ? number : 0;
 }
 
 }  // namespace mayascene

@@ -22,7 +22,8 @@ class ChildProcess {
 
   // Runs the program command[0], a path, with the words. It reads nothing, may take so many bytes of address
   // space (0: as many as this process), and ends when this process does, however that ends. The three
-  // standard descriptors of this process are open. Null with an errno in *failure when it cannot be started.
+  // standard descriptors of this process are open. Null with an errno in *failure when there can be no child.
+  // Whether it can run the program is not waited for: that shows at its end.
   static std::unique_ptr<ChildProcess> start(const std::vector<std::string>& command, std::uint64_t memory,
                                              int* failure);
 
@@ -42,11 +43,15 @@ class ChildProcess {
   // How it ended, in the form of waitpid; nothing while it runs.
   std::optional<int> ended();
 
+  // Of a child that has ended: the errno for which it could not run the program; 0: it did.
+  int notRun();
+
  private:
   ChildProcess() = default;
 
   pid_t process_ = -1;
   std::optional<int> status_;
+  int starting_ = -1;  // brings the errno of a program that cannot be run
   Stream out_, err_;
 };
 

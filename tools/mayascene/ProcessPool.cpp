@@ -145,6 +145,10 @@ class Run {
     end.kind = WIFSIGNALED(status) ? ChildEnd::Kind::Signalled : ChildEnd::Kind::Exited;
     end.number = WIFSIGNALED(status) ? WTERMSIG(status) : WEXITSTATUS(status);
     if (tooMuch(*one->child)) end.kind = ChildEnd::Kind::TooMuchOutput;
+    if (const int failure = one->child->notRun(); failure != 0) {
+      end.kind = ChildEnd::Kind::NotStarted;
+      end.number = failure;
+    }
     // It may have come to its end just before it was killed: then that counts.
     if (one->killedAs && WIFSIGNALED(status)) end.kind = *one->killedAs;
     end.out = std::move(one->child->out().text);
