@@ -20,6 +20,20 @@ constexpr std::string_view kChannelNames[kSlotCount] = {
 
 bool IsRotation(std::size_t slot) { return slot >= kRotateX && slot <= kRotateZ; }
 
+// Whether a constraint gives one of the angles. It knows no turns: they jump where it passes half a turn.
+bool IsTurnedByConstraint(const scene::Scene& scene, scene::NodeId node) {
+  return std::any_of(kChannelNames + kRotateX, kChannelNames + kRotateZ + 1, [&](std::string_view channel) {
+    const auto driver = scene.SourceOf(scene.PlugOf(node, channel));
+    return driver && scene.node(driver->plug.node).type.ends_with("Constraint");
+  });
+}
+
+// The angle, in degrees, by whole turns as near to the one of the frame before as it can be.
+double NextTo(double before, double angle) {
+  constexpr double kTurn = 360.0;
+  return angle - kTurn * std::round((angle - before) / kTurn);
+}
+
 double LargestMagnitude(const Channel& channel) {
   double largest = 0.0;
   for (const double value : channel.values) largest = std::max(largest, std::fabs(value));
@@ -38,6 +52,7 @@ std::size_t Sampler::AddLocal(scene::NodeId node) {
     for (std::size_t slot = 0; slot < kSlotCount; ++slot) {
       source.numbers[slot] = evaluator_->Number(node, kChannelNames[slot]);
     }
+    source.turned = IsTurnedByConstraint(evaluator_->scene(), node);
   } else {
     source.matrix = evaluator_->InParent(node);
   }
@@ -126,8 +141,13 @@ void Sampler::SampleNumbers(const Source& source, bool first, Track* track) {
   const bool inDegrees = std::fabs(degrees - 1.0) < kMatrixRounding;
   for (std::size_t slot = 0; slot < kSlotCount; ++slot) {
     if (!first && !evaluator_->Moves(source.numbers[slot])) continue;
-    const double value = evaluator_->Value(source.numbers[slot]);
-    track->channels[slot].values.push_back(IsRotation(slot) && !inDegrees ? value * degrees : value);
+    std::vector<double>& values = track->channels[slot].values;
+    double value = evaluator_->Value(source.numbers[slot]);
+    if (IsRotation(slot)) {
+      if (!inDegrees) value *= degrees;
+      if (source.turned && !values.empty()) value = NextTo(values.back(), value);
+    }
+    values.push_back(value);
   }
 }
 

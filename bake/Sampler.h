@@ -49,6 +49,7 @@ class Sampler {
     std::array<motion::NumberId, kSlotCount> numbers{};
     std::optional<motion::MatrixId> matrix;
     bool scaled = true;
+    bool turned = false;    // by a constraint
     motion::Vector angles;  // of the frame before, in radians
   };
   struct LensSource {

@@ -5,6 +5,9 @@
 namespace bake {
 namespace {
 
+// What a suffix may take: "_" and ten digits.
+constexpr std::size_t kSuffixRoom = 11;
+
 // The importer drops a camera of this name.
 constexpr std::string_view kDropped = "perspshape";
 
@@ -39,13 +42,14 @@ std::string UniqueNames::Take(std::string_view wanted) {
       base.begin(), base.end(), [](char c) { return !MayStand(c); }, '_');
   if (base.empty()) base = "node";
   base = CutTo(base, kLongest);
-  std::string name = base;
-  std::uint64_t& number = next_.try_emplace(Lowered(base), 2).first->second;
-  while (!taken_.insert(Lowered(name)).second) {
-    const std::string suffix = "_" + std::to_string(number++);
-    name = CutTo(base, kLongest - suffix.size());
-    name += suffix;
-  }
+  if (taken_.insert(Lowered(base)).second) return base;
+  // Long names count together where they begin alike: each by itself would try all numbers of the others.
+  const std::string stem(CutTo(base, kLongest - kSuffixRoom));
+  std::uint64_t& number = next_.try_emplace(Lowered(stem), 2).first->second;
+  std::string name;
+  do {
+    name = stem + "_" + std::to_string(number++);
+  } while (!taken_.insert(Lowered(name)).second);
   return name;
 }
 

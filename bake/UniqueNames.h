@@ -22,8 +22,9 @@ class UniqueNames {
   std::string Take(std::string_view wanted);
 
  private:
-  std::unordered_set<std::string> taken_;                // in lower case
-  std::unordered_map<std::string, std::uint64_t> next_;  // by name in lower case: the number to try
+  std::unordered_set<std::string> taken_;  // in lower case
+  std::unordered_map<std::string, std::uint64_t>
+      next_;  // by the name's beginning in lower case: the number to try
 };
 
 }  // namespace bake

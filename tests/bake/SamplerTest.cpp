@@ -12,6 +12,7 @@ namespace {
 
 using bake::Link;
 using bake_test::CurveOf;
+using testing::DoubleNear;
 using testing::ElementsAre;
 using testing::IsEmpty;
 using testing::SizeIs;
@@ -81,6 +82,27 @@ TEST(Chains, ALinkComesAfterThoseAboveItAndEachOnce) {
   EXPECT_EQ(chains.Add(scene::kNoNode), Link::kNone);
   EXPECT_EQ(chains.links()[0].node, read.At("top"));
   EXPECT_EQ(chains.links()[2].above, 0u);
+}
+
+constexpr char kHeld[] =
+    "createNode transform -n \"held\";\ncreateNode transform -n \"target\";\n"
+    "createNode orientConstraint -n \"hold\" -p \"held\";\nconnectAttr \"target.r\" \"hold.tg[0].tr\";\n"
+    "connectAttr \"hold.cr\" \"held.r\";\n";
+
+TEST(Sampler, TheAnglesOfAConstraintGoOnPastHalfATurn) {
+  Read read(kHeld + CurveOf("animCurveTA", "c", "1 170 3 190", "target.rz"));
+  const std::size_t track = read.sampler.AddLocal(read.At("held"));
+  read.sampler.Run(kRange);
+  EXPECT_THAT(read.sampler.track(track).channels[bake::kRotateZ].values,
+              ElementsAre(DoubleNear(170, 1e-12), DoubleNear(180, 1e-12), DoubleNear(190, 1e-12)));
+}
+
+TEST(Sampler, TheAnglesOfACurveStayHoweverFastItTurns) {
+  Read read("createNode transform -n \"a\";\n" + CurveOf("animCurveTA", "c", "1 0 3 1440", "a.rz"));
+  const std::size_t track = read.sampler.AddLocal(read.At("a"));
+  read.sampler.Run(kRange);
+  EXPECT_THAT(read.sampler.track(track).channels[bake::kRotateZ].values,
+              ElementsAre(0, DoubleNear(720, 1e-9), 1440));
 }
 
 TEST(Chains, WhatHoldsAboveHoldsBelow) {

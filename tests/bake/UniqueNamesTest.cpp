@@ -53,7 +53,18 @@ TEST(UniqueNames, ALongNameIsCutAt200BytesAlsoWithANumber) {
   UniqueNames names;
   const std::string name(300, 'x');
   EXPECT_EQ(names.Take(name), std::string(200, 'x'));
-  EXPECT_EQ(names.Take(name), std::string(198, 'x') + "_2");
+  EXPECT_EQ(names.Take(name), std::string(189, 'x') + "_2");
+}
+
+// Each would try all numbers of those before it.
+TEST(UniqueNames, LongNamesThatBeginAlikeCountTogether) {
+  UniqueNames names;
+  const std::string beginning(195, 'x');
+  for (int i = 10'000; i < 30'000; ++i) {
+    const std::string name = beginning + std::to_string(i);
+    EXPECT_EQ(names.Take(name), name);
+    EXPECT_EQ(names.Take(name), std::string(189, 'x') + "_" + std::to_string(i - 10'000 + 2));
+  }
 }
 
 TEST(UniqueNames, NoCharacterIsCutInTwo) {
