@@ -81,19 +81,16 @@ Value Scene::ValueOf(const Setting& setting, std::size_t component) const {
 std::optional<Value> Scene::Written(NodeId node, std::string_view attribute, std::int32_t index) const {
   const Plug plug = PlugOf(node, attribute, index);
   const Form form = FormOf(node, plug.attribute);
-  const std::size_t compoundWidth = form.compound.empty() ? 1 : FormOf(node, form.compound).width;
-  std::optional<Value> value;
-  for (std::uint32_t at = lists_[node].firstSetting; at != kNone; at = settings_[at].next) {
-    const Setting& setting = settings_[at];
-    const bool own = setting.attribute == plug.attribute;
-    if (!own && (form.compound.empty() || setting.attribute != form.compound)) continue;
-    if (index < setting.first || index > setting.last) continue;
-    // How many numbers an element has, and which of them is asked for.
-    const std::size_t width = own ? form.width : compoundWidth;
-    const auto element = static_cast<std::size_t>(index - setting.first);
-    value = ValueOf(setting, element * width + static_cast<std::size_t>(own ? 0 : form.component));
-  }
-  return value;
+  const std::uint32_t own = settingIndex_.Find(settings_, plug);
+  const std::uint32_t whole =
+      form.compound.empty() ? kNone : settingIndex_.Find(settings_, {node, form.compound, index});
+  if (own == kNone && whole == kNone) return std::nullopt;
+  // The later one counts. How many numbers an element has, and which of them is asked for, depends on it.
+  const bool byCompound = whole != kNone && (own == kNone || own < whole);
+  const Setting& setting = settings_[byCompound ? whole : own];
+  const std::size_t width = byCompound ? FormOf(node, form.compound).width : form.width;
+  const auto element = static_cast<std::size_t>(index - setting.first);
+  return ValueOf(setting, element * width + static_cast<std::size_t>(byCompound ? form.component : 0));
 }
 
 std::vector<std::string_view> Scene::TouchedAttributes(NodeId node) const {

@@ -19,6 +19,7 @@
 #include "scene/FlatMap.h"
 #include "scene/Names.h"
 #include "scene/Plug.h"
+#include "scene/SettingIndex.h"
 #include "scene/Value.h"
 
 namespace scene {
@@ -124,7 +125,7 @@ class Scene {
   Plug PlugOf(NodeId node, std::string_view attribute, std::int32_t index) const;
 
   // What the file sets: the last value for the attribute, its compound included. With an index, that
-  // element's. Looks at everything that is set on the node.
+  // element's. The time does not depend on how much is set on the node, but for its logarithm.
   std::optional<Value> Written(NodeId node, std::string_view attribute, std::int32_t index = kNoIndex) const;
 
   // The number that is written, or the attribute's default. None where what is written cannot be read, and
@@ -166,18 +167,8 @@ class Scene {
  private:
   friend class SceneBuilder;
 
-  static constexpr std::uint32_t kNone = 0xffffffff;
+  static constexpr std::uint32_t kNone = Setting::kNone;
 
-  // What one setAttr says.
-  struct Setting {
-    std::string_view attribute;
-    NodeId node;
-    std::uint32_t value;
-    std::uint32_t valueLength;
-    std::int32_t first;
-    std::int32_t last;
-    std::uint32_t next = kNone;  // of the same node
-  };
   // The ends of a node's lists.
   struct Lists {
     std::uint32_t firstSetting = kNone;
@@ -211,6 +202,7 @@ class Scene {
   std::vector<Node> nodes_;
   std::vector<Lists> lists_;  // by node
   std::vector<Setting> settings_;
+  SettingIndex settingIndex_;
   std::vector<Connection> connections_;
   std::vector<ConnectionLinks> connectionLinks_;
   std::vector<AddedAttribute> added_;

@@ -102,6 +102,7 @@ class SceneBuilder {
   FlatMap<Scene::IndexOfOne> appended_;       // connections made with -na, by both ends
   FlatMap<Scene::IndexOfOne> referenceByName_;
   FlatMap<Scene::IndexOfOne> referenceBySpace_;
+  FlatMap<Scene::IndexOfOne> referenceOfFoster_;  // the node that a fosterParent is connected to last
 };
 
 }  // namespace scene

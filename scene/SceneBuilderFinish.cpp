@@ -45,7 +45,7 @@ void SceneBuilder::ReplaceForward(const std::vector<NodeId>& replacement) {
     node.parent = replacement[node.parent];
     scene_.names_.AddInstance(id, node.parent, node.name);
   }
-  for (Scene::Setting& setting : scene_.settings_) {
+  for (Setting& setting : scene_.settings_) {
     if (replacement[setting.node] == setting.node) continue;
     // Its attribute may be known by now under another name.
     setting.node = replacement[setting.node];
@@ -101,6 +101,7 @@ void SceneBuilder::LinkSettings() {
     (lists.lastSetting == Scene::kNone ? lists.firstSetting : scene_.settings_[lists.lastSetting].next) = at;
     lists.lastSetting = at;
   }
+  scene_.settingIndex_ = SettingIndex(scene_.settings_, scene_.nodes_.size());
 }
 
 void SceneBuilder::LinkConnections() {
@@ -113,6 +114,9 @@ void SceneBuilder::LinkConnections() {
     Scene::Lists& from = scene_.lists_[connection.source.node];
     (from.lastFrom == Scene::kNone ? from.firstFrom : scene_.connectionLinks_[from.lastFrom].nextFrom) = at;
     from.lastFrom = at;
+    const bool foster = scene_.nodes_[connection.source.node].type == "fosterParent";
+    if (!foster || connection.destination.attribute != "fosterParent") continue;
+    referenceOfFoster_.At(connection.source.node, {}).plusOne = connection.destination.node + 1;
   }
 }
 
@@ -121,12 +125,10 @@ std::string_view SceneBuilder::ReferencedFileOf(NodeId parent) const {
   const Node& node = scene_.nodes_[parent];
   const Scene::IndexOfOne* found = nullptr;
   if (node.type == "fosterParent") {
-    // Its connection names the reference; where there is none, its own name does.
-    found = referenceByName_.Find(0, node.name.substr(0, node.name.rfind(node.type)));
-    for (const Connection* const connection : scene_.ConnectionsFrom(parent)) {
-      if (connection->destination.attribute != "fosterParent") continue;
-      found = referenceByName_.Find(0, scene_.nodes_[connection->destination.node].name);
-    }
+    // Its last connection names the reference; where there is none, its own name does.
+    const Scene::IndexOfOne* const connected = referenceOfFoster_.Find(parent, {});
+    found = referenceByName_.Find(0, connected == nullptr ? node.name.substr(0, node.name.rfind(node.type))
+                                                          : scene_.nodes_[connected->plusOne - 1].name);
   } else {
     const std::size_t bar = node.name.rfind('|');
     const std::string_view own = bar == std::string_view::npos ? node.name : node.name.substr(bar + 1);

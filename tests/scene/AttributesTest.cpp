@@ -119,6 +119,20 @@ TEST_F(AttributesTest, ElementsOfAnArrayOfCompoundsAreTold) {
   EXPECT_EQ(scene_.Number(0, "targetWeight", 0), 1.0);
 }
 
+TEST_F(AttributesTest, TheLastCommandThatReachesAnElementCounts) {
+  Read(
+      "createNode parentConstraint -n \"p\";setAttr \".tg[3].totx\" 30;"
+      "setAttr \".tg[2:4].tot\" 21 22 23 31 32 33 41 42 43;setAttr \".tg[2].totz\" 20;"
+      "setAttr \".tg[4:9].totz\" 40;");
+  EXPECT_EQ(scene_.Number(0, "totx", 3), 31.0);
+  EXPECT_EQ(scene_.Number(0, "totz", 2), 20.0);
+  EXPECT_EQ(scene_.Number(0, "totz", 3), 33.0);
+  EXPECT_EQ(scene_.Number(0, "totz", 4), 40.0);
+  EXPECT_EQ(scene_.Number(0, "totz", 5), std::nullopt);
+  EXPECT_EQ(scene_.Number(0, "toty", 4), 42.0);
+  EXPECT_EQ(scene_.Number(0, "totx", 5), 0.0);
+}
+
 TEST_F(AttributesTest, AddedAttributesHaveTheirNamesAndDefaults) {
   Read(
       "createNode transform -n \"a\";\naddAttr -ci true -k true -sn \"w0\" -ln \"targetW0\" -dv 0.5 -min 0 "

@@ -125,6 +125,53 @@ TEST_F(ScaleTest, ConnectionsMadeAndTakenOut) {
   EXPECT_EQ(SourceOf("b", "i[99999]"), "a.translateX");
 }
 
+TEST_F(ScaleTest, TargetsOfOneConstraint) {
+  ReadInTime("createNode parentConstraint -n \"p\";\n" + Repeated([](const std::string& i) {
+               return "setAttr \".tg[" + i + "].tw\" " + i + ";setAttr \".tg[" + i +
+                      "].tot\" -type \"double3\" 1 " + i + " 3;\n";
+             }));
+  double weights = 0.0;
+  double offsets = 0.0;
+  const std::clock_t before = std::clock();
+  for (std::int32_t i = 0; i < kMany; ++i) {
+    weights += *scene_.Number(0, "tw", i);
+    offsets += *scene_.Number(0, "toty", i);
+  }
+  EXPECT_LT(static_cast<double>(std::clock() - before) / CLOCKS_PER_SEC, kMostSeconds);
+  EXPECT_EQ(weights, kMany * (kMany - 1.0) / 2);
+  EXPECT_EQ(offsets, weights);
+}
+
+// Each range lies within the one before it.
+TEST_F(ScaleTest, RangesWithinRanges) {
+  ReadInTime("createNode animCurveTL -n \"k\";\n" + Repeated([](const std::string& i) {
+               return "setAttr \".kit[" + i + ":" + std::to_string(2 * kMany - std::stoi(i)) + "]\" " + i +
+                      ";\n";
+             }));
+  EXPECT_EQ(scene_.Number(0, "kit", 77777), 77777.0);
+  EXPECT_TRUE(scene_.Written(0, "kit", 2 * kMany));
+  EXPECT_FALSE(scene_.Written(0, "kit", 2 * kMany + 1));
+}
+
+TEST_F(ScaleTest, OneElementSetAgainAndAgain) {
+  ReadInTime("createNode animCurveTL -n \"k\";\n" +
+             Repeated([](const std::string& i) { return "setAttr \".kit[7]\" " + i + ";\n"; }));
+  EXPECT_EQ(scene_.Number(0, "kit", 7), 99999.0);
+}
+
+TEST_F(ScaleTest, ChildrenAndConnectionsOfOneFosterParent) {
+  ReadInTime(
+      "file -rdi 1 -rfn \"heroRN\" \"hero.ma\";createNode reference -n \"heroRN\";\n"
+      "createNode fosterParent -n \"f\";\n" +
+      Repeated([](const std::string& i) {
+        return "createNode transform -n \"n" + i + "\" -p \"f\";\nconnectAttr \"f.t\" \"n" + i + ".t\";\n";
+      }) +
+      "connectAttr \"f.msg\" \"heroRN.fp\";\n");
+  EXPECT_EQ(collector().CountOf(diag::Code::ParentInReference), std::uint64_t{kMany});
+  EXPECT_THAT(Diagnostics(),
+              testing::Contains(testing::HasSubstr("belongs to the referenced file \"hero.ma\"")));
+}
+
 TEST_F(ScaleTest, NodesFromElsewhere) {
   ReadInTime("file -r -ns \"h\" \"h.ma\";\n" + Repeated([](const std::string& i) {
                return "connectAttr \"h:n" + i + ".t\" \"z" + i + ".t\";\ncreateNode transform -n \"z" + i +
