@@ -56,6 +56,7 @@ enum class Code : std::uint16_t {
   LinearInfinityAtLinearKey = 308,
   PlateauBesideOvershoot = 309,
   QuaternionCurve = 310,
+  KeysByComponent = 311,
   // What drives a channel: diag/DriverCodes.cpp
   UnsupportedDriver = 401,
   DriverWithoutAnswer = 402,

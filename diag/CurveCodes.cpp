@@ -97,6 +97,15 @@ constexpr Entry kCurveCodes[] = {
                 "\".ktv[0:1]\"  1 0 24 90;\n  setAttr \".roti\" 3;",
      .help =
          "Bake the rotation where the scene was made, or set its interpolation to independent Euler angles."},
+    {.code = Code::KeysByComponent,
+     .severity = Severity::Warning,
+     .symbol = "KeysByComponent",
+     .sentence = "\"{0}\" has keys whose time and value are set apart, which are not read",
+     .meaning = "A key is read where its time and its value are set as a pair. A time or a value that is set "
+                "alone changes no key.",
+     .example = "createNode animCurveTL -n \"shotCam_translateX\";\n  setAttr \".ktv[0].kt\" 1;\n  setAttr "
+                "\".ktv[0].kv\" 10;",
+     .help = "Export the scene again, or write each key of \"{0}\" as a pair of time and value."},
 };
 
 }  // namespace

@@ -41,6 +41,10 @@ constexpr DoubtCode kDoubtCodes[] = {
     {CurveDoubt::kRotationInterpolation, diag::Code::QuaternionCurve},
 };
 
+bool SetsKeysByComponent(const scene::Scene& scene, scene::NodeId node) {
+  return !scene.Pieces(node, "keyTime").empty() || !scene.Pieces(node, "keyValue").empty();
+}
+
 }  // namespace
 
 std::unique_ptr<NumberStep> MakeCurve(Binder* binder) {
@@ -55,6 +59,7 @@ std::unique_ptr<NumberStep> MakeCurve(Binder* binder) {
   for (const DoubtCode& entry : kDoubtCodes) {
     if ((doubts & static_cast<unsigned>(entry.doubt)) != 0) binder->ReportNode(entry.code);
   }
+  if (SetsKeysByComponent(binder->scene(), binder->node())) binder->ReportNode(diag::Code::KeysByComponent);
   return step;
 }
 

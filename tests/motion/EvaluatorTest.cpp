@@ -102,6 +102,16 @@ TEST_F(EvaluatorTest, KeysOfScatteredIndicesComeInTheOrderOfTheirTimes) {
   EXPECT_NEAR(Number("rig", "tx", 15.0), 150.0, kRounding);
 }
 
+TEST_F(EvaluatorTest, KeysThatAreSetByTheirComponentsAreReported) {
+  for (const char* set : {".ktv[1].kt\" 12", ".keyTimeValue[1].keyTime\" 12", ".ktv[1].kv\" 7",
+                          ".keyTimeValue[1].keyValue\" 7"}) {
+    Read(std::string(kLine) + "setAttr \"" + set + ";\ncreateNode transform -n \"rig\";\n" +
+         "connectAttr \"line.o\" \"rig.tx\";\n");
+    EXPECT_EQ(Number("rig", "tx", 6.0), 6.0) << set;
+    EXPECT_THAT(Diagnostics(), testing::ElementsAre(testing::HasSubstr("[MA0311]"))) << set;
+  }
+}
+
 TEST_F(EvaluatorTest, AChannelPassesOnToAnother) {
   Read(std::string(kLine) +
        "createNode transform -n \"a\";\ncreateNode transform -n \"b\";\ncreateNode transform -n \"c\";\n"
