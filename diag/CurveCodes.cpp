@@ -67,7 +67,7 @@ constexpr Entry kCurveCodes[] = {
          "A curve of one key cannot cycle or go on in a direction. The key's value is used at all times.",
      .example = "createNode animCurveTL -n \"shotCam_translateX\";\n  setAttr \".tan\" 9;\n  setAttr "
                 "\".ktv[0]\"  1 10;\n  setAttr \".pst\" 3;",
-     .help = "Nothing."},
+     .help = "Nothing has to be done."},
     {.code = Code::LinearInfinityAtLinearKey,
      .severity = Severity::Warning,
      .symbol = "LinearInfinityAtLinearKey",

@@ -11,7 +11,8 @@ constexpr Entry kLossCodes[] = {
      .sentence = "the orthographic camera \"{0}\" does not come over",
      .meaning = "A camera of a composition has a perspective. The importer leaves orthographic cameras out.",
      .example = "createNode camera -n \"planShape\" -p \"plan\";\n  setAttr \".o\" yes;",
-     .help = "Nothing, unless the shot is seen through it: then give the camera a very long lens and move it "
+     .help = "Nothing has to be done, unless the shot is seen through it: then give the camera a very long "
+             "lens and move it "
              "far away."},
     {.code = Code::StartupCameras,
      .severity = Severity::Note,
@@ -21,7 +22,8 @@ constexpr Entry kLossCodes[] = {
          "persp, top, front and side are the cameras of the viewports. The importer knows the first by its "
          "name, and the others because they are orthographic.",
      .example = "createNode camera -s -n \"perspShape\" -p \"persp\";",
-     .help = "Nothing, unless one of them is the camera of the shot: then duplicate it in Maya under another "
+     .help = "Nothing has to be done, unless one of them is the camera of the shot: then duplicate it in "
+             "Maya under another "
              "name."},
     {.code = Code::CameraNotImported,
      .severity = Severity::Warning,

@@ -69,7 +69,7 @@ constexpr Entry kNodeCodes[] = {
      .sentence = "the command \"{0}\" names \"{1}\", which the file does not create",
      .meaning = "The command changes a node that is not in this file. It does nothing.",
      .example = "rename \"oldCam\" \"shotCam\";",
-     .help = "Nothing, unless the node matters. It may stand in a referenced file."},
+     .help = "Nothing has to be done, unless the node matters. It may stand in a referenced file."},
     {.code = Code::AlreadyConnected,
      .severity = Severity::Note,
      .symbol = "AlreadyConnected",
@@ -99,9 +99,9 @@ constexpr Entry kNodeCodes[] = {
      .sentence = "the referenced file \"{0}\" is not read",
      .meaning = "The scene takes nodes from another file. Those nodes are not known.",
      .example = "file -r -ns \"hero\" -rfn \"heroRN\" \"hero.ma\";",
-     .help =
-         "Nothing, unless a camera or its parent stands in that file: then import the referenced file into "
-         "the scene before the export."},
+     .help = "Nothing has to be done, unless a camera or its parent stands in that file: then import the "
+             "referenced file into "
+             "the scene before the export."},
     {.code = Code::SameNames,
      .severity = Severity::Warning,
      .symbol = "SameNames",

@@ -130,7 +130,8 @@ constexpr Entry kPictureCodes[] = {
          "The importer takes distances as they stand in the file. Scenes in other units come over in another "
          "size than one in centimetres.",
      .example = "currentUnit -l meter -a degree -t film;",
-     .help = "Nothing, unless cameras from several scenes have to fit together: then set the same unit in "
+     .help = "Nothing has to be done, unless cameras from several scenes have to fit together: then set the "
+             "same unit in "
              "all of them, "
              "or import with --linear-units 1."},
     {.code = Code::BeyondCompositionTime,
