@@ -14,7 +14,7 @@ inline constexpr std::size_t kQuoteCount = 2;  // of a string token
 
 // How many bytes of a token are taken: all, or none of one that is too long. Quotes count.
 inline std::size_t TakenLength(const char* first, const char* last) {
-  const auto length = static_cast<std::size_t>(last - first) + 1;
+  const auto length = static_cast<std::size_t>(last - first + 1);
   return length <= kLongestToken ? length : 0;
 }
 

@@ -16,6 +16,7 @@
 
 #include <cmath>
 #include <cstdint>
+#include <deque>
 #include <memory>
 #include <span>
 #include <string>
@@ -132,6 +133,7 @@ class Evaluator {
   // ---- cells and what writes them: EvaluatorCells.cpp ----
 
   NumberId Reserve(const scene::Plug& plug);
+  scene::Plug WithLastingName(const scene::Plug& plug);
   const NodeType* TypeOfOutput(const scene::Plug& plug) const;
   MatrixId ReserveMatrix(scene::Plug plug);
   void Settle();
@@ -168,6 +170,7 @@ class Evaluator {
   Measures measures_;
   std::vector<Cell> numbers_;
   std::vector<Cell> matrices_;
+  std::deque<std::string> unknownNames_;
   scene::FlatMap<CellOfPlug> numberOfPlug_;
   scene::FlatMap<CellOfPlug> matrixOfPlug_;
   std::vector<std::unique_ptr<Step>> steps_;

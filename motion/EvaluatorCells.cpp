@@ -41,9 +41,17 @@ NumberId Evaluator::Reserve(const Plug& plug) {
     MakeNode(*type, plug.node);
     return static_cast<NumberId>(numberOfPlug_.At(KeyOf(plug), plug.attribute).plusOne - 1);
   }
-  const NumberId id = AddNumber(plug);
+  const NumberId id = AddNumber(WithLastingName(plug));
   pendingNumbers_.push_back(id);
   return id;
+}
+
+// A plug whose attribute nobody knows has the name by which it was asked for, and that may be put together on
+// the spot: the evaluator keeps its own.
+Plug Evaluator::WithLastingName(const Plug& plug) {
+  if (scene::FindAttribute(scene_.node(plug.node).type, plug.attribute) != nullptr) return plug;
+  if (scene_.Added(plug.node, plug.attribute) != nullptr) return plug;
+  return {plug.node, unknownNames_.emplace_back(plug.attribute), plug.index};
 }
 
 // Null where the plug is nothing that a node computes.

@@ -129,7 +129,8 @@ ChildProcess::~ChildProcess() {
   if (process_ < 0 || status_) return;
   kill();
   const HeldSignals held;
-  while (::waitpid(process_, nullptr, 0) < 0 && errno == EINTR) continue;
+  while (::waitpid(process_, nullptr, 0) < 0 && errno == EINTR) {
+  }
   forgetChild(process_);
 }
 
