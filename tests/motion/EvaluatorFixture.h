@@ -16,6 +16,11 @@
 
 namespace testmotion {
 
+// A straight line from 0 at frame 0 to 24 at frame 24, whatever a channel measures.
+inline constexpr char kLine[] =
+    "createNode animCurveTL -n \"line\";\n"
+    "setAttr \".tan\" 2;\nsetAttr \".wgt\" no;\nsetAttr -s 2 \".ktv[0:1]\"  0 0 24 24;\n";
+
 class EvaluatorTest : public testing::Test {
  protected:
   void Read(std::string_view text) {

@@ -3,14 +3,13 @@
 #include <CLI/CLI.hpp>
 #include <algorithm>
 #include <filesystem>
-#include <map>
 #include <optional>
 #include <string>
 #include <string_view>
 #include <system_error>
 
-#include "refhost/Rehearsal.h"
 #include "tools/mayascene/BakeWords.h"
+#include "tools/mayascene/HostWords.h"
 #include "tools/mayascene/Interruption.h"
 #include "tools/mayascene/OutputFile.h"
 #include "tools/mayascene/TerminalText.h"
@@ -19,13 +18,11 @@
 namespace mayascene {
 namespace {
 
-constexpr std::int32_t kMostZoomKeys = 1'000'000;
-constexpr std::int64_t kMostMemory = INT64_MAX - 1;  // a number that is too large is read as the largest one
 constexpr double kLeastTimeout = 0.001;
 constexpr double kMostTimeout = 1e6;
 constexpr std::size_t kNameColumn = 36;
 
-// A text in lines of at most `width`, all but the first behind `indent` blanks.
+// A text in lines of at most `width`, all but the first after `indent` blanks.
 std::string wrapped(std::string_view text, std::size_t indent, std::size_t width) {
   std::string lines;
   while (indent + text.size() > width) {
@@ -46,97 +43,6 @@ std::string exitStatuses() {
   }
   return text + "With several scenes it is the highest of theirs. A run that a signal ends has " +
          std::to_string(kSignalStatus) + " and the number\nof the signal.";
-}
-
-// The words of the command line before they are turned into what the host takes.
-struct Words {
-  std::vector<std::string> fail, failAt, throwing, throwAt, refuse;
-  std::string during;
-};
-
-template <typename Parsed>
-using Parser = std::optional<Parsed> (*)(std::string_view, std::string*);
-
-template <typename Parsed>
-void parseEach(const std::string& option, const std::vector<std::string>& words, Parser<Parsed> parse,
-               std::vector<Parsed>* parsed) {
-  for (const std::string& word : words) {
-    std::string complaint;
-    std::optional<Parsed> one = parse(word, &complaint);
-    if (!one) throw CLI::ValidationError(option, complaint);
-    parsed->push_back(std::move(*one));
-  }
-}
-
-CLI::Option* addRepeated(CLI::App* verb, const std::string& name, std::vector<std::string>* words,
-                         const std::string& form, const std::string& description) {
-  return verb->add_option(name, *words, description)->allow_extra_args(false)->option_text(form + " ...");
-}
-
-void addPreferences(CLI::App* verb, std::string* file) {
-  verb->add_option("--preferences", *file, "the preference store, instead of the user's own")
-      ->option_text("FILE");
-}
-
-void addUnits(CLI::App* verb, HostArguments* host) {
-  verb->add_option(
-          "--linear-units", host->linearUnits,
-          "for this run: 1 converts distances from the scene's\nlinear unit to points, 0 takes them as "
-          "they stand")
-      ->option_text("N");
-  addPreferences(verb, &host->preferences);
-}
-
-void addHostOptions(CLI::App* verb, HostArguments* host, Words* words) {
-  addUnits(verb, host);
-  verb->add_option("--translations", host->translations, "the host's translations, lines of KEY=TEXT")
-      ->option_text("FILE");
-  verb->add_option("--module", host->module, "the import module, instead of the one beside the tool")
-      ->option_text("FILE");
-  verb->add_option("--trace", host->trace, "write every call of the importer; - is standard output")
-      ->option_text("FILE");
-  verb->add_option("--plugin-id", host->pluginId, "the plug-in id that the host gives (1)")->option_text("N");
-  verb->add_flag("--permissive", host->permissive, "record any number instead of refusing it");
-
-  constexpr const char* group = "Rehearsing failures";
-  addRepeated(verb, "--fail", &words->fail, "OPERATION:NTH=CODE",
-              "the NTH call (0: each) of the operation fails with CODE")
-      ->group(group);
-  addRepeated(verb, "--fail-at", &words->failAt, "K[+]=CODE",
-              "the K-th suite call fails with CODE; +: and all after it")
-      ->group(group);
-  addRepeated(verb, "--throw", &words->throwing, "OPERATION:NTH=KIND",
-              "the call throws instead: bad_alloc, runtime_error or other")
-      ->group(group);
-  addRepeated(verb, "--throw-at", &words->throwAt, "K[+]=KIND", "the K-th suite call throws")->group(group);
-  addRepeated(verb, "--refuse", &words->refuse, "SUITE:VERSION", "the suite cannot be acquired")
-      ->group(group);
-  verb->add_option("--zoom-keys", host->zoomKeys, "keys that each new camera layer has on its zoom")
-      ->option_text("N")
-      ->check(CLI::Range(std::int32_t{0}, kMostZoomKeys))
-      ->group(group);
-  verb->add_option("--during", words->during,
-                   "the callback that the rehearsal is for: entry, import,\nverify or death")
-      ->option_text("CALLBACK")
-      ->check(CLI::IsMember({"entry", "import", "verify", "death"}))
-      ->group(group);
-}
-
-// The defaults that the texts name are those of refhost::HostOptions.
-void addCeilings(CLI::App* verb, HostArguments* host) {
-  constexpr const char* group = "Ceilings";
-  verb->add_option("--most-layers", host->mostLayers, "layers that the project takes (2000000)")
-      ->option_text("N")
-      ->check(CLI::NonNegativeNumber)
-      ->group(group);
-  verb->add_option("--most-keys", host->mostKeys, "keys that the project takes (100000000)")
-      ->option_text("N")
-      ->check(CLI::NonNegativeNumber)
-      ->group(group);
-  verb->add_option("--most-memory", host->mostMemory, "bytes behind memory handles at one time (4294967296)")
-      ->option_text("N")
-      ->check(CLI::Range(std::int64_t{0}, kMostMemory))
-      ->group(group);
 }
 
 // The library's own range takes "nan" for a number in it.
@@ -161,19 +67,6 @@ std::vector<diag::Code> codesOf(const std::vector<std::string>& words) {
     codes.push_back(entry->code);
   }
   return codes;
-}
-
-void translateWords(const Words& words, HostArguments* host) {
-  parseEach<refhost::Failure>("--fail", words.fail, refhost::parseFail, &host->failures);
-  parseEach<refhost::Failure>("--fail-at", words.failAt, refhost::parseFailAt, &host->failures);
-  parseEach<refhost::Failure>("--throw", words.throwing, refhost::parseThrow, &host->failures);
-  parseEach<refhost::Failure>("--throw-at", words.throwAt, refhost::parseThrowAt, &host->failures);
-  parseEach<refhost::RefusedSuite>("--refuse", words.refuse, refhost::parseRefuse, &host->refusedSuites);
-  const std::map<std::string, refhost::Callback> callbacks = {{"entry", refhost::Callback::Entry},
-                                                              {"import", refhost::Callback::Import},
-                                                              {"verify", refhost::Callback::Verify},
-                                                              {"death", refhost::Callback::Death}};
-  if (!words.during.empty()) host->during = callbacks.at(words.during);
 }
 
 bool sameFile(const std::string& a, const std::string& b) {
@@ -241,7 +134,7 @@ struct CommandLine {
   BakeArguments bake;
   CheckArguments check;
   std::vector<std::string> onlyCodes;
-  Words importWords, verifyWords;
+  HostWords importHostWords, verifyHostWords;
   BakeWords importBakeWords, bakeWords;
   bool importBakes = false;
   std::string preferenceName, preferenceValue;
@@ -278,7 +171,7 @@ struct CommandLine {
         ->option_text("FILE");
     importVerb->add_flag("-q,--quiet", import.quiet, "print nothing but errors");
     importVerb->add_flag("--bake", importBakes, "bake each scene first: see mayascene bake");
-    addHostOptions(importVerb, &import.host, &importWords);
+    addHostOptions(importVerb, &import.host, &importHostWords);
     addCeilings(importVerb, &import.host);
     addBakeOptions(importVerb, &importBakeWords, "With --bake");
   }
@@ -305,7 +198,9 @@ struct CommandLine {
     checkVerb->add_option("--json", check.json, "write the reports; - is standard output")
         ->option_text("FILE");
     checkVerb->add_flag("--strict", check.strict, "warnings make the exit status 1");
-    addRepeated(checkVerb, "--only", &onlyCodes, "CODE", "this code alone, such as MA0701");
+    checkVerb->add_option("--only", onlyCodes, "this code alone, such as MA0701")
+        ->allow_extra_args(false)
+        ->option_text("CODE ...");
     checkVerb->add_flag("--all", check.options.all, "show all diagnostics, not 20 of each code");
     checkVerb->add_flag("-v,--verbose", check.verbose, "a line for each scene on standard error");
     checkVerb->add_flag("-q,--quiet", check.quiet, "print nothing but errors");
@@ -330,7 +225,7 @@ struct CommandLine {
     verifyVerb = app.add_subcommand("verify", "answer for each file whether the importer takes it");
     addScenes(verifyVerb, &verify.scenes);
     verifyVerb->add_flag("-q,--quiet", verify.quiet, "print nothing but errors");
-    addHostOptions(verifyVerb, &verify.host, &verifyWords);
+    addHostOptions(verifyVerb, &verify.host, &verifyHostWords);
   }
 
   void addPrefs() {
@@ -365,7 +260,7 @@ struct CommandLine {
       refuseEmptyValues(*verb);
     Arguments arguments;
     if (importVerb->parsed()) {
-      translateWords(importWords, &import.host);
+      translateHostWords(importHostWords, &import.host);
       translateImportBake();
       checkOutputs({{"--json", import.json},
                     {"--trace", import.host.trace},
@@ -381,7 +276,7 @@ struct CommandLine {
       checkOutputs({{"--json", check.json}}, check.scenes);
       arguments.check = check;
     } else if (verifyVerb->parsed()) {
-      translateWords(verifyWords, &verify.host);
+      translateHostWords(verifyHostWords, &verify.host);
       checkOutputs({{"--trace", verify.host.trace}}, verify.scenes);
       arguments.verify = verify;
     } else {
