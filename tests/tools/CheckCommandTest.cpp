@@ -2,8 +2,6 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include <fstream>
-#include <iterator>
 #include <nlohmann/json.hpp>
 #include <string>
 
@@ -123,14 +121,6 @@ TEST_F(CheckCommand, SeveralScenesAreOneDocument) {
   EXPECT_EQ(document["scenes"][1]["status"], 1);
   EXPECT_EQ(document["scenes"][2]["head"], nullptr);
   EXPECT_EQ(document["scenes"][2]["status"], 3);
-}
-
-TEST_F(CheckCommand, TheReadmeShowsAReportAsItIsPrinted) {
-  workingFolder = MAYASCENE_SOURCE_DIR;
-  const ToolResult check = run({"check", "tests/scenes/production/path_without_quotes.ma"});
-  std::ifstream in(std::string(MAYASCENE_SOURCE_DIR) + "/README.md", std::ios::binary);
-  const std::string readme{std::istreambuf_iterator<char>(in), {}};
-  EXPECT_THAT(readme, HasSubstr("```\n" + check.out + "```\n"));
 }
 
 TEST_F(CheckCommand, ColourGoesToATerminalAlone) {
