@@ -62,7 +62,7 @@ bool NearlyEqual(double a, double b) {
   return std::fabs(a - b) < std::max(kRelative * larger, kAbsolute);
 }
 
-// Deliberate: only the vertical fit is told apart. Fill and overscan count as horizontal here.
+// Deliberate: only the vertical fit counts. Fill and overscan count as horizontal here.
 std::int32_t FilmFitOf(double value) {
   if (NearlyEqual(value, kHorizontalFit)) return 0;
   return NearlyEqual(value, kVerticalFit) ? 1 : 0;

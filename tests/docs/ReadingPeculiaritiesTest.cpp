@@ -14,7 +14,7 @@ using testing::IsEmpty;
 constexpr double kTolerance = 1e-9;
 constexpr double kDoubleZoom = 2.0 * kDefaultZoom;  // of a focal length of 70
 
-TEST(ReadingPeculiarities, FileThatIsNoSceneIsToldAndReturnsZero) {
+TEST(ReadingPeculiarities, FileThatIsNoSceneGivesAMessageAndReturnsZero) {
   const SceneImport import("createNode camera -n \"c\";\n");
   EXPECT_EQ(import.result().code, 0);
   EXPECT_THAT(import.result().messages, ElementsAre("Only Baked Maya Ascii files are supported."));
@@ -69,7 +69,7 @@ TEST(ReadingPeculiarities, WordThatBeginsWithAnotherCharacterStopsTheImport) {
   }
 }
 
-TEST(ReadingPeculiarities, LettersBehindANumberAreIgnored) {
+TEST(ReadingPeculiarities, LettersAfterANumberAreIgnored) {
   const SceneImport import(Scene("createNode camera -n \"c\"; setAttr \".fl\" 70mm;"));
   EXPECT_NEAR(import.Value("c", kZoom), kDoubleZoom, kTolerance);
 }
@@ -153,7 +153,7 @@ TEST(ReadingPeculiarities, ParentCommandChangesNothing) {
   EXPECT_EQ(import.project().layers().size(), 1u);
 }
 
-TEST(ReadingPeculiarities, AttributeBehindAConnectionClearsIt) {
+TEST(ReadingPeculiarities, AttributeAfterAConnectionClearsIt) {
   const std::string curve = Curve("k", "1 0 2 5");
   const std::string transform = "createNode transform -n \"cam\";\n";
   const std::string camera = "createNode camera -n \"camShape\" -p \"cam\";\n";
@@ -182,7 +182,7 @@ TEST(ReadingPeculiarities, KeyWithoutAValueIsZero) {
   EXPECT_NEAR(import.KeyValue("camShape", kPosition, 1), 0.0, kTolerance);
 }
 
-TEST(ReadingPeculiarities, SelectLeavesNoNodeCurrentUnlessItEndsBehindAColon) {
+TEST(ReadingPeculiarities, SelectLeavesNoNodeCurrentUnlessItEndsAfterAColon) {
   {
     const SceneImport cleared(Scene("createNode camera -n \"c\"; select -ne :time1; setAttr \".fl\" 70;"));
     EXPECT_NEAR(cleared.Value("c", kZoom), kDefaultZoom, kTolerance);

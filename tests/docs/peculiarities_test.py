@@ -1,13 +1,11 @@
-"""docs/peculiarities.md against the sources and the tests."""
+"""docs/peculiarities.md and its table against the sources and the tests."""
 
 import re
 import unittest
 
+from peculiarities_table import ENTRIES
 from project import ROOT, read
 
-MARK = re.compile(r"Held by|Marked in")
-HELD = re.compile(r"Held by ((?:`\w+`(?: and )?)+)\.")
-MARKED = re.compile(r"Marked in `([^`]+)`: \"(.+?)\"\.(?=\s|$)")
 TEST = re.compile(r"\bTEST(?:_F|_P)?\(\s*\w+,\s*(\w+)\s*\)")
 ROOMS = ("plugin", "maya", "comp")
 
@@ -36,10 +34,12 @@ def marks():
 
 
 class Peculiarities(unittest.TestCase):
-    document = read("docs/peculiarities.md")
+    def test_the_table_has_the_entries_of_the_page_in_their_order(self):
+        titles = re.findall(r"^### (.+)$", read("docs/peculiarities.md"), re.MULTILINE)
+        self.assertEqual([title for title, _, _ in ENTRIES], titles)
 
     def test_every_deliberate_mark_is_quoted(self):
-        quotes = MARKED.findall(self.document)
+        quotes = [quote for _, _, entry_marks in ENTRIES for quote in entry_marks]
         found = list(marks())
         self.assertTrue(found)
         for path, text in found:
@@ -48,9 +48,10 @@ class Peculiarities(unittest.TestCase):
 
     def test_every_quote_is_of_a_mark(self):
         found = list(marks())
-        for place, quote in MARKED.findall(self.document):
-            marked = any(place == path and quote in text for path, text in found)
-            self.assertTrue(marked, f'{place} has no mark "{quote}"')
+        for title, _, entry_marks in ENTRIES:
+            for place, quote in entry_marks:
+                marked = any(place == path and quote in text for path, text in found)
+                self.assertTrue(marked, f'"{title}": {place} has no mark "{quote}"')
 
     def test_no_mark_is_written_where_it_is_not_looked_for(self):
         in_sources = sum(
@@ -65,23 +66,13 @@ class Peculiarities(unittest.TestCase):
         tests = set()
         for path in (ROOT / "tests").glob("**/*.cpp"):
             tests.update(TEST.findall(path.read_text(encoding="utf-8")))
-        entries = re.split(r"^### ", self.document, flags=re.MULTILINE)[1:]
-        self.assertTrue(entries)
-        for entry in entries:
-            title = entry.splitlines()[0]
-            names = re.findall(r"`(\w+)`", " ".join(HELD.findall(entry)))
+        for title, names, _ in ENTRIES:
             self.assertTrue(names, f'"{title}" names no test')
             for name in names:
                 self.assertIn(name, tests, f'"{title}" names a test that does not exist')
 
-    def test_every_footer_has_the_form_that_is_looked_for(self):
-        self.assertEqual(
-            len(MARK.findall(self.document)) - 2,  # the two that the introduction explains
-            len(HELD.findall(self.document)) + len(MARKED.findall(self.document)),
-        )
-
     def test_every_test_of_the_peculiarities_has_an_entry(self):
-        held = set(re.findall(r"`(\w+)`", " ".join(HELD.findall(self.document))))
+        held = {name for _, names, _ in ENTRIES for name in names}
         for path in (ROOT / "tests" / "docs").glob("*PeculiaritiesTest.cpp"):
             for name in TEST.findall(path.read_text(encoding="utf-8")):
                 self.assertIn(name, held, f"{path.name}: {name} holds no entry")
