@@ -28,7 +28,7 @@ bool IsPlaced(const scene::Scene& scene, NodeId node) {
   return one.parent != scene::kNoNode || one.firstChild != scene::kNoNode || one.type == "transform";
 }
 
-// Whether a curve is behind the node, by way of nodes that have no place of their own.
+// Whether a curve drives the node: itself, or through nodes that have no place of their own.
 bool ComesFromCurve(const scene::Scene& scene, NodeId from) {
   constexpr std::size_t kMostNodes = 64;
   if (IsPlaced(scene, from)) return false;

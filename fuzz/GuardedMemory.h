@@ -18,7 +18,7 @@ class GuardedMemory {
   // The last `size` bytes before the forbidden page, until the next call. What they hold is unspecified.
   char* Take(std::size_t size);
 
-  // The same, holding the text and `nuls` NULs behind it.
+  // The same, holding the text and `nuls` NULs after it.
   char* Hold(std::string_view text, std::size_t nuls);
 
  private:

@@ -1,6 +1,6 @@
 // The whole import: file, module, embedded host. The module stays loaded; each run has a host of its own.
 //
-// Bytes 6 to 9 of a scene stand behind what the header test looks at. Here they say how the host behaves; "
+// Bytes 6 to 9 of a scene stand after what the header test looks at. Here they say how the host behaves; "
 // ASC", which a scene has there, is an ordinary host.
 #include <cmath>
 #include <cstdint>

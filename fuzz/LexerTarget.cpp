@@ -55,7 +55,7 @@ struct Text {
 };
 
 void CheckToken(const Text& text, MayaToken kind, const char* before, const char* first, const char* last) {
-  Require(first >= before, "a token begins behind the one before it");
+  Require(first >= before, "a token begins after the one before it");
   Require(last >= first && last <= text.end, "a token lies within the text");
   Require(last < text.end || kind == EndOfFile, "only the end of the text reaches its NUL");
 }
@@ -65,7 +65,7 @@ void CheckEnd(MAYA_Lex& lexer, const char* end) {
   for (int i = 0; i < 2; ++i) {
     const char* first = nullptr;
     const char* last = nullptr;
-    Require(lexer.GetNextToken(&first, &last) == EndOfFile, "behind the end there are no tokens");
+    Require(lexer.GetNextToken(&first, &last) == EndOfFile, "after the end there are no tokens");
     Require(first == end && last == end, "the end of the text does not move");
   }
 }

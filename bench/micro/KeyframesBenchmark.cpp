@@ -96,7 +96,7 @@ void insertKeys(benchmark::State& state, std::int32_t stream, int values) {
 }
 
 void animateTransform(benchmark::State& state) {
-  // The first transform of the workload comes behind the camera's.
+  // The first transform of the workload comes after the camera's.
   constexpr int kFirstAnimated = 1;
   constexpr double kOneTransform = 0.001;
   const std::string text = sceneOf("composition", kOneTransform);

@@ -44,7 +44,7 @@ TEST(ErrorCodesTest, NamesAreUpperCaseWords) {
   }
 }
 
-TEST(ErrorCodesTest, SentencesAreUniquePlainAndFitBehindAColon) {
+TEST(ErrorCodesTest, SentencesAreUniquePlainAndFitAfterAColon) {
   std::set<std::string> sentences;
   for (const Entry& entry : kEntries) {
     const std::string sentence = entry.sentence;

@@ -78,7 +78,7 @@ TEST_F(Ceilings, TheHelpNamesTheDefaults) {
   EXPECT_THAT(help, HasSubstr("layers that the project takes (" + std::to_string(defaults.mostLayers) + ")"));
   EXPECT_THAT(help, HasSubstr("keys that the project takes (" + std::to_string(defaults.mostKeys) + ")"));
   EXPECT_THAT(help,
-              HasSubstr("behind memory handles at one time (" + std::to_string(defaults.mostMemory) + ")"));
+              HasSubstr("that the importer holds at one time (" + std::to_string(defaults.mostMemory) + ")"));
 }
 
 // Each locator has a chain of parents of its own: a text of a few kilobytes that asks for a hundred million

@@ -97,7 +97,7 @@ TEST_F(HarmlessOutputs, TheWritingDirectionOfTheOutlineCannotBeTurned) {
   EXPECT_FALSE(contains(outline, "\xe2\x80\xae"));
 }
 
-TEST_F(HarmlessOutputs, AnEscapeAtTheEndOfANameDoesNotEatTheColourBehindIt) {
+TEST_F(HarmlessOutputs, AnEscapeAtTheEndOfANameDoesNotEatTheColourAfterIt) {
   environment.clear();
   writeScene("cam\x1b");
   const std::string outline = runOnTerminal({"import", "named.ma"}).out;

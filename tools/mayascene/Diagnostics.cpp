@@ -3,7 +3,7 @@
 namespace mayascene {
 namespace {
 
-// "error 2021 (FILE_OPEN): the file cannot be opened, or is no regular file"; behind it ", line 7" where the
+// "error 2021 (FILE_OPEN): the file cannot be opened, or is no regular file"; after it ", line 7" where the
 // line of the scene is known.
 std::string describeFailure(const refhost::CallbackResult& result) {
   std::string text = "error " + std::to_string(result.code);

@@ -28,8 +28,9 @@ struct ExitMeaning {
 inline constexpr ExitMeaning kExitMeanings[] = {
     {ExitStatus::Done, "done, warnings included"},
     {ExitStatus::Refused,
-     "an error in a scene, a file that is not taken, something asked for that was not done, something left "
-     "behind, or warnings with --strict"},
+     "an error in a scene, a file that is not taken, something asked for that was not done, memory or "
+     "handles "
+     "that the importer kept, or warnings with --strict"},
     {ExitStatus::WrongUsage, "wrong usage"},
     {ExitStatus::Unreadable, "a file cannot be read"},
     {ExitStatus::NoModule, "the import module cannot be loaded"},

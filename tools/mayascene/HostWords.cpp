@@ -95,7 +95,8 @@ void addCeilings(CLI::App* verb, HostArguments* host) {
       ->option_text("N")
       ->check(CLI::NonNegativeNumber)
       ->group(group);
-  verb->add_option("--most-memory", host->mostMemory, "bytes behind memory handles at one time (4294967296)")
+  verb->add_option("--most-memory", host->mostMemory,
+                   "bytes that the importer holds at one time (4294967296)")
       ->option_text("N")
       ->check(CLI::Range(std::int64_t{0}, kMostMemory))
       ->group(group);

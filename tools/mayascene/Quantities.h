@@ -22,7 +22,7 @@ std::string ratioText(const HostRatio& ratio);
 // "5 s (120 frames)"; the time alone where the rate gives no frames.
 std::string durationText(const T_Time& duration, const HostRatio& rate);
 
-// "120 keys, frames 0 to 119 (0 s to 4.958 s)", "1 key, frame 0 (0 s)"; with ", constant" behind where
+// "120 keys, frames 0 to 119 (0 s to 4.958 s)", "1 key, frame 0 (0 s)"; with ", constant" after it where
 // several keys have one value. The stream has keys.
 std::string keysText(const refhost::Stream& stream, const HostRatio& rate);
 

@@ -12,7 +12,7 @@ struct StreamWords {
   std::int32_t id;
   std::string_view label;        // in the outline
   std::string_view cameraLabel;  // the same on a camera
-  std::string_view unitSign;     // behind a value in the outline
+  std::string_view unitSign;     // after a value in the outline
   std::string_view name;         // in the document
   std::string_view cameraName;   // the same on a camera
   std::string_view unit;         // in the document
