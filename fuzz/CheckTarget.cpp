@@ -16,6 +16,7 @@
 #include "refhost/Host.h"
 #include "refhost/ModuleLoader.h"
 #include "tests/check/Contradictions.h"
+#include "text/JsonWriter.h"
 #include "tools/mayascene/CheckJson.h"
 #include "tools/mayascene/CheckText.h"
 #include "tools/mayascene/ImportedLayers.h"
@@ -73,7 +74,7 @@ void CheckOutputs(const mayascene::CheckedScene& scene, std::size_t size) {
   Require(text.str().size() < kShortestReport + scene.report.findings.size() * kLongestFinding + 200 * size,
           "a report does not grow faster than its scene");
   std::ostringstream object, document;
-  mayascene::JsonWriter writer(object);
+  text::JsonWriter writer(object);
   mayascene::writeCheckedScene(writer, scene);
   mayascene::CheckJson json(document);
   json.add(object.str());

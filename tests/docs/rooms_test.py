@@ -69,7 +69,7 @@ class Rooms(unittest.TestCase):
         return room.holds(header)
 
     def test_the_table_has_the_rooms(self):
-        self.assertEqual(len(self.rooms), 14)
+        self.assertEqual(len(self.rooms), 15)
         for room in self.rooms.values():
             self.assertTrue(room.places)
             for place in room.places:

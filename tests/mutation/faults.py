@@ -156,7 +156,7 @@ FAULTS = (
           "if (&layer == &other) return true;", "if (&layer == &other) return false;"),
 
     # --- tools/mayascene/ ---
-    Fault("the JSON drops the sign of a negative zero", "tools/mayascene/JsonWriter.cpp",
+    Fault("the JSON drops the sign of a negative zero", "text/JsonWriter.cpp",
           "if (value == 0.0 && std::signbit(value)) return literal(\"-0.0\");",
           "if (value == 0.0 && std::signbit(value)) return literal(\"0\");"),
     Fault("the status of several scenes is that of the last", "tools/mayascene/ImportCommand.cpp",

@@ -16,6 +16,7 @@ OWN_TESTS = {
     "comp": ("comp_test",),
     "hostutil": ("hostutil_tests",),
     "refhost": ("refhost_test",),
+    "text": ("text_test",),
     "tools": ("tool_tests", "tool_command_tests"),
     "scan": ("scan_tests",),
 }

@@ -4,7 +4,7 @@
 
 #include "diag/Codes.h"
 #include "diag/Diagnostic.h"
-#include "tools/mayascene/JsonWriter.h"
+#include "text/JsonWriter.h"
 
 namespace mayascene {
 namespace {
@@ -12,22 +12,22 @@ namespace {
 constexpr std::string_view kFormat = "mayascene-bake-report";
 constexpr std::int64_t kVersionOfForm = 1;
 
-void writeText(JsonWriter& json, std::string_view key, std::string_view text) {
+void writeText(text::JsonWriter& json, std::string_view key, std::string_view text) {
   json.key(key);
   json.text(text);
 }
 
-void writeCount(JsonWriter& json, std::string_view key, std::uint64_t count) {
+void writeCount(text::JsonWriter& json, std::string_view key, std::uint64_t count) {
   json.key(key);
   json.integer(static_cast<std::int64_t>(count));
 }
 
-void writeTruth(JsonWriter& json, std::string_view key, bool truth) {
+void writeTruth(text::JsonWriter& json, std::string_view key, bool truth) {
   json.key(key);
   json.boolean(truth);
 }
 
-void writeFrames(JsonWriter& json, const std::optional<bake::FrameRange>& frames) {
+void writeFrames(text::JsonWriter& json, const std::optional<bake::FrameRange>& frames) {
   json.key("frames");
   if (!frames) return json.null();
   json.beginObject();
@@ -41,7 +41,7 @@ void writeFrames(JsonWriter& json, const std::optional<bake::FrameRange>& frames
   json.endObject();
 }
 
-void writeCamera(JsonWriter& json, const bake::CameraReport& camera) {
+void writeCamera(text::JsonWriter& json, const bake::CameraReport& camera) {
   json.beginObject();
   writeText(json, "path", camera.path);
   json.key("name");
@@ -57,7 +57,7 @@ void writeCamera(JsonWriter& json, const bake::CameraReport& camera) {
   json.endObject();
 }
 
-void writeDiagnostic(JsonWriter& json, const diag::Diagnostic& diagnostic) {
+void writeDiagnostic(text::JsonWriter& json, const diag::Diagnostic& diagnostic) {
   json.beginObject();
   writeText(json, "code", diag::NameOf(diagnostic.code));
   writeText(json, "severity", diag::NameOf(diag::EntryOf(diagnostic.code).severity));
@@ -70,7 +70,7 @@ void writeDiagnostic(JsonWriter& json, const diag::Diagnostic& diagnostic) {
   json.endObject();
 }
 
-void writeScene(JsonWriter& json, const BakedScene& scene) {
+void writeScene(text::JsonWriter& json, const BakedScene& scene) {
   json.beginObject();
   writeText(json, "path", scene.path);
   json.key("output");
@@ -96,7 +96,7 @@ void writeScene(JsonWriter& json, const BakedScene& scene) {
 }  // namespace
 
 void writeBakeReport(std::ostream& out, const std::vector<BakedScene>& scenes) {
-  JsonWriter json(out);
+  text::JsonWriter json(out);
   json.beginObject();
   writeText(json, "format", kFormat);
   json.key("version");

@@ -5,29 +5,29 @@
 namespace mayascene {
 namespace {
 
-void writeText(JsonWriter& json, std::string_view key, std::string_view text) {
+void writeText(text::JsonWriter& json, std::string_view key, std::string_view text) {
   json.key(key);
   json.text(text);
 }
 
-void writeNumber(JsonWriter& json, std::string_view key, double number) {
+void writeNumber(text::JsonWriter& json, std::string_view key, double number) {
   json.key(key);
   json.number(number);
 }
 
-void writeCount(JsonWriter& json, std::string_view key, std::size_t count) {
+void writeCount(text::JsonWriter& json, std::string_view key, std::size_t count) {
   json.key(key);
   json.integer(static_cast<std::int64_t>(count));
 }
 
-void writePlace(JsonWriter& json, const diag::LineAndColumn& place) {
+void writePlace(text::JsonWriter& json, const diag::LineAndColumn& place) {
   json.beginObject();
   writeCount(json, "line", place.line);
   writeCount(json, "column", place.column);
   json.endObject();
 }
 
-void writeWhere(JsonWriter& json, const check::Where& where) {
+void writeWhere(text::JsonWriter& json, const check::Where& where) {
   json.beginObject();
   writeCount(json, "offset", where.range.offset);
   writeCount(json, "length", where.range.length);
@@ -36,12 +36,12 @@ void writeWhere(JsonWriter& json, const check::Where& where) {
   json.endObject();
 }
 
-void writeValue(JsonWriter& json, double value) { json.number(value); }
-void writeValue(JsonWriter& json, const std::string& value) { json.text(value); }
+void writeValue(text::JsonWriter& json, double value) { json.number(value); }
+void writeValue(text::JsonWriter& json, const std::string& value) { json.text(value); }
 
 // A value and where the file says it; null where it does not.
 template <typename T>
-void writeGiven(JsonWriter& json, std::string_view key, const check::Given<T>& given) {
+void writeGiven(text::JsonWriter& json, std::string_view key, const check::Given<T>& given) {
   json.key(key);
   json.beginObject();
   json.key("value");
@@ -51,7 +51,7 @@ void writeGiven(JsonWriter& json, std::string_view key, const check::Given<T>& g
   json.endObject();
 }
 
-void writeDrives(JsonWriter& json, const std::vector<check::Drive>& drives) {
+void writeDrives(text::JsonWriter& json, const std::vector<check::Drive>& drives) {
   json.key("drivenBy");
   json.beginArray();
   for (const check::Drive& drive : drives) {
@@ -68,7 +68,7 @@ void writeDrives(JsonWriter& json, const std::vector<check::Drive>& drives) {
   json.endArray();
 }
 
-void writeChain(JsonWriter& json, const check::CameraHead& camera) {
+void writeChain(text::JsonWriter& json, const check::CameraHead& camera) {
   json.key("chain");
   json.beginArray();
   for (const check::ChainLink& link : camera.chain) {
@@ -82,7 +82,7 @@ void writeChain(JsonWriter& json, const check::CameraHead& camera) {
   json.boolean(camera.chainGoesOn);
 }
 
-void writeLayer(JsonWriter& json, const check::CameraHead& camera) {
+void writeLayer(text::JsonWriter& json, const check::CameraHead& camera) {
   json.key("layer");
   if (!camera.cameOver) return json.null();
   json.beginObject();
@@ -92,7 +92,7 @@ void writeLayer(JsonWriter& json, const check::CameraHead& camera) {
   json.endObject();
 }
 
-void writeCamera(JsonWriter& json, const check::CameraHead& camera) {
+void writeCamera(text::JsonWriter& json, const check::CameraHead& camera) {
   json.beginObject();
   writeText(json, "path", camera.path);
   json.key("where");
@@ -108,7 +108,7 @@ void writeCamera(JsonWriter& json, const check::CameraHead& camera) {
   json.endObject();
 }
 
-void writeRanges(JsonWriter& json, const check::Head& head) {
+void writeRanges(text::JsonWriter& json, const check::Head& head) {
   json.key("ranges");
   json.beginArray();
   for (const check::Range& range : head.ranges) {
@@ -125,7 +125,7 @@ void writeRanges(JsonWriter& json, const check::Head& head) {
 
 }  // namespace
 
-void writeRange(JsonWriter& json, const diag::Range& range, const diag::LineAndColumn& begin,
+void writeRange(text::JsonWriter& json, const diag::Range& range, const diag::LineAndColumn& begin,
                 const diag::LineAndColumn& end) {
   json.beginObject();
   writeCount(json, "offset", range.offset);
@@ -137,7 +137,7 @@ void writeRange(JsonWriter& json, const diag::Range& range, const diag::LineAndC
   json.endObject();
 }
 
-void writeHead(JsonWriter& json, const check::Head& head) {
+void writeHead(text::JsonWriter& json, const check::Head& head) {
   if (!head.isScene) return json.null();
   json.beginObject();
   writeText(json, "product", head.product);

@@ -2,15 +2,15 @@
 #pragma once
 
 #include "check/Head.h"
-#include "tools/mayascene/JsonWriter.h"
+#include "text/JsonWriter.h"
 
 namespace mayascene {
 
 // Null where the file is no scene.
-void writeHead(JsonWriter& json, const check::Head& head);
+void writeHead(text::JsonWriter& json, const check::Head& head);
 
 // Bytes, and lines and columns of the first byte and after the last one.
-void writeRange(JsonWriter& json, const diag::Range& range, const diag::LineAndColumn& begin,
+void writeRange(text::JsonWriter& json, const diag::Range& range, const diag::LineAndColumn& begin,
                 const diag::LineAndColumn& end);
 
 }  // namespace mayascene

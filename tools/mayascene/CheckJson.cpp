@@ -10,17 +10,17 @@ namespace {
 constexpr std::string_view kFormat = "mayascene-check-report";
 constexpr std::int64_t kVersionOfForm = 1;
 
-void writeText(JsonWriter& json, std::string_view key, std::string_view text) {
+void writeText(text::JsonWriter& json, std::string_view key, std::string_view text) {
   json.key(key);
   json.text(text);
 }
 
-void writeCount(JsonWriter& json, std::string_view key, std::uint64_t count) {
+void writeCount(text::JsonWriter& json, std::string_view key, std::uint64_t count) {
   json.key(key);
   json.integer(static_cast<std::int64_t>(count));
 }
 
-void writeFinding(JsonWriter& json, const check::Finding& finding) {
+void writeFinding(text::JsonWriter& json, const check::Finding& finding) {
   const diag::Diagnostic& diagnostic = finding.diagnostic;
   json.beginObject();
   writeText(json, "code", diag::NameOf(diagnostic.code));
@@ -40,7 +40,7 @@ void writeFinding(JsonWriter& json, const check::Finding& finding) {
   json.endObject();
 }
 
-void writeReport(JsonWriter& json, const check::Report& report) {
+void writeReport(text::JsonWriter& json, const check::Report& report) {
   writeCount(json, "errors", report.errors);
   writeCount(json, "warnings", report.warnings);
   writeCount(json, "notes", report.notes);
@@ -58,7 +58,7 @@ void writeReport(JsonWriter& json, const check::Report& report) {
 
 }  // namespace
 
-void writeCheckedScene(JsonWriter& json, const CheckedScene& scene) {
+void writeCheckedScene(text::JsonWriter& json, const CheckedScene& scene) {
   json.beginObject();
   writeText(json, "path", scene.path);
   writeCount(json, "status", static_cast<std::uint64_t>(scene.status));

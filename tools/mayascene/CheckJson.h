@@ -4,13 +4,13 @@
 #include <ostream>
 #include <string_view>
 
-#include "tools/mayascene/JsonWriter.h"
+#include "text/JsonWriter.h"
 #include "tools/mayascene/SceneCheck.h"
 
 namespace mayascene {
 
 // One scene's object.
-void writeCheckedScene(JsonWriter& json, const CheckedScene& scene);
+void writeCheckedScene(text::JsonWriter& json, const CheckedScene& scene);
 
 // Writes one object for all scenes of a run, each scene as it comes.
 class CheckJson {
@@ -23,7 +23,7 @@ class CheckJson {
 
  private:
   std::ostream& out_;
-  JsonWriter json_;
+  text::JsonWriter json_;
 };
 
 }  // namespace mayascene

@@ -77,7 +77,7 @@ CheckResult resultOf(const CheckedScene& scene, const CheckArguments& arguments)
   }
   if (!arguments.json.empty()) {
     std::ostringstream object;
-    JsonWriter json(object);
+    text::JsonWriter json(object);
     writeCheckedScene(json, scene);
     result.json = std::move(object).str();
   }

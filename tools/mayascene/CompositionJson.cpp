@@ -5,7 +5,7 @@
 #include <vector>
 
 #include "hostapi/CameraSuite.h"
-#include "tools/mayascene/JsonWriter.h"
+#include "text/JsonWriter.h"
 #include "tools/mayascene/StreamWords.h"
 
 namespace mayascene {
@@ -48,28 +48,28 @@ std::string_view kindWord(LayerKind kind) {
   return "null";
 }
 
-void writePair(JsonWriter& json, std::int64_t first, std::int64_t second) {
+void writePair(text::JsonWriter& json, std::int64_t first, std::int64_t second) {
   json.beginRow();
   json.integer(first);
   json.integer(second);
   json.endArray();
 }
 
-void writeTexts(JsonWriter& json, std::string_view key, const std::vector<std::string>& texts) {
+void writeTexts(text::JsonWriter& json, std::string_view key, const std::vector<std::string>& texts) {
   json.key(key);
   json.beginArray();
   for (const std::string& text : texts) json.text(text);
   json.endArray();
 }
 
-void writeVector(JsonWriter& json, const double* values, std::size_t count) {
+void writeVector(text::JsonWriter& json, const double* values, std::size_t count) {
   json.beginRow();
   for (std::size_t i = 0; i < count; ++i) json.number(values[i]);
   json.endArray();
 }
 
 // What is told of every callback.
-void writeCallback(JsonWriter& json, const CallbackResult& result) {
+void writeCallback(text::JsonWriter& json, const CallbackResult& result) {
   json.key("error");
   if (result.code == 0) {
     json.null();
@@ -104,7 +104,7 @@ void writeCallback(JsonWriter& json, const CallbackResult& result) {
   json.endArray();
 }
 
-void writeKeys(JsonWriter& json, const Stream& stream) {
+void writeKeys(text::JsonWriter& json, const Stream& stream) {
   json.key("keys");
   if (stream.keyCount() == 0) return json.null();
   json.beginObject();
@@ -123,7 +123,7 @@ void writeKeys(JsonWriter& json, const Stream& stream) {
   json.endObject();
 }
 
-void writeStream(JsonWriter& json, const Stream& stream, LayerKind kind) {
+void writeStream(text::JsonWriter& json, const Stream& stream, LayerKind kind) {
   json.beginObject();
   json.key("id");
   json.integer(stream.id);
@@ -140,7 +140,7 @@ void writeStream(JsonWriter& json, const Stream& stream, LayerKind kind) {
   json.endObject();
 }
 
-void writeFilmSize(JsonWriter& json, const Layer& layer) {
+void writeFilmSize(text::JsonWriter& json, const Layer& layer) {
   json.key("filmSize");
   if (layer.filmDirection == refhost::kFilmNeverSet) return json.null();
   json.beginObject();
@@ -151,7 +151,7 @@ void writeFilmSize(JsonWriter& json, const Layer& layer) {
   json.endObject();
 }
 
-void writeLayer(JsonWriter& json, const Layer& layer) {
+void writeLayer(text::JsonWriter& json, const Layer& layer) {
   json.beginObject();
   json.key("number");
   json.integer(layer.number);
@@ -175,7 +175,7 @@ void writeLayer(JsonWriter& json, const Layer& layer) {
   json.endObject();
 }
 
-void writeComposition(JsonWriter& json, const Composition& composition) {
+void writeComposition(text::JsonWriter& json, const Composition& composition) {
   json.beginObject();
   json.key("number");
   json.integer(composition.number);
@@ -198,7 +198,7 @@ void writeComposition(JsonWriter& json, const Composition& composition) {
   json.endObject();
 }
 
-void writeScene(JsonWriter& json, const SceneReport& scene) {
+void writeScene(text::JsonWriter& json, const SceneReport& scene) {
   json.beginObject();
   json.key("path");
   json.text(scene.path);
@@ -220,7 +220,7 @@ void writeScene(JsonWriter& json, const SceneReport& scene) {
 }  // namespace
 
 void writeCompositionJson(std::ostream& out, const RunReport& run) {
-  JsonWriter json(out);
+  text::JsonWriter json(out);
   json.beginObject();
   json.key("format");
   json.text(kFormat);

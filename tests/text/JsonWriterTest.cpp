@@ -1,4 +1,4 @@
-#include "tools/mayascene/JsonWriter.h"
+#include "text/JsonWriter.h"
 
 #include <gtest/gtest.h>
 
@@ -11,7 +11,7 @@
 #include <string>
 #include <vector>
 
-namespace mayascene {
+namespace text {
 namespace {
 
 std::string numberAsJson(double value) {
@@ -135,4 +135,4 @@ TEST(JsonWriter, NoPairOfBytesLeavesItsQuotes) {
 }
 
 }  // namespace
-}  // namespace mayascene
+}  // namespace text

@@ -6,7 +6,7 @@
 #include <string_view>
 #include <vector>
 
-namespace mayascene {
+namespace text {
 
 // The caller keeps begin and end in pairs, and gives a key before each value of an object. Objects and arrays
 // are spread over lines, but for those begun with beginRow() and all within them.
@@ -48,4 +48,4 @@ class JsonWriter {
   bool afterKey_ = false;
 };
 
-}  // namespace mayascene
+}  // namespace text

@@ -1,21 +1,50 @@
-#include "tools/mayascene/JsonWriter.h"
+#include "text/JsonWriter.h"
 
 #include <array>
 #include <charconv>
 #include <cmath>
-#include <nlohmann/json.hpp>
 #include <string>
 
-#include "refhost/ShownText.h"
+#include "text/Utf8.h"
 
-namespace mayascene {
+namespace text {
 namespace {
+
+void appendUnit(std::string* text, unsigned unit) {
+  constexpr char kDigits[] = "0123456789abcdef";
+  *text += "\\u";
+  for (const unsigned shift : {12u, 8u, 4u, 0u}) *text += kDigits[(unit >> shift) & 0xfu];
+}
+
+void appendCharacter(std::string* text, char32_t point) {
+  constexpr char32_t kFirstOfPairs = 0x10000;
+  constexpr std::string_view kShort = "\b\t\n\f\r\"\\";
+  constexpr std::string_view kLetters = "btnfr\"\\";
+  const std::size_t place = point < 0x80 ? kShort.find(static_cast<char>(point)) : std::string_view::npos;
+  if (place != std::string_view::npos) {
+    *text += '\\';
+    *text += kLetters[place];
+  } else if (point >= 0x20 && point < 0x7f) {
+    *text += static_cast<char>(point);
+  } else if (point < kFirstOfPairs) {
+    appendUnit(text, point);
+  } else {
+    appendUnit(text, 0xd800u + ((point - kFirstOfPairs) >> 10));
+    appendUnit(text, 0xdc00u + ((point - kFirstOfPairs) & 0x3ffu));
+  }
+}
 
 // Only ASCII goes out, all else as \uXXXX: a name then cannot steer a terminal that the JSON is shown on.
 std::string quoted(std::string_view bytes) {
-  constexpr int oneLine = -1;
-  constexpr bool onlyAscii = true;
-  return nlohmann::json(refhost::shownText(bytes)).dump(oneLine, ' ', onlyAscii);
+  constexpr char32_t kReplacement = 0xfffd;
+  std::string text = "\"";
+  text.reserve(bytes.size() + 2);
+  for (std::size_t at = 0; at < bytes.size();) {
+    const Character character = CharacterAt(bytes, at);
+    appendCharacter(&text, character.length == 0 ? kReplacement : character.point);
+    at += character.length == 0 ? 1 : character.length;
+  }
+  return text += '"';
 }
 
 }  // namespace
@@ -99,4 +128,4 @@ void JsonWriter::newLine() {
   for (std::size_t i = 0; i < levels_.size(); ++i) out_ << ' ';
 }
 
-}  // namespace mayascene
+}  // namespace text

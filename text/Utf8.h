@@ -1,0 +1,25 @@
+// UTF-8: its characters, and what stands in for bytes that are none.
+#pragma once
+
+#include <cstddef>
+#include <string>
+#include <string_view>
+
+namespace text {
+
+// A code point and its length in bytes; a length of 0 where the bytes are no valid UTF-8.
+struct Character {
+  std::size_t length = 0;
+  char32_t point = 0;
+};
+
+// The character that begins at the index, which is below the size. Shorter forms than needed, surrogates and
+// what lies beyond U+10FFFF are not valid.
+Character CharacterAt(std::string_view bytes, std::size_t at);
+
+bool IsUtf8(std::string_view bytes);
+
+// The bytes with each one that is no part of valid UTF-8 replaced by U+FFFD.
+std::string ValidUtf8(std::string_view bytes);
+
+}  // namespace text
