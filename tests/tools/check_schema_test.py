@@ -2,16 +2,11 @@
 """Runs checks and validates what they write against the JSON Schema; then checks that the schema refuses documents that
 are broken in one place each."""
 
-import argparse
-import copy
-import json
-import os
 import pathlib
-import subprocess
 import sys
-import tempfile
 
-import jsonschema
+sys.path.insert(0, str(pathlib.Path(__file__).resolve().parents[1] / "support"))
+from schemas import SchemaTest  # noqa: E402
 
 HEADER = "//Maya ASCII 2018 scene\n"
 UNITS = HEADER + "currentUnit -l centimeter -a degree -t film;\n"
@@ -71,65 +66,22 @@ def diagnostic(document):
 
 
 def main():
-    parser = argparse.ArgumentParser()
-    parser.add_argument("--tool", required=True)
-    parser.add_argument("--schema", required=True)
-    parser.add_argument("--scenes", nargs="+", required=True)
-    arguments = parser.parse_args()
-
-    with open(arguments.schema, encoding="utf-8") as file:
-        schema = json.load(file)
-    jsonschema.Draft7Validator.check_schema(schema)
-    validator = jsonschema.Draft7Validator(schema)
-    failures = []
-
-    with tempfile.TemporaryDirectory() as folder:
-        environment = dict(os.environ, XDG_CONFIG_HOME=folder)
-
-        def document_of(*words):
-            run = subprocess.run(
-                [arguments.tool, "check", "--json", "-", *words],
-                stdout=subprocess.PIPE, stderr=subprocess.PIPE, cwd=folder, env=environment, check=False)
-            return json.loads(run.stdout)
-
-        def write(name, text):
-            pathlib.Path(folder, name).write_text(text, encoding="utf-8")
-
-        write("camera.ma", CAMERA)
-        write("many.ma", UNITS + "currentUnit -t parsec;\n" * 30)
-        write("notes.txt", "just some notes\n")
-        write("broken.ma", HEADER + "createNode transform -n \"open;\n")
-        write("infinite.ma", CAMERA + "createNode camera -n \"c\";\n\tsetAttr \".fl\" 0;\n")
-        scenes = sorted(str(path) for place in arguments.scenes for path in pathlib.Path(place).glob("*.ma"))
-        if len(scenes) < 8:
-            failures.append(f"no scenes in {arguments.scenes}")
-        good = document_of("camera.ma")
-        documents = {
-            "a camera": good,
-            "every kind of file": document_of("many.ma", "notes.txt", "broken.ma", "missing.ma", "infinite.ma"),
-            "own scenes": document_of("--all", *scenes),
-        }
-
-    for name, document in documents.items():
-        for error in validator.iter_errors(document):
-            failures.append(f"{name}: {error.message} at {list(error.absolute_path)}")
-    if not documents["every kind of file"]["scenes"][0]["notInFull"]:
-        failures.append("nothing was counted alone")
-    if documents["every kind of file"]["scenes"][3]["failure"] is None:
-        failures.append("no file could not be read")
-
-    for name, damage in BROKEN.items():
-        broken = copy.deepcopy(good)
-        damage(broken)
-        if broken == good:
-            failures.append(f"{name}: nothing was broken")
-        if validator.is_valid(broken):
-            failures.append(f"{name}: the schema takes a broken document")
-
-    for failure in failures:
-        print(failure)
-    print(f"{len(documents)} documents, {len(BROKEN)} broken ones, {len(failures)} failures")
-    return 1 if failures else 0
+    test = SchemaTest()
+    test.write("camera.ma", CAMERA)
+    test.write("many.ma", UNITS + "currentUnit -t parsec;\n" * 30)
+    test.write("notes.txt", "just some notes\n")
+    test.write("broken.ma", HEADER + "createNode transform -n \"open;\n")
+    test.write("infinite.ma", CAMERA + "createNode camera -n \"c\";\n\tsetAttr \".fl\" 0;\n")
+    good = test.document_of("check", "camera.ma")
+    every = test.document_of("check", "many.ma", "notes.txt", "broken.ma", "missing.ma", "infinite.ma")
+    test.expect(every["scenes"][0]["notInFull"], "nothing was counted alone")
+    test.expect(every["scenes"][3]["failure"] is not None, "no file could not be read")
+    documents = {
+        "a camera": good,
+        "every kind of file": every,
+        "own scenes": test.document_of("check", "--all", *test.scenes(least=8)),
+    }
+    return test.finish(documents, good, BROKEN)
 
 
 if __name__ == "__main__":

@@ -2,16 +2,12 @@
 """Runs the tool and validates what it writes against the JSON Schema; then checks that the schema refuses documents
 that are broken in one place each."""
 
-import argparse
-import copy
 import json
-import os
 import pathlib
-import subprocess
 import sys
-import tempfile
 
-import jsonschema
+sys.path.insert(0, str(pathlib.Path(__file__).resolve().parents[1] / "support"))
+from schemas import SchemaTest  # noqa: E402
 
 HEADER = "//Maya ASCII 2023 scene\n"
 CAMERA = HEADER + """currentUnit -l centimeter -a degree -t film;
@@ -69,69 +65,28 @@ def null(document):
 
 
 def main():
-    parser = argparse.ArgumentParser()
-    parser.add_argument("--tool", required=True)
-    parser.add_argument("--schema", required=True)
-    parser.add_argument("--scenes", required=True)
-    arguments = parser.parse_args()
-
-    with open(arguments.schema, encoding="utf-8") as file:
-        schema = json.load(file)
-    jsonschema.Draft7Validator.check_schema(schema)
-    validator = jsonschema.Draft7Validator(schema)
-    failures = []
-
-    with tempfile.TemporaryDirectory() as folder:
-        environment = dict(os.environ, XDG_CONFIG_HOME=folder)
-
-        def document_of(*words):
-            run = subprocess.run(
-                [arguments.tool, "import", "--json", "-", *words],
-                stdout=subprocess.PIPE, stderr=subprocess.PIPE, cwd=folder, env=environment, check=False)
-            return json.loads(run.stdout)
-
-        def write(name, text):
-            pathlib.Path(folder, name).write_text(text, encoding="utf-8")
-
-        write("camera.ma", CAMERA)
-        write("wide.ma", CAMERA + "select -ne :defaultResolution;\n\tsetAttr \".pa\" 2;\n")
-        write("aperture.ma", CAMERA + "createNode camera -n \"c\";\n\tsetAttr \".cap\" 0 0;\n")
-        write("rig.ma", HEADER + "createNode transform -n \"rig\";\n")
-        write("notes.txt", "just some notes\n")
-        write("broken.ma", HEADER + "createNode transform -n \"open;\n")
-        examples = sorted(str(path) for path in pathlib.Path(arguments.scenes).glob("*.ma"))
-        if not examples:
-            failures.append(f"no scenes in {arguments.scenes}")
-        good = document_of("camera.ma")
-        documents = {
-            "a camera": good,
-            "every outcome": document_of("camera.ma", "wide.ma", "rig.ma", "notes.txt", "broken.ma", "missing.ma"),
-            "infinities": document_of("--permissive", "aperture.ma"),
-            "leftovers": document_of("--fail", "SetStreamValue:0=9", "camera.ma"),
-            "the examples": document_of(*examples),
-        }
-
-    for name, document in documents.items():
-        for error in validator.iter_errors(document):
-            failures.append(f"{name}: {error.message} at {list(error.absolute_path)}")
-    outcomes = {one["outcome"] for one in documents["every outcome"]["scenes"]}
-    if outcomes != {"imported", "nothing", "refused", "failed", "unreadable"}:
-        failures.append(f"not every outcome occurred: {outcomes}")
-    if '"inf"' not in json.dumps(documents["infinities"]):
-        failures.append("no infinity occurred")
-
-    for name, damage in BROKEN.items():
-        broken = copy.deepcopy(good)
-        damage(broken)
-        if broken == good:
-            failures.append(f"{name}: nothing was broken")
-        if validator.is_valid(broken):
-            failures.append(f"{name}: the schema takes a broken document")
-
-    for failure in failures:
-        print(failure)
-    print(f"{len(documents)} documents, {len(BROKEN)} broken ones, {len(failures)} failures")
-    return 1 if failures else 0
+    test = SchemaTest()
+    test.write("camera.ma", CAMERA)
+    test.write("wide.ma", CAMERA + "select -ne :defaultResolution;\n\tsetAttr \".pa\" 2;\n")
+    test.write("aperture.ma", CAMERA + "createNode camera -n \"c\";\n\tsetAttr \".cap\" 0 0;\n")
+    test.write("rig.ma", HEADER + "createNode transform -n \"rig\";\n")
+    test.write("notes.txt", "just some notes\n")
+    test.write("broken.ma", HEADER + "createNode transform -n \"open;\n")
+    good = test.document_of("import", "camera.ma")
+    every = test.document_of("import", "camera.ma", "wide.ma", "rig.ma", "notes.txt", "broken.ma", "missing.ma")
+    outcomes = {one["outcome"] for one in every["scenes"]}
+    test.expect(outcomes == {"imported", "nothing", "refused", "failed", "unreadable"},
+                f"not every outcome occurred: {outcomes}")
+    infinities = test.document_of("import", "--permissive", "aperture.ma")
+    test.expect('"inf"' in json.dumps(infinities), "no infinity occurred")
+    documents = {
+        "a camera": good,
+        "every outcome": every,
+        "infinities": infinities,
+        "leftovers": test.document_of("import", "--fail", "SetStreamValue:0=9", "camera.ma"),
+        "the examples": test.document_of("import", *test.scenes(least=1)),
+    }
+    return test.finish(documents, good, BROKEN)
 
 
 if __name__ == "__main__":

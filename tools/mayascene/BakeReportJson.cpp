@@ -2,9 +2,8 @@
 
 #include <string_view>
 
-#include "diag/Codes.h"
 #include "diag/Diagnostic.h"
-#include "text/JsonWriter.h"
+#include "tools/mayascene/JsonMembers.h"
 
 namespace mayascene {
 namespace {
@@ -12,31 +11,13 @@ namespace {
 constexpr std::string_view kFormat = "mayascene-bake-report";
 constexpr std::int64_t kVersionOfForm = 1;
 
-void writeText(text::JsonWriter& json, std::string_view key, std::string_view text) {
-  json.key(key);
-  json.text(text);
-}
-
-void writeCount(text::JsonWriter& json, std::string_view key, std::uint64_t count) {
-  json.key(key);
-  json.integer(static_cast<std::int64_t>(count));
-}
-
-void writeTruth(text::JsonWriter& json, std::string_view key, bool truth) {
-  json.key(key);
-  json.boolean(truth);
-}
-
 void writeFrames(text::JsonWriter& json, const std::optional<bake::FrameRange>& frames) {
   json.key("frames");
   if (!frames) return json.null();
   json.beginObject();
-  json.key("first");
-  json.number(frames->first);
-  json.key("last");
-  json.number(frames->Last());
-  json.key("step");
-  json.number(frames->step);
+  writeNumber(json, "first", frames->first);
+  writeNumber(json, "last", frames->Last());
+  writeNumber(json, "step", frames->step);
   writeCount(json, "count", frames->count);
   json.endObject();
 }
@@ -50,19 +31,12 @@ void writeCamera(text::JsonWriter& json, const bake::CameraReport& camera) {
   writeTruth(json, "written", camera.written);
   writeTruth(json, "moves", camera.moves);
   writeTruth(json, "lensMoves", camera.lensMoves);
-  json.key("differences");
-  json.beginArray();
-  for (const std::string& difference : camera.differences) json.text(difference);
-  json.endArray();
+  writeTexts(json, "differences", camera.differences);
   json.endObject();
 }
 
 void writeDiagnostic(text::JsonWriter& json, const diag::Diagnostic& diagnostic) {
-  json.beginObject();
-  writeText(json, "code", diag::NameOf(diagnostic.code));
-  writeText(json, "severity", diag::NameOf(diag::EntryOf(diagnostic.code).severity));
-  writeText(json, "sentence", diag::SentenceOf(diagnostic));
-  writeText(json, "help", diag::HelpOf(diagnostic));
+  beginDiagnostic(json, diagnostic);
   writeCount(json, "line", diagnostic.place.line);
   writeCount(json, "column", diagnostic.place.column);
   writeCount(json, "offset", diagnostic.range.offset);
@@ -97,10 +71,7 @@ void writeScene(text::JsonWriter& json, const BakedScene& scene) {
 
 void writeBakeReport(std::ostream& out, const std::vector<BakedScene>& scenes) {
   text::JsonWriter json(out);
-  json.beginObject();
-  writeText(json, "format", kFormat);
-  json.key("version");
-  json.integer(kVersionOfForm);
+  beginReport(json, kFormat, kVersionOfForm);
   json.key("scenes");
   json.beginArray();
   for (const BakedScene& scene : scenes) writeScene(json, scene);

@@ -2,23 +2,10 @@
 
 #include <string_view>
 
+#include "tools/mayascene/JsonMembers.h"
+
 namespace mayascene {
 namespace {
-
-void writeText(text::JsonWriter& json, std::string_view key, std::string_view text) {
-  json.key(key);
-  json.text(text);
-}
-
-void writeNumber(text::JsonWriter& json, std::string_view key, double number) {
-  json.key(key);
-  json.number(number);
-}
-
-void writeCount(text::JsonWriter& json, std::string_view key, std::size_t count) {
-  json.key(key);
-  json.integer(static_cast<std::int64_t>(count));
-}
 
 void writePlace(text::JsonWriter& json, const diag::LineAndColumn& place) {
   json.beginObject();
@@ -78,8 +65,7 @@ void writeChain(text::JsonWriter& json, const check::CameraHead& camera) {
     json.endObject();
   }
   json.endArray();
-  json.key("chainGoesOn");
-  json.boolean(camera.chainGoesOn);
+  writeTruth(json, "chainGoesOn", camera.chainGoesOn);
 }
 
 void writeLayer(text::JsonWriter& json, const check::CameraHead& camera) {

@@ -3,6 +3,7 @@
 #include <string_view>
 
 #include "tools/mayascene/CheckHeadJson.h"
+#include "tools/mayascene/JsonMembers.h"
 
 namespace mayascene {
 namespace {
@@ -10,27 +11,10 @@ namespace {
 constexpr std::string_view kFormat = "mayascene-check-report";
 constexpr std::int64_t kVersionOfForm = 1;
 
-void writeText(text::JsonWriter& json, std::string_view key, std::string_view text) {
-  json.key(key);
-  json.text(text);
-}
-
-void writeCount(text::JsonWriter& json, std::string_view key, std::uint64_t count) {
-  json.key(key);
-  json.integer(static_cast<std::int64_t>(count));
-}
-
 void writeFinding(text::JsonWriter& json, const check::Finding& finding) {
   const diag::Diagnostic& diagnostic = finding.diagnostic;
-  json.beginObject();
-  writeText(json, "code", diag::NameOf(diagnostic.code));
-  writeText(json, "severity", diag::NameOf(diag::EntryOf(diagnostic.code).severity));
-  writeText(json, "sentence", diag::SentenceOf(diagnostic));
-  writeText(json, "help", diag::HelpOf(diagnostic));
-  json.key("arguments");
-  json.beginArray();
-  for (const std::string& argument : diagnostic.arguments) json.text(argument);
-  json.endArray();
+  beginDiagnostic(json, diagnostic);
+  writeTexts(json, "arguments", diagnostic.arguments);
   json.key("range");
   if (diag::IsOfWholeFile(diagnostic)) {
     json.null();
@@ -69,10 +53,7 @@ void writeCheckedScene(text::JsonWriter& json, const CheckedScene& scene) {
 }
 
 CheckJson::CheckJson(std::ostream& out) : out_(out), json_(out) {
-  json_.beginObject();
-  writeText(json_, "format", kFormat);
-  json_.key("version");
-  json_.integer(kVersionOfForm);
+  beginReport(json_, kFormat, kVersionOfForm);
   json_.key("scenes");
   json_.beginArray();
 }

@@ -6,6 +6,7 @@
 
 #include "hostapi/CameraSuite.h"
 #include "text/JsonWriter.h"
+#include "tools/mayascene/JsonMembers.h"
 #include "tools/mayascene/StreamWords.h"
 
 namespace mayascene {
@@ -52,13 +53,6 @@ void writePair(text::JsonWriter& json, std::int64_t first, std::int64_t second) 
   json.beginRow();
   json.integer(first);
   json.integer(second);
-  json.endArray();
-}
-
-void writeTexts(text::JsonWriter& json, std::string_view key, const std::vector<std::string>& texts) {
-  json.key(key);
-  json.beginArray();
-  for (const std::string& text : texts) json.text(text);
   json.endArray();
 }
 
@@ -221,11 +215,7 @@ void writeScene(text::JsonWriter& json, const SceneReport& scene) {
 
 void writeCompositionJson(std::ostream& out, const RunReport& run) {
   text::JsonWriter json(out);
-  json.beginObject();
-  json.key("format");
-  json.text(kFormat);
-  json.key("version");
-  json.integer(kVersionOfForm);
+  beginReport(json, kFormat, kVersionOfForm);
   json.key("linearUnits");
   json.integer(run.linearUnits);
   json.key("scenes");
