@@ -7,6 +7,7 @@
 //   300  curves                      600  what a bake writes
 //   700  what stops an import          800  what does not come over
 //   900  where the picture differs   1000  what keeps a check from its end
+//   1100  what an export cannot say
 #pragma once
 
 #include <cstdint>
@@ -141,6 +142,12 @@ enum class Code : std::uint16_t {
   CheckOutOfMemory = 1003,
   ReportTooLarge = 1004,
   CheckNotStarted = 1005,
+  // What an export cannot say: diag/ExportCodes.cpp
+  ExportNotFinite = 1101,
+  ExportPictureUnusable = 1102,
+  ExportLensUnusable = 1103,
+  ExportParentCircle = 1104,
+  ExportNumberTooLarge = 1105,
 };
 
 // Ordered: a later one is worse.

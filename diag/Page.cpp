@@ -25,6 +25,7 @@ constexpr std::array kTopics = {
     Topic{800, "What does not come over"},
     Topic{900, "Where the picture differs"},
     Topic{1000, "What keeps a check from its end"},
+    Topic{1100, "What an export cannot say"},
 };
 
 constexpr std::string_view kIntroduction =

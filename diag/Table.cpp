@@ -15,7 +15,7 @@ std::vector<Entry> WholeTable() {
   std::vector<Entry> table;
   for (const std::span<const Entry> part :
        {ReadingCodes(), NodeCodes(), CurveCodes(), DriverCodes(), CameraCodes(), BakeCodes(), StopCodes(),
-        LossCodes(), PictureCodes(), ProcessCodes()}) {
+        LossCodes(), PictureCodes(), ProcessCodes(), ExportCodes()}) {
     table.insert(table.end(), part.begin(), part.end());
   }
   return table;

@@ -17,5 +17,6 @@ std::span<const Entry> StopCodes();
 std::span<const Entry> LossCodes();
 std::span<const Entry> PictureCodes();
 std::span<const Entry> ProcessCodes();
+std::span<const Entry> ExportCodes();
 
 }  // namespace diag

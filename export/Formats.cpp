@@ -1,0 +1,42 @@
+// The table of formats: a writer is a line here, and a file of its own.
+#include <algorithm>
+#include <array>
+
+#include "export/Format.h"
+#include "export/SafeNames.h"
+#include "export/Writers.h"
+
+namespace interchange {
+namespace {
+
+constexpr std::array kFormats = {
+    Format{.name = "csv",
+           .suffix = ".csv",
+           .sentence = "a row a frame and layer; with --keys a row a key",
+           .listsKeys = true,
+           .write = WriteCsv},
+};
+
+}  // namespace
+
+std::span<const Format> Formats() { return kFormats; }
+
+const Format* FindFormat(std::string_view name) {
+  const auto found = std::find_if(kFormats.begin(), kFormats.end(),
+                                  [&](const Format& format) { return format.name == name; });
+  return found == kFormats.end() ? nullptr : &*found;
+}
+
+const Format* FormatOfPath(std::string_view path) {
+  const std::string lowered = Lowered(path);
+  const auto found = std::find_if(kFormats.begin(), kFormats.end(),
+                                  [&](const Format& format) { return lowered.ends_with(format.suffix); });
+  return found == kFormats.end() ? nullptr : &*found;
+}
+
+bool Write(const Format& format, const Composition& composition, const WriteOptions& options,
+           std::string_view stem, Files& files, diag::Collector* diagnostics) {
+  return IsWritable(composition, diagnostics) && format.write(composition, options, stem, files, diagnostics);
+}
+
+}  // namespace interchange

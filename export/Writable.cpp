@@ -1,0 +1,106 @@
+// What no format can say.
+#include <algorithm>
+#include <cmath>
+#include <cstdint>
+#include <iterator>
+#include <vector>
+
+#include "export/Format.h"
+
+namespace interchange {
+namespace {
+
+using diag::Code;
+
+bool IsPositive(double number) { return std::isfinite(number) && number > 0.0; }
+
+bool AreSound(const Channel (&channels)[3], std::size_t frames) {
+  return std::all_of(std::begin(channels), std::end(channels),
+                     [&](const Channel& channel) { return channel.IsSound(frames); });
+}
+
+bool AreSound(const std::vector<StreamKeys>& keys) {
+  return std::all_of(keys.begin(), keys.end(), [](const StreamKeys& stream) {
+    const auto finite = [](double value) { return std::isfinite(value); };
+    return stream.values.size() == stream.frames.size() * stream.components &&
+           std::all_of(stream.frames.begin(), stream.frames.end(), finite) &&
+           std::all_of(stream.values.begin(), stream.values.end(), finite);
+  });
+}
+
+// The first of a layer's values that is no number, in words; empty where all are sound.
+std::string_view UnsoundPart(const Layer& layer, std::size_t frames) {
+  if (!AreSound(layer.position, frames)) return "position";
+  if (!AreSound(layer.rotation, frames)) return "rotation";
+  if (!AreSound(layer.scale, frames)) return "scale";
+  if (!AreSound(layer.interest, frames)) return "point of interest";
+  if (layer.lens && !layer.lens->zoom.IsSound(frames)) return "zoom";
+  return AreSound(layer.keys) ? "" : "keys";
+}
+
+bool IsUsable(const std::optional<double>& extra) { return !extra || std::isfinite(*extra); }
+
+bool IsUsable(const Lens& lens, std::size_t frames) {
+  if (!IsPositive(lens.filmWidth) || !IsPositive(lens.filmHeight)) return false;
+  if (!IsUsable(lens.filmOffsetX) || !IsUsable(lens.filmOffsetY) || !IsUsable(lens.squeeze)) return false;
+  const std::size_t looked = lens.zoom.moves() ? frames : 1;
+  for (std::size_t frame = 0; frame < looked; ++frame) {
+    if (!IsPositive(lens.zoom.at(frame))) return false;
+  }
+  return true;
+}
+
+// Whether parents are layers, and the way up from each layer ends.
+bool ParentsEnd(const std::vector<Layer>& layers) {
+  enum class Mark : std::uint8_t { None, OnTheWay, Ends };
+  std::vector<Mark> marks(layers.size(), Mark::None);
+  std::vector<std::size_t> way;
+  for (std::size_t start = 0; start < layers.size(); ++start) {
+    way.clear();
+    std::optional<std::size_t> at = start;
+    while (at && *at < layers.size() && marks[*at] == Mark::None) {
+      marks[*at] = Mark::OnTheWay;
+      way.push_back(*at);
+      at = layers[*at].parent;
+    }
+    if (at && (*at >= layers.size() || marks[*at] == Mark::OnTheWay)) return false;
+    for (const std::size_t passed : way) marks[passed] = Mark::Ends;
+  }
+  return true;
+}
+
+bool IsPictureUsable(const Composition& composition) {
+  return IsPositive(composition.width) && IsPositive(composition.height) &&
+         IsPositive(composition.pixelAspect) && IsPositive(composition.framesPerSecond) &&
+         IsPositive(composition.metersPerUnit) && std::isfinite(composition.firstFrame) &&
+         composition.frames != 0;
+}
+
+bool IsLayerUsable(const Layer& layer, std::size_t frames, diag::Collector* diagnostics) {
+  const std::string_view unsound = UnsoundPart(layer, frames);
+  if (!unsound.empty()) {
+    diagnostics->Report(Code::ExportNotFinite, {}, {layer.name, unsound});
+    return false;
+  }
+  if (layer.kind != LayerKind::Camera || (layer.lens && IsUsable(*layer.lens, frames))) return true;
+  diagnostics->Report(Code::ExportLensUnusable, {}, {layer.name});
+  return false;
+}
+
+}  // namespace
+
+bool IsWritable(const Composition& composition, diag::Collector* diagnostics) {
+  if (!IsPictureUsable(composition)) {
+    diagnostics->Report(Code::ExportPictureUnusable, {});
+    return false;
+  }
+  bool usable = true;
+  for (const Layer& layer : composition.layers) {
+    usable = IsLayerUsable(layer, composition.frames, diagnostics) && usable;
+  }
+  if (ParentsEnd(composition.layers)) return usable;
+  diagnostics->Report(Code::ExportParentCircle, {});
+  return false;
+}
+
+}  // namespace interchange

@@ -1,0 +1,13 @@
+// The writers of the table in Formats.cpp. Each is a Format::write.
+#pragma once
+
+#include <string_view>
+
+#include "export/Format.h"
+
+namespace interchange {
+
+bool WriteCsv(const Composition& composition, const WriteOptions& options, std::string_view stem,
+              Files& files, diag::Collector* diagnostics);
+
+}  // namespace interchange
