@@ -54,9 +54,9 @@
   ENTRY(MEMORY,                 3031, "the host cannot allocate the memory")                                \
   ENTRY(MEMORY_STATE,           3032, "a memory handle was unlocked more often than it was locked") \
   ENTRY(BAD_MEMORY_SIZE,        3033, "a memory handle was asked for with a negative size or unknown flags") \
-  ENTRY(TOO_MANY_LAYERS,        3034, "the host holds as many layers as it was told to take at most")       \
-  ENTRY(TOO_MANY_KEYS,          3035, "the host holds as many keys as it was told to take at most")         \
-  ENTRY(TOO_MUCH_MEMORY,        3036, "the importer asks for more memory than the host was told to give")   \
+  ENTRY(TOO_MANY_LAYERS,        3034, "the host holds as many layers as its limit allows")                       \
+  ENTRY(TOO_MANY_KEYS,          3035, "the host holds as many keys as its limit allows")                         \
+  ENTRY(TOO_MUCH_MEMORY,        3036, "the importer asks for more memory than the host's limit allows")           \
   ENTRY(SILENT_ERRORS,          3041, "silent errors were ended that had not begun, or with another state record") \
   ENTRY(REGISTRATION,           3051, "an importer was registered with a wrong name, count or callback set") \
   ENTRY(SUITE_REFUSED,          3061, "the suite is not offered in that version")                           \

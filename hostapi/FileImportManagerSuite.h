@@ -1,4 +1,4 @@
-/* "QZGP File Import Manager Suite": what a plug-in tells the host about the files that it imports. */
+/* "QZGP File Import Manager Suite": which files a plug-in imports, and its callbacks for them. */
 #ifndef HOSTAPI_FILEIMPORTMANAGERSUITE_H
 #define HOSTAPI_FILEIMPORTMANAGERSUITE_H
 
@@ -30,8 +30,8 @@ typedef struct HostImporterExtension {
 typedef HostError (*HostImportCallback)(const HostUTF16Unit* path, void* ignored1, void* ignored2,
                                         VOR_Item* folder);
 
-/* Sets *canImport to 1 when the importer takes the file, else to 0, after a failure too, but for one to end
- * the silence or to dispose of the file. The middle pointer is not read. */
+/* Sets *canImport to 1 when the importer takes the file, else to 0. A failure also sets 0, except a failure
+ * to end the silence or to dispose of the file. The middle pointer is not read. */
 typedef HostError (*HostVerifyCallback)(const HostUTF16Unit* path, void* ignored, uint8_t* canImport);
 
 /* The callbacks of an importer. The host copies the set. */

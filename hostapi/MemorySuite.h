@@ -1,4 +1,4 @@
-/* "QZGP Memory Suite": blocks of the host's memory behind handles. */
+/* "QZGP Memory Suite": blocks of the host's memory, named by handles. */
 #ifndef HOSTAPI_MEMORYSUITE_H
 #define HOSTAPI_MEMORYSUITE_H
 

@@ -18,7 +18,7 @@ typedef struct WNBasicSuite {
    * Codes: HOST_ERR_BAD_POINTER, HOST_ERR_SUITE_REFUSED. */
   HostError (*AcquireSuite)(const char* name, int32_t version, const void** suite);
 
-  /* Slot 1. Gives one acquisition back.
+  /* Slot 1. Gives one acquisition back. Must not throw.
    * Codes: HOST_ERR_BAD_POINTER, HOST_ERR_SUITE_NOT_HELD. */
   HostError (*ReleaseSuiteByName)(const char* name, int32_t version);
 } WNBasicSuite;

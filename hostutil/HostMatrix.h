@@ -28,13 +28,16 @@ typedef struct MatrixComponents {
   double rotation[3]; /* about X, Y and Z, in radians; Y lies within a quarter turn of 0 */
 } MatrixComponents;
 
+/* Makes it the identity. */
 HOSTUTIL_API HostError MatrixSetIdentity(TransformMatrix* matrix);
+
+/* Moves by (tx, ty, tz). */
 HOSTUTIL_API HostError MatrixTranslate(TransformMatrix* matrix, double tx, double ty, double tz);
 
-/* About the origin. */
+/* Scales about the origin. */
 HOSTUTIL_API HostError MatrixScale(TransformMatrix* matrix, double sx, double sy, double sz);
 
-/* About an axis through the origin. The axis need not be of length 1; one of length 0 turns nothing. */
+/* Turns about an axis through the origin. The axis need not be of length 1; one of length 0 turns nothing. */
 HOSTUTIL_API HostError MatrixRotateAxis(TransformMatrix* matrix, double ax, double ay, double az,
                                         double angle);
 

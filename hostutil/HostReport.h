@@ -1,5 +1,5 @@
-/* What a plug-in tells the host of its failures: a standard exception that reaches a callback, which the host
- * shows and names a code for; and the line of a scene where a failure was found. */
+/* How a plug-in reports its failures to the host: a standard exception that reaches a callback, which the
+ * host shows and names a code for; and the line of a scene where a failure was found. */
 #ifndef HOSTUTIL_HOSTREPORT_H
 #define HOSTUTIL_HOSTREPORT_H
 
@@ -10,7 +10,7 @@
 extern "C" {
 #endif
 
-/* The kinds of exception that the host tells apart. */
+/* The kinds of exception that the host distinguishes. */
 enum { HOST_EXCEPTION_MEMORY = 1, HOST_EXCEPTION_OTHER = 2 };
 
 /* Shows a message to the user through the reporter that the host has set, and returns the code for the

@@ -1,88 +1,83 @@
-"""docs/host-interface.md against the headers of hostapi/ and hostutil/."""
+"""docs/host-reference.md and docs/host-interface.md against the headers, the sources and the calls of real imports."""
 
+import json
 import re
 import unittest
 
 import headers
+import host_reference
 from project import ROOT, read
 
+REFERENCE = read("docs/host-reference.md")
 DOCUMENT = read("docs/host-interface.md")
-HEADING = re.compile(r"^### (?:Basic suite|(QZGP [\w ]+ Suite), version (\d+))$", re.MULTILINE)
-OPERATION = re.compile(r"^\| (\d+)(\*?) \| `(\w+)` \| `([^`]*)` \| (.+) \|$", re.MULTILINE)
 
 
 def section(title):
-    found = re.search(rf"^## {re.escape(title)}\n(.*?)(?=^## |\Z)", DOCUMENT, re.MULTILINE | re.DOTALL)
-    return found[1]
+    return re.search(rf"^## {re.escape(title)}\n(.*?)(?=^## |\Z)", DOCUMENT, re.MULTILINE | re.DOTALL)[1]
 
 
-def documented_suites():
-    """(name, version) to its operations, as the document has them."""
-    marks = list(HEADING.finditer(DOCUMENT))
-    found = {}
-    for mark in marks:
-        text = re.split(r"^##", DOCUMENT[mark.end() :], maxsplit=1, flags=re.MULTILINE)[0]
-        rows = OPERATION.findall(text)
-        found[mark[1] or "", int(mark[2] or 0)] = tuple(
-            headers.Operation(int(slot), name, arguments, star == "*") for slot, star, name, arguments, _ in rows
-        )
-    return found
+def code_names(text):
+    return re.findall(r"`(\w+)`", text)
 
 
-class HostInterface(unittest.TestCase):
+class Reference(unittest.TestCase):
     maxDiff = None
 
-    def test_every_suite_has_its_versions_slots_and_arguments(self):
-        declared = {(suite.name, suite.version): suite.operations for suite in headers.suites()}
-        self.assertEqual(len(declared), 14)
-        self.assertEqual(documented_suites(), declared)
+    def test_it_is_what_its_script_prints(self):
+        self.assertEqual(REFERENCE, host_reference.page())
 
-    def test_the_suites_stand_in_the_order_of_their_release(self):
-        source = read("plugin/QZGP_SuiteHandler.cpp")
-        released = re.findall(r"\{QZGP_(\w+)_SUITE, QZGP_\w+_SUITE_(\d+)\}", source)
-        documented = [
-            (name.removeprefix("QZGP ").removesuffix(" Suite").upper().replace(" ", "_"), str(version))
-            for name, version in documented_suites()
-            if name
-        ]
-        self.assertEqual(documented, released)
+    def test_it_has_every_operation_of_every_suite(self):
+        declared = []
+        for path in (ROOT / "hostapi").glob("*Suite.h"):
+            tables = re.findall(r"typedef struct (?:QZGP_|WN)\w+ \{.*?^\}", path.read_text(encoding="utf-8"), re.M | re.S)
+            declared += re.findall(r"HostError \(\*(\w+)\)", "".join(tables))
+        listed = re.findall(r"^\| \d+\*? \| `(\w+)\(", REFERENCE, re.MULTILINE)
+        self.assertEqual(len(headers.suites()), 14)
+        self.assertEqual(sorted(listed), sorted(declared))
 
-    def test_every_error_code_is_listed_with_its_number_and_meaning(self):
-        rows = re.findall(r"^\| `(\w+)` \| (\d+) \| (.+) \|$", section("Error codes"), re.MULTILINE)
-        codes = headers.error_codes()
-        self.assertEqual(len(codes), read("hostapi/ErrorCodes.h").count("ENTRY("))
-        self.assertEqual(rows, codes)
+    def test_every_operation_names_the_codes_of_the_embedded_host(self):
+        for suite in headers.suites():
+            for operation in suite.operations:
+                self.assertTrue(operation.codes[0].startswith("HOST_ERR_"), operation.name)
+
+    def test_it_has_every_error_code(self):
+        self.assertEqual(len(headers.error_codes()), read("hostapi/ErrorCodes.h").count("ENTRY("))
 
     def test_every_code_that_is_named_exists(self):
         names = {name for name, _, _ in headers.error_codes()}
-        library = section("The utility library")
-        for name in re.findall(r"`([A-Z]+(?:_[A-Z]+)+)`", library):
-            self.assertIn(name, names)
+        for path in [*(ROOT / "hostapi").glob("*.h"), *(ROOT / "hostutil").glob("*.h")]:
+            for name in re.findall(r"\bHOST_ERR_([A-Z]\w+)", path.read_text(encoding="utf-8")):
+                self.assertIn(name, names | {"NONE"}, path.name)
 
-    def test_every_utility_function_is_listed_as_it_is_declared(self):
-        rows = re.findall(r"^\| `([^`]+\))` \|", section("The utility library"), re.MULTILINE)
-        self.assertEqual(sorted(rows), sorted(headers.utility_functions().values()))
-
-    def test_every_function_is_listed_under_its_header(self):
-        parts = re.split(r"^### [\w -]+: (hostutil/\w+\.h)$", section("The utility library"), flags=re.MULTILINE)
-        self.assertGreater(len(parts), 2)
-        for header, text in zip(parts[1::2], parts[2::2]):
-            declared = read(header)
-            for name in re.findall(r"^\| `[^`(]*?(\w+)\(", text, re.MULTILINE):
-                self.assertRegex(declared, rf"HOSTUTIL_API [^;]*\b{name}\(")
+    def test_it_has_every_function_of_the_library_with_a_contract(self):
+        listed = [
+            re.search(r"(\w+)\(", declaration)[1]
+            for functions in headers.utility_contracts().values()
+            for declaration, contract in functions
+            if contract
+        ]
+        self.assertEqual(sorted(listed), sorted(headers.utility_functions()))
 
     def test_the_library_exports_what_is_listed(self):
         exported = set(re.findall(r"^\s+(\w+);$", read("hostutil/exports.map"), re.MULTILINE)) - {"local"}
-        listed = set(headers.utility_functions()) | set(headers.setup_functions())
-        self.assertEqual(exported, listed)
+        self.assertEqual(exported, set(headers.utility_functions()) | set(headers.setup_functions()))
 
+    def test_it_has_every_named_number_of_the_suites(self):
+        for name, value in headers.constants().items():
+            self.assertRegex(REFERENCE, rf"#define {name} \(?{re.escape(value)}\b")
+
+    def test_it_has_every_stream(self):
+        self.assertEqual(len(headers.streams()), read("hostapi/LayerStreams.h").count("HOST_STREAM_"))
+
+
+class Interface(unittest.TestCase):
     def test_the_hosts_own_functions_and_services_are_named(self):
-        text = section("What the embedded host adds")
+        named = code_names(section("What the embedded host adds"))
         for name in headers.setup_functions() + headers.rehearsed_services():
-            self.assertIn(f"`{name}`", text)
+            self.assertIn(name, named)
 
-    def test_functions_that_are_not_called_are_told(self):
-        told = re.search(r"^(`HostCompareNoCase`.*?) are there for other plug-ins", section("The utility library"), re.MULTILINE | re.DOTALL)
+    def test_functions_that_are_not_called_are_named(self):
+        sentence = re.search(r"^(`HostCompareNoCase`.*?) are there for other plug-ins", DOCUMENT, re.M | re.S)
         sources = "".join(
             path.read_text(encoding="utf-8") for room in ("plugin", "maya", "comp") for path in (ROOT / room).glob("*.*")
         )
@@ -96,29 +91,72 @@ class HostInterface(unittest.TestCase):
             for name in headers.utility_functions()
             if not re.search(rf"\b({name}|{inline.get(name, name)})\b", sources)
         ]
-        self.assertEqual(sorted(re.findall(r"`(\w+)`", told[1])), sorted(unused))
+        self.assertEqual(sorted(code_names(sentence[1])), sorted(unused))
 
-    def test_the_entry_and_the_callbacks_are_as_declared(self):
-        code = headers.one_line(re.search(r"```c\n(.*?)```", DOCUMENT, re.DOTALL)[1])
-        declared = headers.one_line(
-            "".join(
-                read(f"hostapi/{name}.h") for name in ("PluginEntry", "FileImportManagerSuite", "RegisterSuite")
-            )
-        )
-        for name, arguments in re.findall(r"HostError \(?\*?(\w+)\)?\(([^)]*)\);", code):
-            typename = "HostPluginEntry" if name == "GPMain_MayaImport" else name
-            self.assertIn(f"typedef HostError (*{typename})({arguments});", declared)
+    def test_every_operation_that_is_named_exists(self):
+        operations = {operation.name for suite in headers.suites() for operation in suite.operations}
+        rows = re.findall(r"^\| `(\w+)` \|", section("What the module passes"), re.MULTILINE)
+        self.assertGreater(len(rows), 10)
+        for name in rows:
+            self.assertIn(name, operations)
 
-    def test_every_named_number_of_the_headers_is_told(self):
-        for name, value in headers.constants().items():
-            self.assertIn(value, DOCUMENT, name)
 
-    def test_the_stream_table_is_that_of_the_border(self):
-        source = read("hostapi/LayerStreams.h")
-        rows = re.findall(r"^\| (\d+) \| (.+?) \| ([13]) \| (\w+) \|$", section("The layer streams"), re.MULTILINE)
-        declared = re.findall(r"^\s+HOST_STREAM_\w+ = (\d+),?\s+/\* (one|three), (\w+)", source, re.MULTILINE)
-        counts = {"1": "one", "3": "three"}
-        self.assertEqual([(number, counts[count], unit) for number, _, count, unit in rows], declared)
+class Life(unittest.TestCase):
+    """The drawing of an import is taken as a grammar, and traces of imports have to be sentences of it."""
+
+    text = section("The life of an import")
+    drawing = re.search(r"^```mermaid\nsequenceDiagram\n(.*?)^```$", text, re.MULTILINE | re.DOTALL)[1]
+    runs = dict(re.findall(r"^\| (values|keys) \| (.+) \|$", text, re.MULTILINE))
+
+    def sentence(self, name):
+        if name not in self.runs:
+            return f"{name} "
+        return "".join("(?:" + "".join(f"{call} " for call in code_names(part)) + ")*" for part in self.runs[name].split(";"))
+
+    def grammar(self):
+        pattern = ""
+        ends = []
+        for line in self.drawing.splitlines():
+            word, _, rest = line.strip().partition(" ")
+            if word in ("loop", "opt"):
+                pattern += "(?:"
+                ends.append(")*" if word == "loop" else ")?")
+            elif word == "end":
+                pattern += ends.pop()
+            elif word != "participant":
+                self.assertRegex(word, r"^(Host->>Module|Module->>Host):$")
+                pattern += "".join(self.sentence(name) for name in rest.split(", "))
+        self.assertEqual(ends, [])
+        return re.compile(pattern)
+
+    @staticmethod
+    def calls(trace):
+        for line in trace.read_text(encoding="utf-8").splitlines():
+            record = json.loads(line)
+            if record["call"] == "enter":
+                yield record["callback"]
+            elif record["call"] not in ("leave", "AcquireSuite", "ReleaseSuiteByName"):
+                yield record["call"]
+
+    def test_every_golden_trace_is_drawn(self):
+        grammar = self.grammar()
+        traces = sorted((ROOT / "tests" / "examples" / "golden").glob("*.trace"))
+        self.assertGreater(len(traces), 1)
+        for trace in traces:
+            self.assertTrue(grammar.fullmatch("".join(f"{call} " for call in self.calls(trace))), trace.name)
+
+    def test_every_operation_is_drawn(self):
+        drawn = set(re.findall(r"\w+", self.drawing)) | set(code_names("".join(self.runs.values())))
+        for suite in headers.suites():
+            for operation in suite.operations:
+                self.assertIn(operation.name, drawn | {"AcquireSuite", "ReleaseSuiteByName"})
+
+    def test_a_call_out_of_order_is_no_sentence(self):
+        trace = next(iter(sorted((ROOT / "tests" / "examples" / "golden").glob("*.trace"))))
+        calls = list(self.calls(trace))
+        at = calls.index("CreateComp")
+        calls[at], calls[at + 1] = calls[at + 1], calls[at]
+        self.assertIsNone(self.grammar().fullmatch("".join(f"{call} " for call in calls)))
 
 
 if __name__ == "__main__":
