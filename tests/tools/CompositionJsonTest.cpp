@@ -35,6 +35,21 @@ TEST(CompositionJson, TheFormIsNamedAndNumbered) {
   EXPECT_EQ(document["scenes"], json::array());
 }
 
+TEST(CompositionJson, ASceneHasItsOwnNumbersWhereTheyAreKnown) {
+  RunReport run;
+  run.scenes.resize(3);
+  run.scenes[0].numbers = SceneNumbers{.firstFrame = 101.0, .lastFrame = 140.5, .linearUnit = "meter"};
+  run.scenes[1].numbers = SceneNumbers{.firstFrame = {}, .lastFrame = {}, .linearUnit = "ft"};
+  const json scenes = documentOf(run)["scenes"];
+  EXPECT_EQ(scenes[0]["firstFrame"], 101);
+  EXPECT_EQ(scenes[0]["lastFrame"], 140.5);
+  EXPECT_EQ(scenes[0]["linearUnit"], "meter");
+  EXPECT_FALSE(scenes[1].contains("firstFrame"));
+  EXPECT_FALSE(scenes[1].contains("lastFrame"));
+  EXPECT_EQ(scenes[1]["linearUnit"], "ft");
+  EXPECT_FALSE(scenes[2].contains("linearUnit"));
+}
+
 TEST(CompositionJson, ACompositionHasItsMeasures) {
   const HandBuiltScene scene;
   RunReport run;

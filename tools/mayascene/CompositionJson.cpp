@@ -192,6 +192,12 @@ void writeComposition(text::JsonWriter& json, const Composition& composition) {
   json.endObject();
 }
 
+void writeNumbers(text::JsonWriter& json, const SceneNumbers& numbers) {
+  if (numbers.firstFrame) writeNumber(json, "firstFrame", *numbers.firstFrame);
+  if (numbers.lastFrame) writeNumber(json, "lastFrame", *numbers.lastFrame);
+  writeText(json, "linearUnit", numbers.linearUnit);
+}
+
 void writeScene(text::JsonWriter& json, const SceneReport& scene) {
   json.beginObject();
   json.key("path");
@@ -201,6 +207,7 @@ void writeScene(text::JsonWriter& json, const SceneReport& scene) {
   json.key("status");
   json.integer(static_cast<int>(scene.status));
   writeCallback(json, scene.result);
+  if (scene.numbers) writeNumbers(json, *scene.numbers);
   json.key("compositions");
   json.beginArray();
   if (scene.result.folder != nullptr) {

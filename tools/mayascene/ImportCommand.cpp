@@ -4,6 +4,7 @@
 
 #include <filesystem>
 #include <memory>
+#include <optional>
 #include <string>
 #include <utility>
 
@@ -134,6 +135,14 @@ ExitStatus judgeScene(const SceneReport& report, bool outlinePrinted, Diagnostic
   return ExitStatus::Refused;
 }
 
+// The scene is read once more for them, so only for who asked for JSON; a bake has read it already.
+std::optional<SceneNumbers> numbersOf(const SceneReport& report, const BakedScene* baked) {
+  const refhost::Folder* const folder = report.result.folder;
+  if (folder == nullptr || folder->compositions.empty()) return std::nullopt;
+  if (baked != nullptr) return mayascene::numbersOf(*baked);
+  return mayascene::numbersOf(report.path, *folder->compositions.front());
+}
+
 ExitStatus importAll(const ImportArguments& arguments, HostSession& session, Outputs& outputs, RunReport* run,
                      Diagnostics& diagnostics) {
   ExitStatus status = ExitStatus::Done;
@@ -152,6 +161,7 @@ ExitStatus importAll(const ImportArguments& arguments, HostSession& session, Out
       printOutline(out, report, style);
       out.flush();
     }
+    if (outputs.json) report.numbers = numbersOf(report, arguments.bake ? &run->bakes.back() : nullptr);
     const ExitStatus bakeStatus = arguments.bake ? report.status : ExitStatus::Done;
     report.status = worse(bakeStatus, judgeScene(report, outputs.outline != nullptr, diagnostics));
     status = worse(status, report.status);

@@ -2,12 +2,14 @@
 #pragma once
 
 #include <cstdint>
+#include <optional>
 #include <string>
 #include <vector>
 
 #include "refhost/Host.h"
 #include "tools/mayascene/ExitStatus.h"
 #include "tools/mayascene/SceneBake.h"
+#include "tools/mayascene/SceneNumbers.h"
 
 namespace mayascene {
 
@@ -23,8 +25,9 @@ struct SceneReport {
   std::string path;  // as the user named it; bytes
   Outcome outcome = Outcome::Unreadable;
   ExitStatus status = ExitStatus::Unreadable;
-  bool explained = false;          // why nothing was imported was said already
-  refhost::CallbackResult result;  // its folder lives as long as the host
+  bool explained = false;               // why nothing was imported was said already
+  refhost::CallbackResult result;       // its folder lives as long as the host
+  std::optional<SceneNumbers> numbers;  // where JSON was asked for and the scene could be read
 };
 
 struct RunReport {

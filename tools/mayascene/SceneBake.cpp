@@ -8,6 +8,7 @@
 
 #include "diag/Codes.h"
 #include "scene/Scene.h"
+#include "tools/mayascene/SceneNumbers.h"
 #include "tools/mayascene/SceneText.h"
 #include "tools/mayascene/Version.h"
 
@@ -77,6 +78,7 @@ BakedScene bakeScene(const std::string& path, const BakeArguments& arguments, Di
   const scene::Scene scene = scene::Read(text->text(), collector);
   const bake::Origin origin{std::string("mayascene ") + kVersion,
                             std::filesystem::path(path).filename().string(), arguments.words};
+  baked.linearUnit = linearUnitOf(scene);
   baked.report = bake::Bake(scene, arguments.options, origin, &collector, out);
   gather(collector, &baked);
   const bool allWritten = std::all_of(baked.report.cameras.begin(), baked.report.cameras.end(),

@@ -19,6 +19,7 @@ struct BakedScene {
   std::string path;    // as the user named it; bytes
   std::string output;  // the bake's, empty where there is none
   ExitStatus status = ExitStatus::Unreadable;
+  std::string linearUnit;  // of the scene's lengths, as SceneNumbers has it
   bake::Report report;
   std::vector<diag::Diagnostic> diagnostics;  // with their places, the worst first
   std::uint64_t errors = 0;
