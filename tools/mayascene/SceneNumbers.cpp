@@ -3,13 +3,10 @@
 #include <algorithm>
 #include <new>
 #include <string_view>
-#include <unordered_set>
 
-#include "bake/KeyedChannel.h"
-#include "bake/Selection.h"
+#include "bake/FirstKey.h"
 #include "check/Times.h"
 #include "diag/Collector.h"
-#include "motion/Measures.h"
 #include "scene/Units.h"
 #include "tools/mayascene/SceneText.h"
 
@@ -17,48 +14,6 @@ namespace mayascene {
 namespace {
 
 constexpr std::string_view kDefaultUnit = "cm";
-
-// The first key of each node that an import takes, and the smallest of them.
-class FirstKeys {
- public:
-  explicit FirstKeys(const scene::Scene& scene) : scene_(scene), measures_(motion::MeasuresOf(scene)) {}
-
-  void takeShape(scene::NodeId shape) {
-    const auto lens = bake::FindKeys(scene_, shape, "focalLength", measures_);
-    if (lens) takeKey(lens->curve.keys.front().time);
-    // A circle of parents is cut by the reader; a shared chain is gone up once.
-    for (scene::NodeId node = scene_.node(shape).parent; node != scene::kNoNode && seen_.insert(node).second;
-         node = scene_.node(node).parent) {
-      takeTransform(node);
-    }
-  }
-
-  std::optional<double> smallest() const { return smallest_; }
-
- private:
-  // Of a node with a channel of two keys all channels count from its first channel that has a key.
-  void takeTransform(scene::NodeId node) {
-    std::optional<double> first;
-    bool animated = false;
-    for (const std::string_view attribute : bake::kPlaceChannels) {
-      const auto channel = bake::FindKeys(scene_, node, attribute, measures_);
-      if (!channel) continue;
-      if (!first) first = channel->curve.keys.front().time;
-      animated = animated || channel->curve.keys.size() > 1;
-    }
-    if (animated) takeKey(*first);
-  }
-
-  void takeKey(double seconds) {
-    const double frame = seconds * measures_.framesPerSecond;
-    smallest_ = std::min(smallest_.value_or(frame), frame);
-  }
-
-  const scene::Scene& scene_;
-  motion::Measures measures_;
-  std::unordered_set<scene::NodeId> seen_;
-  std::optional<double> smallest_;
-};
 
 }  // namespace
 
@@ -68,13 +23,8 @@ std::string linearUnitOf(const scene::Scene& scene) {
 }
 
 std::optional<double> firstKeyOf(const scene::Scene& scene) {
-  diag::Collector ignored(scene.text());
-  const bake::Selection selection = bake::Select(scene, {}, &ignored);
-  FirstKeys keys(scene);
-  for (const scene::NodeId camera : selection.cameras) keys.takeShape(camera);
-  for (const scene::NodeId locator : selection.locators) keys.takeShape(locator);
-  if (keys.smallest() && !check::CountsFrames(scene)) return 0.0;
-  return keys.smallest();
+  const std::optional<double> first = bake::FirstKeyOfImport(scene);
+  return first && !check::CountsFrames(scene) ? 0.0 : first;
 }
 
 std::optional<double> lastKeyOf(const refhost::Composition& composition) {
