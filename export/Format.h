@@ -52,9 +52,14 @@ std::span<const Format> Formats();
 const Format* FindFormat(std::string_view name);
 const Format* FormatOfPath(std::string_view path);
 
+// Picture, pixel aspect, rate, unit, film and zoom of a composition that can be written lie between these.
+inline constexpr double kSmallestMeasure = 1e-9;
+inline constexpr double kLargestMeasure = 1e12;
+
 // Whether a writer can be given it; an error is reported for each thing that keeps it from that. Then every
-// number is finite; picture, rate, film and zoom are above 0; a channel that moves has a value for each
-// frame; every camera has a lens; no parents go in a circle. Numbers may still be as large as a double is.
+// number is finite; the measures above are within their bounds; a channel that moves has a value for each
+// frame; every camera has a lens; no parents go in a circle. Places, rotations and scales may still be as
+// large as a double is.
 bool IsWritable(const Composition& composition, diag::Collector* diagnostics);
 
 // Writes it in the format, where it is writable.

@@ -12,7 +12,8 @@ namespace {
 
 using diag::Code;
 
-bool IsPositive(double number) { return std::isfinite(number) && number > 0.0; }
+// Sizes, rates and lenses beyond these are none, and what is computed of them would not be finite.
+bool IsMeasure(double number) { return number >= kSmallestMeasure && number <= kLargestMeasure; }
 
 bool AreSound(const Channel (&channels)[3], std::size_t frames) {
   return std::all_of(std::begin(channels), std::end(channels),
@@ -41,11 +42,11 @@ std::string_view UnsoundPart(const Layer& layer, std::size_t frames) {
 bool IsUsable(const std::optional<double>& extra) { return !extra || std::isfinite(*extra); }
 
 bool IsUsable(const Lens& lens, std::size_t frames) {
-  if (!IsPositive(lens.filmWidth) || !IsPositive(lens.filmHeight)) return false;
+  if (!IsMeasure(lens.filmWidth) || !IsMeasure(lens.filmHeight)) return false;
   if (!IsUsable(lens.filmOffsetX) || !IsUsable(lens.filmOffsetY) || !IsUsable(lens.squeeze)) return false;
   const std::size_t looked = lens.zoom.moves() ? frames : 1;
   for (std::size_t frame = 0; frame < looked; ++frame) {
-    if (!IsPositive(lens.zoom.at(frame))) return false;
+    if (!IsMeasure(lens.zoom.at(frame))) return false;
   }
   return true;
 }
@@ -70,9 +71,9 @@ bool ParentsEnd(const std::vector<Layer>& layers) {
 }
 
 bool IsPictureUsable(const Composition& composition) {
-  return IsPositive(composition.width) && IsPositive(composition.height) &&
-         IsPositive(composition.pixelAspect) && IsPositive(composition.framesPerSecond) &&
-         IsPositive(composition.metersPerUnit) && std::isfinite(composition.firstFrame) &&
+  return IsMeasure(composition.width) && IsMeasure(composition.height) &&
+         IsMeasure(composition.pixelAspect) && IsMeasure(composition.framesPerSecond) &&
+         IsMeasure(composition.metersPerUnit) && std::isfinite(composition.firstFrame) &&
          composition.frames != 0;
 }
 

@@ -1,0 +1,184 @@
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <charconv>
+#include <cmath>
+#include <string>
+#include <vector>
+
+#include "diag/Collector.h"
+#include "export/Format.h"
+#include "tests/export/HostileCompositions.h"
+
+namespace interchange {
+namespace {
+
+using interchange_test::FilesInMemory;
+using interchange_test::HostileComposition;
+using testing::ElementsAre;
+using testing::HasSubstr;
+
+using Row = std::vector<std::string>;
+
+// Reads comma-separated values strictly, by the grammar of RFC 4180. None where the text breaks it.
+std::optional<std::vector<Row>> RowsOf(const std::string& text) {
+  std::vector<Row> rows;
+  for (std::size_t at = 0; at < text.size();) {
+    Row row;
+    for (bool more = true; more;) {
+      std::string cell;
+      if (at < text.size() && text[at] == '"') {
+        for (++at;; ++at) {
+          if (at >= text.size()) return std::nullopt;
+          if (text[at] != '"') {
+            cell += text[at];
+          } else if (at + 1 < text.size() && text[at + 1] == '"') {
+            cell += text[++at];
+          } else {
+            break;
+          }
+        }
+        ++at;
+      } else {
+        for (; at < text.size() && text[at] != ',' && text[at] != '\r'; ++at) {
+          if (text[at] == '"' || text[at] == '\n') return std::nullopt;
+          cell += text[at];
+        }
+      }
+      row.push_back(cell);
+      if (at >= text.size()) return std::nullopt;
+      more = text[at] == ',';
+      if (more) ++at;
+    }
+    if (text.compare(at, 2, "\r\n") != 0) return std::nullopt;
+    at += 2;
+    if (!rows.empty() && row.size() != rows.front().size()) return std::nullopt;
+    rows.push_back(row);
+  }
+  return rows;
+}
+
+bool IsNumber(const std::string& text) {
+  double number = 0.0;
+  const auto read = std::from_chars(text.data(), text.data() + text.size(), number);
+  return read.ec == std::errc() && read.ptr == text.data() + text.size() && std::isfinite(number);
+}
+
+std::vector<Row> Written(const Composition& composition, bool keys = false) {
+  FilesInMemory files;
+  diag::Collector diagnostics("");
+  EXPECT_TRUE(Write(*FindFormat("csv"), composition, {.keys = keys}, "shot", files, &diagnostics));
+  EXPECT_EQ(diagnostics.count(), 0u);
+  EXPECT_TRUE(files.beside().empty());
+  const auto rows = RowsOf(files.main());
+  EXPECT_TRUE(rows) << files.main();
+  return rows.value_or(std::vector<Row>());
+}
+
+Composition OneCamera() {
+  Composition composition;
+  composition.width = 1920;
+  composition.height = 1080;
+  composition.framesPerSecond = 25;
+  composition.firstFrame = 101;
+  composition.frames = 2;
+  Layer arm;
+  arm.name = "arm";
+  arm.position[1] = 7.0;
+  arm.rotation[2] = 90.0;
+  Layer camera;
+  camera.name = "cam";
+  camera.kind = LayerKind::Camera;
+  camera.parent = 0;
+  camera.position[0] = Channel(std::vector<double>{1.5, 2.5});
+  camera.rotation[0] = 370.0;
+  camera.scale[2] = 3.0;
+  camera.lens.emplace();
+  camera.lens->zoom = 540.0;
+  camera.lens->filmWidth = 32.0;
+  camera.lens->filmHeight = 18.0;
+  composition.layers = {arm, camera};
+  return composition;
+}
+
+TEST(CsvWriter, ARowForEachFrameOfEachLayer) {
+  const std::vector<Row> rows = Written(OneCamera());
+  ASSERT_EQ(rows.size(), 5u);
+  EXPECT_THAT(rows[0], ElementsAre("layer", "frame", "seconds", "tx", "ty", "tz", "rx", "ry", "rz", "sx",
+                                   "sy", "sz", "wx", "wy", "wz", "zoom", "focal", "fov", "number", "parent"));
+  EXPECT_THAT(rows[1], ElementsAre("arm", "101", "0", "0", "7", "0", "0", "0", "90", "1", "1", "1", "0", "7",
+                                   "0", "", "", "", "1", ""));
+  EXPECT_THAT(rows[4], ElementsAre("cam", "102", "0.04", "2.5", "0", "0", "370", "0", "0", "1", "1", "3", "0",
+                                   "9.5", "0", "540", "9", "90", "2", "1"));
+}
+
+TEST(CsvWriter, AnAimedCameraHasItsResultingAngles) {
+  Composition composition = OneCamera();
+  Layer& camera = composition.layers[1];
+  camera.position[0] = camera.rotation[0] = 0.0;
+  camera.aimed = true;
+  camera.interest[0] = -1.0;
+  const std::vector<Row> rows = Written(composition);
+  EXPECT_THAT((Row(rows[3].begin() + 6, rows[3].begin() + 9)), ElementsAre("0", "90", "0"));
+}
+
+TEST(CsvWriter, ARowForEachKeyOfEachStream) {
+  Composition composition = OneCamera();
+  composition.layers[1].keys = {{"position", 3, {101, 103.5}, {1, 2, 3, 4, 5, 6}}, {"zoom", 1, {102}, {540}}};
+  const std::vector<Row> rows = Written(composition, true);
+  ASSERT_EQ(rows.size(), 4u);
+  EXPECT_THAT(rows[0], ElementsAre("layer", "stream", "frame", "seconds", "x", "y", "z", "number"));
+  EXPECT_THAT(rows[2], ElementsAre("cam", "position", "103.5", "0.1", "4", "5", "6", "2"));
+  EXPECT_THAT(rows[3], ElementsAre("cam", "zoom", "102", "0.04", "540", "", "", "2"));
+}
+
+TEST(CsvWriter, NamesAreNoFormulas) {
+  for (const std::string name : {"=1", "+1", "-1", "@x", "  =1"}) {
+    Composition composition = OneCamera();
+    composition.layers[0].name = name;
+    EXPECT_EQ(Written(composition)[1][0], '\'' + name);
+  }
+}
+
+TEST(CsvWriter, NamesAreQuotedAndWithoutControls) {
+  Composition composition = OneCamera();
+  composition.layers[0].name = "a \"b\", c";
+  composition.layers[1].name = "two\nlines\xff\t";
+  const std::vector<Row> rows = Written(composition);
+  EXPECT_EQ(rows[1][0], "a \"b\", c");
+  EXPECT_EQ(rows[3][0], "two\\nlines\\xff\\t");
+}
+
+TEST(CsvWriter, HostileCompositionsGiveATableOrAnError) {
+  std::size_t written = 0, refused = 0;
+  for (std::uint64_t seed = 0; seed < interchange_test::kHostileCompositions; ++seed) {
+    SCOPED_TRACE(seed);
+    const Composition composition = HostileComposition(seed);
+    FilesInMemory files;
+    diag::Collector diagnostics("");
+    if (!Write(*FindFormat("csv"), composition, {}, "shot", files, &diagnostics)) {
+      ASSERT_GT(diagnostics.CountOf(diag::Severity::Error), 0u);
+      ++refused;
+      continue;
+    }
+    ++written;
+    const auto rows = RowsOf(files.main());
+    ASSERT_TRUE(rows);
+    ASSERT_EQ(rows->size(), 1 + composition.layers.size() * composition.frames);
+    for (std::size_t i = 1; i < rows->size(); ++i) {
+      const Row& row = (*rows)[i];
+      const std::size_t first = row[0].find_first_not_of(' ');
+      ASSERT_TRUE(first == std::string::npos ||
+                  std::string("=+-@\t\r").find(row[0][first]) == std::string::npos);
+      for (std::size_t cell = 1; cell < row.size(); ++cell) {
+        const bool mayBeEmpty = cell >= 15 && cell != 18;
+        ASSERT_TRUE(IsNumber(row[cell]) || (mayBeEmpty && row[cell].empty())) << row[cell];
+      }
+    }
+  }
+  EXPECT_GT(written, interchange_test::kHostileCompositions / 2);
+  EXPECT_GT(refused, interchange_test::kHostileCompositions / 50);
+}
+
+}  // namespace
+}  // namespace interchange
