@@ -1,0 +1,1 @@
+"""What needs no Blender: the composition, its channels, the tool's run."""
