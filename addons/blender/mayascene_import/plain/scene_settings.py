@@ -7,8 +7,11 @@ Settings = namedtuple("Settings", "fps fps_base aspect_x aspect_y start end")
 
 _MOST_FPS = 32767
 
-METRES = {"mm": 0.001, "cm": 0.01, "m": 1.0, "km": 1000.0,
-          "in": 0.0254, "ft": 0.3048, "yd": 0.9144, "mi": 1609.344}
+# The names that a scene may write.
+METRES = {"mm": 0.001, "millimeter": 0.001, "cm": 0.01, "centimeter": 0.01,
+          "m": 1.0, "meter": 1.0, "km": 1000.0, "kilometer": 1000.0,
+          "in": 0.0254, "inch": 0.0254, "ft": 0.3048, "foot": 0.3048,
+          "yd": 0.9144, "yard": 0.9144, "mi": 1609.344, "mile": 1609.344}
 
 
 def metres_per_unit(linear_unit):
