@@ -1,5 +1,5 @@
 // A yardstick: reads the file whole, into a buffer on large pages, and counts its words. An import has to do
-// as much at least. Whoever reads into fresh small pages pays mostly for their faults, and those cost one
+// as much at least. A read into fresh small pages mostly waits for their faults, and those cost one
 // processor several times what they cost another.
 #include <fcntl.h>
 #include <sys/mman.h>

@@ -1,5 +1,5 @@
-// What an import made of a scene, in plain numbers. Whoever ran the import fills it in; the rules never guess
-// it.
+// What an import made of a scene, in plain numbers. The caller fills it in after an import; the rules never
+// guess it.
 #pragma once
 
 #include <array>

@@ -44,7 +44,7 @@ target_compile_options(mayascene_test_options INTERFACE -O0)
 # 1 under the sanitizers, where what takes long is done in part; the other builds do all of it.
 target_compile_definitions(mayascene_test_options INTERFACE MAYASCENE_SANITIZED=$<BOOL:${MAYASCENE_SANITIZE}>)
 if(MAYASCENE_SANITIZE)
-  # "function" tells a call through a pointer by the address of a type's description, of which every shared library has
+  # "function" checks a call through a pointer by the address of a type's description, of which every shared library has
   # its own: it would take each call across the border for a wrong one.
   set(MAYASCENE_SANITIZERS -fsanitize=address,undefined,float-cast-overflow -fno-sanitize-recover=all
                            $<$<CXX_COMPILER_ID:Clang>:-fno-sanitize=function>)

@@ -1,6 +1,6 @@
 //Maya ASCII 2024 scene
 // A dolly with zoom: the camera rolls back from the actor at the origin while the lens grows longer at the same
-// rate, so that the actor keeps their size and the room behind them closes in. The focal length is animated.
+// rate, so that the actor keeps their size and the room in the background closes in. The focal length is animated.
 // Baked at every fourth frame, 24 frames a second.
 //Name: dolly_zoom.ma
 requires maya "2024";

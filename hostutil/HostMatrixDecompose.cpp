@@ -18,7 +18,7 @@ constexpr double kHalfTurn = 3.141592653589793;
 // Below this cosine of the Y angle the X and Z angles turn about one line.
 constexpr double kPoleCosine = 1e-9;
 
-// Two axes closer to one line than this sine do not tell the third.
+// Two axes closer to one line than this sine do not determine the third.
 constexpr double kParallelSine = 1e-9;
 
 using Vector = std::array<double, kAxes>;

@@ -44,8 +44,8 @@ typedef void (*HostLedgerVisitor)(void* context, int32_t kind, const char* descr
 
 HOSTUTIL_API void HostVisitLedger(HostLedgerVisitor visitor, void* context);
 
-/* Frees every object that is still held, whoever refers to it: files (open ones are closed), lists and texts.
- * String tables stay. */
+/* Frees every object that is still held, even if something still refers to it: files (open ones are closed),
+ * lists and texts. String tables stay. */
 HOSTUTIL_API void HostReleaseLeftovers(void);
 
 /* --- Failure rehearsal -------------------------------------------------------------------------- */

@@ -15,7 +15,7 @@
 
 namespace {
 
-// What tells a list from other memory.
+// What distinguishes a list from other memory.
 constexpr uint64_t kListMark = 0x5265634C69737431;
 
 // The size of a time and a value, the records that are copied most: by a copy of known size.

@@ -236,7 +236,7 @@ void MAYA_Lex::FailReading() {
 }
 
 void MAYA_Lex::FailAtEnd() {
-  // Of a token that is never closed, its beginning tells more than the end of the text.
+  // Of a token that is never closed, its beginning says more than the end of the text.
   NoteLine(kUnexpectedEnd, tokenStart);
   ReportError(LocalizedText(kUnexpectedEndMessage));
   ThrowCode(kUnexpectedEnd);

@@ -87,7 +87,7 @@ class MAYA_Lex : public QZGP_SuiteHandler {
   // The terminating NUL.
   const char* end() const { return end_; }
 
-  // Tells the host at which line of the text a failure of that code was found.
+  // Reports to the host at which line of the text a failure of that code was found.
   void NoteLine(std::int32_t code, const char* at) const;
 
  private:

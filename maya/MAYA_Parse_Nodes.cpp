@@ -49,7 +49,7 @@ void MAYA_Parse::ParseCreateTransformNode() {
   CreateNodeRecord(DefaultTransform(), kTransformNode, &transforms, &transformNames_);
 }
 
-// A constraint is a transform that only its connections tell apart.
+// A constraint is a transform that differs by its connections alone.
 void MAYA_Parse::ParseCreateLookAtNode() { ParseCreateTransformNode(); }
 
 void MAYA_Parse::ParseCreateCameraNode() {

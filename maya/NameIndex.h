@@ -18,8 +18,8 @@ class NameIndex {
   // The first record of that name, or kNoIndex.
   std::int32_t Find(std::string_view name) const;
 
-  // For one who knows what will be looked up: what Find will need first, and, a while later, what it will
-  // need then. Hints; the name of a hash is shorter than a record's name field, as above.
+  // For a caller that knows what will be looked up: what Find will need first, and, a while later, what it
+  // will need then. Hints; the name of a hash is shorter than a record's name field, as above.
   static std::uint32_t Hash(std::string_view name);
   void PrefetchEntry(std::uint32_t hash) const;
   void PrefetchName(std::uint32_t hash) const;

@@ -25,7 +25,7 @@ class NodeChannels {
   // Of a node without curves.
   NodeChannels() { curves_.fill(kNoIndex); }
 
-  // Looks a curve's keys up, whoever's channel it drives; -1 has none. Throws the list's code.
+  // Looks a curve's keys up, whichever channel it drives; -1 has none. Throws the list's code.
   static Channel Find(const RecordList* curves, std::int32_t curve);
 
   // Takes the next channel of the node, from slot 0 on. False when it is animated and its key count differs

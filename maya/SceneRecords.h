@@ -23,7 +23,7 @@ inline constexpr int kTargetSlot = 10;       // the transform that the constrain
 inline constexpr int kConstrainedSlot = 11;  // the transform that the constraint turns
 inline constexpr int kCurveSlotCount = 12;
 
-// A transform, or a constraint, which is told apart by its links alone.
+// A transform, or a constraint, which differs by its links alone.
 struct MAYA_Transform {
   char name[kNameCapacity];
   char parent[kNameCapacity];

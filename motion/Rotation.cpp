@@ -7,7 +7,7 @@ namespace {
 
 constexpr double kPi = 3.141592653589793;
 constexpr double kTurn = 2.0 * kPi;
-constexpr double kPole = 1e-9;  // the cosine of the second angle below which the others are not told apart
+constexpr double kPole = 1e-9;  // the cosine of the second angle below which the others are not separable
 
 // The axes in the order of their turns, and whether they follow each other as x, y, z do.
 struct Turns {

@@ -10,8 +10,8 @@ constexpr const char* kEntries[] = {
     "$$$/QZ/Maya_Import/LStr/0002=^^1: ^^2",
     "$$$/QZ/Maya_Import/LStr/0003=Error reading Maya file.",
     "$$$/QZ/Maya_Import/LStr/0004=Unexpected end of maya file.",
-    // Deliberate: the spelling "Inconsistant". Mended, it would be another text to
-    // whoever searches for this one.
+    // Deliberate: the spelling "Inconsistant". Mended, a search for this text
+    // would not find it.
     "$$$/QZ/Maya_Import/LStr/0005=Inconsistant number of keyframes for Maya camera.",
     "$$$/QZ/Maya_Import/LStr/0006=Square",
     "$$$/QZ/Maya_Import/LStr/0007=^^1 ^^2",

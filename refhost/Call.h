@@ -66,7 +66,7 @@ class Call {
   // The code is the call's, whether it is a refusal's or that of nobody's broken promise.
   void fail(HostError code) { error_ = code; }
 
-  // The objects behind handles. Null after a refusal that says what is wrong; `what` names the handle's part
+  // The objects of handles. Null after a refusal that says what is wrong; `what` names the handle's part
   // in the call, such as "the parent".
   Composition* composition(VOR_CompItem* handle, const char* what = "the composition");
   Item* item(VOR_Item* handle, const char* what);

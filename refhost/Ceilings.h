@@ -20,7 +20,7 @@ struct Allowance {
 
   std::int64_t layers;  // of the project
   std::int64_t keys;    // of the project and of open batches; never more than an index can count
-  std::int64_t memory;  // bytes behind memory handles
+  std::int64_t memory;  // bytes of memory handles
 };
 
 // Whether the host takes a further layer, so many keys, or so many bytes. False after a refusal. Who makes it

@@ -1,9 +1,9 @@
 // Handles: opaque pointers that are never addresses.
 //
-// A handle packs its kind, its trace number and, for what can be given back, the slot of the object behind
-// it. Checking one is a mask, a compare and a look into a table by index; no handle is ever dereferenced, so
-// a foreign pointer is told from a handle without touching it. A slot is used again after its handle was
-// given back, with a new number: the old handle stays recognisable as stale.
+// A handle packs its kind, its trace number and, for what can be given back, the slot of its
+// object. Checking one is a mask, a compare and a look into a table by index; no handle is ever dereferenced,
+// so a foreign pointer is recognised without being followed. A slot is used again after its handle was given
+// back, with a new number: the old handle stays recognisable as stale.
 //
 // With 64-bit pointers the top byte makes every handle a non-canonical address and holds the low six bits of
 // the host's serial number, so that a handle of an earlier host is foreign (until 64 hosts later). With
@@ -92,7 +92,7 @@ class HandlePool {
   HandlePool(const HandleCodec& codec, HandleKind kind) : codec_(codec), kind_(kind) {}
 
   Object* find(const void* handle) {
-    // The slot holds the whole handle, so that one comparison tells kind, host, number and life. That of a
+    // The slot holds the whole handle, so that one comparison checks kind, host, number and life. That of a
     // free slot would lead to another one.
     const std::size_t slot = HandleCodec::heldSlot(handle);
     if (slot >= slotCount_ || slots_[slot].handle != handle) [[unlikely]]
@@ -107,7 +107,7 @@ class HandlePool {
            (HandleCodec::heldNumber(handle) <= handedOut_ || !HandleCodec::kWide);
   }
 
-  // Hands out a new handle and the object behind it, which is blank. Null when there are no more numbers or
+  // Hands out a new handle and its object, which is blank. Null when there are no more numbers or
   // slots.
   Object* add(void** handle) { return makeFreeSlot() ? addToFreeSlot(handle) : nullptr; }
 

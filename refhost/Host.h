@@ -56,7 +56,7 @@ struct HostOptions {
   std::int32_t mostLayers = 2'000'000;  // layers in the project
   std::int32_t mostKeys = 100'000'000;  // keys in the project and in open batches
   std::int64_t mostMemory = std::int64_t{1}
-                            << 32;  // bytes behind memory handles at one time; twice the largest file
+                            << 32;  // bytes of memory handles at one time; twice the largest file
 };
 
 // Something that a callback left behind.

@@ -1,4 +1,4 @@
-// "QZGP Memory Suite" 1: blocks of memory behind handles.
+// "QZGP Memory Suite" 1: blocks of memory, named by handles.
 #include <cstddef>
 #include <cstdint>
 #include <new>

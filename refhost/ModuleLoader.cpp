@@ -23,7 +23,7 @@ HostPluginEntry ModuleLoader::load(const std::filesystem::path& file, std::strin
   std::error_code error;
   const std::filesystem::path absolute = std::filesystem::absolute(file, error);
   const std::filesystem::path& place = error ? file : absolute;
-  // The loader would wait for somebody to write into a FIFO. What is missing it tells in its own words.
+  // The loader would wait for somebody to write into a FIFO. What is missing it says in its own words.
   std::error_code unknown;
   const std::filesystem::file_status status = std::filesystem::status(place, unknown);
   if (std::filesystem::exists(status) && !std::filesystem::is_regular_file(status)) {

@@ -1,4 +1,4 @@
-// The suite operations that the embedded host counts, traces and can be told to fail: one table of name,
+// The suite operations that the embedded host counts, traces and can make fail: one table of name,
 // suite and version.
 #pragma once
 

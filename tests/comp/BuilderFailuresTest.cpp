@@ -222,7 +222,7 @@ TEST(BuilderFailuresTest, AnExceptionOutOfTheReleaseOfAZoomStreamGoesBeforeTheCo
   EXPECT_EQ(codeWith(Kind::Code), HOST_ERR_EXCEPTION_MEMORY);
 }
 
-TEST(BuilderFailuresTest, DifferentKeyCountsAreToldOnceAndWhatWasMadeStays) {
+TEST(BuilderFailuresTest, DifferentKeyCountsAreReportedOnceAndWhatWasMadeStays) {
   const ImportRun run = ImportText(Scene(TransformText("arm") + TransformText("rig", "arm") +
                                          CameraText("lens", "rig") + Animation("arm.tx", {{1, 0}, {2, 1}}) +
                                          Animation("arm.sz", {{1, 0}, {2, 1}, {3, 2}})));

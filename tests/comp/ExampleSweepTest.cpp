@@ -69,11 +69,11 @@ class ExampleSweepTest : public ::testing::TestWithParam<std::string> {
                           std::string_view error, std::string_view after) {
     ASSERT_GE(run.calls.size(), before.size() + after.size());
     EXPECT_EQ(run.calls.compare(0, before.size(), before), 0);
-    const std::string_view behind = std::string_view(run.calls).substr(before.size());
-    const std::string_view failed = behind.substr(0, behind.find('\n'));
+    const std::string_view rest = std::string_view(run.calls).substr(before.size());
+    const std::string_view failed = rest.substr(0, rest.find('\n'));
     EXPECT_EQ(CallName(failed), failing);
     EXPECT_EQ(Field(failed, "error"), error);
-    EXPECT_EQ(behind.substr(failed.size() + 1), after);
+    EXPECT_EQ(rest.substr(failed.size() + 1), after);
   }
 
   // One failing call changes nothing of the others.

@@ -115,7 +115,7 @@ TEST(GrowthTest, KeysCostTheSameEach) {
       500);
 }
 
-TEST(GrowthTest, SpinningKeysCostTheSameHoweverManyTurnsLieBehindThem) {
+TEST(GrowthTest, SpinningKeysCostTheSameHoweverManyTurnsLieAfterThem) {
   ExpectLinear(
       [](int count) {
         SceneKeys keys;

@@ -64,13 +64,13 @@ TEST_F(SamplingTest, AConstantChannelLendsItsOneValueToEveryKeyAndTheOthersKeepT
   }
 }
 
-TEST_F(SamplingTest, DifferentCountsAreToldWithTheCamerasTextWhateverTheNodeIs) {
+TEST_F(SamplingTest, DifferentCountsAreReportedWithTheCamerasTextWhateverTheNodeIs) {
   Use(Animation("n.tx", KeysFrom(1, {1, 2, 3, 4, 5})) + Animation("n.sz", KeysFrom(1, {1, 2, 3, 4})));
   EXPECT_EQ(CodeOf([&] { parser().VerifyAnimInfo(&node_); }), 1289987);
   EXPECT_THAT(End().messages, ElementsAre(kInconsistentText));
 }
 
-TEST_F(SamplingTest, DifferentCountsAreToldBeforeALaterCurveIsLookedAt) {
+TEST_F(SamplingTest, DifferentCountsAreReportedBeforeALaterCurveIsLookedAt) {
   Use(Animation("n.tx", KeysFrom(1, {1, 2})) + Animation("n.ty", KeysFrom(1, {1, 2, 3})));
   node_.curve[2] = 4711;
   EXPECT_EQ(CodeOf([&] { parser().VerifyAnimInfo(&node_); }), 1289987);
@@ -155,7 +155,7 @@ TEST_F(SamplingTest, AGameSceneKeepsTheOffset) {
   EXPECT_EQ(parser().GetKeyTime(&node_, 0), (T_Time{10000, 15000}));
 }
 
-TEST_F(SamplingTest, ACurveBehindTheOneThatGivesTheTimeIsNotLookedAt) {
+TEST_F(SamplingTest, ACurveAfterTheOneThatGivesTheTimeIsNotLookedAt) {
   Use(Animation("n.tx", KeysFrom(10, {1, 2})));
   node_.curve[1] = 4711;
   EXPECT_EQ(CodeOf([&] { parser().GetKeyTime(&node_, 0); }), 0);
@@ -197,7 +197,7 @@ TEST_F(SamplingTest, ExtractingAGroupLooksAtNoOtherGroup) {
   EXPECT_THAT(Extracted(0, 1), ElementsAre(2.0, -102.0, -103.0));
 }
 
-// What VerifyAnimInfo found is told from what is fetched anew by the lists that are read.
+// What VerifyAnimInfo found is distinguished from what is fetched anew by the lists that are read.
 class RememberedSamplingTest : public SamplingTest {
  protected:
   // Two nodes of different curves and key times, "a" and "b".

@@ -54,7 +54,7 @@ inline constexpr std::int32_t kRotationX = HOST_STREAM_ROTATION_X;
 inline constexpr std::int32_t kRotationY = HOST_STREAM_ROTATION_Y;
 inline constexpr std::int32_t kZoom = HOST_STREAM_ZOOM;
 
-// The zoom of a camera with all defaults in Scene(): 35 mm behind 1.4173 inches, 640 pixels wide.
+// The zoom of a camera with all defaults in Scene(): 35 mm over 1.4173 inches, 640 pixels wide.
 inline constexpr double kDefaultZoom = 640.0 * 35.0 / 25.4 / 1.4173;
 
 }  // namespace docs_test

@@ -5,7 +5,7 @@ import unittest
 
 from project import ROOT, read
 
-DOCUMENTS = ["README.md", "CHANGELOG.md", "SECURITY.md"] + sorted(
+DOCUMENTS = ["README.md", "CHANGELOG.md", "CONTRIBUTING.md", "SECURITY.md"] + sorted(
     path.relative_to(ROOT).as_posix() for path in (ROOT / "docs").glob("**/*.md")
 )
 LINK = re.compile(r"\[[^\]]*\]\(([^)\s]+)\)")
@@ -77,6 +77,15 @@ class Documents(unittest.TestCase):
                 self.assertIsNone(re.search(r"[ \t]$|\t", line), f"{name}: {line}")
 
 
+class Contributing(unittest.TestCase):
+    def test_every_file_and_folder_that_it_names_exists(self):
+        named = re.findall(r"`((?:[a-z]+/)+[\w.-]*)`", read("CONTRIBUTING.md"))
+        self.assertGreater(len(named), 40)
+        for name in named:
+            if not name.startswith("build/"):
+                self.assertTrue((ROOT / name).exists(), name)
+
+
 class Readme(unittest.TestCase):
     readme = read("README.md")
 
@@ -107,8 +116,8 @@ class Readme(unittest.TestCase):
             text = read(name)
             for script, option in re.findall(r"(scripts/\w+) (--[a-z][\w-]+)", text):
                 self.assertIn(option, read(script), f"{name} names {script} {option}")
-            text = re.sub(r"scripts/\w+ --[a-z][\w-]+", "", text)
-            # What another program is told, up to the command that it is to run.
+            text = re.sub(r"(scripts/\w+|build/test/bin/\w+_tests?) --[a-z][\w-]+", "", text)
+            # The options of another program, up to the command that it is to run.
             text = re.sub(r"\bparallel -[^']*", "", text)
             for option in re.findall(r"(?<![\w-])(--[a-z][\w-]+)", text):
                 self.assertIn(option, arguments + "--help --version", f"{name} names {option}")

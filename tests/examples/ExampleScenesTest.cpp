@@ -93,7 +93,7 @@ TEST(AimedCamera, LooksAtTheMovingTarget) {
   EXPECT_GT(across.back(), 600.0);
 }
 
-// A weight that is connected behind the target's translation names the constraint as a target too.
+// A weight that is connected after the target's translation names the constraint as a target too.
 TEST(AimedCamera, WhoseWeightIsConnectedLastIsAimedAtTheConstraintItself) {
   std::ifstream file(example("aimed_camera"), std::ios::binary);
   std::string text{std::istreambuf_iterator<char>(file), {}};

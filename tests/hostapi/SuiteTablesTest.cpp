@@ -72,7 +72,7 @@ TEST(SuiteTablesTest, EveryOperationIsInItsSlot) {
 }
 
 // A suite ends with its last operation that is used, and holds nothing but operations.
-TEST(SuiteTablesTest, EverySuiteEndsBehindItsLastOperation) {
+TEST(SuiteTablesTest, EverySuiteEndsAfterItsLastOperation) {
   EXPECT_EQ(sizeof(WNBasicSuite), 2 * sizeof(Operation));
   EXPECT_EQ(sizeof(QZGP_UtilitySuite7), 5 * sizeof(Operation));
   EXPECT_EQ(sizeof(QZGP_MemorySuite1), 4 * sizeof(Operation));

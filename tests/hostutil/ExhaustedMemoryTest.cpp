@@ -102,7 +102,7 @@ TEST_F(ExhaustedMemoryTest, AFailureIsPlannedOrRefused) {
   const HostUtilityFailure failure{HOST_UTILITY_ListCount, 1, 77, HOST_THROW_NOTHING};
   {
     const LimitedMemory none(0);
-    // Behind failures that were planned and cleared before there may be room left.
+    // After failures that were planned and cleared before there may be room left.
     for (int i = 0; i < 100 && RefusedAllocations() == 0; ++i) {
       const HostError code = HostAddUtilityFailure(&failure);
       EXPECT_EQ(code, RefusedAllocations() == 0 ? HOST_ERR_NONE : HOST_ERR_EXCEPTION_MEMORY);

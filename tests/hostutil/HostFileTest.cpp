@@ -90,7 +90,7 @@ TEST_F(HostFileTest, ANegativeCountIsAShortRead) {
   EXPECT_EQ(byte, '?');
 }
 
-TEST_F(HostFileTest, TheSizeIsToldOpenOrClosed) {
+TEST_F(HostFileTest, TheSizeIsGivenOpenOrClosed) {
   file_ = MakeFile(folder_.Write("scene.ma", std::string(12345, 'x')));
   int64_t size = 0;
   EXPECT_EQ(HostFileSize(file_, &size), HOST_ERR_NONE);

@@ -273,7 +273,7 @@ TEST(HostMatrixDecomposeTest, AxesOnOneLineOrNotAtRightAnglesGiveNoNaN) {
   }
 }
 
-// Two directions on one line do not tell the third: the rotation is that of the first alone.
+// Two directions on one line do not determine the third: the rotation is that of the first alone.
 TEST(HostMatrixDecomposeTest, TwoAxesOnOneLineWithoutAThirdTurnAsTheFirstAlone) {
   const Point none{0, 0, 0};
   const Point line{-0.48, 0.6, 0.64};

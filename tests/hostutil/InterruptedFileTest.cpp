@@ -116,7 +116,7 @@ TEST_F(InterruptedFileTest, AnInterruptedCloseHasClosed) {
   EXPECT_EQ(HostFileOpen(file_, HOST_FILE_READ), HOST_ERR_NONE);
 }
 
-TEST_F(InterruptedFileTest, AFailedCloseIsToldAndTheFileIsNotOpenAnyMore) {
+TEST_F(InterruptedFileTest, AFailedCloseIsReportedAndTheFileIsNotOpenAnyMore) {
   ASSERT_EQ(HostFileOpen(file_, HOST_FILE_READ), HOST_ERR_NONE);
   closing = {1, EIO};
   EXPECT_EQ(HostFileClose(file_), HOST_ERR_FILE_CLOSE);

@@ -93,7 +93,7 @@ TEST_F(RecordListGrowthTest, EveryRecordSizeIsKeptByteForByte) {
       std::vector<unsigned char> copy(size + 1, 0xEE);
       ASSERT_EQ(RecordListGet(list, i, copy.data()), HOST_ERR_NONE);
       ASSERT_EQ(std::memcmp(copy.data(), record.data(), size), 0);
-      ASSERT_EQ(copy[size], 0xEE) << "nothing behind the record is written";
+      ASSERT_EQ(copy[size], 0xEE) << "nothing after the record is written";
     }
     ASSERT_EQ(RecordListDispose(list), HOST_ERR_NONE);
   }

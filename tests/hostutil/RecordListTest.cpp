@@ -91,7 +91,7 @@ TEST_F(RecordListTest, AnIndexOutsideTheListIsRefusedAndTheRecordStaysAsItIs) {
   }
 }
 
-TEST_F(RecordListTest, AnIndexBehindTheCountButWithinTheMemoryIsRefused) {
+TEST_F(RecordListTest, AnIndexAfterTheCountButWithinTheMemoryIsRefused) {
   Fill(1);  // the growth step has made room for ten
   Record record{};
   EXPECT_EQ(RecordListGet(list_, 1, &record), HOST_ERR_LIST_INDEX);

@@ -55,7 +55,7 @@ TEST_F(FailureLinesTest, ACommandThatNeverEndsIsAtTheLastLineThatHoldsSomething)
   EXPECT_EQ(LineOfEnd("\n\nconnectAttr \"a.b\" "), 3);
 }
 
-TEST_F(FailureLinesTest, BehindAnEmbeddedNulNothingCounts) {
+TEST_F(FailureLinesTest, AfterAnEmbeddedNulNothingCounts) {
   EXPECT_EQ(LineOfEnd("createNode camera\n\0\n\n\n"sv), 1);
 }
 

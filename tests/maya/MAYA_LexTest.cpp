@@ -134,7 +134,7 @@ TEST_F(LexTest, PunctuationIsOneByteEach) {
                                  {Identifier, "a:b"}});
 }
 
-// What each byte gives where a token starts, with a blank behind it.
+// What each byte gives where a token starts, with a blank after it.
 TEST_F(LexTest, EveryFirstByteGivesTheKindOfItsClass) {
   for (int byte = 1; byte < 256; ++byte) {
     SCOPED_TRACE(byte);

@@ -13,7 +13,7 @@ TEST_F(LexTest, AStringKeepsItsQuotes) {
   ExpectTokens("\"abc\" \"\" \"a;b //c\"", {{String, "\"abc\""}, {String, "\"\""}, {String, "\"a;b //c\""}});
 }
 
-TEST_F(LexTest, AStringNeedsNothingBehindIt) {
+TEST_F(LexTest, AStringNeedsNothingAfterIt) {
   ExpectTokens("\"a\"b \"c\"\"d\"",
                {{String, "\"a\""}, {Identifier, "b"}, {String, "\"c\""}, {String, "\"d\""}});
 }
@@ -56,22 +56,22 @@ TEST_F(LexTest, ThePositionStaysOnTheNulOfAnUnexpectedEnd) {
   }
 }
 
-TEST_F(LexTest, NothingIsPassedOverBehindTheEnd) {
+TEST_F(LexTest, NothingIsPassedOverAfterTheEnd) {
   const GuardedText text("a ");
   MAYA_Lex lex(host_.basicSuite(), text.begin(), text.end());
   const char* start = nullptr;
   const char* last = nullptr;
   while (lex.GetNextToken(&start, &last) != EndOfFile) continue;
-  const char* const behind = lex.position;
-  ASSERT_EQ(behind, text.end() + 1);
+  const char* const passed = lex.position;
+  ASSERT_EQ(passed, text.end() + 1);
   lex.SkipHarmless();
-  EXPECT_EQ(lex.position, behind);
+  EXPECT_EQ(lex.position, passed);
   lex.SkipWhiteSpace();
-  EXPECT_EQ(lex.position, behind);
+  EXPECT_EQ(lex.position, passed);
   EXPECT_EQ(lex.SkipCharacters("a"), 0);
-  EXPECT_EQ(lex.position, behind);
+  EXPECT_EQ(lex.position, passed);
   lex.SkipHarmlessInCommand();
-  EXPECT_EQ(lex.position, behind);
+  EXPECT_EQ(lex.position, passed);
 }
 
 TEST_F(LexTest, ALineCommentTakesItsLineEndAlong) {
@@ -183,7 +183,7 @@ TEST_F(LexTest, ANulWhereATokenWouldStartIsTheEndWhereverItStands) {
   ExpectTokens("\"a\"\0\"b\""sv, {{String, "\"a\""}});
 }
 
-TEST_F(LexTest, NothingIsReadBehindANulThatWasTheEnd) {
+TEST_F(LexTest, NothingIsReadAfterANulThatWasTheEnd) {
   const GuardedText text("a \0b "sv);
   MAYA_Lex lex(host_.basicSuite(), text.begin(), text.end());
   const char* start = nullptr;
@@ -220,7 +220,7 @@ TEST_F(LexTest, WithoutTheUtilitySuiteALexicalErrorIsTheMissingSuite) {
   EXPECT_THAT(Messages(), ::testing::IsEmpty());
 }
 
-TEST_F(LexTest, AFailureThrowsItsCodeBehindItsMessage) {
+TEST_F(LexTest, AFailureThrowsItsCodeAfterItsMessage) {
   const GuardedText text("");
   MAYA_Lex lex(host_.basicSuite(), text.begin(), text.end());
   EXPECT_THAT([&] { lex.FailReading(); }, ::testing::Throws<int>(::testing::Eq(0x13AF01)));

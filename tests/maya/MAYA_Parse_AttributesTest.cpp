@@ -150,7 +150,7 @@ TEST_F(TransformAttributesTest, AFailedScanThrowsItsCodeAndKeepsWhatWasStored) {
   }
 }
 
-TEST_F(TransformAttributesTest, ANumberMayHaveAFractionAnExponentAndLettersBehindIt) {
+TEST_F(TransformAttributesTest, ANumberMayHaveAFractionAnExponentAndLettersAfterIt) {
   ASSERT_EQ(ReadWith("setAttr \".t\" -.5 5. 23.976fps;"), 0);
   EXPECT_THAT(Field(&MAYA_Transform::translate), ElementsAre(-0.5, 5.0, 23.976));
   ASSERT_EQ(ReadWith("setAttr \".t\" 1e 1e-400 4.9e-324;"), 0);

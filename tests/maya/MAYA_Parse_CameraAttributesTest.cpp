@@ -220,7 +220,7 @@ TEST_F(CameraAttributesTest, ATransformOfTheCamerasNameIsAnotherRecord) {
   EXPECT_EQ(TransformCount(), 1);
 }
 
-TEST_F(CameraAttributesTest, TheEndInTheHeadIsNoErrorAndBehindItIsOne) {
+TEST_F(CameraAttributesTest, TheEndInTheHeadIsNoErrorAndAfterItIsOne) {
   for (const char* const head :
        {"setAttr ", "setAttr -k ", "setAttr -k off ", "setAttr \".v\" ", "setAttr -k off \".v\""}) {
     EXPECT_EQ(ReadWith(head), 0) << head;

@@ -66,7 +66,7 @@ TEST_F(KeysTest, OtherTokensBetweenKeysArePassedOver) {
             (Keys{{1, 2}, {3, 4}, {5, 6}}));
 }
 
-TEST_F(KeysTest, TheKeysAreFoundBehindALongOtherAttribute) {
+TEST_F(KeysTest, TheKeysAreFoundAfterALongOtherAttribute) {
   std::string many;
   for (int i = 0; i < 100; ++i) many += i % 9 == 0 ? "\n\t18.5 no" : " 1 yes";
   for (const char* const between :
@@ -241,7 +241,7 @@ TEST_F(KeysTest, TheEndInsideAKeyCommandIsAnUnexpectedEnd) {
   }
 }
 
-TEST_F(KeysTest, TheEndBehindManyKeysIsAnUnexpectedEndToo) {
+TEST_F(KeysTest, TheEndAfterManyKeysIsAnUnexpectedEndToo) {
   std::string text = "createNode animCurveTL -n \"a\";\nsetAttr -s 999999999 \".ktv\"";
   for (int key = 0; key < 1000; ++key) text += " " + std::to_string(key) + " 5";
   EXPECT_EQ(Read(text + " "), 1289986);

@@ -70,7 +70,7 @@ TEST_F(NameIndexTest, OnlyTheLettersAToZAreFolded) {
   EXPECT_EQ(Find("{X"), 1);
 }
 
-TEST_F(NameIndexTest, TheLongestNamesAreToldApart) {
+TEST_F(NameIndexTest, TheLongestNamesAreDistinguished) {
   const std::string common(254, 'n');
   EXPECT_EQ(Add(common + "a"), 0);
   EXPECT_EQ(Add(common + "b"), 1);
@@ -145,7 +145,7 @@ TEST_F(NameIndexTest, NumberedNamesHardlyMeet) {
   ExpectMeetings(names, names.size() / 10);
 }
 
-TEST_F(NameIndexTest, NamesThatOnlyTheirLengthTellsApartHardlyMeet) {
+TEST_F(NameIndexTest, NamesThatOnlyTheirLengthDistinguishesHardlyMeet) {
   std::vector<std::string> names;
   for (std::size_t size = 0; size < kNameCapacity; ++size) names.push_back(std::string(size, '\0'));
   ExpectMeetings(names, names.size() / 10);

@@ -147,7 +147,7 @@ TEST_F(NodeChannelsTest, ANodeWithAnotherCurveInAnySlotIsAnotherNode) {
   EXPECT_TRUE(IsAtHand(channels, node_, 1));
 }
 
-TEST_F(NodeChannelsTest, EveryAnimatedChannelThatDiffersFromTheFirstIsTold) {
+TEST_F(NodeChannelsTest, EveryAnimatedChannelThatDiffersFromTheFirstIsReported) {
   Use({1, 3, 0, 3, 4, 3, -1, 1, 2});
   NodeChannels channels;
   const bool agrees[] = {true, true, true, true, false, true, true, true, false};

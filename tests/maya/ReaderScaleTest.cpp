@@ -67,7 +67,7 @@ std::size_t AddressSpace() {
 
 TEST_F(ScaleTest, AKeyCountThatLiesReservesNoMoreThanItsCommandCouldHold) {
   constexpr int kCurves = 2000;
-  constexpr int kKeysOfACurve = 300;  // the count is looked at behind a first run of 256
+  constexpr int kKeysOfACurve = 300;  // the count is looked at after a first run of 256
   // Two records of half a kilobyte, a list, and its keys; those that could still follow are no more than
   // there are.
   constexpr std::size_t kBytesPerCurve = 4096 + 2 * kKeysOfACurve * sizeof(MAYA_Key);

@@ -16,7 +16,7 @@ using ::testing::IsEmpty;
 
 class TruncationTest : public ReaderTest {
  protected:
-  // What the end of the text after `cut` bytes of the piece gives, told from the piece's own tokens.
+  // What the end of the text after `cut` bytes of the piece gives, derived from the piece's own tokens.
   HostError Predict(const ScenePiece& piece, std::size_t cut) {
     const std::string_view text(piece.text);
     MAYA_Lex lex(host_.basicSuite(), piece.text);
@@ -25,10 +25,10 @@ class TruncationTest : public ReaderTest {
       const char* last = nullptr;
       const MayaToken kind = lex.GetNextToken(&start, &last);
       const auto from = static_cast<std::size_t>(start - piece.text);
-      const auto behind = static_cast<std::size_t>(last - piece.text) + 1;
+      const auto wordEnd = static_cast<std::size_t>(last - piece.text) + 1;
       if (kind == EndOfFile || cut <= from) break;
       const bool word = kind == Number || kind == Option || (kind >= File && kind <= Identifier);
-      if (word ? cut > behind : cut >= behind) {
+      if (word ? cut > wordEnd : cut >= wordEnd) {
         if (kind == Semicolon) return 0;
         continue;
       }
@@ -48,7 +48,7 @@ TEST_F(TruncationTest, EveryCutIsTakenAsTheRulesSay) {
     const std::size_t size = std::string_view(piece.text).size();
     for (std::size_t cut = 0; cut < size; ++cut) {
       const std::string text = scene.substr(0, pieceStart + cut);
-      SCOPED_TRACE(std::string("cut behind: ") + std::string(piece.text, cut));
+      SCOPED_TRACE(std::string("cut after: ") + std::string(piece.text, cut));
       const HostError code = Predict(piece, cut);
       ASSERT_EQ(Read(text), code);
       if (code == 0)

@@ -103,10 +103,10 @@ TEST(Curve, WeightedIsTheBezierOfItsHandles) {
 }
 
 TEST(Curve, AHandleBeforeItsKeyLiesOnIt) {
-  const Curve behind(Weighted({-3.0, 6.0}, {2.0, 0.0}));
+  const Curve beyond(Weighted({-3.0, 6.0}, {2.0, 0.0}));
   const Curve on(Weighted({0.0, 0.0}, {2.0, 0.0}));
-  EXPECT_EQ(behind.At(1.5), on.At(1.5));
-  EXPECT_NE(behind.At(1.5), Curve(Weighted({0.0, 6.0}, {2.0, 0.0})).At(1.5));
+  EXPECT_EQ(beyond.At(1.5), on.At(1.5));
+  EXPECT_NE(beyond.At(1.5), Curve(Weighted({0.0, 6.0}, {2.0, 0.0})).At(1.5));
 }
 
 TEST(Curve, AHandleBeyondTheSpanStaysWhereTimeRunsOnNevertheless) {

@@ -130,7 +130,7 @@ FAULTS = (
           "camera->cameraAperture[1] : camera->cameraAperture[0]", "camera->cameraAperture[0] : camera->cameraAperture[1]"),
     Fault("kilometres are mended", "comp/MAYA_Parse_SceneUnits.cpp",
           "return distance * 1000.0 * 100.0 * kPointsPerInch;", "return distance * 1000.0 * 100.0 / 2.54 * kPointsPerInch;"),
-    Fault("the default perspective camera is told by its case", "comp/MAYA_Parse_Assembly.cpp",
+    Fault("the default perspective camera is recognised with its case", "comp/MAYA_Parse_Assembly.cpp",
           "SameWord(camera.name, kPerspectiveCamera)", "camera.name == kPerspectiveCamera"),
     Fault("the width in square pixels is not rounded", "comp/MAYA_Parse_Assembly.cpp",
           "return TruncateToInt32(scaled + 0.5);", "return TruncateToInt32(scaled);"),

@@ -1,7 +1,7 @@
 """Finds the places of a C++ source where one token can be changed so that the program means something else.
 
 A mutant is one such change. Comments, texts, characters, preprocessor lines, what a preprocessor line leaves out on
-most machines (behind #else), attributes, static assertions and conditions of the compiler (if constexpr) are left
+most machines (after #else), attributes, static assertions and conditions of the compiler (if constexpr) are left
 alone.
 """
 
@@ -37,7 +37,7 @@ UNARY_SIGN_FOLLOWS = ("(", ",", "=", "return", "{", "?", ":", "[")
 CONDITIONALS = ("if", "while")
 
 INTEGER = re.compile(r"(0[xX][0-9a-fA-F']+|\d[\d']*)([uUlLzZ]*)")
-# Up to here a double tells an integer from the next one.
+# Up to here doubles distinguish neighbouring integers.
 MOST_EXACT = 2**53
 
 
@@ -106,7 +106,7 @@ def change_of_operator(source, before, token, after):
     return None
 
 
-def condition_behind(tokens, index):
+def condition_after(tokens, index):
     """Begin and end of the condition whose "(" is the token; None where there is none."""
     depth, begin = 0, tokens[index].end
     for token in tokens[index:]:
@@ -144,7 +144,7 @@ def mutants_of(file, source):
         if change:
             found.append(Mutant(file, token.begin, token.end, *change))
         if token.text in CONDITIONALS and after and after.text == "(":
-            span = condition_behind(tokens, index + 1)
+            span = condition_after(tokens, index + 1)
             if span and not is_turned_round_already(tokens, *span):
                 found.append(Mutant(file, *span, f"!({source[span[0]:span[1]].strip()})", "condition"))
     return found

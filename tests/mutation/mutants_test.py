@@ -46,7 +46,7 @@ class Mutants(unittest.TestCase):
         self.assert_changes("f(1e200)", ("constant", "f(2e+200)"))
         self.assert_changes("f(true)", ("constant", "f(false)"))
 
-    def test_a_condition_is_negated_behind_what_it_declares(self):
+    def test_a_condition_is_negated_after_what_it_declares(self):
         self.assert_changes("if (f(a)) g();", ("condition", "if (!(f(a))) g();"))
         self.assert_changes("if (int b; f(b)) g();", ("condition", "if (int b;!(f(b))) g();"))
         self.assert_changes("while (a)", ("condition", "while (!(a))"))

@@ -54,7 +54,7 @@ CallbackModel::CallbackModel(std::vector<std::string> calls, HostError code, boo
     : good_(std::move(calls)), goodCode_(code), canImport_(canImport) {}
 
 // A failure after that of the good run changes nothing of its code.
-HostError CallbackModel::CodeBehind(const Way& way) const { return goodCode_ != 0 ? goodCode_ : way.code; }
+HostError CallbackModel::CodeAfter(const Way& way) const { return goodCode_ != 0 ? goodCode_ : way.code; }
 
 Outcome CallbackModel::WhereCallsFail(std::size_t index, const Way& way, bool onwards) const {
   const bool thrown = way.kind != Failure::Kind::Code;
@@ -75,7 +75,7 @@ Outcome CallbackModel::WhereCallsFail(std::size_t index, const Way& way, bool on
     for (const std::string& call : HeldAfter(good_, end + 1, true).CleanUp()) {
       outcome.calls.push_back(WithError(call, onwards ? way.error : "0"));
     }
-    outcome.code = endsSilence ? CodeBehind(way) : way.code;
+    outcome.code = endsSilence ? CodeAfter(way) : way.code;
     if (!thrown && CallName(good_[end]) == "AcquireSuite") outcome.code = HOST_ERR_MISSING_SUITE;
     outcome.canImport = endsSilence && canImport_;
     const bool shown = IsReported(way) && !endsSilence;  // what is shown while silent is not shown
@@ -92,8 +92,8 @@ Outcome CallbackModel::WhereAServiceFails(std::string_view service, std::size_t 
   outcome.calls = FirstCalls(place);
   const HeldByCallback held = HeldAfter(good_, place, false);
   for (const std::string& call : held.CleanUp()) outcome.calls.push_back(WithError(call, "0"));
-  const bool behind = disposal || (service == "FileClose" && !thrown);
-  outcome.code = behind ? CodeBehind(way) : way.code;
+  const bool late = disposal || (service == "FileClose" && !thrown);
+  outcome.code = late ? CodeAfter(way) : way.code;
   outcome.canImport = disposal && canImport_;
   outcome.files = disposal ? 1 : 0;
   outcome.reported = IsReported(way) && !held.IsSilent() ? way.code : 0;

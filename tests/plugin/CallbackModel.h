@@ -1,4 +1,4 @@
-// What the entry and the verify callback come to when something in them fails, told from a run in which
+// What the entry and the verify callback come to when something in them fails, derived from a run in which
 // nothing does.
 #pragma once
 
@@ -30,11 +30,11 @@ class CallbackModel {
   // When call `index` (from 0) fails, or with `onwards` every call from it on.
   Outcome WhereCallsFail(std::size_t index, const Way& way, bool onwards) const;
 
-  // When a service fails behind so many calls of the good run.
+  // When a service fails after so many calls of the good run.
   Outcome WhereAServiceFails(std::string_view service, std::size_t place, const Way& way) const;
 
  private:
-  HostError CodeBehind(const Way& way) const;
+  HostError CodeAfter(const Way& way) const;
   std::vector<std::string> FirstCalls(std::size_t count) const;
   std::vector<std::string> CallsWithoutImporter() const;
 

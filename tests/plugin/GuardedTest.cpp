@@ -70,7 +70,7 @@ TEST_F(GuardedTest, AtTheBorderNothingPassesThrough) {
   EXPECT_EQ(reports_.size(), 1u);
 }
 
-TEST_F(GuardedTest, UnreportedWorkEndsWithItsStandardExceptionAndNobodyIsTold) {
+TEST_F(GuardedTest, UnreportedWorkEndsWithItsStandardExceptionAndNothingIsShown) {
   bool done = false;
   Unreported([&] { done = true; });
   EXPECT_TRUE(done);

@@ -70,7 +70,7 @@ TEST_F(ImportTest, TheFileObjectIsNotDisposedOf) {
   EXPECT_TRUE(result.leftovers[0].keptByDesign);
 }
 
-TEST_F(ImportTest, AFileThatIsNoMayaAsciiIsToldToTheUserAndIsNoFailure) {
+TEST_F(ImportTest, AFileThatIsNoMayaAsciiIsReportedToTheUserAndIsNoFailure) {
   const refhost::CallbackResult result = Import(Write("scene.ma", "FOR4 not a scene; createNode camera;\n"));
   EXPECT_EQ(result.code, 0);
   EXPECT_THAT(result.messages, ElementsAre(kOnlyMayaText));

@@ -78,7 +78,7 @@ class TextEndTest : public PluginTest {
   }
 };
 
-TEST_F(TextEndTest, TwoNulsStandBehindTheText) {
+TEST_F(TextEndTest, TwoNulsStandAfterTheText) {
   EXPECT_EQ(BlockAfter(kScene), kScene + "\0\0"s);
   EXPECT_EQ(BlockAfter("//Maya 123"), "//Maya 123\0\0"s);
 }

@@ -120,7 +120,7 @@ const std::vector<Refusal> kHandleRefusals = {
      }},
 };
 
-TEST(Refusals, NullStaleAndForeignHandlesAreToldApart) { expectRefusals(kHandleRefusals); }
+TEST(Refusals, NullStaleAndForeignHandlesAreDistinguished) { expectRefusals(kHandleRefusals); }
 
 TEST(Refusals, PermissiveHostRefusesHandlesAsEver) {
   HostOptions options;

@@ -13,7 +13,7 @@ using testsupport::TemporaryFolder;
 using ::testing::ElementsAre;
 using ::testing::IsEmpty;
 
-// What the plug-in saw, and what it is told to do.
+// What the plug-in saw, and what a test makes it do.
 struct Plugin {
   const WNBasicSuite* basic = nullptr;
   std::int32_t pluginId = 0;
@@ -195,7 +195,7 @@ TEST_F(HostCalls, HostThatGoesCallsTheDeathHookFirst) {
   EXPECT_EQ(plugin.deaths, 1);
 }
 
-TEST_F(HostCalls, ExceptionOutOfThePluginIsSurvivedAndTold) {
+TEST_F(HostCalls, ExceptionOutOfThePluginIsSurvivedAndReported) {
   plugin.throwsInImport = true;
   Host host(options());
   host.load(entry, &loaded);

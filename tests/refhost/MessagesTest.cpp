@@ -64,7 +64,7 @@ TEST(Messages, TranslateAndReportIsKeptBackWhileErrorsAreSilent) {
   EXPECT_THAT(plugin.leave().messages, IsEmpty());
 }
 
-TEST(Messages, SpanThatNeverEndsIsToldAndEndsWithTheCallback) {
+TEST(Messages, SpanThatNeverEndsIsReportedAndEndsWithTheCallback) {
   StandIn plugin({}, Callback::Verify);
   HostSilentErrorState state{};
   kUtilitySuite7.BeginSilentErrors(&state);

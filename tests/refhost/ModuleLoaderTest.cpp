@@ -31,7 +31,7 @@ TEST(ModuleLoader, EntryOfTheModuleIsCalledWithThePluginId) {
   EXPECT_EQ(result.code, 23);
 }
 
-TEST(ModuleLoader, ModuleThatIsMissingIsToldInWords) {
+TEST(ModuleLoader, ModuleThatIsMissingIsReportedInWords) {
   Host host(optionsFor("/nowhere/at/all.so"));
   CallbackResult result;
   std::string failure;
@@ -53,7 +53,7 @@ TEST(ModuleLoader, FifoAndFolderAreNoModulesAndAreNotWaitedFor) {
   }
 }
 
-TEST(ModuleLoader, ModuleWithoutEntryIsToldInWords) {
+TEST(ModuleLoader, ModuleWithoutEntryIsReportedInWords) {
   Host host(optionsFor(MODULE_WITHOUT_ENTRY));
   CallbackResult result;
   std::string failure;

@@ -90,7 +90,7 @@ TEST(Preferences, WritingThroughALinkKeepsTheLink) {
   EXPECT_EQ(folder.read("real"), "[S]\nk=2\n");
 }
 
-TEST(Preferences, FileThatCannotBeWrittenIsToldInWords) {
+TEST(Preferences, FileThatCannotBeWrittenIsReportedInWords) {
   const TemporaryFolder folder;
   folder.write("file", "");
   Preferences preferences(folder.path() / "file" / "store");

@@ -56,7 +56,7 @@ struct BadForm {
   const char* complaint;
 };
 
-TEST(RehearsalForms, EveryBadFormIsToldInWords) {
+TEST(RehearsalForms, EveryBadFormIsReportedInWords) {
   const char* namedForm = ": the form is OPERATION:NTH=CODE";
   const char* namedThrowForm = ": the form is OPERATION:NTH=KIND";
   const char* numberedForm = ": the form is K=CODE or K+=CODE";

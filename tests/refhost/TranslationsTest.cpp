@@ -32,14 +32,14 @@ TEST(Translations, LastLineNeedsNoLineEnd) {
   EXPECT_THAT(*read, ElementsAre(Pair("k", "t")));
 }
 
-TEST(Translations, LineWithoutEqualsSignIsToldByItsNumber) {
+TEST(Translations, LineWithoutEqualsSignIsReportedByItsNumber) {
   const TemporaryFolder folder;
   std::string complaint;
   EXPECT_FALSE(readTranslations(folder.write("de", "# c\nk=t\nwrong\n"), &complaint).has_value());
   EXPECT_THAT(complaint, EndsWith("de:3: the line has no \"=\""));
 }
 
-TEST(Translations, MissingFileIsToldInWords) {
+TEST(Translations, MissingFileIsReportedInWords) {
   const TemporaryFolder folder;
   std::string complaint;
   EXPECT_FALSE(readTranslations(folder.path() / "none", &complaint).has_value());

@@ -157,7 +157,7 @@ TEST(DecimalTest, ALargeExponentAndManyDigitsMakeUpForEachOther) {
 }
 
 TEST(DecimalTest, ADigitFarBackDecidesTheRounding) {
-  // Halfway between 1 and the next double: to even without, upward with anything behind it.
+  // Halfway between 1 and the next double: to even without, upward with anything after it.
   const std::string half = "1.00000000000000011102230246251565404236316680908203125";
   ExpectValue(half, 1.0);
   for (const std::size_t count : {std::size_t{10}, std::size_t{390}, std::size_t{800}, std::size_t{5000}}) {

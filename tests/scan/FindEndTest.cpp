@@ -40,7 +40,7 @@ class FindEndTest : public ::testing::Test {
   TextRoom room_;
 };
 
-TEST_F(FindEndTest, EveryPairOfNeighboursIsToldApart) {
+TEST_F(FindEndTest, EveryPairOfNeighboursIsDistinguished) {
   for (int first = 0; first < 256; ++first) {
     for (int second = 0; second < 256; ++second) {
       std::string text(10, 'w');

@@ -69,7 +69,7 @@ class HostileTexts {
     }
   }
 
-  // What the main loop looks at and reads on behind.
+  // What the main loop looks at and reads on after.
   void AddActing() {
     using namespace std::string_view_literals;
     static constexpr std::string_view kPieces[] = {

@@ -44,7 +44,7 @@ struct Tally {
 
 bool SameBits(double a, double b) { return std::memcmp(&a, &b, sizeof a) == 0; }
 
-// What std::from_chars says of the number. It tells overflow from underflow by no code of its own; the C
+// What std::from_chars says of the number. It has one code for overflow and underflow; the C
 // library's answer does.
 Expected Judge(const std::string& text, std::size_t begin) {
   Expected expected{begin, text.size(), NumberStatus::Ok, 0.0, true};

@@ -42,10 +42,10 @@ const NumberTexts::Form NumberTexts::kTable[kForms] = {
     {"subnormal", 3, &NumberTexts::Subnormal},
     {"at the ends of the range", 3, &NumberTexts::EdgeOfRange},
     {"many digits", 4, &NumberTexts::ManyDigits},
-    {"zeros in front and behind", 3, &NumberTexts::Zeros},
+    {"zeros before and after", 3, &NumberTexts::Zeros},
     {"halfway between two doubles, near 1", 3, &NumberTexts::Halfway},
     {"halfway between two doubles, anywhere", 1, &NumberTexts::HalfwayAnywhere},
-    {"with a plus or letters behind", 2, &NumberTexts::WithSuffix},
+    {"with a plus or letters after", 2, &NumberTexts::WithSuffix},
 };
 
 std::string_view NumberTexts::FormName(int form) { return kTable[form].name; }

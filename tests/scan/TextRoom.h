@@ -38,7 +38,7 @@ class TextRoom {
     char* const end = guard_ - gap - 1;
     std::memcpy(end - text.size(), text.data(), text.size());
     *end = '\0';
-    // Whoever reads these bytes sees keywords, quotes and terminators.
+    // A read of these bytes gives keywords, quotes and terminators.
     for (std::size_t i = 0; i < gap; ++i) end[1 + i] = "c \"/;-"[i % 6];
     return end;
   }

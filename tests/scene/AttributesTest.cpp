@@ -108,7 +108,7 @@ TEST_F(AttributesTest, ArraysAreReadInPieces) {
   EXPECT_EQ(scene_.Number(0, "keyTime", 4), 5.0);
 }
 
-TEST_F(AttributesTest, ElementsOfAnArrayOfCompoundsAreTold) {
+TEST_F(AttributesTest, ElementsOfAnArrayOfCompoundsAreRecognised) {
   Read(
       "createNode parentConstraint -n \"p\";setAttr \".tg[0].tot\" -type \"double3\" 1 2 3 ;"
       "setAttr \".target[1].targetOffsetTranslate.targetOffsetTranslateY\" 6;setAttr \".tg[1].tw\" 0.25;");

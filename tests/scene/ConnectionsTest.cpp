@@ -152,7 +152,7 @@ TEST_F(ConnectionsTest, ANodeThatIsNotInTheFileIsNamedNevertheless) {
   EXPECT_EQ(SourceOf("time1", "outTime"), "a.translateZ");
 }
 
-TEST_F(ConnectionsTest, NodesOfOneNameAreToldByTheirPaths) {
+TEST_F(ConnectionsTest, NodesOfOneNameAreDistinguishedByTheirPaths) {
   Read(
       "createNode transform -n \"l\";createNode transform -n \"r\";createNode transform -n \"x\" -p \"l\";"
       "createNode transform -n \"x\" -p \"r\";createNode animCurveTL -n \"k\";connectAttr \"k.o\" "

@@ -88,13 +88,13 @@ void SceneReader::setCameraAttr() {
   if (!orthographic && !interest && !fit && !focal && !aperture) return;
   Triple values{};
   std::size_t count = 0;
-  bool told = false;  // the command has a value
+  bool given = false;  // the command has a value
   for (token = inCommand(); token.kind != Kind::Semicolon; token = inCommand()) {
     if (orthographic && token.kind == Kind::Identifier && means(kBareWords, copied(token.text), Means::Yes)) {
-      camera_.orthographic = told = true;
+      camera_.orthographic = given = true;
     }
     if (orthographic || token.kind != Kind::Number) continue;
-    told = true;
+    given = true;
     if (fit) {
       const double value = number(token);
       camera_.verticalFit = !nearlyEqual(value, 1.0) && nearlyEqual(value, 2.0);
@@ -108,7 +108,7 @@ void SceneReader::setCameraAttr() {
     camera_.horizontalAperture = values[0];
     camera_.verticalAperture = values[1];
   }
-  if (told) writeBack(scene_.cameras, camera_);
+  if (given) writeBack(scene_.cameras, camera_);
 }
 
 void SceneReader::setCurveAttr() {

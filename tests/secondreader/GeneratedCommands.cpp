@@ -129,7 +129,7 @@ void SceneGenerator::repeatedNode() {
   }
 }
 
-// Attributes of whatever is current by now, behind a command or two that may have changed that.
+// Attributes of whatever is current by now, after a command or two that may have changed that.
 void SceneGenerator::attributesAgain() {
   for (int count = dice_.between(0, 2); count > 0; --count) otherCommand();
   if (dice_.chance(50)) {

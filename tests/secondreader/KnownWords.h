@@ -130,7 +130,7 @@ inline constexpr KnownWord kAttributes[] = {
     {".pa", Means::PixelAspect},   {".pixelAspect", Means::PixelAspect},
 };
 
-// Attributes that are connected: behind the node's name and a dot.
+// Attributes that are connected: after the node's name and a dot.
 inline constexpr KnownWord kPlugs[] = {
     {"o", Means::Output},
     {"output", Means::Output},

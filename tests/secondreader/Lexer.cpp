@@ -59,7 +59,7 @@ Token Lexer::next() {
   }
 }
 
-// Behind the last byte of the word; a word that the text ends in is an error.
+// After the last byte of the word; a word that the text ends in is an error.
 std::size_t Lexer::wordEnd(std::size_t place) {
   while (place < text_.size() && !isWhite(text_[place]) && text_[place] != ';') ++place;
   if (place == text_.size()) failAtEnd();
@@ -103,9 +103,9 @@ Token Lexer::comment() {
     const char byte = at(place++);
     if (byte == '\0') failAtEnd();
     if (byte != '*') continue;
-    const char behind = at(place++);
-    if (behind == '/') return token(Kind::Comment, place);
-    if (behind == '\0') failAtEnd();
+    const char next = at(place++);
+    if (next == '/') return token(Kind::Comment, place);
+    if (next == '\0') failAtEnd();
   }
 }
 

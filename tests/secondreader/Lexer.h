@@ -71,7 +71,7 @@ class Lexer {
   [[noreturn]] void failAtEnd();
 
  private:
-  // The byte there; NUL at the end of the text and behind it.
+  // The byte there; NUL at the end of the text and after it.
   char at(std::size_t place) const { return place < text_.size() ? text_[place] : '\0'; }
   [[noreturn]] void failAtByte();
 

@@ -100,7 +100,7 @@ TEST(CompareRatiosTest, RatiosAreComparedExactly) {
   EXPECT_EQ(compareRatios({-2147483647 - 1, 4294967295u}, {-2147483647, 4294967295u}), -1);
 }
 
-TEST(WholePartTest, WhatIsBehindThePointIsCutOffAndTheEndsHold) {
+TEST(WholePartTest, WhatIsAfterThePointIsCutOffAndTheEndsHold) {
   EXPECT_EQ(wholePart(2.9), 2);
   EXPECT_EQ(wholePart(-2.9), -2);
   EXPECT_EQ(wholePart(2147483647.5), 2147483647);

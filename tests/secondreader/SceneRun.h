@@ -1,6 +1,6 @@
 // Runs a scene through the importer under the embedded host, and holds what came of it to the prediction.
 // Where the process is to end, that is a process of its own, which has to end by SIGABRT with the predicted
-// trace behind it.
+// trace after it.
 #pragma once
 
 #include <cstdint>

@@ -50,7 +50,7 @@ std::string_view takeUpTo(std::string_view* rest, std::string_view marks) {
   return taken;
 }
 
-// Both begin with the numbers of an array; what stands behind it is compared as it stands.
+// Both begin with the numbers of an array; what stands after it is compared as it stands.
 bool doublesAgree(std::string_view a, std::string_view b, Rounding rounding) {
   while (a != b) {
     const std::string_view textA = takeUpTo(&a, ",]");

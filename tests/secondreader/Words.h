@@ -17,7 +17,7 @@ inline bool same(std::string_view a, std::string_view b) {
          std::equal(a.begin(), a.end(), b.begin(), [](char x, char y) { return lower(x) == lower(y); });
 }
 
-// What of a token is kept: nothing of one of 255 bytes or more, and nothing behind a NUL.
+// What of a token is kept: nothing of one of 255 bytes or more, and nothing after a NUL.
 inline std::string copied(std::string_view token) {
   constexpr std::size_t kTooLong = 255;
   if (token.size() >= kTooLong) return {};

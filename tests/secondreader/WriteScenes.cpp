@@ -1,5 +1,5 @@
 // write-scenes FIRST_SEED COUNT FOLDER: generated scenes as files. Each seed gets a folder of its number with
-// the scene, the translations that its host has, and "arguments": what stands behind "mayascene import" in a
+// the scene, the translations that its host has, and "arguments": what stands after "mayascene import" in a
 // run from within that folder, one argument a line.
 #include <cstdint>
 #include <cstdio>

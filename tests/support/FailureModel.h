@@ -1,4 +1,4 @@
-// What a callback owes the host after a failure, told from the calls that it made before.
+// What a callback owes the host after a failure, derived from the calls that it made before.
 #pragma once
 
 #include <cstddef>
@@ -115,7 +115,7 @@ struct Made {
   bool operator==(const Made&) const = default;
 };
 
-// A line of a trace, as far as it tells what was made and what is held.
+// A line of a trace, as far as it says what was made and what is held.
 struct CallFacts {
   explicit CallFacts(std::string_view line);
 

@@ -6,7 +6,7 @@
 
 namespace testsupport {
 
-// Holds a copy of the text, a NUL behind it, and a page behind the NUL that nobody may read or write: a
+// Holds a copy of the text, a NUL after it, and a page after the NUL that nobody may read or write: a
 // reader that goes one byte too far ends the process.
 class GuardedText {
  public:

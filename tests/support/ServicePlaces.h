@@ -1,4 +1,4 @@
-// When in a callback the host's utility services are called, told from a run in which nothing fails.
+// When in a callback the host's utility services are called, derived from a run in which nothing fails.
 #pragma once
 
 #include <cstddef>

@@ -105,7 +105,7 @@ TEST(CompositionJson, EachStreamHasNameAndUnit) {
   EXPECT_EQ(layers[1]["streams"][0]["name"], "anchorPoint");
 }
 
-TEST(CompositionJson, WhatCameOfACallbackIsToldInFull) {
+TEST(CompositionJson, WhatCameOfACallbackIsReportedInFull) {
   RunReport run;
   SceneReport& scene = run.scenes.emplace_back();
   scene.path = "a\xff.ma";

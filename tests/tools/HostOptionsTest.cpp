@@ -107,7 +107,7 @@ TEST_F(HostOptions, TranslationsReplaceTheMessages) {
                        "messages\n  Nur gebackene Szenen.\n"));
 }
 
-TEST_F(HostOptions, ATranslationWithoutAnEqualsSignIsToldWithItsLine) {
+TEST_F(HostOptions, ATranslationWithoutAnEqualsSignIsReportedWithItsLine) {
   write("words.txt", "# what the user sees\nno sign\n");
   const ToolResult result = import({"still.ma", "--translations", "words.txt"});
   EXPECT_EQ(result.status, 3);
@@ -129,10 +129,10 @@ TEST_F(HostOptions, FailMakesTheNthCallFail) {
 
 TEST_F(HostOptions, FailCountsAnewForEachScene) {
   const ToolResult result = import({"still.ma", "still.ma", "--fail", "CreateComp:1=3014", "--quiet"});
-  std::size_t told = 0;
+  std::size_t reported = 0;
   for (std::size_t at = 0; (at = result.err.find("error 3014 (BAD_VALUE)", at)) != std::string::npos; ++at)
-    ++told;
-  EXPECT_EQ(told, 2u) << result.err;
+    ++reported;
+  EXPECT_EQ(reported, 2u) << result.err;
 }
 
 TEST_F(HostOptions, FailAtCountsEverySuiteCall) {

@@ -114,7 +114,7 @@ TEST_F(ImportCommand, WhatIsNoMayaAsciiIsRefusedWithTheImportersMessage) {
             "mayascene: notes.txt: refused: it is no Maya ASCII scene\n");
 }
 
-TEST_F(ImportCommand, ACodeIsToldWithNameAndMeaningAndWhatWasMadeStays) {
+TEST_F(ImportCommand, ACodeIsReportedWithNameAndMeaningAndWhatWasMadeStays) {
   write("uneven.ma", sceneText(std::string(craneCamera()) + "createNode animCurveTA -n \"boom_rotateY\";\n"
                                                             "\tsetAttr -s 2 \".ktv[0:1]\" 1 0 2 7.5;\n"
                                                             "connectAttr \"boom_rotateY.o\" \"boom.ry\";\n"));
@@ -131,7 +131,7 @@ TEST_F(ImportCommand, ACodeIsToldWithNameAndMeaningAndWhatWasMadeStays) {
       << result.err;
 }
 
-TEST_F(ImportCommand, AFailureOfTheTextIsToldWithItsLine) {
+TEST_F(ImportCommand, AFailureOfTheTextIsReportedWithItsLine) {
   write("byte.ma",
         "//Maya ASCII 2016 scene\n/* two\nthree */\ncreateNode camera -n \"c\";\n\tsetAttr \".fl\" #35;\n");
   write("end.ma",

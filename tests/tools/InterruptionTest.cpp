@@ -56,7 +56,7 @@ TEST_F(Interruption, AHangUpLeavesNoPartialOutputEither) {
   EXPECT_EQ(files(), (std::vector<std::string>{"many.ma", "out.json"}));
 }
 
-// The trace is a log: where it ends tells how far the run came. Nothing else is left, with both outputs at
+// The trace is a log: where it ends shows how far the run came. Nothing else is left, with both outputs at
 // work.
 TEST_F(Interruption, WhileTheTraceIsWrittenTheJsonIsNotThereAndTheTraceIsItsBeginning) {
   const ToolResult result = interruptedWhenThereIs(

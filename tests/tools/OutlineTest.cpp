@@ -69,7 +69,7 @@ TEST(Outline, AnImportThatFailedHalfwaySaysSo) {
       contains(outlineOf(scene.report), "crane.ma: 1 composition, 1 camera, 2 nulls, 4 keys (incomplete)\n"));
 }
 
-TEST(Outline, ASceneWithoutCamerasIsToldInOneLine) {
+TEST(Outline, ASceneWithoutCamerasIsReportedInOneLine) {
   HandBuiltScene scene;
   scene.folder.compositions.clear();
   scene.report.outcome = Outcome::Nothing;
@@ -97,7 +97,7 @@ TEST(Outline, HostileNamesAreEscapedWhereverTheyStand) {
   EXPECT_TRUE(contains(outline, "  f\\x1bg\n"));
 }
 
-TEST(Outline, AChainOfTwentyThousandParentsIsToldInDepthsAndDoesNotGrowTheLines) {
+TEST(Outline, AChainOfTwentyThousandParentsIsShownInDepthsAndDoesNotGrowTheLines) {
   HandBuiltScene scene;
   constexpr std::size_t links = 20'000;
   refhost::Layer* parent = scene.add(refhost::LayerKind::Null, "link", nullptr);

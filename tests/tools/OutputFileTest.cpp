@@ -78,7 +78,7 @@ TEST_F(OutputFileTest, ASymbolicLinkToAFileThatIsNotThereYetStaysALink) {
   EXPECT_EQ(read("far/real.json"), "made");
 }
 
-TEST_F(OutputFileTest, ASymbolicLinkThatLeadsInACircleStaysALinkAndIsTold) {
+TEST_F(OutputFileTest, ASymbolicLinkThatLeadsInACircleStaysALinkAndIsReported) {
   std::filesystem::create_symlink("out.json", target);
   EXPECT_EQ(OutputFile::open(target, &failure), nullptr);
   EXPECT_EQ(failure, target + " cannot be written: Too many levels of symbolic links");
@@ -97,7 +97,7 @@ TEST_F(OutputFileTest, ALogStandsUnderItsNameFromTheStartAndStaysWithoutACommit)
   EXPECT_EQ(files(), Names{"calls.jsonl"});
 }
 
-TEST_F(OutputFileTest, ALogThatCannotBeWrittenIsToldAtOnceOrWithTheCommit) {
+TEST_F(OutputFileTest, ALogThatCannotBeWrittenIsReportedAtOnceOrWithTheCommit) {
   EXPECT_EQ(OutputFile::openLog(path("no/such/log").string(), &failure), nullptr);
   EXPECT_EQ(failure, path("no/such/log").string() + " cannot be written: No such file or directory");
   const auto log = OutputFile::openLog("/dev/full", &failure);
@@ -115,7 +115,7 @@ TEST_F(OutputFileTest, ADeviceIsWrittenAndNotReplaced) {
   EXPECT_TRUE(std::filesystem::is_character_file("/dev/null"));
 }
 
-TEST_F(OutputFileTest, AFullDeviceIsToldWithTheCommit) {
+TEST_F(OutputFileTest, AFullDeviceIsReportedWithTheCommit) {
   const auto output = OutputFile::open("/dev/full", &failure);
   ASSERT_NE(output, nullptr) << failure;
   output->stream() << "too much";
@@ -123,7 +123,7 @@ TEST_F(OutputFileTest, AFullDeviceIsToldWithTheCommit) {
   EXPECT_EQ(failure, "/dev/full cannot be written: No space left on device");
 }
 
-TEST_F(OutputFileTest, WhatCannotBeWrittenIsToldAtOnce) {
+TEST_F(OutputFileTest, WhatCannotBeWrittenIsReportedAtOnce) {
   EXPECT_EQ(OutputFile::open(path("no/such/folder.json").string(), &failure), nullptr);
   EXPECT_EQ(failure, path("no/such/folder.json").string() + " cannot be written: No such file or directory");
   EXPECT_EQ(OutputFile::open(path("").string(), &failure), nullptr);

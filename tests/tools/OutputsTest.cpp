@@ -93,7 +93,7 @@ TEST_F(Outputs, WhatGoesToAClosedStandardErrorGoesIntoNoOutput) {
   }
 }
 
-TEST_F(Outputs, AnOutlineThatCannotBeWrittenIsToldToo) {
+TEST_F(Outputs, AnOutlineThatCannotBeWrittenIsReportedToo) {
   const ToolResult result = run({"import", "still.ma", "--quiet", "--trace", "/dev/full"});
   EXPECT_EQ(result.status, 5);
   EXPECT_EQ(result.err, "mayascene: /dev/full cannot be written: No space left on device\n");

@@ -43,7 +43,7 @@ std::size_t openDescriptors() {
 
 class Pool : public ::testing::Test {
  protected:
-  // Runs the children, each of which is told what to do, and gives their ends in the order in which they
+  // Runs the children, each with its command, and gives their ends in the order in which they
   // came.
   std::vector<ChildEnd> run(const std::vector<Words>& children) {
     std::vector<ChildEnd> ends;

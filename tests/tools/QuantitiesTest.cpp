@@ -53,7 +53,7 @@ TEST(Quantities, RatiosAreDividedAndNeverByZero) {
   EXPECT_EQ(ratioText({24, 0}), "24/0");
 }
 
-TEST(Quantities, DurationsAreToldInSecondsAndFrames) {
+TEST(Quantities, DurationsAreShownInSecondsAndFrames) {
   EXPECT_EQ(durationText({120000, 24000}, {24, 1}), "5 s (120 frames)");
   EXPECT_EQ(durationText({1000, 24000}, {24, 1}), "0.042 s (1 frame)");
   EXPECT_EQ(durationText({29970, 2997}, {30, 1}), "10 s (300 frames)");
@@ -74,7 +74,7 @@ refhost::Stream keyed(std::vector<T_Time> times, std::vector<double> values) {
   return stream;
 }
 
-TEST(Quantities, KeysAreToldWithTheirSpan) {
+TEST(Quantities, KeysAreShownWithTheirSpan) {
   EXPECT_EQ(keysText(keyed({{0, 24000}}, {5}), {24, 1}), "1 key, frame 0 (0 s)");
   const refhost::Stream several = keyed({{-1000, 24000}, {500, 24000}, {119000, 24000}}, {1, 2, 1});
   EXPECT_EQ(keysText(several, {24, 1}), "3 keys, frames -1 to 119 (-0.042 s to 4.958 s)");

@@ -9,7 +9,7 @@ namespace {
 
 using SceneFile = mayascene_test::ToolTest;
 
-TEST_F(SceneFile, TheHeaderIsToldWithoutRegardToCase) {
+TEST_F(SceneFile, TheHeaderIsRecognisedWithoutRegardToCase) {
   for (const char* text : {"//Maya ASCII 2023 scene\n", "//MAYA", "//mAyA\n"}) {
     write("a.ma", text);
     EXPECT_TRUE(lookAtScene(path("a.ma")).readable) << text;

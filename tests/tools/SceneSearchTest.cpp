@@ -146,7 +146,7 @@ TEST_F(SceneSearch, AFolderWithoutScenesIsNamed) {
   EXPECT_EQ(shortened(found.scenes), (Names{"v/a.ma"}));
 }
 
-// Whoever may read everything gives that up first.
+// A user who may read everything gives that up first.
 TEST_F(SceneSearch, AFolderThatMayNotBeReadIsNamedAndTheOthersAreSearched) {
   for (const char* name : {"s/a/1.ma", "s/b/2.ma", "s/c/3.ma"}) file(name);
   fs::permissions(folder_.path(), fs::perms::all);

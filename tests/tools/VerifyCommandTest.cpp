@@ -32,7 +32,7 @@ TEST_F(VerifyCommand, SomeNotTakenIsOneAndShowsNoMessage) {
   EXPECT_EQ(result.err, "");
 }
 
-TEST_F(VerifyCommand, ACodeIsToldAndIsNotTaken) {
+TEST_F(VerifyCommand, ACodeIsReportedAndIsNotTaken) {
   const ToolResult result = run({"verify", "short.ma"});
   EXPECT_EQ(result.status, 1);
   EXPECT_EQ(result.out, "short.ma: not taken\n");

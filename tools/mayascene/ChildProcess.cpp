@@ -66,7 +66,7 @@ bool redirect(const Preparation& prepared) {
   held.defaultInChild();
   const bool ready =
       ::prctl(PR_SET_PDEATHSIG, SIGKILL) == 0 && redirect(prepared) && limitMemory(prepared.memory);
-  // Whose parent ended before it could be told so.
+  // Whose parent ended before it could be notified.
   if (::getppid() != prepared.parent) ::_exit(kNotRun);
   if (ready) ::execv(prepared.words.front(), prepared.words.data());
   const int failure = errno;

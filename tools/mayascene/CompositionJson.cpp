@@ -62,7 +62,7 @@ void writeVector(text::JsonWriter& json, const double* values, std::size_t count
   json.endArray();
 }
 
-// What is told of every callback.
+// What is written of every callback.
 void writeCallback(text::JsonWriter& json, const CallbackResult& result) {
   json.key("error");
   if (result.code == 0) {

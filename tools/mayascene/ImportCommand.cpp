@@ -54,8 +54,8 @@ struct Outputs {
 };
 
 // The importer answers a file that is no Maya ASCII scene with a message and code 0, having made nothing. Two
-// signs tell it from a scene without cameras, of which nothing is made either: the file does not begin as
-// one, or the host showed a message (a file that changed, or could not be read, after the look).
+// signs distinguish it from a scene without cameras, of which nothing is made either: the file does not begin
+// as one, or the host showed a message (a file that changed, or could not be read, after the look).
 Outcome outcomeOf(const SceneLook& look, const refhost::CallbackResult& result) {
   if (result.code != 0) return Outcome::Failed;
   if (result.folder != nullptr && !result.folder->compositions.empty()) return Outcome::Imported;

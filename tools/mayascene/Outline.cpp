@@ -22,7 +22,7 @@ using refhost::Stream;
 
 constexpr std::size_t kStep = 2;          // blanks by which a child layer stands further in than its parent
 constexpr std::size_t kPropertyStep = 4;  // and a property than its layer
-constexpr std::size_t kDeepest = 24;      // from here on depth is told in figures: the page ends somewhere
+constexpr std::size_t kDeepest = 24;      // from here on depth is a number: the page ends somewhere
 constexpr std::size_t kLabelWidth = 19;
 constexpr double kPointsPerInch = 72.0;
 constexpr double kMillimetresPerInch = 25.4;

@@ -18,7 +18,7 @@ class OutputFile {
   // when it cannot be written.
   static std::unique_ptr<OutputFile> open(const std::string& target, std::string* failure);
 
-  // Opens an output that tells how a run went and is wanted most where the run is cut short: it is written
+  // Opens an output that shows how a run went and is wanted most where the run is cut short: it is written
   // under its own name from the start, over what lay there, and may end anywhere. What is written last goes
   // out when the process is terminated, too. One at a time. Null with a sentence in *failure when it cannot
   // be written.

@@ -1,4 +1,4 @@
-// What came of a run, as the outline and the JSON tell it.
+// What came of a run, as the outline and the JSON show it.
 #pragma once
 
 #include <cstdint>

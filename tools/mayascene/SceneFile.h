@@ -12,7 +12,7 @@ struct SceneLook {
   bool mayaHeader = false;  // it begins with "//Maya", in capitals or not
 };
 
-// Never waits: a FIFO without a writer and a directory are told from a regular file at once.
+// Never waits: a FIFO without a writer and a directory are recognised at once.
 SceneLook lookAtScene(const std::filesystem::path& path);
 
 }  // namespace mayascene

@@ -78,9 +78,9 @@ class Comparison:
         frames = frames_of(rig, given, step)
         for feature in rig.features:
             self.features[feature] = self.features.get(feature, 0) + 1
-        told = report["frames"]
-        if (told["first"], told["count"]) != (frames[0], len(frames)):
-            self.complain(rig.name, "frames", told, "expected", frames[0], len(frames))
+        reported = report["frames"]
+        if (reported["first"], reported["count"]) != (frames[0], len(frames)):
+            self.complain(rig.name, "frames", reported, "expected", frames[0], len(frames))
             return
         composition = Composition(scene)
         self.hold_times(rig, composition, len(frames), step)
