@@ -20,6 +20,7 @@ def _options():
     parser.add_argument("--tool", required=True)
     parser.add_argument("--only", action="append", choices=sorted(_PARTS))
     parser.add_argument("--table")
+    parser.add_argument("--picture")
     return parser.parse_args()
 
 
@@ -44,19 +45,29 @@ class Run:
                           for text in result.failures]
 
 
+_ADDONS = os.path.join(scenes.ROOT, "addons", "blender")
+
+
+def _draw(run, path):
+    """The picture of docs/blender.md."""
+    crane = next(scene for scene in run.examples if scene.name == "crane_shot")
+    blender.run("blender_picture.py",
+                {"addons": _ADDONS, "tool": run.tool, "scene": crane.path,
+                 "output": os.path.abspath(path)}, run.folder)
+
+
 def _addon(run):
-    addons = os.path.join(scenes.ROOT, "addons", "blender")
     plain = [scene for scene in scenes.examples(run.tool, bake=False)
              if scene.imported]
     for bake, taken in ((True, run.scenes), (False, plain)):
         through = ("add-on" if bake else "add-on, without a bake")
-        results = addon_test.measure(taken, run.tool, addons, run.folder)
+        results = addon_test.measure(taken, run.tool, _ADDONS, run.folder)
         for scene, result in zip(taken, results):
             run.take(scene, f"{through}, Blender {blender.version()}", result)
     lens = next(scene for scene in run.examples if scene.name == "dolly_zoom")
     run.problems += [
         f"second import: {text}" for text in addon_update_test.problems(
-            lens, run.tool, addons, run.folder)]
+            lens, run.tool, _ADDONS, run.folder)]
 
 
 _PARTS = {"addon": _addon}
@@ -68,6 +79,8 @@ def main():
         run = Run(options, folder)
         for name in options.only or _PARTS:
             _PARTS[name](run)
+        if options.picture:
+            _draw(run, options.picture)
     print(summary_of(run.rows))
     print(table_of(run.rows))
     print(f"{run.absent} of {len(scenes.SHOTS)} shots are absent")
