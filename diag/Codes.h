@@ -148,6 +148,13 @@ enum class Code : std::uint16_t {
   ExportLensUnusable = 1103,
   ExportParentCircle = 1104,
   ExportNumberTooLarge = 1105,
+  ExportNameReplaced = 1110,
+  ExportCameraScaled = 1111,
+  ExportTimesShifted = 1112,
+  ExportTimesTooFine = 1113,
+  ExportZoomByExtension = 1114,
+  ExportFileTooLarge = 1115,
+  ExportDownAxisLost = 1116,
 };
 
 // Ordered: a later one is worse.

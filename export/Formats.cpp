@@ -10,6 +10,16 @@ namespace interchange {
 namespace {
 
 constexpr std::array kFormats = {
+    Format{.name = "gltf",
+           .suffix = ".gltf",
+           .sentence = "glTF 2.0, with a .bin beside it: always metres, y up",
+           .ownAxes = true,
+           .write = WriteGltf},
+    Format{.name = "glb",
+           .suffix = ".glb",
+           .sentence = "glTF 2.0 in one file: always metres, y up",
+           .ownAxes = true,
+           .write = WriteGlb},
     Format{.name = "csv",
            .suffix = ".csv",
            .sentence = "a row a frame and layer; with --keys a row a key",

@@ -7,6 +7,10 @@
 
 namespace interchange {
 
+bool WriteGltf(const Composition& composition, const WriteOptions& options, std::string_view stem,
+               Files& files, diag::Collector* diagnostics);
+bool WriteGlb(const Composition& composition, const WriteOptions& options, std::string_view stem,
+              Files& files, diag::Collector* diagnostics);
 bool WriteCsv(const Composition& composition, const WriteOptions& options, std::string_view stem,
               Files& files, diag::Collector* diagnostics);
 
