@@ -97,7 +97,7 @@ constexpr Entry kExportCodes[] = {
      .meaning = "All numbers are in the axes that were asked for. Cameras are turned, so that they still see "
                 "the same picture.",
      .example = "",
-     .help = "Leave --axes host out."},
+     .help = "Export in the axes of the scene."},
 };
 
 }  // namespace

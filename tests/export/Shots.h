@@ -1,7 +1,7 @@
 // Compositions for the tests of writers.
 #pragma once
 
-#include <cstdint>
+#include <cstddef>
 #include <string>
 #include <vector>
 
@@ -26,9 +26,5 @@ std::vector<NamedShot> AllShots(interchange::Axes axes = interchange::Axes::Scen
 // Points before a camera at a frame, near and far, in the middle and at the rim.
 std::vector<Point> PointsBefore(const interchange::Composition& composition, std::size_t camera,
                                 std::size_t frame);
-
-// Names, numbers, parents and lenses that a host in good order never holds, among others that it does. The
-// same for the same seed.
-interchange::Composition HostileComposition(std::uint64_t seed);
 
 }  // namespace exporttest
