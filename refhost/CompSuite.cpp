@@ -5,7 +5,7 @@
 
 #include "refhost/Call.h"
 #include "refhost/ShownText.h"
-#include "refhost/SuiteShelf.h"
+#include "refhost/SuiteRegistry.h"
 
 namespace refhost {
 namespace {

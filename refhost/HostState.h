@@ -19,7 +19,7 @@
 #include "refhost/Preferences.h"
 #include "refhost/ProjectEditor.h"
 #include "refhost/RehearsalRunner.h"
-#include "refhost/SuiteShelf.h"
+#include "refhost/SuiteRegistry.h"
 #include "refhost/Trace.h"
 
 namespace refhost {
@@ -105,7 +105,7 @@ class [[gnu::visibility("hidden")]] HostState {
   HandlePool<HeldStream> streams{codec, HandleKind::Stream};
   HandlePool<Batch> batches{codec, HandleKind::Batch};
   HandlePool<MemoryBlock> memory{codec, HandleKind::Memory};
-  SuiteShelf suites;
+  SuiteRegistry suites;
   RehearsalRunner rehearsal;
   Trace trace;
   std::optional<TraceLine> traceLine;  // of the call that runs; calls do not nest

@@ -7,7 +7,7 @@
 
 #include "refhost/Call.h"
 #include "refhost/StreamTable.h"
-#include "refhost/SuiteShelf.h"
+#include "refhost/SuiteRegistry.h"
 
 namespace refhost {
 namespace {

@@ -7,7 +7,7 @@
 
 #include "hostutil/HostSetup.h"
 #include "refhost/Call.h"
-#include "refhost/SuiteShelf.h"
+#include "refhost/SuiteRegistry.h"
 
 namespace refhost {
 namespace {

@@ -1,6 +1,6 @@
 // "QZGP Register Suite" 6: the death hook.
 #include "refhost/Call.h"
-#include "refhost/SuiteShelf.h"
+#include "refhost/SuiteRegistry.h"
 
 namespace refhost {
 namespace {

@@ -6,7 +6,7 @@
 #include <system_error>
 
 #include "refhost/Operations.h"
-#include "refhost/SuiteShelf.h"
+#include "refhost/SuiteRegistry.h"
 
 namespace refhost {
 namespace {
@@ -147,7 +147,7 @@ std::optional<RefusedSuite> parseRefuse(std::string_view text, std::string* comp
     complain(complaint, text, "the form is SUITE:VERSION");
     return std::nullopt;
   }
-  if (SuiteShelf().find(halves->before, *version) == nullptr) {
+  if (SuiteRegistry().find(halves->before, *version) == nullptr) {
     complain(complaint, text, "the host offers no such suite");
     return std::nullopt;
   }

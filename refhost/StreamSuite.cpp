@@ -2,7 +2,7 @@
 #include <string>
 
 #include "refhost/Call.h"
-#include "refhost/SuiteShelf.h"
+#include "refhost/SuiteRegistry.h"
 
 namespace refhost {
 namespace {

@@ -1,7 +1,7 @@
 // "QZGP Utility Suite" 7: messages and silent errors.
 #include "refhost/Call.h"
 #include "refhost/ShownText.h"
-#include "refhost/SuiteShelf.h"
+#include "refhost/SuiteRegistry.h"
 
 namespace refhost {
 namespace {

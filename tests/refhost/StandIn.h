@@ -12,7 +12,7 @@
 #include "hostapi/ErrorCodes.h"
 #include "hostapi/LayerStreams.h"
 #include "refhost/Host.h"
-#include "refhost/SuiteShelf.h"
+#include "refhost/SuiteRegistry.h"
 
 namespace refhost {
 

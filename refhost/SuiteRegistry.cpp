@@ -1,8 +1,8 @@
-#include "refhost/SuiteShelf.h"
+#include "refhost/SuiteRegistry.h"
 
 namespace refhost {
 
-SuiteShelf::SuiteShelf()
+SuiteRegistry::SuiteRegistry()
     : suites_{{QZGP_UTILITY_SUITE, QZGP_UTILITY_SUITE_7, &kUtilitySuite7},
               {QZGP_MEMORY_SUITE, QZGP_MEMORY_SUITE_1, &kMemorySuite1},
               {QZGP_PERSISTENT_DATA_SUITE, QZGP_PERSISTENT_DATA_SUITE_3, &kPersistentDataSuite3},
@@ -17,14 +17,14 @@ SuiteShelf::SuiteShelf()
               {QZGP_KEYFRAME_SUITE, QZGP_KEYFRAME_SUITE_3, &kKeyframeSuite3},
               {QZGP_KEYFRAME_SUITE, QZGP_KEYFRAME_SUITE_4, &kKeyframeSuite4}} {}
 
-OfferedSuite* SuiteShelf::find(std::string_view name, std::int32_t version) {
+OfferedSuite* SuiteRegistry::find(std::string_view name, std::int32_t version) {
   for (OfferedSuite& suite : suites_) {
     if (suite.version == version && suite.name == name) return &suite;
   }
   return nullptr;
 }
 
-void SuiteShelf::giveAllBack() {
+void SuiteRegistry::giveAllBack() {
   for (OfferedSuite& suite : suites_) {
     suite.held = 0;
     suite.failedReleases = 0;

@@ -35,9 +35,9 @@ struct OfferedSuite {
   std::int64_t failedReleases = 0;  // releases that a rehearsal made fail
 };
 
-class SuiteShelf {
+class SuiteRegistry {
  public:
-  SuiteShelf();
+  SuiteRegistry();
 
   OfferedSuite* find(std::string_view name, std::int32_t version);  // null when it is not offered
   const std::vector<OfferedSuite>& all() const { return suites_; }
