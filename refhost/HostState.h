@@ -14,7 +14,7 @@
 #include "refhost/Ceilings.h"
 #include "refhost/Handles.h"
 #include "refhost/Host.h"
-#include "refhost/MessageBoard.h"
+#include "refhost/MessageLog.h"
 #include "refhost/ModuleLoader.h"
 #include "refhost/Preferences.h"
 #include "refhost/ProjectEditor.h"
@@ -110,7 +110,7 @@ class [[gnu::visibility("hidden")]] HostState {
   Trace trace;
   std::optional<TraceLine> traceLine;  // of the call that runs; calls do not nest
   Preferences preferences;
-  MessageBoard messages;
+  MessageLog messages;
   std::vector<Importer> importers;  // by id - 1
   HostDeathHook deathHook = nullptr;
   std::intptr_t deathHookRefcon = 0;

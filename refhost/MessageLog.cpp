@@ -1,16 +1,16 @@
-#include "refhost/MessageBoard.h"
+#include "refhost/MessageLog.h"
 
 #include <utility>
 
 namespace refhost {
 
-void MessageBoard::show(std::string text) {
+void MessageLog::show(std::string text) {
   (spans_.empty() ? shown_ : spans_.back().kept).push_back(std::move(text));
 }
 
-void MessageBoard::beginSilence(const HostSilentErrorState* state) { spans_.push_back({state, {}}); }
+void MessageLog::beginSilence(const HostSilentErrorState* state) { spans_.push_back({state, {}}); }
 
-bool MessageBoard::endSilence(const HostSilentErrorState* state, bool report) {
+bool MessageLog::endSilence(const HostSilentErrorState* state, bool report) {
   if (spans_.empty() || spans_.back().state != state) return false;
   std::vector<std::string> kept = std::move(spans_.back().kept);
   spans_.pop_back();
@@ -19,7 +19,7 @@ bool MessageBoard::endSilence(const HostSilentErrorState* state, bool report) {
   return true;
 }
 
-std::vector<std::string> MessageBoard::takeShown() {
+std::vector<std::string> MessageLog::takeShown() {
   spans_.clear();
   return std::exchange(shown_, {});
 }

@@ -8,7 +8,7 @@
 
 namespace refhost {
 
-class MessageBoard {
+class MessageLog {
  public:
   void show(std::string text);
 
