@@ -52,7 +52,7 @@ struct HostOptions {
   std::int32_t zoomKeys = 0;           // keys that each new camera layer has on its zoom stream
   bool permissive = false;             // record any number instead of refusing it
 
-  // Ceilings. What goes beyond one is refused with a code and a sentence; what exists stays.
+  // Limits. What goes beyond one is refused with a code and a sentence; what exists stays.
   std::int32_t mostLayers = 2'000'000;  // layers in the project
   std::int32_t mostKeys = 100'000'000;  // keys in the project and in open batches
   std::int64_t mostMemory = std::int64_t{1}

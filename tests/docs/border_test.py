@@ -12,7 +12,7 @@ THROWS = "plugin/ErrorCodes.h"
 CATCHES = "plugin/Guarded.h"
 EXCEPTION_WORD = re.compile(r"\b(?:throw|try|catch)\b")
 
-# Codes that need more than a row of a test: tests of their own make the ceilings happen, and memory that is
+# Codes that need more than a row of a test: tests of their own make the limits happen, and memory that is
 # exhausted cannot be made to happen here.
 BEYOND_A_ROW = {"TOO_MANY_LAYERS", "TOO_MANY_KEYS", "MEMORY"}
 

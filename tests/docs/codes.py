@@ -66,7 +66,7 @@ def reached(body, functions_of, members, is_member, seen=frozenset()):
 def given():
     """Operation to the codes that the embedded host's sources give it."""
     members = functions(read("refhost/Call.h") + read("refhost/Call.cpp"))
-    shared = functions(read("refhost/Ceilings.cpp"))
+    shared = functions(read("refhost/Limits.cpp"))
     found = {}
     for path in sorted((ROOT / "refhost").glob("*Suite.cpp")):
         own = functions(path.read_text(encoding="utf-8"))

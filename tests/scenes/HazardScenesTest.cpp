@@ -155,7 +155,7 @@ TEST(HazardScenes, AThousandParentsAboveEachOfAThousandLocatorsAllBecomeNulls) {
   EXPECT_EQ(tops, 1000u);
 }
 
-TEST(HazardScenes, ParentsWithoutEndAreRefusedAtTheCeilingAndTheNullsBeforeStay) {
+TEST(HazardScenes, ParentsWithoutEndAreRefusedAtTheLimitAndTheNullsBeforeStay) {
   constexpr std::int32_t kMost = 5000;
   refhost::HostOptions options;
   options.mostLayers = kMost;

@@ -172,7 +172,7 @@ struct CommandLine {
     importVerb->add_flag("-q,--quiet", import.quiet, "print nothing but errors");
     importVerb->add_flag("--bake", importBakes, "bake each scene first: see mayascene bake");
     addHostOptions(importVerb, &import.host, &importHostWords);
-    addCeilings(importVerb, &import.host);
+    addLimits(importVerb, &import.host);
     addBakeOptions(importVerb, &importBakeWords, "With --bake");
   }
 

@@ -85,8 +85,8 @@ void addHostOptions(CLI::App* verb, HostArguments* host, HostWords* words) {
 }
 
 // The defaults that the texts name are those of refhost::HostOptions.
-void addCeilings(CLI::App* verb, HostArguments* host) {
-  constexpr const char* group = "Ceilings";
+void addLimits(CLI::App* verb, HostArguments* host) {
+  constexpr const char* group = "Limits";
   verb->add_option("--most-layers", host->mostLayers, "layers that the project takes (2000000)")
       ->option_text("N")
       ->check(CLI::NonNegativeNumber)

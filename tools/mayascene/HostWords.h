@@ -20,10 +20,10 @@ void addPreferences(CLI::App* verb, std::string* file);
 // The linear units and the preference store.
 void addUnits(CLI::App* verb, HostArguments* host);
 
-// The units, and all else but the ceilings.
+// The units, and all else but the limits.
 void addHostOptions(CLI::App* verb, HostArguments* host, HostWords* words);
 
-void addCeilings(CLI::App* verb, HostArguments* host);
+void addLimits(CLI::App* verb, HostArguments* host);
 
 // Throws CLI::ValidationError for a word that means nothing.
 void translateHostWords(const HostWords& words, HostArguments* host);

@@ -1,4 +1,4 @@
-// The ceilings that the command line sets, by their effect.
+// The limits that the command line sets, by their effect.
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
@@ -14,15 +14,15 @@ namespace {
 
 using testing::HasSubstr;
 
-class Ceilings : public ToolTest {
+class Limits : public ToolTest {
  protected:
-  Ceilings() {
+  Limits() {
     write("still.ma", sceneText(stillCamera()));
     write("crane.ma", sceneText(craneCamera()));
   }
 };
 
-TEST_F(Ceilings, LayersBeyondTheMostAreACodeAndASentenceAndTheOthersAreShown) {
+TEST_F(Limits, LayersBeyondTheMostAreACodeAndASentenceAndTheOthersAreShown) {
   const ToolResult result = run({"import", "--most-layers", "1", "crane.ma"});
   EXPECT_EQ(result.status, 1);
   EXPECT_THAT(result.err, HasSubstr("error 3034 (TOO_MANY_LAYERS)"));
@@ -30,7 +30,7 @@ TEST_F(Ceilings, LayersBeyondTheMostAreACodeAndASentenceAndTheOthersAreShown) {
   EXPECT_THAT(result.out, HasSubstr("crane.ma: 1 composition"));
 }
 
-TEST_F(Ceilings, KeysBeyondTheMostAreACodeAndTheFirstOnesStay) {
+TEST_F(Limits, KeysBeyondTheMostAreACodeAndTheFirstOnesStay) {
   const ToolResult result = run({"import", "--most-keys", "2", "--json", "out.json", "crane.ma"});
   EXPECT_EQ(result.status, 1);
   EXPECT_THAT(result.err, HasSubstr("error 3035 (TOO_MANY_KEYS)"));
@@ -45,26 +45,26 @@ TEST_F(Ceilings, KeysBeyondTheMostAreACodeAndTheFirstOnesStay) {
   EXPECT_EQ(keys, 2u) << report;
 }
 
-TEST_F(Ceilings, MemoryBeyondTheMostIsACode) {
+TEST_F(Limits, MemoryBeyondTheMostIsACode) {
   const ToolResult result = run({"import", "--most-memory", "10", "still.ma"});
   EXPECT_EQ(result.status, 1);
   EXPECT_THAT(result.err, HasSubstr("error 3036 (TOO_MUCH_MEMORY)"));
   EXPECT_THAT(result.err, HasSubstr("left of 10"));
 }
 
-TEST_F(Ceilings, WhatLiesWithinThemIsImported) {
+TEST_F(Limits, WhatLiesWithinThemIsImported) {
   EXPECT_EQ(run({"import", "--most-layers", "100", "--most-keys", "1000", "--most-memory", "1000000",
                  "still.ma", "crane.ma"})
                 .status,
             0);
 }
 
-TEST_F(Ceilings, TheyCountOverAllScenesOfARun) {
+TEST_F(Limits, TheyCountOverAllScenesOfARun) {
   EXPECT_EQ(run({"import", "--most-layers", "1", "still.ma"}).status, 0);
   EXPECT_EQ(run({"import", "--most-layers", "1", "still.ma", "still.ma"}).status, 1);
 }
 
-TEST_F(Ceilings, ANumberThatIsNoneIsWrongUsage) {
+TEST_F(Limits, ANumberThatIsNoneIsWrongUsage) {
   for (const char* const option : {"--most-layers", "--most-keys", "--most-memory"}) {
     for (const char* const number : {"-1", "many", "99999999999999999999"}) {
       EXPECT_EQ(run({"import", option, number, "still.ma"}).status, 2) << option << " " << number;
@@ -72,7 +72,7 @@ TEST_F(Ceilings, ANumberThatIsNoneIsWrongUsage) {
   }
 }
 
-TEST_F(Ceilings, TheHelpNamesTheDefaults) {
+TEST_F(Limits, TheHelpNamesTheDefaults) {
   const refhost::HostOptions defaults;
   const std::string help = run({"import", "--help"}).out;
   EXPECT_THAT(help, HasSubstr("layers that the project takes (" + std::to_string(defaults.mostLayers) + ")"));
@@ -83,7 +83,7 @@ TEST_F(Ceilings, TheHelpNamesTheDefaults) {
 
 // Each locator has a chain of parents of its own: a text of a few kilobytes that asks for a hundred million
 // layers.
-TEST_F(Ceilings, ASmallTextThatAsksForLayersWithoutEndEndsInSeconds) {
+TEST_F(Limits, ASmallTextThatAsksForLayersWithoutEndEndsInSeconds) {
   constexpr int kChain = 10'000;
   constexpr int kLocators = 10'000;
   std::string scene = "createNode camera -n \"cam\";\n";

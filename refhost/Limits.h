@@ -1,7 +1,7 @@
 // What the host takes at most: layers, keys and bytes of memory.
 //
 // The importer makes a null layer for each parent of each camera and marked locator, so that a small text can
-// ask for far more than it holds. Beyond a ceiling the host refuses; what exists stays.
+// ask for far more than it holds. Beyond a limit the host refuses; what exists stays.
 #pragma once
 
 #include <cstdint>
@@ -15,7 +15,7 @@ class Call;
 
 // How much more the host takes. None goes below 0.
 struct Allowance {
-  // Ceilings below 0 count as 0.
+  // Limits below 0 count as 0.
   explicit Allowance(const HostOptions& options);
 
   std::int64_t layers;  // of the project

@@ -1,4 +1,4 @@
-// What goes beyond a ceiling is refused with a code and a sentence, and what exists stays.
+// What goes beyond a limit is refused with a code and a sentence, and what exists stays.
 #include <cstdint>
 #include <string>
 
@@ -60,7 +60,7 @@ HostError newBlock(std::int64_t size, HostMemHandle** handle) {
   return kMemorySuite1.NewMemHandle(kPluginId, "block", size, 0, handle);
 }
 
-TEST(Ceilings, ALayerBeyondTheMostIsRefusedWhateverItsKind) {
+TEST(Limits, ALayerBeyondTheMostIsRefusedWhateverItsKind) {
   StandIn plugin(layersAtMost(2));
   VOR_CompItem* inner = plugin.makeComp();
   VOR_CompItem* outer = plugin.makeComp();
@@ -78,7 +78,7 @@ TEST(Ceilings, ALayerBeyondTheMostIsRefusedWhateverItsKind) {
                                                    "AddLayerFromItem: the host takes no more than 2 layers"));
 }
 
-TEST(Ceilings, ANestedLayerCountsAsWell) {
+TEST(Limits, ANestedLayerCountsAsWell) {
   StandIn plugin(layersAtMost(1));
   VOR_CompItem* inner = plugin.makeComp();
   VOR_Item* item = nullptr;
@@ -88,7 +88,7 @@ TEST(Ceilings, ANestedLayerCountsAsWell) {
   EXPECT_EQ(newNull(inner), HOST_ERR_TOO_MANY_LAYERS);
 }
 
-TEST(Ceilings, LayersOfAnEarlierSceneCountAndStay) {
+TEST(Limits, LayersOfAnEarlierSceneCountAndStay) {
   StandIn plugin(layersAtMost(1));
   plugin.makeNull(plugin.makeComp());
   plugin.leave();
@@ -97,9 +97,9 @@ TEST(Ceilings, LayersOfAnEarlierSceneCountAndStay) {
   EXPECT_EQ(plugin.host().project().layers().size(), 1u);
 }
 
-class KeyCeiling : public testing::Test {
+class KeyLimit : public testing::Test {
  protected:
-  explicit KeyCeiling(std::int32_t most = 3) : plugin(keysAtMost(most)) {}
+  explicit KeyLimit(std::int32_t most = 3) : plugin(keysAtMost(most)) {}
 
   StandIn plugin;
   VOR_Layer* layer = plugin.makeNull(plugin.makeComp());
@@ -108,7 +108,7 @@ class KeyCeiling : public testing::Test {
   VOR_AddKeyframesInfo* batch = plugin.open(turn);
 };
 
-TEST_F(KeyCeiling, AKeyBeyondTheMostIsRefusedAndTheOthersStay) {
+TEST_F(KeyLimit, AKeyBeyondTheMostIsRefusedAndTheOthersStay) {
   for (std::int32_t at = 0; at < 3; ++at) EXPECT_EQ(addKey(batch, at, turn), 0);
   EXPECT_EQ(addKey(batch, 3, turn), HOST_ERR_TOO_MANY_KEYS);
   EXPECT_EQ(kKeyframeSuite3.EndKeyframeBatch(1, batch), 0);
@@ -117,7 +117,7 @@ TEST_F(KeyCeiling, AKeyBeyondTheMostIsRefusedAndTheOthersStay) {
   EXPECT_THAT(plugin.leave().refusals, ElementsAre("AddBatchKeyframe: the host takes no more than 3 keys"));
 }
 
-TEST_F(KeyCeiling, KeysOfAllOpenBatchesCount) {
+TEST_F(KeyLimit, KeysOfAllOpenBatchesCount) {
   VOR_AddKeyframesInfo* other = plugin.open(tilt);
   EXPECT_EQ(addKey(batch, 0, turn), 0);
   EXPECT_EQ(addKey(other, 0, tilt), 0);
@@ -125,13 +125,13 @@ TEST_F(KeyCeiling, KeysOfAllOpenBatchesCount) {
   EXPECT_EQ(addKey(other, 1, tilt), HOST_ERR_TOO_MANY_KEYS);
 }
 
-TEST_F(KeyCeiling, CommittedKeysCount) {
+TEST_F(KeyLimit, CommittedKeysCount) {
   for (std::int32_t at = 0; at < 3; ++at) EXPECT_EQ(addKey(batch, at, turn), 0);
   EXPECT_EQ(kKeyframeSuite3.EndKeyframeBatch(1, batch), 0);
   EXPECT_EQ(addKey(plugin.open(tilt), 0, tilt), HOST_ERR_TOO_MANY_KEYS);
 }
 
-TEST_F(KeyCeiling, KeysThatAreNotKeptMakeRoomForOthers) {
+TEST_F(KeyLimit, KeysThatAreNotKeptMakeRoomForOthers) {
   const T_Time time{7, 1};
   std::int32_t index = 0;
   EXPECT_EQ(addKey(batch, 5, turn), 0);
@@ -150,7 +150,7 @@ TEST_F(KeyCeiling, KeysThatAreNotKeptMakeRoomForOthers) {
   EXPECT_EQ(addKey(batch, 5, tilt), HOST_ERR_TOO_MANY_KEYS);
 }
 
-TEST_F(KeyCeiling, KeysOfABatchThatWasLeftBehindMakeRoomForOthers) {
+TEST_F(KeyLimit, KeysOfABatchThatWasLeftBehindMakeRoomForOthers) {
   for (std::int32_t at = 0; at < 3; ++at) EXPECT_EQ(addKey(batch, at, turn), 0);
   EXPECT_THAT(plugin.leave().leftovers[2].description, HasSubstr("batch:1"));
   plugin.enterAgain(Callback::Import);
@@ -161,7 +161,7 @@ TEST_F(KeyCeiling, KeysOfABatchThatWasLeftBehindMakeRoomForOthers) {
 }
 
 // The calls that nobody watches take a way of their own.
-TEST(Ceilings, AKeyBeyondTheMostIsRefusedWithoutATraceToo) {
+TEST(Limits, AKeyBeyondTheMostIsRefusedWithoutATraceToo) {
   constexpr std::int32_t kMost = 100;  // more than a batch first has room for
   HostOptions options = keysAtMost(kMost);
   options.pluginId = kPluginId;
@@ -183,7 +183,7 @@ TEST(Ceilings, AKeyBeyondTheMostIsRefusedWithoutATraceToo) {
   EXPECT_EQ(host.project().layers()[0].findStream(HOST_STREAM_ROTATION_Z)->keyCount(), std::size_t{kMost});
 }
 
-TEST(Ceilings, TheKeysOnANewCamerasZoomCount) {
+TEST(Limits, TheKeysOnANewCamerasZoomCount) {
   StandIn plugin(keysAtMost(5, 2));
   VOR_CompItem* comp = plugin.makeComp();
   EXPECT_EQ(newCamera(comp), 0);
@@ -193,7 +193,7 @@ TEST(Ceilings, TheKeysOnANewCamerasZoomCount) {
   EXPECT_EQ(plugin.host().project().layers().size(), 3u);
 }
 
-TEST(Ceilings, MemoryBeyondTheMostIsRefusedUntilSomeIsGivenBack) {
+TEST(Limits, MemoryBeyondTheMostIsRefusedUntilSomeIsGivenBack) {
   StandIn plugin(memoryAtMost(100));
   HostMemHandle* first = nullptr;
   HostMemHandle* second = nullptr;
@@ -211,7 +211,7 @@ TEST(Ceilings, MemoryBeyondTheMostIsRefusedUntilSomeIsGivenBack) {
   EXPECT_EQ(newBlock(100, &first), 0) << "the blocks that were left behind are gone";
 }
 
-TEST(Ceilings, CeilingsBelowZeroAreZero) {
+TEST(Limits, LimitsBelowZeroAreZero) {
   HostOptions options = layersAtMost(-1);
   options.mostKeys = -1;
   options.mostMemory = -1;

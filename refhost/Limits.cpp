@@ -1,4 +1,4 @@
-#include "refhost/Ceilings.h"
+#include "refhost/Limits.h"
 
 #include <algorithm>
 #include <string>
