@@ -153,7 +153,7 @@ TEST_P(GltfWriterTest, TimesAreTheScenesFramesWhereTheyCanBe) {
   }
 }
 
-TEST_P(GltfWriterTest, FramesThatNoTimeTellsApartAreRefused) {
+TEST_P(GltfWriterTest, FramesOfOneTimeAreRefused) {
   Composition composition = StillShot();
   composition.frames = (1u << 24) + 3;
   composition.layers[0].position[0] =
