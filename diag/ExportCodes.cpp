@@ -70,10 +70,10 @@ constexpr Entry kExportCodes[] = {
     {.code = Code::ExportTimesTooFine,
      .severity = Severity::Error,
      .symbol = "ExportTimesTooFine",
-     .sentence = "the frames are too many, or too short, for the times of glTF",
+     .sentence = "the frames are too many, or their numbers too large, for the times of {0}",
      .meaning =
-         "Times are numbers of 32 bits there: two frames would have the same. Nothing is written of the "
-         "scene.",
+         "Two frames would have the same time: glTF has times of 32 bits, USD of 64. Nothing is written "
+         "of the scene.",
      .example = "",
      .help = "Export fewer frames: --frames A:B."},
     {.code = Code::ExportZoomByExtension,

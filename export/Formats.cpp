@@ -20,6 +20,7 @@ constexpr std::array kFormats = {
            .sentence = "glTF 2.0 in one file: always metres, y up",
            .ownAxes = true,
            .write = WriteGlb},
+    Format{.name = "usda", .suffix = ".usda", .sentence = "USD as text, in doubles", .write = WriteUsda},
     Format{.name = "csv",
            .suffix = ".csv",
            .sentence = "a row a frame and layer; with --keys a row a key",

@@ -45,7 +45,7 @@ bool IsTaken(const GltfPlan& plan, diag::Collector* diagnostics) {
   const Composition& composition = plan.composition();
   if (!GltfTakesStill(composition, diagnostics)) return false;
   if (!plan.TimesRise()) {
-    diagnostics->Report(Code::ExportTimesTooFine, {});
+    diagnostics->Report(Code::ExportTimesTooFine, {}, {"glTF"});
     return false;
   }
   ReportCommonLosses(composition, "glTF", diagnostics);

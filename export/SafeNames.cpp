@@ -42,10 +42,13 @@ std::string SafeName(std::string_view name, std::string_view otherwise) {
 }
 
 std::string UniqueNames::Take(std::string_view name) {
-  std::string free(name);
-  for (std::size_t number = 2; !taken_.insert(Lowered(free)).second; ++number) {
-    free = std::string(name) + '_' + std::to_string(number);
-  }
+  const auto [own, isFree] = taken_.try_emplace(Lowered(name), 1);
+  if (isFree) return std::string(name);
+  std::string free;
+  // Of many of one name each begins where the one before ended.
+  do {
+    free = std::string(name) + '_' + std::to_string(++own->second);
+  } while (!taken_.try_emplace(Lowered(free), 1).second);
   return free;
 }
 

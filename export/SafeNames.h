@@ -3,7 +3,7 @@
 #pragma once
 
 #include <cstddef>
-#include <set>
+#include <map>
 #include <string>
 #include <string_view>
 
@@ -26,7 +26,7 @@ class UniqueNames {
   std::string Take(std::string_view name);
 
  private:
-  std::set<std::string> taken_;  // lowered
+  std::map<std::string, std::size_t> taken_;  // lowered, and the number that it got last
 };
 
 }  // namespace interchange

@@ -1,0 +1,16 @@
+// A reader of USD's text of the tests' own, for what a writer of cameras and transforms can write. Throws
+// Broken where the text is none, or breaks a rule.
+#pragma once
+
+#include <string_view>
+
+#include "tests/export/SeenScene.h"
+
+namespace exporttest {
+
+// Layers are the prims below the root, in the order of the text, with the names that their customData keep.
+// Times are time codes; places are in units of the stage.
+// `hostAxes`: each camera is a prim of its own below that of its layer, turned about x by half a turn.
+SeenScene ReadUsda(std::string_view text, bool hostAxes = false);
+
+}  // namespace exporttest
