@@ -18,12 +18,12 @@ class PrimNames {
 
   const std::string& root() const { return root_; }
   const std::string& layer(std::size_t index) const { return layers_[index]; }
-  // Of the camera below a layer, in the host's axes.
+  // Of the camera below a camera's layer.
   const std::string& lens(std::size_t index) const { return lenses_[index]; }
 
  private:
   std::vector<std::string> layers_;
-  std::vector<std::string> lenses_;  // empty in the scene's axes
+  std::vector<std::string> lenses_;  // empty for nulls
   std::string root_;
 };
 

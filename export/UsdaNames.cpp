@@ -39,8 +39,11 @@ PrimNames::PrimNames(const Composition& composition) {
     layers_.push_back(names.Take(PrimName(layer.name, layer.kind == LayerKind::Camera ? "camera" : "null")));
   }
   root_ = names.Take(PrimName(composition.name, "composition"));
-  if (composition.axes != Axes::Host) return;
-  for (const std::string& layer : layers_) lenses_.push_back(names.Take(layer + "_lens"));
+  lenses_.resize(layers_.size());
+  for (std::size_t index = 0; index < layers_.size(); ++index) {
+    if (composition.layers[index].kind == LayerKind::Camera)
+      lenses_[index] = names.Take(layers_[index] + "_lens");
+  }
 }
 
 std::string UsdaText(std::string_view bytes) {

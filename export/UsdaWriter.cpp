@@ -1,7 +1,8 @@
 // USD as text: a prim for each layer, nested as the layers are, with a time sample for each frame.
 //
-// Numbers are the doubles of the description. Times are the scene's own frame numbers. A camera looks along
-// -z here; in the host's axes it is a prim of its own, turned about x below that of its layer.
+// Numbers are the doubles of the description. Times are the scene's own frame numbers. A camera is a prim of
+// its own below that of its layer: there are readers that animate transforms alone. It looks along -z here;
+// in the host's axes it is turned about x for that.
 #include <string>
 #include <string_view>
 #include <vector>
@@ -100,17 +101,16 @@ class Usda {
 
   void BeginLayer(std::size_t index) {
     const Layer& layer = composition_.layers[index];
-    const bool camera = layer.kind == LayerKind::Camera;
-    const bool host = composition_.axes == Axes::Host;
-    BeginPrim(camera && !host ? "Camera" : "Xform", names_.layer(index), layer.name);
-    if (camera && !host) WriteLens(*layer.lens);
+    BeginPrim("Xform", names_.layer(index), layer.name);
     WriteTransform(layer);
-    if (!camera || !host) return;
+    if (layer.kind != LayerKind::Camera) return;
     const std::string& lens = names_.lens(index);
     BeginPrim("Camera", lens, lens);
     WriteLens(*layer.lens);
-    Line() << "double xformOp:rotateX = 180\n";
-    Line() << "uniform token[] xformOpOrder = [\"xformOp:rotateX\"]\n";
+    if (composition_.axes == Axes::Host) {
+      Line() << "double xformOp:rotateX = 180\n";
+      Line() << "uniform token[] xformOpOrder = [\"xformOp:rotateX\"]\n";
+    }
     EndPrim();
   }
 

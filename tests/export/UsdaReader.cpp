@@ -115,7 +115,7 @@ class Stage {
   };
   struct Open {
     std::optional<std::size_t> layer;  // none: the root
-    bool isLensOfParent = false;
+    bool isLens = false;
     std::set<std::string> attributes, children;
   };
 
@@ -179,14 +179,13 @@ class Stage {
     }
     words_.Need('{');
     Open open;
-    open.isLensOfParent = type == "Camera" && hostAxes_;
-    Ask(!open.isLensOfParent || parent, "a lens of a layer");
+    open.isLens = type == "Camera";
+    Ask(!open.isLens || parent, "a lens of a layer");
     open.layer = parent;
-    if (!root && !open.isLensOfParent) {
+    if (!root && !open.isLens) {
       SeenLayer layer;
       layer.name = name;
       layer.parent = parent;
-      layer.camera = type == "Camera";
       scene_.layers.push_back(layer);
       open.layer = scene_.layers.size() - 1;
     }
@@ -225,7 +224,7 @@ class Stage {
       order += words_.Takes(',') ? " " : "";
     }
     const std::string wanted =
-        open_.back().isLensOfParent ? "xformOp:rotateX" : "xformOp:translate xformOp:rotateXYZ xformOp:scale";
+        open_.back().isLens ? "xformOp:rotateX" : "xformOp:translate xformOp:rotateXYZ xformOp:scale";
     Ask(name == "xformOpOrder" && order == wanted, "order of operations: " + order);
   }
 
@@ -264,10 +263,10 @@ class Stage {
         Ask(std::isfinite(static_cast<float>(value[0])), "beyond a float");
     }
     SeenLayer& layer = scene_.layers[*open_.back().layer];
-    if (open_.back().isLensOfParent && name == "xformOp:rotateX") {
+    if (open_.back().isLens && name == "xformOp:rotateX") {
       Ask(track.values.size() == 1 && track.values[0][0] == 180, "half a turn");
     } else if (name.starts_with("xformOp:")) {
-      Ask(!open_.back().isLensOfParent, "operations of a lens");
+      Ask(!open_.back().isLens, "operations of a lens");
       Track& own = name == "xformOp:translate"   ? layer.position
                    : name == "xformOp:rotateXYZ" ? layer.rotation
                                                  : layer.scale;

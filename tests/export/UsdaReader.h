@@ -8,9 +8,9 @@
 
 namespace exporttest {
 
-// Layers are the prims below the root, in the order of the text, with the names that their customData keep.
-// Times are time codes; places are in units of the stage.
-// `hostAxes`: each camera is a prim of its own below that of its layer, turned about x by half a turn.
+// Layers are the prims that transform, in the order of the text, with the names that their customData keep;
+// a camera is a prim below its layer's, in the host's axes turned about x by half a turn. Times are time
+// codes; places are in units of the stage.
 SeenScene ReadUsda(std::string_view text, bool hostAxes = false);
 
 }  // namespace exporttest
