@@ -72,13 +72,14 @@ def _pixel_limit(composition, camera, frame, depth, precision, usual):
 
 
 def compare(composition, measured, names, to_program, precision,
-            scale_of_picture=(1.0, 1.0)):
+            scale_of_picture=(1.0, 1.0), lens_at=None):
     """`names` maps a layer's number to the program's name for it. `measured`
     is {frame: {name: {"world": rows, "projection": rows or None}}}.
 
     `scale_of_picture` is the part of the composition's width and height that
     the program's picture shows: of two nested compositions the outer one is
-    up to a pixel narrower or wider.
+    up to a pixel narrower or wider. `lens_at` is a frame whose lens a program
+    shows at all frames.
     """
     usual = LIMIT_SINGLE if precision == "single" else LIMIT_DOUBLE
     result = Result()
@@ -96,7 +97,7 @@ def compare(composition, measured, names, to_program, precision,
             if layer.camera:
                 _compare_pixels(composition, layer, frame, found, to_program,
                                 precision, usual, scale_of_picture,
-                                points[layer.number], result)
+                                points[layer.number], result, lens_at)
     if composition.cameras() and result.pixels == 0:
         result.fail("no known point was in front of a camera")
     return result
@@ -126,11 +127,13 @@ def _measures(composition, wanted, reach):
 
 
 def _compare_pixels(composition, camera, frame, found, to_program, precision,
-                    usual, scale_of_picture, points, result):
+                    usual, scale_of_picture, points, result, lens_at):
     half = (composition.width * scale_of_picture[0] / 2,
             composition.height * scale_of_picture[1] / 2)
     reach = composition.reach(camera, frame)
     shown = composition.view(camera, frame)
+    if lens_at is not None:
+        shown.zoom = composition.zoom(camera, lens_at)
     view = inverse_of_rigid(found["world"])
     for point in points:
         wanted = shown.pixel(point)
