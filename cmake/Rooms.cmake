@@ -1,0 +1,28 @@
+# How the libraries of the product are made.
+
+# add_room(NAME KIND SOURCES ... [LINKS ...]): one library of the house. KIND is STATIC, SHARED or MODULE.
+function(add_room name kind)
+  cmake_parse_arguments(ROOM "" "" "SOURCES;LINKS" ${ARGN})
+  add_library(${name} ${kind} ${ROOM_SOURCES})
+  target_link_libraries(${name} PUBLIC ${ROOM_LINKS} PRIVATE $<BUILD_INTERFACE:mayascene_options>)
+  target_include_directories(${name} PUBLIC ${PROJECT_SOURCE_DIR})
+  if(MAYASCENE_COVERAGE AND name IN_LIST MAYASCENE_MEASURED_ROOMS)
+    # Every source has copies of its own of inline functions and templates: of shared ones the linker keeps a single
+    # copy, and the others would read as never run. The compiler warns of each.
+    target_compile_options(${name} PRIVATE --coverage -fno-weak -w)
+  endif()
+endfunction()
+
+# precompile_headers(NAME [HEADER...]): has the sources of a library begin with these headers, compiled once; with those
+# of refhost where none are named. What a source uses it includes nevertheless: the fuzz preset and scripts/determinism
+# build without them.
+function(precompile_headers name)
+  if(ARGN)
+    target_precompile_headers(${name} PRIVATE ${ARGN})
+  else()
+    target_precompile_headers(${name} REUSE_FROM refhost)
+  endif()
+  # GCC 12 forgets there that the standard library is not ours, and sees overflows in its strings that cannot happen.
+  set(mistaken -Wno-array-bounds -Wno-stringop-overflow -Wno-stringop-overread)
+  target_compile_options(${name} PRIVATE "$<$<COMPILE_LANG_AND_ID:CXX,GNU>:${mistaken}>")
+endfunction()
