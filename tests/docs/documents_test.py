@@ -71,6 +71,12 @@ class Documents(unittest.TestCase):
             self.assertIsNone(re.search(home, text), name)
             self.assertNotIn(str(ROOT), text, name)
 
+    def test_dates_stand_in_measurements_alone(self):
+        for name in DOCUMENTS:
+            if not name.startswith("docs/measurements/"):
+                text = LINK.sub("", read(name))
+                self.assertIsNone(re.search(r"\b20\d\d-\d\d-\d\d\b", text), name)
+
     def test_no_document_has_lines_that_end_in_blanks_or_tabs(self):
         for name in DOCUMENTS:
             for line in read(name).splitlines():
