@@ -6,8 +6,8 @@ namespace interchange {
 
 void AppendNumber(std::string* text, double number) {
   char digits[32];
-  if (number == 0.0) number = 0.0;  // without a sign
-  text->append(digits, std::to_chars(digits, digits + sizeof digits, number).ptr);
+  const double unsignedZero = number == 0.0 ? 0.0 : number;
+  text->append(digits, std::to_chars(digits, digits + sizeof digits, unsignedZero).ptr);
 }
 
 void TextWriter::Flush() {

@@ -3,6 +3,7 @@
 // Numbers are the doubles of the description. Times are the scene's own frame numbers. A camera is a prim of
 // its own below that of its layer: there are readers that animate transforms alone. It looks along -z here;
 // in the host's axes it is turned about x for that.
+#include <algorithm>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -71,7 +72,7 @@ class Usda {
   // Deep ones are not moved in further: the text would grow with the square of the depth.
   TextWriter& Line() {
     constexpr std::size_t kDeepest = 16;
-    for (std::size_t i = 0; i < (depth_ < kDeepest ? depth_ : kDeepest); ++i) out_ << "    ";
+    for (std::size_t level = std::min(depth_, kDeepest); level > 0; --level) out_ << "    ";
     return out_;
   }
 
