@@ -4,6 +4,7 @@
 
 #include "bake/Baker.h"
 #include "diag/Diagnostic.h"
+#include "scene/SpecialNames.h"
 
 namespace bake {
 namespace {
@@ -132,7 +133,7 @@ void Baker::WriteLocator(const Item& item, Writer* writer) {
   const std::string parent = WriteTransform(item, writer);
   const std::string_view own = scene_.node(item.shape).name;
   // A mark beyond what is kept of a long name would be lost.
-  const bool marked = IsMarked(own.substr(0, UniqueNames::kLongest / 2));
+  const bool marked = scene::IsMarked(own.substr(0, UniqueNames::kLongest / 2));
   const std::string name = writer->TakeName(marked ? std::string(own) : std::string(kMark).append(own));
   writer->Locator(name, parent, path);
 }

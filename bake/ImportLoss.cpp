@@ -13,6 +13,7 @@
 #include "motion/Evaluator.h"
 #include "motion/KeptBelow.h"
 #include "motion/SceneCamera.h"
+#include "scene/Attributes.h"
 
 namespace bake {
 namespace {
@@ -100,7 +101,7 @@ class LossSearch {
   void LookAtPlace(NodeId node, std::size_t keys, bool aimed) {
     std::optional<KeyedChannel> first;
     std::vector<KeyedChannel> single;
-    for (const std::string_view attribute : kPlaceChannels) {
+    for (const std::string_view attribute : scene::kPlaceChannels) {
       if (found_) return;
       auto channel = FindKeys(scene_, node, attribute, measures_);
       if (!channel) {

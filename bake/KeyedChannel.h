@@ -1,7 +1,6 @@
 // A channel that a curve drives directly, as an import finds it.
 #pragma once
 
-#include <array>
 #include <cstddef>
 #include <optional>
 #include <string>
@@ -12,9 +11,6 @@
 #include "scene/Scene.h"
 
 namespace bake {
-
-constexpr std::array<std::string_view, 9> kPlaceChannels = {
-    "translateX", "translateY", "translateZ", "rotateX", "rotateY", "rotateZ", "scaleX", "scaleY", "scaleZ"};
 
 struct KeyedChannel {
   std::string_view attribute;  // of the node that is driven

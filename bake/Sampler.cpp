@@ -6,6 +6,7 @@
 
 #include "bake/PlainForm.h"
 #include "motion/Transform.h"
+#include "scene/Attributes.h"
 
 namespace bake {
 namespace {
@@ -15,14 +16,14 @@ constexpr double kDegrees = 57.29577951308232;  // in a radian
 // Channels that come out of a matrix are level where they differ by rounding alone.
 constexpr double kMatrixRounding = 1e-12;
 
-constexpr std::string_view kChannelNames[kSlotCount] = {
-    "translateX", "translateY", "translateZ", "rotateX", "rotateY", "rotateZ", "scaleX", "scaleY", "scaleZ"};
+static_assert(scene::kPlaceChannels.size() == kSlotCount);  // a slot is a place in this list
 
 bool IsRotation(std::size_t slot) { return slot >= kRotateX && slot <= kRotateZ; }
 
 // Whether a constraint gives one of the angles. It knows no turns: they jump where it passes half a turn.
 bool IsTurnedByConstraint(const scene::Scene& scene, scene::NodeId node) {
-  return std::any_of(kChannelNames + kRotateX, kChannelNames + kRotateZ + 1, [&](std::string_view channel) {
+  const auto first = scene::kPlaceChannels.begin();
+  return std::any_of(first + kRotateX, first + kRotateZ + 1, [&](std::string_view channel) {
     const auto driver = scene.SourceOf(scene.PlugOf(node, channel));
     return driver && scene.node(driver->plug.node).type.ends_with("Constraint");
   });
@@ -50,7 +51,7 @@ std::size_t Sampler::AddLocal(scene::NodeId node) {
   Source source;
   if (IsPlain(evaluator_->scene(), node)) {
     for (std::size_t slot = 0; slot < kSlotCount; ++slot) {
-      source.numbers[slot] = evaluator_->Number(node, kChannelNames[slot]);
+      source.numbers[slot] = evaluator_->Number(node, scene::kPlaceChannels[slot]);
     }
     source.turned = IsTurnedByConstraint(evaluator_->scene(), node);
   } else {

@@ -4,22 +4,18 @@
 #include <array>
 #include <string>
 
+#include "scene/SpecialNames.h"
+
 namespace bake {
 namespace {
 
 using scene::NodeId;
 
 constexpr std::array<std::string_view, 2> kCameraTypes = {"camera", "stereoRigCamera"};
-constexpr std::array<std::string_view, 4> kStartupCameras = {"perspShape", "topShape", "frontShape",
-                                                             "sideShape"};
-constexpr std::array<std::string_view, 3> kMarks = {"null", "NULL", "Null"};
 
-template <typename List>
-bool IsOneOf(std::string_view word, const List& list) {
-  return std::find(list.begin(), list.end(), word) != list.end();
+bool IsCamera(std::string_view type) {
+  return std::find(kCameraTypes.begin(), kCameraTypes.end(), type) != kCameraTypes.end();
 }
-
-bool IsStartupCamera(const scene::Node& node) { return node.shared && IsOneOf(node.name, kStartupCameras); }
 
 // A name of the command line: a node's own name, or its whole path. The topmost node of a path that begins
 // without a "|" is from elsewhere.
@@ -42,7 +38,8 @@ bool IsWanted(const scene::Scene& scene, NodeId camera, const Options& options, 
 }
 
 void SelectLocator(NodeId id, std::string_view name, const Options& options, Selection* selection) {
-  if (options.locators == Locators::kAll || (options.locators == Locators::kMarked && IsMarked(name))) {
+  if (options.locators == Locators::kAll ||
+      (options.locators == Locators::kMarked && scene::IsMarked(name))) {
     selection->locators.push_back(id);
   } else if (options.locators == Locators::kMarked) {
     ++selection->locatorsLeftOut;
@@ -53,13 +50,8 @@ void SelectLocator(NodeId id, std::string_view name, const Options& options, Sel
 
 bool IsSetUp(const scene::Scene& scene, NodeId id) {
   const scene::Node& node = scene.node(id);
-  if (node.origin != scene::Origin::Created || !IsOneOf(node.type, kCameraTypes)) return false;
-  return !IsStartupCamera(node) && scene.Number(id, "orthographic").value_or(0.0) == 0.0;
-}
-
-bool IsMarked(std::string_view name) {
-  return std::any_of(kMarks.begin(), kMarks.end(),
-                     [name](std::string_view mark) { return name.find(mark) != std::string_view::npos; });
+  if (node.origin != scene::Origin::Created || !IsCamera(node.type)) return false;
+  return !scene::IsStartupCamera(node) && scene.Number(id, "orthographic").value_or(0.0) == 0.0;
 }
 
 Selection Select(const scene::Scene& scene, const Options& options, diag::Collector* diagnostics) {

@@ -22,9 +22,6 @@ struct Selection {
 // with.
 bool IsSetUp(const scene::Scene& scene, scene::NodeId id);
 
-// Whether the importer takes a locator of the name.
-bool IsMarked(std::string_view name);
-
 // The cameras that somebody set up, and locators. Reports each name of the options that fits none of them.
 Selection Select(const scene::Scene& scene, const Options& options, diag::Collector* diagnostics);
 

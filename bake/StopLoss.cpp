@@ -4,6 +4,7 @@
 
 #include "bake/KeyedChannel.h"
 #include "bake/Loss.h"
+#include "scene/Attributes.h"
 
 namespace bake {
 namespace {
@@ -87,7 +88,7 @@ NodeId TransformOf(const scene::Scene& scene, std::string_view layer) {
 // A node with channels of different numbers of keys.
 std::optional<Loss> UnequalKeys(const scene::Scene& scene, NodeId node, const motion::Measures& measures) {
   std::optional<KeyedChannel> first;
-  for (const std::string_view name : kPlaceChannels) {
+  for (const std::string_view name : scene::kPlaceChannels) {
     auto channel = FindKeys(scene, node, name, measures);
     if (!channel || channel->curve.keys.size() < 2) continue;
     if (!first) {

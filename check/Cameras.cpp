@@ -1,7 +1,6 @@
 #include "check/Cameras.h"
 
 #include <algorithm>
-#include <array>
 #include <cstddef>
 
 namespace check {
@@ -9,9 +8,6 @@ namespace {
 
 // With its quotes a name has fewer bytes than this.
 constexpr std::size_t kQuotedName = 255;
-
-constexpr std::array<std::string_view, 4> kStartupCameras = {"perspShape", "topShape", "frontShape",
-                                                             "sideShape"};
 
 char Lower(char c) { return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c; }
 
@@ -40,11 +36,6 @@ std::string_view ImportName(const scene::Scene& scene, const scene::Node& node) 
   if (node.origin != scene::Origin::Created || offset == 0 || offset + length >= text.size()) return {};
   if (text[offset - 1] != '"' || text[offset + length] != '"' || length + 2 >= kQuotedName) return {};
   return text.substr(offset, length);
-}
-
-bool IsStartupCamera(const scene::Node& node) {
-  return node.shared &&
-         std::find(kStartupCameras.begin(), kStartupCameras.end(), node.name) != kStartupCameras.end();
 }
 
 std::vector<Camera> FindCameras(const scene::Scene& scene, const CameOver& cameOver) {

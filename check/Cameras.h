@@ -27,7 +27,4 @@ std::string_view ImportName(const scene::Scene& scene, const scene::Node& node);
 // Whether two names are one for the importer: it does not look at case.
 bool SameName(std::string_view a, std::string_view b);
 
-// A camera that every scene begins with.
-bool IsStartupCamera(const scene::Node& node);
-
 }  // namespace check

@@ -1,15 +1,11 @@
 #include "check/Curves.h"
 
-#include <array>
 #include <cmath>
 
 #include "check/Cameras.h"
 
 namespace check {
 namespace {
-
-constexpr std::array<std::string_view, 9> kPlaceChannels = {
-    "translateX", "translateY", "translateZ", "rotateX", "rotateY", "rotateZ", "scaleX", "scaleY", "scaleZ"};
 
 void TakeInTime(double time, KeyedChannel* channel) {
   if (channel->keys == 0) channel->first = time;
@@ -34,8 +30,6 @@ void ReadKeys(const scene::Scene& scene, KeyedChannel* channel) {
 }
 
 }  // namespace
-
-std::span<const std::string_view> PlaceChannels() { return kPlaceChannels; }
 
 bool IsImportedCurve(std::string_view type) {
   return SameName(type, "animCurveTL") || SameName(type, "animCurveTA") || SameName(type, "animCurveTU");

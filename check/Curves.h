@@ -10,9 +10,6 @@
 
 namespace check {
 
-// The nine channels that the importer takes keys of, in its order.
-std::span<const std::string_view> PlaceChannels();
-
 struct KeyedChannel {
   std::string_view channel;
   scene::NodeId curve = scene::kNoNode;

@@ -3,6 +3,7 @@
 #include <algorithm>
 
 #include "check/HeadInternal.h"
+#include "scene/SpecialNames.h"
 
 namespace check {
 namespace {
@@ -52,7 +53,7 @@ Head ReadHead(const scene::Scene& scene, const scene::Settings& settings, const 
   head.pixelAspect = GivenBy(settings.deviceAspect, lines);
   head.pixelAspect.value = settings.pixelAspect();
   for (const Camera& camera : cameras) {
-    if (IsStartupCamera(scene.node(camera.shape)) && camera.layer == nullptr) continue;
+    if (scene::IsStartupCamera(scene.node(camera.shape)) && camera.layer == nullptr) continue;
     if (head.cameras.size() == Head::kMostCameras) {
       ++head.camerasNotShown;
     } else {

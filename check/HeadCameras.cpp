@@ -11,12 +11,11 @@
 #include "check/PathText.h"
 #include "motion/Camera.h"
 #include "motion/SceneCamera.h"
+#include "scene/Attributes.h"
 
 namespace check {
 namespace {
 
-constexpr std::array<std::string_view, 9> kPlaceChannels = {
-    "translateX", "translateY", "translateZ", "rotateX", "rotateY", "rotateZ", "scaleX", "scaleY", "scaleZ"};
 constexpr std::array<std::string_view, 4> kLensChannels = {"focalLength", "horizontalFilmAperture",
                                                            "verticalFilmAperture", "filmFit"};
 
@@ -82,7 +81,8 @@ void DescribeChain(const scene::Scene& scene, const Camera& camera, diag::Lines&
       head->chainGoesOn = true;
       return;
     }
-    head->chain.push_back({std::string(scene.node(id).name), DrivesOf(scene, id, kPlaceChannels, lines)});
+    head->chain.push_back(
+        {std::string(scene.node(id).name), DrivesOf(scene, id, scene::kPlaceChannels, lines)});
   }
 }
 

@@ -4,6 +4,7 @@
 
 #include "check/Curves.h"
 #include "check/RulesInternal.h"
+#include "scene/Attributes.h"
 
 namespace check {
 namespace {
@@ -14,7 +15,7 @@ using scene::NodeId;
 bool ReportUnequal(const Subject& subject, NodeId node) {
   const KeyedChannel* first = nullptr;
   bool reported = false;
-  const std::vector<KeyedChannel> channels = FindKeyedChannels(subject.scene, node, PlaceChannels());
+  const std::vector<KeyedChannel> channels = FindKeyedChannels(subject.scene, node, scene::kPlaceChannels);
   for (const KeyedChannel& channel : channels) {
     if (channel.keys < 2) continue;
     if (first == nullptr) first = &channel;

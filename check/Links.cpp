@@ -1,15 +1,8 @@
 #include "check/Links.h"
 
-#include <algorithm>
-#include <array>
+#include "scene/SpecialNames.h"
 
 namespace check {
-
-bool IsMarked(std::string_view name) {
-  constexpr std::array<std::string_view, 3> kMarks = {"null", "NULL", "Null"};
-  return std::any_of(kMarks.begin(), kMarks.end(),
-                     [name](std::string_view mark) { return name.find(mark) != std::string_view::npos; });
-}
 
 std::vector<Link> FindLinks(const scene::Scene& scene, const std::vector<Camera>& cameras) {
   std::vector<Link> links;
@@ -29,7 +22,7 @@ std::vector<Link> FindLinks(const scene::Scene& scene, const std::vector<Camera>
   }
   for (scene::NodeId id = 0; id < scene.nodes().size(); ++id) {
     const scene::Node& node = scene.node(id);
-    if (SameName(node.type, "locator") && IsMarked(ImportName(scene, node))) add(id, false);
+    if (SameName(node.type, "locator") && scene::IsMarked(ImportName(scene, node))) add(id, false);
   }
   return links;
 }

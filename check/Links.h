@@ -18,7 +18,4 @@ struct Link {
 // Those of the cameras and locators that the importer takes, each once: from the shape's own upwards.
 std::vector<Link> FindLinks(const scene::Scene& scene, const std::vector<Camera>& cameras);
 
-// Whether the importer makes a null of a locator of the name.
-bool IsMarked(std::string_view name);
-
 }  // namespace check

@@ -2,6 +2,7 @@
 #include <string>
 
 #include "check/RulesInternal.h"
+#include "scene/SpecialNames.h"
 
 namespace check {
 namespace {
@@ -43,7 +44,7 @@ void ReportCameras(const Subject& subject) {
     const scene::Node& node = subject.scene.node(camera.shape);
     if (camera.layer != nullptr || (camera.taken && subject.cameOver.stop != Stop::None)) {
       ReportAttributes(subject, camera.shape);
-    } else if (IsStartupCamera(node)) {
+    } else if (scene::IsStartupCamera(node)) {
       if (startup++ == 0) firstStartup = &node;
     } else if (subject.scene.Number(camera.shape, "orthographic").value_or(0.0) != 0.0) {
       subject.diagnostics.Report(Code::OrthographicCamera, node.place, {node.name});
@@ -60,7 +61,7 @@ void ReportLocators(const Subject& subject) {
   const scene::Node* first = nullptr;
   for (const scene::Node& node : subject.scene.nodes()) {
     if (node.origin != scene::Origin::Created || !SameName(node.type, "locator")) continue;
-    if (IsMarked(ImportName(subject.scene, node))) continue;
+    if (scene::IsMarked(ImportName(subject.scene, node))) continue;
     if (unmarked++ == 0) first = &node;
   }
   if (unmarked != 0) {

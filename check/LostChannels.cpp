@@ -9,6 +9,7 @@
 
 #include "check/Curves.h"
 #include "check/RulesInternal.h"
+#include "scene/Attributes.h"
 
 namespace check {
 namespace {
@@ -63,7 +64,7 @@ void Add(std::string_view channel, std::string* channels) {
 void ReportDrivers(const Subject& subject, const Link& link) {
   const scene::Scene& scene = subject.scene;
   std::map<NodeId, Driven> drivers;
-  for (const std::string_view channel : PlaceChannels()) {
+  for (const std::string_view channel : scene::kPlaceChannels) {
     const auto driver = scene.SourceOf(scene.PlugOf(link.node, channel));
     if (!driver) continue;
     const std::string_view type = scene.node(driver->plug.node).type;
@@ -91,7 +92,7 @@ void ReportDrivers(const Subject& subject, const Link& link) {
 void ReportOneKey(const Subject& subject, const Link& link) {
   std::string channels;
   diag::Range place;
-  for (const KeyedChannel& keyed : FindKeyedChannels(subject.scene, link.node, PlaceChannels())) {
+  for (const KeyedChannel& keyed : FindKeyedChannels(subject.scene, link.node, scene::kPlaceChannels)) {
     if (keyed.keys > 1) return;
     const double stored = subject.scene.Number(link.node, keyed.channel).value_or(0.0);
     if (keyed.keys == 0 || std::fabs(stored - keyed.firstValue) <= 1e-9 * (1.0 + std::fabs(stored))) continue;

@@ -13,6 +13,7 @@
 #include "check/Times.h"
 #include "motion/Curve.h"
 #include "motion/CurveReader.h"
+#include "scene/Attributes.h"
 
 namespace check {
 namespace {
@@ -114,7 +115,7 @@ std::vector<NodeKeys> ChainKeys(const Subject& subject, const Camera& camera) {
   std::size_t length = 0;
   for (NodeId id = camera.transform; id != scene::kNoNode && ++length <= kLongestChain;
        id = subject.scene.node(id).parent) {
-    if (auto keys = KeysOf(subject.scene, id, PlaceChannels(), 2)) chain.push_back(std::move(*keys));
+    if (auto keys = KeysOf(subject.scene, id, scene::kPlaceChannels, 2)) chain.push_back(std::move(*keys));
   }
   return chain;
 }
@@ -160,7 +161,8 @@ std::optional<double> LastKey(const Subject& subject, const Camera& camera) {
 
 void ReportTimes(const Subject& subject) {
   for (const Link& link : subject.links) {
-    if (const auto keys = KeysOf(subject.scene, link.node, PlaceChannels(), 2)) ReportKeys(subject, *keys);
+    if (const auto keys = KeysOf(subject.scene, link.node, scene::kPlaceChannels, 2))
+      ReportKeys(subject, *keys);
   }
   for (const Camera& camera : subject.cameras) {
     if (!camera.taken) continue;

@@ -1,6 +1,7 @@
 // What is known of node types and their attributes: long and short names, compounds, defaults.
 #pragma once
 
+#include <array>
 #include <cstdint>
 #include <optional>
 #include <string>
@@ -19,6 +20,10 @@ struct AttributeInfo {
   int component = 0;                             // which, from 0
   std::vector<const AttributeInfo*> components;  // of a compound, in order
 };
+
+// The channels that give a transform its place, in the order in which the importer takes keys of them.
+inline constexpr std::array<std::string_view, 9> kPlaceChannels = {
+    "translateX", "translateY", "translateZ", "rotateX", "rotateY", "rotateZ", "scaleX", "scaleY", "scaleZ"};
 
 // The attribute by its long or short name; null where the type has none of the name that is known. Of a type
 // that is not known, what all transforms have: it may be a transform that a plug-in brings.

@@ -1,0 +1,16 @@
+// Names that have a meaning of their own for an import and for a bake.
+#pragma once
+
+#include <string_view>
+
+#include "scene/Scene.h"
+
+namespace scene {
+
+// A camera that every scene begins with.
+bool IsStartupCamera(const Node& node);
+
+// Whether the importer makes a null of a locator of the name.
+bool IsMarked(std::string_view name);
+
+}  // namespace scene
