@@ -34,7 +34,7 @@ class FirstKeys {
   void TakeTransform(scene::NodeId node) {
     std::optional<double> first;
     bool animated = false;
-    for (const std::string_view attribute : kPlaceChannels) {
+    for (const std::string_view attribute : scene::kPlaceChannels) {
       const auto channel = FindKeys(scene_, node, attribute, measures_);
       if (!channel) continue;
       if (!first) first = channel->curve.keys.front().time;

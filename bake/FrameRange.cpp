@@ -1,12 +1,12 @@
 #include "bake/FrameRange.h"
 
 #include <algorithm>
-#include <charconv>
 #include <cmath>
 #include <string>
 #include <string_view>
 
 #include "motion/CurveReader.h"
+#include "text/Numbers.h"
 
 namespace bake {
 namespace {
@@ -31,17 +31,13 @@ struct Ends {
   }
 };
 
-std::string TextOf(double number) {
-  char text[32];
-  return {text, std::to_chars(text, text + sizeof text, number).ptr};
-}
-
 std::optional<FrameRange> RangeOf(double first, double last, double step, bool bounded,
                                   diag::Collector* diagnostics) {
   const double count = std::floor((last - first) / step + kFrameTolerance) + 1.0;
   const double most = bounded ? static_cast<double>(kMostFrames) : kMostTimes;
   if (!(count <= most) || !((count - 1.0) * step <= kMostTimes)) {
-    diagnostics->Report(diag::Code::TooManyFrames, {}, {TextOf(first), TextOf(last)});
+    diagnostics->Report(diag::Code::TooManyFrames, {},
+                        {text::ShortestNumber(first), text::ShortestNumber(last)});
     return std::nullopt;
   }
   return FrameRange{first, step, static_cast<std::size_t>(count)};

@@ -8,13 +8,15 @@
 #include <string_view>
 
 #include "check/HeadInternal.h"
-#include "check/PathText.h"
 #include "motion/Camera.h"
 #include "motion/SceneCamera.h"
 #include "scene/Attributes.h"
 
 namespace check {
 namespace {
+
+// A chain can be as long as its file, and each of its cameras says its path.
+constexpr std::size_t kLongestPath = 1000;
 
 constexpr std::array<std::string_view, 4> kLensChannels = {"focalLength", "horizontalFilmAperture",
                                                            "verticalFilmAperture", "filmFit"};
@@ -101,7 +103,7 @@ void DescribeLayer(const CameOver& cameOver, const CameOverLayer& layer, CameraH
 CameraHead DescribeCamera(const scene::Scene& scene, const scene::Settings& settings,
                           const CameOver& cameOver, const Camera& camera, diag::Lines& lines) {
   CameraHead head;
-  head.path = PathText(scene, camera.shape);
+  head.path = scene.PathOf(camera.shape, kLongestPath);
   head.where = WhereIs(scene.node(camera.shape).place, lines);
   head.focalLength = NumberOf(scene, camera.shape, "focalLength", lines);
   head.horizontalAperture = NumberOf(scene, camera.shape, "horizontalFilmAperture", lines);

@@ -3,10 +3,10 @@
 #include <cmath>
 #include <string>
 
-#include "check/NumberText.h"
 #include "check/RulesInternal.h"
 #include "motion/Camera.h"
 #include "motion/SceneCamera.h"
+#include "text/Numbers.h"
 
 namespace check {
 namespace {
@@ -66,7 +66,7 @@ class Lens {
 
   void ReportFactor(std::string_view attribute, Code code) {
     if (const auto place = Differs({attribute, 1.0})) {
-      subject_.diagnostics.Report(code, *place, {name(), NumberText(Number(attribute, 1.0))});
+      subject_.diagnostics.Report(code, *place, {name(), text::RoundedNumber(Number(attribute, 1.0))});
     }
   }
 

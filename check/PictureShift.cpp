@@ -6,11 +6,11 @@
 #include <string>
 
 #include "check/ImportedPicture.h"
-#include "check/NumberText.h"
 #include "check/RulesInternal.h"
 #include "check/Times.h"
 #include "motion/Evaluator.h"
 #include "motion/SceneCamera.h"
+#include "text/Numbers.h"
 
 namespace check {
 namespace {
@@ -129,9 +129,10 @@ class Shift {
     if (largest_ < kSmallestShift) return;
     const double whole = std::hypot(picture_.width, picture_.height);
     const std::string way =
-        largest_ > whole ? "more than the whole picture" : NumberText(largest_) + " pixels";
+        largest_ > whole ? "more than the whole picture" : text::RoundedNumber(largest_) + " pixels";
     const scene::Node& node = subject_.scene.node(camera_.shape);
-    subject_.diagnostics.Report(diag::Code::PictureShifts, node.place, {node.name, way, NumberText(frame_)});
+    subject_.diagnostics.Report(diag::Code::PictureShifts, node.place,
+                                {node.name, way, text::RoundedNumber(frame_)});
   }
 
   const Subject& subject_;

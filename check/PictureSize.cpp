@@ -3,8 +3,8 @@
 #include <optional>
 #include <string>
 
-#include "check/NumberText.h"
 #include "check/RulesInternal.h"
+#include "text/Numbers.h"
 
 namespace check {
 namespace {
@@ -21,14 +21,14 @@ void Compare(const Subject& subject, const char* what, double made, const scene:
              double tolerance) {
   if (std::fabs(made - meant.value) <= tolerance) return;
   subject.diagnostics.Report(Code::PictureSizeAssumed, PlaceOr(meant.place, subject.scene),
-                             {what, NumberText(made), NumberText(meant.value)});
+                             {what, text::RoundedNumber(made), text::RoundedNumber(meant.value)});
 }
 
 void CompareRate(const Subject& subject, double made) {
   const double meant = subject.settings.rate.value.perSecond();
   if (std::fabs(made - meant) <= 1e-3 * meant) return;
   subject.diagnostics.Report(Code::RateDiffers, subject.settings.rate.place.value_or(diag::Range{}),
-                             {NumberText(meant), NumberText(made)});
+                             {text::RoundedNumber(meant), text::RoundedNumber(made)});
 }
 
 }  // namespace

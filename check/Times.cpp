@@ -8,12 +8,12 @@
 #include <vector>
 
 #include "check/Curves.h"
-#include "check/NumberText.h"
 #include "check/RulesInternal.h"
 #include "check/Times.h"
 #include "motion/Curve.h"
 #include "motion/CurveReader.h"
 #include "scene/Attributes.h"
+#include "text/Numbers.h"
 
 namespace check {
 namespace {
@@ -86,7 +86,7 @@ bool TurnsFar(const Subject& subject, const KeyedChannel& channel) {
 void ReportKeys(const Subject& subject, const NodeKeys& keys) {
   const std::string_view name = subject.scene.node(keys.node).name;
   const auto say = [&](Code code, const KeyedChannel& channel, double number) {
-    subject.diagnostics.Report(code, channel.place, {name, NumberText(number)});
+    subject.diagnostics.Report(code, channel.place, {name, text::RoundedNumber(number)});
   };
   const auto first = [&](const auto& holds) {
     const auto found = std::find_if(keys.channels.begin(), keys.channels.end(), holds);
@@ -96,8 +96,9 @@ void ReportKeys(const Subject& subject, const NodeKeys& keys) {
         return channel.keys > 1 && !channel.whole &&
                (IsCurved(subject, channel) || TurnsFar(subject, channel));
       })) {
-    subject.diagnostics.Report(Code::KeysAreNoBake, bad->place,
-                               {name, std::to_string(bad->keys), NumberText(bad->last - bad->first + 1.0)});
+    subject.diagnostics.Report(
+        Code::KeysAreNoBake, bad->place,
+        {name, std::to_string(bad->keys), text::RoundedNumber(bad->last - bad->first + 1.0)});
   }
   if (const auto* const bad = first([](const KeyedChannel& one) { return one.keys != 0 && one.first < 0.0; }))
     say(Code::NegativeFrames, *bad, bad->first);
@@ -127,9 +128,10 @@ void ReportStarts(const Subject& subject, const Camera& camera) {
       chain.begin(), chain.end(), [](const NodeKeys& a, const NodeKeys& b) { return a.first < b.first; });
   for (const NodeKeys& one : chain) {
     if (one.first - earliest->first < 1e-3) continue;
-    subject.diagnostics.Report(Code::KeysStartApart, one.channels.front().place,
-                               {subject.scene.node(one.node).name, NumberText(one.first),
-                                subject.scene.node(earliest->node).name, NumberText(earliest->first)});
+    subject.diagnostics.Report(
+        Code::KeysStartApart, one.channels.front().place,
+        {subject.scene.node(one.node).name, text::RoundedNumber(one.first),
+         subject.scene.node(earliest->node).name, text::RoundedNumber(earliest->first)});
   }
 }
 

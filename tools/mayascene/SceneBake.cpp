@@ -1,13 +1,13 @@
 #include "tools/mayascene/SceneBake.h"
 
 #include <algorithm>
-#include <charconv>
 #include <filesystem>
 #include <map>
-#include <string_view>
 
 #include "diag/Codes.h"
 #include "scene/Scene.h"
+#include "text/Numbers.h"
+#include "tools/mayascene/SceneFile.h"
 #include "tools/mayascene/SceneNumbers.h"
 #include "tools/mayascene/SceneText.h"
 #include "tools/mayascene/Version.h"
@@ -17,23 +17,11 @@ namespace {
 
 constexpr int kShownPerCode = 3;
 
-bool beginsAsScene(std::string_view text) {
-  constexpr std::string_view kHeader = "//maya";
-  return text.size() >= kHeader.size() &&
-         std::equal(kHeader.begin(), kHeader.end(), text.begin(), [](char wanted, char found) {
-           return wanted == (found >= 'A' && found <= 'Z' ? static_cast<char>(found - 'A' + 'a') : found);
-         });
-}
-
-std::string textOf(double number) {
-  char text[32];
-  return {text, std::to_chars(text, text + sizeof text, number).ptr};
-}
-
 std::string framesOf(const bake::FrameRange& frames) {
-  if (frames.count == 1) return "frame " + textOf(frames.first);
-  std::string text = "frames " + textOf(frames.first) + " to " + textOf(frames.Last());
-  if (frames.step != 1.0) text += " by " + textOf(frames.step);
+  if (frames.count == 1) return "frame " + text::ShortestNumber(frames.first);
+  std::string text =
+      "frames " + text::ShortestNumber(frames.first) + " to " + text::ShortestNumber(frames.Last());
+  if (frames.step != 1.0) text += " by " + text::ShortestNumber(frames.step);
   return text;
 }
 

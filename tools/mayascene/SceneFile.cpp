@@ -4,6 +4,7 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <array>
 #include <cerrno>
 #include <cstddef>
@@ -29,10 +30,6 @@ class Descriptor {
   int value_;
 };
 
-char lowered(char letter) {
-  return letter >= 'A' && letter <= 'Z' ? static_cast<char>(letter - 'A' + 'a') : letter;
-}
-
 // A read that fails counts as another header: the importer reads for itself and says what is wrong.
 bool hasMayaHeader(int descriptor) {
   std::array<char, kHeader.size()> head{};
@@ -43,11 +40,18 @@ bool hasMayaHeader(int descriptor) {
     if (count <= 0) return false;
     filled += static_cast<std::size_t>(count);
   }
-  for (char& letter : head) letter = lowered(letter);
-  return std::string_view(head.data(), head.size()) == kHeader;
+  return beginsAsScene({head.data(), head.size()});
 }
 
 }  // namespace
+
+bool beginsAsScene(std::string_view text) {
+  return std::equal(kHeader.begin(), kHeader.end(), text.begin(),
+                    text.begin() + std::min(text.size(), kHeader.size()), [](char wanted, char found) {
+                      return wanted ==
+                             (found >= 'A' && found <= 'Z' ? static_cast<char>(found - 'A' + 'a') : found);
+                    });
+}
 
 SceneLook lookAtScene(const std::filesystem::path& path) {
   SceneLook look;

@@ -3,6 +3,7 @@
 
 #include <filesystem>
 #include <string>
+#include <string_view>
 
 namespace mayascene {
 
@@ -11,6 +12,9 @@ struct SceneLook {
   std::string failure;      // where it is not readable: why, in words
   bool mayaHeader = false;  // it begins with "//Maya", in capitals or not
 };
+
+// "//Maya", in capitals or not.
+bool beginsAsScene(std::string_view text);
 
 // Never waits: a FIFO without a writer and a directory are recognised at once.
 SceneLook lookAtScene(const std::filesystem::path& path);
