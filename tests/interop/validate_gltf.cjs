@@ -36,4 +36,7 @@ async function main(files) {
   process.exitCode = faulty > 0 ? 1 : 0;
 }
 
-main(process.argv.slice(2));
+main(process.argv.slice(2)).catch((failure) => {
+  console.error(`validate-gltf: ${failure.message ?? failure}`);
+  process.exitCode = 1;
+});
