@@ -112,6 +112,7 @@ class Stage {
     Track focal;
     double width = 0, height = 0;
     std::array<double, 2> offset = {};
+    bool turned = false;  // about x by half a turn
   };
   struct Open {
     std::optional<std::size_t> layer;  // none: the root
@@ -265,6 +266,7 @@ class Stage {
     SeenLayer& layer = scene_.layers[*open_.back().layer];
     if (open_.back().isLens && name == "xformOp:rotateX") {
       Ask(track.values.size() == 1 && track.values[0][0] == 180, "half a turn");
+      lenses_.at(*open_.back().layer).turned = true;
     } else if (name.starts_with("xformOp:")) {
       Ask(!open_.back().isLens, "operations of a lens");
       Track& own = name == "xformOp:translate"   ? layer.position
@@ -289,6 +291,7 @@ class Stage {
 
   void PutLens(std::size_t prim, const Lens& lens) {
     SeenLayer& layer = scene_.layers[prim];
+    Ask(lens.turned == hostAxes_, "cameras are turned in the axes of the host");
     Ask(lens.width > 0 && lens.height > 0 && !lens.focal.values.empty(), "apertures");
     layer.camera = true;
     layer.aspect = lens.width / lens.height;
