@@ -1,9 +1,19 @@
 #include "export/Variation.h"
 
 #include <algorithm>
+#include <cmath>
 #include <iterator>
 
 namespace interchange {
+namespace {
+
+// A matrix that was taken apart has a scale that rounding makes uneven.
+bool IsClose(double a, double b) {
+  constexpr double kRounding = 1e-9;
+  return std::fabs(a - b) <= kRounding * std::fabs(b);
+}
+
+}  // namespace
 
 bool Varies(const Channel& channel, std::size_t frames) {
   if (!channel.moves()) return false;
@@ -29,7 +39,8 @@ bool IsScaledUnevenly(const Layer& layer, std::size_t frames) {
                                  [](const Channel& channel) { return channel.moves(); });
   for (std::size_t frame = 0; frame < (moves ? frames : 1); ++frame) {
     const double x = layer.scale[0].at(frame);
-    if (!(x > 0.0) || layer.scale[1].at(frame) != x || layer.scale[2].at(frame) != x) return true;
+    if (!(x > 0.0) || !IsClose(layer.scale[1].at(frame), x) || !IsClose(layer.scale[2].at(frame), x))
+      return true;
   }
   return false;
 }

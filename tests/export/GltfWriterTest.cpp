@@ -202,6 +202,10 @@ TEST_P(GltfWriterTest, CamerasUnderUnevenScaleAreReported) {
   Composition composition = RigShot();
   composition.layers[1].parent.reset();
   EXPECT_EQ(Write(composition).CountOf(Code::ExportCameraScaled), 0u);
+  composition.layers[1].scale[1] = 1 + 1e-15;
+  EXPECT_EQ(Write(composition).CountOf(Code::ExportCameraScaled), 0u);
+  composition.layers[1].scale[1] = 1.001;
+  EXPECT_EQ(Write(composition).CountOf(Code::ExportCameraScaled), 1u);
 }
 
 TEST_P(GltfWriterTest, NamesOfAnyBytesBecomeText) {
