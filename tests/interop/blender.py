@@ -7,6 +7,11 @@ import subprocess
 HERE = os.path.dirname(os.path.abspath(__file__))
 
 
+# Blender looks for its libraries beside the first python3 on PATH.
+_ENVIRONMENT = dict(os.environ,
+                    PATH="/usr/bin:/bin:" + os.environ.get("PATH", ""))
+
+
 class BlenderFailed(Exception):
     pass
 
@@ -21,7 +26,7 @@ def run(script, jobs, folder, prefix=""):
          "--python-exit-code", "9", "--python", os.path.join(HERE, script),
          "--", HERE, path],
         stdout=subprocess.PIPE, stderr=subprocess.STDOUT, text=True,
-        errors="replace", check=False)
+        errors="replace", check=False, env=_ENVIRONMENT)
     if done.returncode != 0:
         raise BlenderFailed(prefix + done.stdout[-4000:])
     return done.stdout

@@ -12,8 +12,9 @@ from known_points import known_points
 LIMIT_SINGLE = 0.05
 LIMIT_DOUBLE = 1e-3
 
-# Half a unit in the last place of a single and a double, relative.
-EPSILON = {"single": 2.0 ** -24, "double": 2.0 ** -53}
+# Half a unit in the last place, relative: of a single, of a double, and of
+# six digits in a text.
+EPSILON = {"single": 2.0 ** -24, "double": 2.0 ** -53, "six digits": 5e-6}
 
 # How many roundings a place or a pixel goes through, at most, in a chain of
 # parents: each link has a matrix of products and sums, and a key between
@@ -63,6 +64,8 @@ def projected(view, projection, point):
 def _pixel_limit(composition, camera, frame, depth, precision, usual):
     """The usual limit, or what the roundings of single precision come to
     where the scene is far from its origin, and near the lens."""
+    if precision != "single":
+        return usual
     epsilon = EPSILON[precision]
     reach = composition.reach(camera, frame) + depth
     zoom = composition.zoom(camera, frame)
@@ -81,7 +84,7 @@ def compare(composition, measured, names, to_program, precision,
     up to a pixel narrower or wider. `lens_at` is a frame whose lens a program
     shows at all frames.
     """
-    usual = LIMIT_SINGLE if precision == "single" else LIMIT_DOUBLE
+    usual = LIMIT_DOUBLE if precision == "double" else LIMIT_SINGLE
     result = Result()
     result.limit = usual
     points = {camera.number: known_points(composition, camera)

@@ -10,7 +10,11 @@ import tempfile
 
 import addon_test
 import addon_update_test
+import assimp
 import blender
+import exports
+import gltf_test
+import node
 import scenes
 from table import Row, summary_of, table_of
 
@@ -32,6 +36,7 @@ class Run:
         self.folder = folder
         self.rows = []
         self.problems = []
+        self.remarks = []
         self.examples = scenes.examples(self.tool)
         self.shots, self.absent = scenes.shots(self.tool)
         self.scenes = self.examples + self.shots
@@ -70,7 +75,32 @@ def _addon(run):
             lens, run.tool, _ADDONS, run.folder)]
 
 
-_PARTS = {"addon": _addon}
+def _gltf(run):
+    gltf, glb = ({scene.name: exports.export(run.tool, scene, suffix,
+                                             run.folder)
+                  for scene in run.scenes} for suffix in (".gltf", ".glb"))
+    run.problems += gltf_test.validator_problems(
+        [*gltf.values(), *glb.values()])
+    worst, moving, problems = gltf_test.lens_problems(run.scenes, gltf)
+    run.problems += problems
+    run.remarks.append(
+        f"glTF: {moving} lenses move, the edge of the picture is at most "
+        f"{worst:.1e} px off; {2 * len(gltf)} files go to the validator")
+    ways = ((f".gltf, Blender {blender.version()}",
+             gltf_test.through_blender, gltf),
+            (f".glb, three {node.version_of('three')}",
+             gltf_test.through_three, glb),
+            (f".gltf, assimp {assimp.version()}",
+             gltf_test.through_assimp, gltf))
+    for through, way, files in ways:
+        for scene, result in way(run.scenes, files, run.folder):
+            run.take(scene, through, result)
+
+
+_FAILURES = (assimp.AssimpFailed, blender.BlenderFailed,
+             exports.ExportFailed, node.NodeFailed)
+
+_PARTS = {"addon": _addon, "gltf": _gltf}
 
 
 def main():
@@ -78,11 +108,16 @@ def main():
     with tempfile.TemporaryDirectory() as folder:
         run = Run(options, folder)
         for name in options.only or _PARTS:
-            _PARTS[name](run)
+            try:
+                _PARTS[name](run)
+            except _FAILURES as failure:
+                run.problems.append(f"{name}: {failure}")
         if options.picture:
             _draw(run, options.picture)
     print(summary_of(run.rows))
     print(table_of(run.rows))
+    for text in run.remarks:
+        print(text)
     print(f"{run.absent} of {len(scenes.SHOTS)} shots are absent")
     if options.table:
         with open(options.table, "w", encoding="utf-8") as file:
