@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <limits>
+#include <set>
 #include <utility>
 
 #include "check/HeadInternal.h"
@@ -38,10 +39,30 @@ bool IsTheStopAgain(const diag::Diagnostic& diagnostic, std::uint32_t stopLine) 
   return diagnostic.code <= diag::Code::UnexpectedByte && diagnostic.place.line == stopLine;
 }
 
+// The lines of parents that the import does not have.
+std::set<std::uint32_t> LostParentLines(const diag::Collector& collector) {
+  std::set<std::uint32_t> lines;
+  for (const diag::Diagnostic& one : collector.kept()) {
+    if (one.code == diag::Code::ParentNotImported) lines.insert(one.place.line);
+  }
+  return lines;
+}
+
+// Whether the reader of the whole scene misses a parent that the import was found to miss.
+bool IsTheLostParentAgain(const diag::Diagnostic& diagnostic, const std::set<std::uint32_t>& lines) {
+  return (diagnostic.code == diag::Code::ParentMissing || diagnostic.code == diag::Code::ParentInReference) &&
+         lines.contains(diagnostic.place.line);
+}
+
 void Gather(std::string_view text, const Options& options, diag::Collector* collector, Report* report) {
   const std::uint32_t stopLine = StopLine(*collector);
+  std::set<std::uint32_t> lostParents;
+  if (IsWanted(diag::Code::ParentNotImported, options)) lostParents = LostParentLines(*collector);
   for (const diag::Diagnostic& diagnostic : collector->kept()) {
-    if (!IsWanted(diagnostic.code, options) || IsTheStopAgain(diagnostic, stopLine)) continue;
+    if (!IsWanted(diagnostic.code, options) || IsTheStopAgain(diagnostic, stopLine) ||
+        IsTheLostParentAgain(diagnostic, lostParents)) {
+      continue;
+    }
     Finding finding{diagnostic, collector->lines().At(diagnostic.range.offset + diagnostic.range.length), {}};
     if (!diag::IsOfWholeFile(diagnostic)) finding.excerpt = diag::Excerpt(text, diagnostic.range);
     report->findings.push_back(std::move(finding));

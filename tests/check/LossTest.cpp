@@ -50,6 +50,30 @@ TEST(LossTest, AParentInAReferenceIsSaidWithItsFile) {
               HasSubstr("\"rig:root\", which stands in \"set/rig.ma\""));
 }
 
+TEST(LossTest, AParentThatDoesNotComeOverIsSaidOnce) {
+  const std::string child =
+      "createNode transform -n \"shotCam\" -p \"rig:root\";\n"
+      "createNode camera -n \"shotCamShape\" -p \"shotCam\";\n" +
+      kResolution;
+  const std::string missing = kHead + child;
+  const std::string referenced = kHead + "file -r -ns \"rig\" -rfn \"rigRN\" \"set/rig.ma\";\n" + child;
+  for (const std::string& text : {missing, referenced}) {
+    const Checked checked(text);
+    EXPECT_EQ(checked.CountOf(Code::ParentNotImported), 1u) << checked.All();
+    EXPECT_EQ(checked.CountOf(Code::ParentMissing) + checked.CountOf(Code::ParentInReference), 0u)
+        << checked.All();
+  }
+  check::Options missed;
+  missed.only = {Code::ParentMissing};
+  EXPECT_EQ(Checked(missing, missed).CountOf(Code::ParentMissing), 1u);
+}
+
+// No camera hangs on the node, so that no other diagnostic speaks of it.
+TEST(LossTest, AParentThatIsMissedAboveNoCameraIsSaid) {
+  const Checked checked(kHead + "createNode transform -n \"prop\" -p \"rig\";\n" + kResolution);
+  EXPECT_EQ(checked.CountOf(Code::ParentMissing), 1u) << checked.All();
+}
+
 TEST(LossTest, AParentOfATypeThatTheImporterDoesNotKnow) {
   const Checked checked(kHead +
                         "createNode joint -n \"arm\";\ncreateNode transform -n \"shotCam\" -p \"arm\";\n"
