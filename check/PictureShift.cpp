@@ -1,11 +1,11 @@
 // How far the picture of an import is from the scene's.
 #include <algorithm>
-#include <array>
 #include <cmath>
 #include <optional>
 #include <string>
 
 #include "check/ImportedPicture.h"
+#include "check/PointsPerUnit.h"
 #include "check/RulesInternal.h"
 #include "check/Times.h"
 #include "motion/Evaluator.h"
@@ -31,24 +31,6 @@ struct Frames {
   double first = 1.0;
   double last = 1.0;
 };
-
-// Points of the layers in one unit of the scene, where distances are converted.
-double PointsPerUnit(std::string_view word) {
-  struct Row {
-    std::string_view shortName, longName;
-    double points;
-  };
-  // Deliberate: metres and kilometres do not fit the rest. The importer converts them so.
-  constexpr std::array kRows = {
-      Row{"mm", "millimeter", 72.0 / 25.4},    Row{"m", "meter", 100.0 / 0.0254 * 72.0},
-      Row{"km", "kilometer", 1000.0 * 7200.0}, Row{"in", "inch", 72.0},
-      Row{"ft", "foot", 12.0 * 72.0},          Row{"yd", "yard", 36.0 * 72.0},
-      Row{"mi", "mile", 5280.0 * 12.0 * 72.0}};
-  for (const Row& row : kRows) {
-    if (SameName(word, row.shortName) || SameName(word, row.longName)) return row.points;
-  }
-  return 72.0 / 2.54;
-}
 
 class Shift {
  public:

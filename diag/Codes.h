@@ -148,6 +148,10 @@ enum class Code : std::uint16_t {
   ExportLensUnusable = 1103,
   ExportParentCircle = 1104,
   ExportNumberTooLarge = 1105,
+  ExportTooManyFrames = 1106,
+  ExportKeysBetweenFrames = 1107,
+  ExportNullsLeftOut = 1108,
+  ExportWithoutCamera = 1109,
   ExportNameReplaced = 1110,
   ExportCameraScaled = 1111,
   ExportTimesShifted = 1112,
@@ -155,6 +159,9 @@ enum class Code : std::uint16_t {
   ExportZoomByExtension = 1114,
   ExportFileTooLarge = 1115,
   ExportDownAxisLost = 1116,
+  ExportRotationOrder = 1121,
+  ExportPartLost = 1122,
+  ExportFramesRounded = 1123,
 };
 
 // Ordered: a later one is worse.

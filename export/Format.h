@@ -35,7 +35,7 @@ struct Format {
   std::string_view name;      // "chan", as -f takes it
   std::string_view suffix;    // ".chan"
   std::string_view sentence;  // for help
-  bool ownAxes = false;       // axes and unit are the format's own, whatever the user says
+  bool ownAxes = false;       // the axes are the format's own, whatever the user says
   bool listsKeys = false;     // takes WriteOptions::keys
 
   // Writes a composition that IsWritable() takes. `stem` is the safe name of the main output, without its

@@ -13,6 +13,8 @@ bool WriteGlb(const Composition& composition, const WriteOptions& options, std::
               Files& files, diag::Collector* diagnostics);
 bool WriteUsda(const Composition& composition, const WriteOptions& options, std::string_view stem,
                Files& files, diag::Collector* diagnostics);
+bool WriteChan(const Composition& composition, const WriteOptions& options, std::string_view stem,
+               Files& files, diag::Collector* diagnostics);
 bool WriteCsv(const Composition& composition, const WriteOptions& options, std::string_view stem,
               Files& files, diag::Collector* diagnostics);
 

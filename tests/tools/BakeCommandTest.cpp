@@ -205,7 +205,7 @@ TEST_F(BakeCommand, SeveralScenesNeedAFolder) {
   EXPECT_EQ(run({"bake", "a.ma", "b.ma", "-o", "-"}).status, 2);
   const ToolResult result = run({"bake", "a.ma", "b.ma", "-o", "file"});
   EXPECT_EQ(result.status, 2);
-  EXPECT_THAT(result.err, HasSubstr("file is no folder: the bakes of several scenes need one"));
+  EXPECT_THAT(result.err, HasSubstr("file is no folder: the outputs of several scenes need one"));
   EXPECT_FALSE(std::filesystem::exists(path("-")));
 }
 

@@ -9,6 +9,7 @@
 #include <system_error>
 
 #include "tools/mayascene/BakeWords.h"
+#include "tools/mayascene/ExportWords.h"
 #include "tools/mayascene/HostWords.h"
 #include "tools/mayascene/Interruption.h"
 #include "tools/mayascene/OutputFile.h"
@@ -133,6 +134,8 @@ struct CommandLine {
   PrefsArguments prefs;
   BakeArguments bake;
   CheckArguments check;
+  ExportArguments exported;
+  ExportWords exportWords;
   std::vector<std::string> onlyCodes;
   HostWords importHostWords, verifyHostWords;
   BakeWords importBakeWords, bakeWords;
@@ -143,6 +146,7 @@ struct CommandLine {
   CLI::App* prefsVerb = nullptr;
   CLI::App* bakeVerb = nullptr;
   CLI::App* checkVerb = nullptr;
+  CLI::App* exportVerb = nullptr;
   CLI::App* setVerb = nullptr;
 
   CommandLine() {
@@ -153,6 +157,7 @@ struct CommandLine {
     app.footer(exitStatuses());
     addImport();
     addBake();
+    addExport();
     addCheck();
     addVerify();
     addPrefs();
@@ -186,6 +191,12 @@ struct CommandLine {
         ->option_text("OUT");
     bakeVerb->add_flag("-q,--quiet", bake.quiet, "print nothing but errors");
     addBakeOptions(bakeVerb, &bakeWords, "");
+  }
+
+  void addExport() {
+    exportVerb = app.add_subcommand("export", "write cameras and nulls of scenes for other programs");
+    addScenes(exportVerb, &exported.scenes);
+    addExportOptions(exportVerb, &exportWords, &exported);
   }
 
   void addCheck() {
@@ -256,7 +267,7 @@ struct CommandLine {
 
   Arguments parse(std::vector<std::string> words) {
     app.parse(std::move(words));
-    for (const CLI::App* verb : {importVerb, bakeVerb, checkVerb, verifyVerb, prefsVerb, setVerb})
+    for (const CLI::App* verb : {importVerb, bakeVerb, exportVerb, checkVerb, verifyVerb, prefsVerb, setVerb})
       refuseEmptyValues(*verb);
     Arguments arguments;
     if (importVerb->parsed()) {
@@ -271,6 +282,11 @@ struct CommandLine {
       translateBakeWords(bakeWords, &bake);
       checkOutputs({{"--output", bake.output}, {"--report", bake.report}}, bake.scenes);
       arguments.bake = bake;
+    } else if (exportVerb->parsed()) {
+      translateExportWords(*exportVerb, exportWords, &exported);
+      checkOutputs({{"--output", exported.output}, {"--report", exported.bake ? exported.bake->report : ""}},
+                   exported.scenes);
+      arguments.exported = exported;
     } else if (checkVerb->parsed()) {
       check.options.only = codesOf(onlyCodes);
       checkOutputs({{"--json", check.json}}, check.scenes);

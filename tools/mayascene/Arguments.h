@@ -7,7 +7,9 @@
 #include <string>
 #include <vector>
 
+#include "bake/Options.h"
 #include "check/Check.h"
+#include "export/Format.h"
 #include "refhost/Host.h"
 #include "tools/mayascene/BakeCommand.h"
 #include "tools/mayascene/ExitStatus.h"
@@ -62,18 +64,33 @@ struct CheckArguments {
   bool colourComplaints = false;
 };
 
+struct ExportArguments {
+  HostArguments host;
+  std::vector<std::string> scenes;
+  std::string output;                           // a file, a folder, or "-" for standard output
+  const interchange::Format* format = nullptr;  // null: that of the output's suffix
+  std::optional<BakeArguments> bake;            // bake each scene first
+  std::optional<bake::FrameSpan> frames;        // none: the first to the last keyed frame
+  double scale = 1.0;                           // above 0
+  std::optional<interchange::Axes> axes;        // none: those of the scene, or the format's own
+  bool keys = false;
+  bool strict = false;
+  bool quiet = false;
+};
+
 struct PrefsArguments {
   std::string preferences;                  // empty: the user's own store
   std::optional<std::int32_t> linearUnits;  // the value to set; none: show
 };
 
-// Exactly one of the five is there, or none and the run is over: help was shown, or usage was wrong.
+// Exactly one of the six is there, or none and the run is over: help was shown, or usage was wrong.
 struct Arguments {
   std::optional<ImportArguments> import;
   std::optional<VerifyArguments> verify;
   std::optional<PrefsArguments> prefs;
   std::optional<BakeArguments> bake;
   std::optional<CheckArguments> check;
+  std::optional<ExportArguments> exported;
   ExitStatus over = ExitStatus::Done;
 };
 

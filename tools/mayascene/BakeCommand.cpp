@@ -47,7 +47,7 @@ ExitStatus runBake(const BakeArguments& arguments, Diagnostics& diagnostics) {
   std::string failure;
   std::vector<std::string> places;
   const ExitStatus placed =
-      placeBakes(arguments.scenes, arguments.output, arguments.report, &places, &failure);
+      placeOutputs(arguments.scenes, arguments.output, ".ma", arguments.report, &places, &failure);
   if (placed != ExitStatus::Done) {
     diagnostics.complain("", failure);
     return placed;

@@ -18,26 +18,21 @@ std::string lowered(std::string text) {
   return text;
 }
 
-// The scene's own name, as a name that no other bake of the run has.
-std::string freeName(const fs::path& scene, std::set<std::string>* taken) {
+// The scene's own name, as a name that no other output of the run has.
+std::string freeName(const fs::path& scene, const std::string& suffix, std::set<std::string>* taken) {
   const std::string stem = scene.stem().empty() ? "scene" : scene.stem().string();
-  std::string name = stem + ".ma";
+  std::string name = stem + suffix;
   for (int number = 2; !taken->insert(lowered(name)).second; ++number) {
-    name = stem + "_" + std::to_string(number) + ".ma";
+    name = stem + "_" + std::to_string(number) + suffix;
   }
   return name;
-}
-
-bool isSameFile(const fs::path& a, const fs::path& b) {
-  std::error_code ignored;
-  return a.lexically_normal() == b.lexically_normal() || fs::equivalent(a, b, ignored);
 }
 
 // The folder `output`, made where it is not there.
 ExitStatus makeFolder(const std::string& output, std::string* failure) {
   std::error_code error;
   if (fs::exists(output, error) || output == kStandardOutput) {
-    *failure = output + " is no folder: the bakes of several scenes need one";
+    *failure = output + " is no folder: the outputs of several scenes need one";
     return ExitStatus::WrongUsage;
   }
   if (fs::create_directories(output, error) || fs::is_directory(output)) return ExitStatus::Done;
@@ -52,8 +47,14 @@ ExitStatus refuse(const std::string& place, const char* why, std::string* failur
 
 }  // namespace
 
-ExitStatus placeBakes(const std::vector<std::string>& scenes, const std::string& output,
-                      const std::string& report, std::vector<std::string>* places, std::string* failure) {
+bool isSameFile(const fs::path& a, const fs::path& b) {
+  std::error_code ignored;
+  return a.lexically_normal() == b.lexically_normal() || fs::equivalent(a, b, ignored);
+}
+
+ExitStatus placeOutputs(const std::vector<std::string>& scenes, const std::string& output,
+                        const std::string& suffix, const std::string& report,
+                        std::vector<std::string>* places, std::string* failure) {
   std::error_code error;
   const bool folder = output != kStandardOutput && fs::is_directory(output, error);
   if (scenes.size() == 1 && !folder && !output.ends_with('/')) {
@@ -65,7 +66,7 @@ ExitStatus placeBakes(const std::vector<std::string>& scenes, const std::string&
     }
     std::set<std::string> taken;
     for (const std::string& scene : scenes) {
-      places->push_back((fs::path(output) / freeName(scene, &taken)).string());
+      places->push_back((fs::path(output) / freeName(scene, suffix, &taken)).string());
     }
   }
   for (const std::string& place : *places) {

@@ -1,6 +1,7 @@
-// Where the bakes of a run go.
+// Where the outputs of a run go that has one for each scene.
 #pragma once
 
+#include <filesystem>
 #include <string>
 #include <vector>
 
@@ -8,13 +9,17 @@
 
 namespace mayascene {
 
-// A file for each scene, and Done. One scene's is `output`, unless that is a folder, or ends with a "/";
-// those of several lie in the folder `output`, under the scenes' own names, with _2, _3 … where two are the
-// same without regard to case. The folder is made where it is not there.
+// A file for each scene, and Done. `suffix` is ".ma" for bakes. One scene's is `output`, unless that is a
+// folder, or ends with a "/"; those of several lie in the folder `output`, under the scenes' own names, with
+// _2, _3 … where two are the same without regard to case. The folder is made where it is not there.
 //
-// WrongUsage, with a sentence in *failure, where a bake would be written over one of the scenes or over
+// WrongUsage, with a sentence in *failure, where an output would be written over one of the scenes or over
 // `report`, and where several have no folder to go to. CannotWrite where the folder cannot be made.
-ExitStatus placeBakes(const std::vector<std::string>& scenes, const std::string& output,
-                      const std::string& report, std::vector<std::string>* places, std::string* failure);
+ExitStatus placeOutputs(const std::vector<std::string>& scenes, const std::string& output,
+                        const std::string& suffix, const std::string& report,
+                        std::vector<std::string>* places, std::string* failure);
+
+// Whether both lead to one file, which need not be there.
+bool isSameFile(const std::filesystem::path& a, const std::filesystem::path& b);
 
 }  // namespace mayascene

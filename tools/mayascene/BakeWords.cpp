@@ -19,17 +19,6 @@ std::optional<double> numberOf(std::string_view text) {
   return whole && std::isfinite(number) ? std::optional(number) : std::nullopt;
 }
 
-bake::FrameSpan framesOf(const std::string& text) {
-  const std::size_t colon = text.find(':');
-  const std::string_view all = text;
-  const auto first = numberOf(all.substr(0, colon));
-  const auto last = colon == std::string::npos ? first : numberOf(all.substr(colon + 1));
-  if (!first || !last || *last < *first) {
-    throw CLI::ValidationError("--frames", text + ": the form is A:B, with A at most B");
-  }
-  return {*first, *last};
-}
-
 double stepOf(const std::string& text) {
   constexpr double kSmallest = 0.001;
   const auto step = numberOf(text);
@@ -40,6 +29,17 @@ double stepOf(const std::string& text) {
 }
 
 }  // namespace
+
+bake::FrameSpan framesOf(const std::string& text) {
+  const std::size_t colon = text.find(':');
+  const std::string_view all = text;
+  const auto first = numberOf(all.substr(0, colon));
+  const auto last = colon == std::string::npos ? first : numberOf(all.substr(colon + 1));
+  if (!first || !last || *last < *first) {
+    throw CLI::ValidationError("--frames", text + ": the form is A:B, with A at most B");
+  }
+  return {*first, *last};
+}
 
 void addBakeOptions(CLI::App* verb, BakeWords* words, const std::string& group) {
   const auto grouped = [&](CLI::Option* option) {

@@ -27,4 +27,7 @@ std::vector<std::string> givenBakeOptions(const CLI::App& verb);
 // Throws CLI::ValidationError for a word that means nothing.
 void translateBakeWords(const BakeWords& words, BakeArguments* bake);
 
+// "A:B" or "A". Throws CLI::ValidationError for anything else.
+bake::FrameSpan framesOf(const std::string& text);
+
 }  // namespace mayascene

@@ -2,7 +2,6 @@
 
 #include <unistd.h>
 
-#include <filesystem>
 #include <memory>
 #include <optional>
 #include <string>
@@ -15,9 +14,7 @@
 #include "tools/mayascene/Outline.h"
 #include "tools/mayascene/OutputFile.h"
 #include "tools/mayascene/Report.h"
-#include "tools/mayascene/SceneBake.h"
-#include "tools/mayascene/SceneFile.h"
-#include "tools/mayascene/TemporaryBake.h"
+#include "tools/mayascene/SceneImport.h"
 
 namespace mayascene {
 namespace {
@@ -52,88 +49,6 @@ struct Outputs {
     return status;
   }
 };
-
-// The importer answers a file that is no Maya ASCII scene with a message and code 0, having made nothing. Two
-// signs distinguish it from a scene without cameras, of which nothing is made either: the file does not begin
-// as one, or the host showed a message (a file that changed, or could not be read, after the look).
-Outcome outcomeOf(const SceneLook& look, const refhost::CallbackResult& result) {
-  if (result.code != 0) return Outcome::Failed;
-  if (result.folder != nullptr && !result.folder->compositions.empty()) return Outcome::Imported;
-  return look.mayaHeader && result.messages.empty() ? Outcome::Nothing : Outcome::Refused;
-}
-
-SceneReport importOne(const std::string& path, HostSession& session, Diagnostics& diagnostics) {
-  SceneReport report;
-  report.path = path;
-  const SceneLook look = lookAtScene(path);
-  if (!look.readable) {
-    diagnostics.complain(path, look.failure);
-    return report;
-  }
-  report.result = session.host().importScene(path);
-  report.outcome = outcomeOf(look, report.result);
-  return report;
-}
-
-// The host knows the bake's path alone; what it says is shown with the scene's. Both have one file name.
-void nameScene(const std::filesystem::path& bake, const std::string& scene, refhost::CallbackResult* result) {
-  const std::string bakeFolder = bake.parent_path().string() + '/';
-  const std::string sceneFolder = scene.substr(0, scene.rfind('/') + 1);
-  const auto replace = [&](std::string* text) {
-    for (std::size_t at = text->find(bakeFolder); at != std::string::npos; at = text->find(bakeFolder, at)) {
-      text->replace(at, bakeFolder.size(), sceneFolder);
-      at += sceneFolder.size();
-    }
-  };
-  for (refhost::Leftover& leftover : result->leftovers) replace(&leftover.description);
-  for (std::string& refusal : result->refusals) replace(&refusal);
-  for (std::string& message : result->messages) replace(&message);
-}
-
-// Bakes the scene and imports the bake; what is said names the scene.
-SceneReport importBaked(const std::string& path, const BakeArguments& arguments, HostSession& session,
-                        Diagnostics& diagnostics, BakedScene* baked) {
-  SceneReport report;
-  report.path = path;
-  baked->path = path;
-  // A path that leads to no file need not have a name that a bake could have.
-  const SceneLook look = lookAtScene(path);
-  if (!look.readable) {
-    diagnostics.complain(path, look.failure);
-    return report;
-  }
-  std::string failure;
-  const auto bake = TemporaryBake::make(std::filesystem::path(path).filename().string(), &failure);
-  if (bake != nullptr) {
-    *baked = bakeScene(path, arguments, diagnostics, bake->stream());
-    showBake(*baked, diagnostics);
-  }
-  if (bake == nullptr || !bake->finish(&failure)) {
-    diagnostics.complain(path, failure);
-    report.status = baked->status = ExitStatus::CannotWrite;
-    return report;
-  }
-  report.status = baked->status;
-  if (!isWorthKeeping(*baked, arguments.options)) {
-    report.explained = true;
-    if (report.status != ExitStatus::Unreadable) report.outcome = Outcome::Refused;
-    return report;
-  }
-  report.result = session.host().importScene(bake->path());
-  nameScene(bake->path(), path, &report.result);
-  report.outcome = outcomeOf(lookAtScene(bake->path()), report.result);
-  return report;
-}
-
-// What goes to standard error about one scene, and its status.
-ExitStatus judgeScene(const SceneReport& report, bool outlinePrinted, Diagnostics& diagnostics) {
-  if (report.outcome == Outcome::Unreadable || report.explained) return report.status;
-  if (!outlinePrinted) diagnostics.messages(report.path, report.result);
-  const ExitStatus status = diagnostics.judge(report.path, report.result);
-  if (report.outcome != Outcome::Refused) return status;
-  diagnostics.complain(report.path, "refused: it is no Maya ASCII scene");
-  return ExitStatus::Refused;
-}
 
 // The scene is read once more for them, so only for who asked for JSON; a bake has read it already.
 std::optional<SceneNumbers> numbersOf(const SceneReport& report, const BakedScene* baked) {

@@ -12,6 +12,7 @@
 #include "tools/mayascene/BakeCommand.h"
 #include "tools/mayascene/CheckCommand.h"
 #include "tools/mayascene/Diagnostics.h"
+#include "tools/mayascene/ExportCommand.h"
 #include "tools/mayascene/ImportCommand.h"
 #include "tools/mayascene/Interruption.h"
 #include "tools/mayascene/PrefsCommand.h"
@@ -25,14 +26,16 @@ using mayascene::ExitStatus;
 
 ExitStatus run(int argc, const char* const* argv) {
   const Arguments arguments = mayascene::parseArguments(argc, argv, std::cout, std::cerr);
-  const bool quiet = (arguments.import && arguments.import->quiet) ||
-                     (arguments.verify && arguments.verify->quiet) ||
-                     (arguments.bake && arguments.bake->quiet) || (arguments.check && arguments.check->quiet);
+  const bool quiet =
+      (arguments.import && arguments.import->quiet) || (arguments.verify && arguments.verify->quiet) ||
+      (arguments.bake && arguments.bake->quiet) || (arguments.check && arguments.check->quiet) ||
+      (arguments.exported && arguments.exported->quiet);
   const bool colour =
       mayascene::colourAllowed(STDERR_FILENO) || (arguments.check && arguments.check->colourComplaints);
   Diagnostics diagnostics(std::cerr, mayascene::Style(colour), quiet);
   if (arguments.import) return mayascene::runImport(*arguments.import, diagnostics);
   if (arguments.bake) return mayascene::runBake(*arguments.bake, diagnostics);
+  if (arguments.exported) return mayascene::runExport(*arguments.exported, diagnostics);
   if (arguments.check) return mayascene::runCheck(*arguments.check, diagnostics);
   if (arguments.verify) return mayascene::runVerify(*arguments.verify, diagnostics);
   if (arguments.prefs) return mayascene::runPrefs(*arguments.prefs, diagnostics);

@@ -1,0 +1,160 @@
+// mayascene export, from outside.
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <string>
+#include <vector>
+
+#include "tests/tools/ToolRun.h"
+
+namespace {
+
+using mayascene_test::ToolTest;
+using testing::ElementsAre;
+using testing::HasSubstr;
+using testing::StartsWith;
+
+// A camera under a boom in the unit, keyed from frame 11 on.
+std::string rig(const std::string& unit) {
+  return "//Maya ASCII 2023 scene\ncurrentUnit -l " + unit +
+         " -a degree -t film;\ncreateNode transform -n \"boom\";\n\tsetAttr \".t\" -type \"double3\" 0 2 0;\n"
+         "createNode transform -n \"cam\" -p \"boom\";\ncreateNode camera -n \"camShape\" -p \"cam\";\n"
+         "createNode animCurveTL -n \"c1\";\n\tsetAttr -s 3 \".ktv[0:2]\" 11 0 12 1 13 4;\n"
+         "connectAttr \"c1.o\" \"cam.tz\";\n"
+         "createNode animCurveTA -n \"c2\";\n\tsetAttr -s 3 \".ktv[0:2]\" 11 0 12 -10 13 -20;\n"
+         "connectAttr \"c2.o\" \"cam.rx\";\n";
+}
+
+class ExportCommandTest : public ToolTest {
+ protected:
+  // The columns frame, tx … rz of the camera's row of a frame in a written table.
+  std::string rowOf(const std::string& file, const std::string& frame) {
+    const std::string text = '\n' + read(file);
+    const std::size_t at = text.find("\ncamShape," + frame + ',');
+    if (at == std::string::npos) return "none in " + text;
+    std::size_t end = at;
+    for (int commas = 0; commas < 9; ++commas) end = text.find(',', end + 1);
+    return text.substr(at + 10, end - at - 10);
+  }
+};
+
+TEST_F(ExportCommandTest, FramesAndLengthsAreTheScenesOwn) {
+  for (const char* unit : {"cm", "m", "km", "in", "ft", "mm"}) {
+    write("shot.ma", rig(unit));
+    for (const char* converted : {"0", "1"}) {
+      const auto result =
+          run({"export", "shot.ma", "-o", "shot.csv", "--linear-units", converted, "--quiet"});
+      EXPECT_EQ(result.status, 0) << result.err;
+      EXPECT_EQ(result.err, "");
+      EXPECT_EQ(rowOf("shot.csv", "11"), "11,0,0,0,0,0,0,0");
+      const std::string row = rowOf("shot.csv", "13");
+      ASSERT_THAT(row, StartsWith("13,0.08333333333333333,0,0,")) << unit << converted;
+      EXPECT_NEAR(std::stod(row.substr(27)), 4.0, 1e-14) << unit << converted;
+    }
+  }
+}
+
+TEST_F(ExportCommandTest, RotationsAreTheScenesOwn) {
+  write("shot.ma", rig("cm"));
+  EXPECT_EQ(run({"export", "shot.ma", "-o", "shot.csv", "--quiet"}).status, 0);
+  EXPECT_EQ(rowOf("shot.csv", "12"), "12,0.041666666666666664,0,0,1,-10,0,0");
+}
+
+TEST_F(ExportCommandTest, HostAxesAndScaleTurnAndStretchPlaces) {
+  write("shot.ma", rig("cm"));
+  EXPECT_EQ(run({"export", "shot.ma", "-o", "shot.csv", "--axes", "host", "--scale", "10", "--quiet"}).status,
+            0);
+  EXPECT_EQ(rowOf("shot.csv", "13"), "13,0.08333333333333333,0,0,-40,-20,0,0");
+}
+
+TEST_F(ExportCommandTest, FramesAreChosenInTheScenesNumbers) {
+  write("shot.ma", rig("cm"));
+  EXPECT_EQ(run({"export", "shot.ma", "-o", "shot.csv", "--frames", "12:14", "--quiet"}).status, 0);
+  EXPECT_THAT(rowOf("shot.csv", "11"), HasSubstr("none"));
+  EXPECT_EQ(rowOf("shot.csv", "12"), "12,0,0,0,1,-10,0,0");
+  EXPECT_EQ(rowOf("shot.csv", "14"), "14,0.08333333333333333,0,0,4,-20,0,0");
+}
+
+TEST_F(ExportCommandTest, ABakeIsExportedFromItsFirstToItsLastFrame) {
+  write("shot.ma", rig("cm"));
+  const auto result = run({"export", "--bake", "--frames", "10:15", "shot.ma", "-o", "shot.csv"});
+  EXPECT_EQ(result.status, 0) << result.err;
+  EXPECT_THAT(result.err, HasSubstr("shot.ma: written to shot.csv"));
+  EXPECT_THAT(rowOf("shot.csv", "10"), StartsWith("10,0,0,0,0,"));
+  EXPECT_THAT(rowOf("shot.csv", "15"), HasSubstr(",0,0,4,-20,0,0"));
+}
+
+TEST_F(ExportCommandTest, KeysAreListedAsTheyAre) {
+  write("shot.ma", rig("cm"));
+  EXPECT_EQ(run({"export", "shot.ma", "-o", "shot.csv", "--keys", "--quiet"}).status, 0);
+  EXPECT_THAT(read("shot.csv"), HasSubstr("\ncamShape,position,13,0.08333333333333333,0,0,4,"));
+  EXPECT_THAT(read("shot.csv"), HasSubstr("\ncamShape,xRotation,12,0.041666666666666664,-10,,,"));
+}
+
+TEST_F(ExportCommandTest, AChanFileHasTheCamerasPlaceInTheWorld) {
+  write("shot.ma", rig("cm"));
+  const auto result = run({"export", "shot.ma", "-o", "shot.chan"});
+  EXPECT_EQ(result.status, 0) << result.err;
+  EXPECT_THAT(read("shot.chan"), StartsWith("11\t0\t2\t0\t0\t0\t0\t"));
+  EXPECT_THAT(result.err, HasSubstr("rotation order XYZ"));
+}
+
+TEST_F(ExportCommandTest, SeveralScenesGoIntoAFolderUnderTheirNames) {
+  std::filesystem::create_directories(path("a"));
+  write("shot.ma", rig("cm"));
+  write("a/SHOT.ma", rig("cm"));
+  EXPECT_EQ(run({"export", "-f", "csv", "shot.ma", "a/SHOT.ma", "-o", "out", "--quiet"}).status, 0);
+  EXPECT_TRUE(std::filesystem::exists(path("out/shot.csv")));
+  EXPECT_TRUE(std::filesystem::exists(path("out/SHOT_2.csv")));
+}
+
+TEST_F(ExportCommandTest, WhatDoesNotGoTogetherIsWrongUsage) {
+  write("shot.ma", rig("cm"));
+  const std::vector<std::vector<std::string>> wrong = {{"-o", "shot"},
+                                                       {"-o", "shot.ma", "-f", "csv"},
+                                                       {"-o", "x.csv", "--step", "2"},
+                                                       {"-o", "x.csv", "--scale", "0"},
+                                                       {"-o", "x.chan", "--axes", "host"},
+                                                       {"-o", "x.chan", "--keys"},
+                                                       {"-o", "x.csv", "-f", "fbx"},
+                                                       {"-o", "x.csv", "--frames", "5:1"}};
+  for (std::vector<std::string> words : wrong) {
+    words.insert(words.begin(), {"export", "shot.ma"});
+    EXPECT_EQ(run(words).status, 2) << words[3];
+  }
+  EXPECT_THAT(files(), ElementsAre("shot.ma"));
+}
+
+TEST_F(ExportCommandTest, WhatCannotBeExportedLeavesNoFile) {
+  write("empty.ma", "//Maya ASCII 2023 scene\ncreateNode transform -n \"rig\";\n");
+  write("notes.ma", "just some notes\n");
+  EXPECT_EQ(run({"export", "empty.ma", "-o", "x.csv"}).status, 1);
+  EXPECT_EQ(run({"export", "notes.ma", "-o", "x.csv"}).status, 1);
+  EXPECT_EQ(run({"export", "missing.ma", "-o", "x.csv"}).status, 3);
+  EXPECT_EQ(run({"export", "empty.ma", "-o", "no/such/x.csv"}).status, 1);
+  EXPECT_THAT(files(), ElementsAre("empty.ma", "notes.ma"));
+}
+
+TEST_F(ExportCommandTest, ManyFramesAreWrittenOnlyWhereTheyAreAskedFor) {
+  std::string scene = rig("cm");
+  scene.replace(scene.find("13 4"), 4, "900000 4");
+  scene.replace(scene.find("13 -20"), 6, "900000 -20");
+  write("long.ma", scene);
+  const auto result = run({"export", "long.ma", "-o", "long.csv"});
+  EXPECT_EQ(result.status, 1);
+  EXPECT_THAT(result.err, HasSubstr("MA1106"));
+  EXPECT_EQ(run({"export", "long.ma", "-o", "long.csv", "--frames", "11:12", "--quiet"}).status, 0);
+}
+
+TEST_F(ExportCommandTest, KeysBetweenFramesAreAWarning) {
+  write("shot.ma", rig("cm"));
+  const std::vector<std::string> words = {"export", "--bake", "--step", "0.5", "shot.ma", "-o", "shot.csv"};
+  const auto result = run(words);
+  EXPECT_EQ(result.status, 0);
+  EXPECT_THAT(result.err, HasSubstr("MA1107"));
+  std::vector<std::string> strict = words;
+  strict.emplace_back("--strict");
+  EXPECT_EQ(run(strict).status, 1);
+}
+
+}  // namespace

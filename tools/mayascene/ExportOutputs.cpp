@@ -1,0 +1,50 @@
+#include "tools/mayascene/ExportOutputs.h"
+
+#include <algorithm>
+#include <filesystem>
+
+#include "export/SafeNames.h"
+#include "tools/mayascene/BakeOutputs.h"
+
+namespace mayascene {
+
+namespace fs = std::filesystem;
+
+std::ostream* ExportFiles::Main() {
+  main_ = OutputFile::open(place_, &failure_);
+  if (main_ == nullptr) return nullptr;
+  written_.push_back(place_);
+  return &main_->stream();
+}
+
+std::ostream* ExportFiles::Beside(std::string_view stem, std::string_view suffix, std::string* name) {
+  if (place_ == kStandardOutput) {
+    failure_ = "it is written as more than one file, which standard output cannot take";
+    return nullptr;
+  }
+  const fs::path folder = fs::path(place_).parent_path();
+  fs::path place;
+  for (int number = 1;; ++number) {
+    *name = std::string(stem) + (number == 1 ? "" : '_' + std::to_string(number)) + std::string(suffix);
+    place = folder / *name;
+    if (taken_->outputs.insert(interchange::Lowered(place.lexically_normal().string())).second) break;
+  }
+  const auto same = [&](const std::string& one) { return isSameFile(place, one); };
+  if (std::any_of(taken_->untouchable.begin(), taken_->untouchable.end(), same)) {
+    failure_ = place.string() + " is a scene or the report, and would be overwritten";
+    return nullptr;
+  }
+  auto output = OutputFile::open(place.string(), &failure_);
+  if (output == nullptr) return nullptr;
+  written_.push_back(place.string());
+  return &beside_.emplace_back(std::move(output))->stream();
+}
+
+bool ExportFiles::commit() {
+  for (const auto& output : beside_) {
+    if (!output->commit(&failure_)) return false;
+  }
+  return main_ == nullptr || main_->commit(&failure_);
+}
+
+}  // namespace mayascene

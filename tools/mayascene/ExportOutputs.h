@@ -1,0 +1,48 @@
+// The files of one exported scene.
+#pragma once
+
+#include <memory>
+#include <set>
+#include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
+
+#include "export/Format.h"
+#include "tools/mayascene/OutputFile.h"
+
+namespace mayascene {
+
+// What the files of a run keep off: scenes and a report are never written over, and no two outputs share a
+// file.
+struct TakenFiles {
+  std::vector<std::string> untouchable;
+  std::set<std::string> outputs;  // without regard to case
+};
+
+class ExportFiles : public interchange::Files {
+ public:
+  // `place` is the main output's, or "-". The taken files outlive the object.
+  ExportFiles(std::string place, TakenFiles* taken) : place_(std::move(place)), taken_(taken) {}
+
+  std::ostream* Main() override;
+  std::ostream* Beside(std::string_view stem, std::string_view suffix, std::string* name) override;
+
+  // Puts all of them where they belong, the main one last. What is not committed leaves nothing.
+  bool commit();
+
+  const std::string& failure() const { return failure_; }  // why an output cannot be made or committed
+  const std::vector<std::string>& written() const { return written_; }
+
+ private:
+  std::ostream* open(const std::string& place);
+
+  std::string place_;
+  TakenFiles* taken_;
+  std::unique_ptr<OutputFile> main_;
+  std::vector<std::unique_ptr<OutputFile>> beside_;
+  std::vector<std::string> written_;
+  std::string failure_;
+};
+
+}  // namespace mayascene

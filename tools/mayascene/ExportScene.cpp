@@ -1,0 +1,235 @@
+#include "tools/mayascene/ExportScene.h"
+
+#include <algorithm>
+#include <cmath>
+#include <map>
+#include <memory>
+#include <string>
+#include <unordered_map>
+#include <utility>
+#include <vector>
+
+#include "check/PointsPerUnit.h"
+#include "hostapi/CameraSuite.h"
+#include "hostapi/LayerStreams.h"
+#include "scene/Units.h"
+#include "tools/mayascene/Quantities.h"
+#include "tools/mayascene/StreamWords.h"
+
+namespace mayascene {
+namespace {
+
+using interchange::Channel;
+
+constexpr double kMetresPerCentimetre = 0.01;
+constexpr double kMillimetresPerPoint = 25.4 / 72.0;
+constexpr double kDefaultFilmWidth = 36.0;  // millimetres; it changes no picture
+constexpr double kFrameTolerance = 1e-6;
+
+double quotientOf(const HostRatio& ratio) {
+  return static_cast<double>(ratio.numerator) / static_cast<double>(ratio.denominator);
+}
+
+// One composition on its way into a description.
+class Describer {
+ public:
+  Describer(const refhost::Composition& inner, const DescriptionOptions& options, double unitsPerPoint,
+            interchange::Composition* made)
+      : inner_(inner), options_(options), made_(*made), length_(unitsPerPoint * options.scale) {}
+
+  // `offset`: the frame of the composition that is the first to be described.
+  void run(double offset, diag::Collector* diagnostics) {
+    offset_ = offset;
+    std::unordered_map<const refhost::Layer*, std::size_t> places;
+    for (const refhost::Layer* layer : inner_.layers) {
+      if (layer->kind == refhost::LayerKind::Composition) continue;
+      places.emplace(layer, made_.layers.size());
+      betweenFrames_ = 0;
+      made_.layers.push_back(layerOf(*layer));
+      if (betweenFrames_ != 0) {
+        diagnostics->Report(diag::Code::ExportKeysBetweenFrames, {},
+                            {layer->name, std::to_string(betweenFrames_)});
+      }
+    }
+    for (const auto& [layer, place] : places) {
+      const auto parent = places.find(layer->parent);
+      if (parent != places.end()) made_.layers[place].parent = parent->second;
+    }
+  }
+
+ private:
+  // Y and Z point the other way in the host.
+  double sign(std::size_t axis) const {
+    return axis != 0 && options_.axes == interchange::Axes::Scene ? -1.0 : 1.0;
+  }
+
+  // The factors from a stream's components to the description's.
+  double factor(std::int32_t stream, std::size_t component) const {
+    switch (stream) {
+      case HOST_STREAM_ANCHOR_POINT:
+      case HOST_STREAM_POSITION:
+        return sign(component) * length_;
+      case HOST_STREAM_SCALE:
+        return 0.01;
+      case HOST_STREAM_ROTATION_Y:
+      case HOST_STREAM_ROTATION_Z:
+        return sign(1);
+      default:
+        return 1.0;
+    }
+  }
+
+  // A per cent is divided: a hundred of them come out as 1.
+  double converted(std::int32_t stream, std::size_t component, double value) const {
+    return stream == HOST_STREAM_SCALE ? value / 100.0 : value * factor(stream, component);
+  }
+
+  Channel::Places placesOf(const refhost::KeyTimes& times) {
+    const std::vector<T_Time>& row = times;
+    Channel::Places& places = places_[&row];
+    if (places) return places;
+    std::vector<double> frames;
+    frames.reserve(row.size());
+    for (const T_Time& time : row) {
+      const double frame = framesAt(time, inner_.frameRate) - offset_;
+      const double whole = std::nearbyint(frame);
+      frames.push_back(std::fabs(frame - whole) < kFrameTolerance ? whole : frame);
+    }
+    return places = std::make_shared<const std::vector<double>>(std::move(frames));
+  }
+
+  // Whether there is a key at each frame of the description and nowhere else.
+  bool areAllFrames(const std::vector<double>& places) const {
+    if (places.size() != made_.frames) return false;
+    for (std::size_t i = 0; i < places.size(); ++i) {
+      if (places[i] != static_cast<double>(i)) return false;
+    }
+    return true;
+  }
+
+  Channel channelOf(const refhost::Stream& stream, std::size_t component) {
+    if (stream.keyCount() == 0 || options_.keys) {
+      return converted(stream.id, component, stream.value[component]);
+    }
+    const auto dimension = static_cast<std::size_t>(stream.dimension);
+    const std::vector<double>& from = stream.keys->values;
+    const auto value = [&](std::size_t key) {
+      return converted(stream.id, component, from[key * dimension + component]);
+    };
+    const double first = value(0);
+    std::size_t same = 1;
+    while (same < stream.keyCount() && value(same) == first) ++same;
+    if (same == stream.keyCount()) return first;
+    std::vector<double> values;
+    values.reserve(stream.keyCount());
+    for (std::size_t key = 0; key < stream.keyCount(); ++key) values.push_back(value(key));
+    const Channel::Places places = placesOf(stream.keys->times);
+    if (areAllFrames(*places)) return Channel(std::move(values));
+    countBetween(*places);
+    return Channel(places, std::move(values));
+  }
+
+  void countBetween(const std::vector<double>& places) {
+    const auto between = std::count_if(places.begin(), places.end(),
+                                       [](double place) { return place != std::nearbyint(place); });
+    betweenFrames_ = std::max(betweenFrames_, static_cast<std::size_t>(between));
+  }
+
+  void take(const refhost::Layer& layer, std::int32_t id, Channel* channels, std::size_t count) {
+    const refhost::Stream* const stream = layer.findStream(id);
+    if (stream == nullptr) return;
+    for (std::size_t i = 0; i < count; ++i) channels[i] = channelOf(*stream, i);
+  }
+
+  interchange::Lens lensOf(const refhost::Layer& layer) {
+    interchange::Lens lens;
+    take(layer, HOST_STREAM_ZOOM, &lens.zoom, 1);
+    const double film = layer.filmSize * kMillimetresPerPoint;
+    const double aspect = made_.height / made_.width;
+    if (layer.filmDirection == HOST_FILM_HORIZONTAL) {
+      lens.filmWidth = film;
+    } else {
+      lens.filmWidth = layer.filmDirection == HOST_FILM_VERTICAL ? film / aspect : kDefaultFilmWidth;
+    }
+    lens.filmHeight = lens.filmWidth * aspect;
+    return lens;
+  }
+
+  interchange::Layer layerOf(const refhost::Layer& layer) {
+    interchange::Layer made;
+    made.name = layer.name;
+    take(layer, HOST_STREAM_POSITION, made.position, 3);
+    take(layer, HOST_STREAM_ROTATION_X, &made.rotation[0], 1);
+    take(layer, HOST_STREAM_ROTATION_Y, &made.rotation[1], 1);
+    take(layer, HOST_STREAM_ROTATION_Z, &made.rotation[2], 1);
+    take(layer, HOST_STREAM_SCALE, made.scale, 3);
+    if (options_.keys) takeKeys(layer, &made.keys);
+    if (layer.kind != refhost::LayerKind::Camera) return made;
+    made.kind = interchange::LayerKind::Camera;
+    made.aimed = layer.aimed;
+    if (made.aimed) take(layer, HOST_STREAM_ANCHOR_POINT, made.interest, 3);
+    made.lens = lensOf(layer);
+    return made;
+  }
+
+  void takeKeys(const refhost::Layer& layer, std::vector<interchange::StreamKeys>* lists) {
+    for (const StreamWords& words : kStreamWords) {
+      const refhost::Stream* const stream = layer.findStream(words.id);
+      if (stream == nullptr || stream->keyCount() == 0) continue;
+      interchange::StreamKeys list;
+      list.stream = layer.kind == refhost::LayerKind::Camera ? words.cameraName : words.name;
+      list.components = static_cast<std::size_t>(stream->dimension);
+      const Channel::Places places = placesOf(stream->keys->times);
+      for (std::size_t key = 0; key < places->size(); ++key) {
+        const double place = (*places)[key];
+        if (options_.frames && (place < 0.0 || made_.firstFrame + place > options_.frames->last)) continue;
+        list.frames.push_back(made_.firstFrame + place);
+        for (std::size_t i = 0; i < list.components; ++i) {
+          list.values.push_back(converted(stream->id, i, stream->keys->values[key * list.components + i]));
+        }
+      }
+      lists->push_back(std::move(list));
+    }
+  }
+
+  const refhost::Composition& inner_;
+  const DescriptionOptions& options_;
+  interchange::Composition& made_;
+  double length_;
+  double offset_ = 0.0;
+  std::size_t betweenFrames_ = 0;
+  std::map<const std::vector<T_Time>*, Channel::Places> places_;
+};
+
+}  // namespace
+
+std::optional<interchange::Composition> describe(const refhost::Folder& folder, const SceneNumbers& numbers,
+                                                 std::int32_t linearUnits, const DescriptionOptions& options,
+                                                 diag::Collector* diagnostics) {
+  // Where there are two, the first holds the layers and the second one shows it.
+  const refhost::Composition& inner = *folder.compositions.front();
+  interchange::Composition made;
+  made.name = inner.name;
+  made.width = inner.width;
+  made.height = inner.height;
+  made.pixelAspect = quotientOf(folder.compositions.back()->pixelAspect);
+  made.framesPerSecond = quotientOf(inner.frameRate);
+  made.metersPerUnit = scene::LinearUnitOf(numbers.linearUnit).value_or(1.0) * kMetresPerCentimetre;
+  made.axes = options.axes;
+
+  const double start = numbers.firstFrame.value_or(1.0);
+  made.firstFrame = options.frames ? options.frames->first : start;
+  const double last = options.frames ? options.frames->last : numbers.lastFrame.value_or(start);
+  const double frames = std::floor(last - made.firstFrame + kFrameTolerance) + 1.0;
+  if (!(frames <= (options.frames ? kMostFrames : kMostFramesUnasked))) {
+    diagnostics->Report(diag::Code::ExportTooManyFrames, {}, {numberText(made.firstFrame), numberText(last)});
+    return std::nullopt;
+  }
+  made.frames = options.keys ? 1 : std::max<std::size_t>(1, static_cast<std::size_t>(std::max(frames, 1.0)));
+
+  const double unitsPerPoint = linearUnits == 0 ? 1.0 : 1.0 / check::PointsPerUnit(numbers.linearUnit);
+  Describer(inner, options, unitsPerPoint, &made).run(made.firstFrame - start, diagnostics);
+  return made;
+}
+
+}  // namespace mayascene

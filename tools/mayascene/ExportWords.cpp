@@ -1,0 +1,104 @@
+#include "tools/mayascene/ExportWords.h"
+
+#include <algorithm>
+#include <charconv>
+#include <cmath>
+#include <vector>
+
+#include "export/Format.h"
+#include "tools/mayascene/HostWords.h"
+
+namespace mayascene {
+namespace {
+
+std::vector<std::string> formatNames() {
+  std::vector<std::string> names;
+  for (const interchange::Format& format : interchange::Formats()) names.emplace_back(format.name);
+  return names;
+}
+
+// The formats, a line each, as help shows them.
+std::string formatLines() {
+  constexpr std::size_t kColumn = 6;
+  std::string text = "Formats:";
+  for (const interchange::Format& format : interchange::Formats()) {
+    std::string name(format.name);
+    name.resize(std::max(kColumn, name.size() + 1), ' ');
+    text += "\n  " + name + std::string(format.sentence);
+  }
+  return text;
+}
+
+double scaleOf(const std::string& text) {
+  constexpr double kSmallest = 1e-9, kLargest = 1e9;
+  double scale = 0.0;
+  const auto read = std::from_chars(text.data(), text.data() + text.size(), scale);
+  const bool whole = read.ec == std::errc() && read.ptr == text.data() + text.size();
+  if (!whole || !(scale >= kSmallest && scale <= kLargest)) {
+    throw CLI::ValidationError("--scale", text + ": a scale is a number between 1e-9 and 1e9");
+  }
+  return scale;
+}
+
+// What a format does not take. Of no format: the output has no suffix that names one.
+void checkFormat(const ExportArguments& arguments) {
+  const interchange::Format* format = arguments.format;
+  if (format == nullptr) format = interchange::FormatOfPath(arguments.output);
+  if (format == nullptr) {
+    throw CLI::ValidationError("--format",
+                               arguments.output + " ends as none of the formats does; name one with -f");
+  }
+  const std::string name(format->name);
+  if (format->ownAxes && arguments.axes) {
+    throw CLI::ValidationError("--axes", name + " has axes of its own");
+  }
+  if (!format->listsKeys && arguments.keys) {
+    throw CLI::ValidationError("--keys", name + " has values at frames; a list of keys is for csv");
+  }
+}
+
+}  // namespace
+
+void addExportOptions(CLI::App* verb, ExportWords* words, ExportArguments* arguments) {
+  verb->add_option("-o,--output", arguments->output, "the file; with several scenes a folder for them")
+      ->required()
+      ->option_text("OUT");
+  verb->add_option("-f,--format", words->format, "the format (that of OUT's suffix): see below")
+      ->option_text("FORMAT")
+      ->check(CLI::IsMember(formatNames()));
+  verb->add_option("--scale", words->scale, "multiplies all lengths (1)")->option_text("N");
+  verb->add_option("--axes", words->axes,
+                   "scene (y up, cameras look along -z; this is the\ndefault) or host (y down, along +z)")
+      ->option_text("AXES")
+      ->check(CLI::IsMember({"scene", "host"}));
+  verb->add_flag("--keys", arguments->keys, "a list of keys instead of frames, in csv");
+  verb->add_flag("-q,--quiet", arguments->quiet, "print nothing but errors");
+  verb->add_flag("--bake", words->bakes, "bake each scene first: see mayascene bake");
+  addUnits(verb, &arguments->host);
+  addLimits(verb, &arguments->host);
+  addBakeOptions(verb, &words->bake, "With --bake");
+  verb->get_option("--frames")
+      ->description("the frames to write (the first to the last key, or\nall of the bake)")
+      ->group("Options");
+  verb->get_option("--strict")->group("Options");
+  verb->footer(formatLines());
+}
+
+void translateExportWords(const CLI::App& verb, const ExportWords& words, ExportArguments* arguments) {
+  if (!words.bakes) {
+    for (const std::string& given : givenBakeOptions(verb)) {
+      if (given != "--frames" && given != "--strict") throw CLI::ValidationError(given, "goes with --bake");
+    }
+  }
+  if (!words.format.empty()) arguments->format = interchange::FindFormat(words.format);
+  if (!words.scale.empty()) arguments->scale = scaleOf(words.scale);
+  if (!words.axes.empty()) {
+    arguments->axes = words.axes == "host" ? interchange::Axes::Host : interchange::Axes::Scene;
+  }
+  if (!words.bake.frames.empty()) arguments->frames = framesOf(words.bake.frames);
+  if (words.bakes) translateBakeWords(words.bake, &arguments->bake.emplace());
+  arguments->strict = words.bake.strict;
+  checkFormat(*arguments);
+}
+
+}  // namespace mayascene
