@@ -76,8 +76,9 @@ def _pixel_limit(composition, camera, frame, depth, precision, usual):
 
 def compare(composition, measured, names, to_program, precision,
             scale_of_picture=(1.0, 1.0), lens_at=None):
-    """`names` maps a layer's number to the program's name for it. `measured`
-    is {frame: {name: {"world": rows, "projection": rows or None}}}.
+    """`names` maps the number of each layer that a format has to the
+    program's name for it. `measured` is
+    {frame: {name: {"world": rows, "projection": rows or None}}}.
 
     `scale_of_picture` is the part of the composition's width and height that
     the program's picture shows: of two nested compositions the outer one is
@@ -91,7 +92,9 @@ def compare(composition, measured, names, to_program, precision,
               for camera in composition.cameras()}
     for frame, layers in sorted(measured.items()):
         for layer in composition.layers:
-            found = layers.get(names.get(layer.number))
+            if layer.number not in names:
+                continue
+            found = layers.get(names[layer.number])
             if found is None:
                 result.fail(f'"{layer.name}" is missing at frame {frame}')
                 continue

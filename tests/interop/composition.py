@@ -191,6 +191,10 @@ class Composition:
     def zoom(self, camera, frame):
         return camera.streams["zoom"].at(frame / self.rate)[0]
 
+    def lens_moves(self, camera):
+        return len({self.zoom(camera, frame)
+                    for frame in self.frames()}) > 1
+
     def view(self, camera, frame):
         return View(self, camera, frame)
 

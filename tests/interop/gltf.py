@@ -81,15 +81,13 @@ def worst_lens(composition, path):
         if not layer.camera:
             continue
         angle = fields_of_view(document, buffer, cameras[index])
-        zooms = set()
         for frame in composition.frames():
             seconds = start + (frame - composition.start) / composition.rate
             wanted = composition.zoom(layer, frame)
-            zooms.add(wanted)
             half = composition.height / 2
             found = half / math.tan(angle(seconds) / 2)
             worst = max(worst, abs(half * found / wanted - half))
-        moving += len(zooms) > 1
+        moving += composition.lens_moves(layer)
     return worst, moving
 
 

@@ -12,10 +12,12 @@ import addon_test
 import addon_update_test
 import assimp
 import blender
+import chan_test
 import exports
 import gltf_test
 import node
 import scenes
+import usd_test
 from table import Row, summary_of, table_of
 
 
@@ -75,17 +77,24 @@ def _addon(run):
             lens, run.tool, _ADDONS, run.folder)]
 
 
+def _exported(run, suffix):
+    return {scene.name: exports.export(run.tool, scene, suffix, run.folder)
+            for scene in run.scenes}
+
+
+def _remark_lens(run, format_name, found):
+    worst, moving, problems = found
+    run.problems += problems
+    run.remarks.append(f"{format_name}: lenses that move: {moving}; the edge "
+                       f"of the picture is at most {worst:.1e} px off")
+
+
 def _gltf(run):
-    gltf, glb = ({scene.name: exports.export(run.tool, scene, suffix,
-                                             run.folder)
-                  for scene in run.scenes} for suffix in (".gltf", ".glb"))
+    gltf, glb = _exported(run, ".gltf"), _exported(run, ".glb")
     run.problems += gltf_test.validator_problems(
         [*gltf.values(), *glb.values()])
-    worst, moving, problems = gltf_test.lens_problems(run.scenes, gltf)
-    run.problems += problems
-    run.remarks.append(
-        f"glTF: {moving} lenses move, the edge of the picture is at most "
-        f"{worst:.1e} px off; {2 * len(gltf)} files go to the validator")
+    run.remarks.append(f"glTF: {2 * len(gltf)} files go to the validator")
+    _remark_lens(run, "glTF", gltf_test.lens_problems(run.scenes, gltf))
     ways = ((f".gltf, Blender {blender.version()}",
              gltf_test.through_blender, gltf),
             (f".glb, three {node.version_of('three')}",
@@ -97,10 +106,27 @@ def _gltf(run):
             run.take(scene, through, result)
 
 
+def _usd(run):
+    files = _exported(run, ".usda")
+    _remark_lens(run, "USD", usd_test.lens_problems(run.scenes, files))
+    through = f".usda, three {node.version_of('three')}"
+    for scene, result in usd_test.through_three(run.scenes, files,
+                                                run.folder):
+        run.take(scene, through, result)
+
+
+def _chan(run):
+    files = _exported(run, ".chan")
+    through = f".chan, Blender {blender.version()}"
+    for scene, result in chan_test.through_blender(run.scenes, files,
+                                                   run.folder):
+        run.take(scene, through, result)
+
+
 _FAILURES = (assimp.AssimpFailed, blender.BlenderFailed,
              exports.ExportFailed, node.NodeFailed)
 
-_PARTS = {"addon": _addon, "gltf": _gltf}
+_PARTS = {"addon": _addon, "gltf": _gltf, "usd": _usd, "chan": _chan}
 
 
 def main():

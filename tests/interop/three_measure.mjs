@@ -1,8 +1,9 @@
-// What three shows of .glb files at each frame. Its one argument is a JSON file of jobs: a file, the frames with their
-// seconds, and where to write.
+// What three shows of .glb and .usda files at each frame. Its one argument is a JSON file of jobs: a file, the frames
+// with their seconds, and where to write.
 import { readFileSync, writeFileSync } from 'node:fs';
 import { AnimationMixer, LoopOnce } from 'three';
 import { GLTFLoader } from 'three/examples/jsm/loaders/GLTFLoader.js';
+import { USDLoader } from 'three/examples/jsm/loaders/USDLoader.js';
 
 function rows(matrix) {
   const e = matrix.elements;
@@ -18,6 +19,14 @@ async function loadGltf(file) {
     if (place.nodes !== undefined && object.isObject3D) named.set(`layer${place.nodes}`, object);
   }
   return { root: loaded.scene, clips: loaded.animations, named };
+}
+
+// Prims have names that stand once in a file.
+function loadUsd(file) {
+  const root = new USDLoader().parse(readFileSync(file, 'utf8'));
+  const named = new Map();
+  root.traverse((object) => named.set(object.name, object));
+  return { root, clips: root.animations, named };
 }
 
 function measure(loaded, frames) {
@@ -47,6 +56,6 @@ function measure(loaded, frames) {
 }
 
 for (const job of JSON.parse(readFileSync(process.argv[2], 'utf8'))) {
-  const loaded = await loadGltf(job.file);
+  const loaded = job.file.endsWith('.usda') ? loadUsd(job.file) : await loadGltf(job.file);
   writeFileSync(job.output, JSON.stringify({ frames: measure(loaded, job.frames) }));
 }
