@@ -18,6 +18,7 @@ import gltf_test
 import node
 import scenes
 import usd_test
+import usda
 from table import Row, summary_of, table_of
 
 
@@ -124,7 +125,7 @@ def _chan(run):
 
 
 _FAILURES = (assimp.AssimpFailed, blender.BlenderFailed,
-             exports.ExportFailed, node.NodeFailed)
+             exports.ExportFailed, node.NodeFailed, usda.NoUsda)
 
 _PARTS = {"addon": _addon, "gltf": _gltf, "usd": _usd, "chan": _chan}
 

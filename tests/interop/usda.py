@@ -9,6 +9,10 @@ _TOKEN = re.compile(r'\s+|#[^\n]*|"(?:[^"\\]|\\.)*"|[][{}()=,:]'
 _BRACKETS = {"(": ")", "[": "]", "{": "}"}
 
 
+class NoUsda(Exception):
+    pass
+
+
 class Prim:
     def __init__(self, kind, prim, above):
         self.kind = kind
@@ -141,4 +145,8 @@ def _text(token):
 
 def read(path):
     with open(path, encoding="utf-8") as file:
-        return _Reader(file.read()).stage()
+        text = file.read()
+    try:
+        return _Reader(text).stage()
+    except (ValueError, IndexError) as failure:
+        raise NoUsda(f"{path}: {failure}") from failure
