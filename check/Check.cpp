@@ -86,7 +86,8 @@ void CheckScene(std::string_view text, const CameOver& cameOver, diag::Collector
   *head = ReadHead(scene, settings, cameOver, cameras, collector->lines());
   const motion::Measures measures = motion::MeasuresOf(scene);
   const std::vector<Link> links = FindLinks(scene, cameras);
-  const Subject subject{scene, settings, measures, cameOver, cameras, links, *collector};
+  Channels channels(scene);
+  const Subject subject{scene, settings, measures, cameOver, cameras, links, channels, *collector};
   if (cameOver.stop == Stop::UnequalKeys) ReportKeyCounts(subject);
   for (const auto rule :
        {ReportLostCameras, ReportLostParents, ReportLostChannels, ReportLostLookAts, ReportNames,

@@ -1,11 +1,14 @@
 #include "check/Curves.h"
 
+#include <array>
 #include <cmath>
 
 #include "check/Cameras.h"
 
 namespace check {
 namespace {
+
+constexpr std::array<std::string_view, 1> kFocalLength = {"focalLength"};
 
 void TakeInTime(double time, KeyedChannel* channel) {
   if (channel->keys == 0) channel->first = time;
@@ -42,16 +45,31 @@ bool IsPath(const scene::Scene& scene, const diag::Range& plug) {
          text.substr(0, text.find('.')).find('|') != std::string_view::npos;
 }
 
-std::vector<KeyedChannel> FindKeyedChannels(const scene::Scene& scene, scene::NodeId node,
-                                            std::span<const std::string_view> channels) {
-  std::vector<KeyedChannel> found;
+const Channels::Found& Channels::Of(scene::NodeId node) {
+  static const Found none;
+  if (!scene_.IsDriven(node)) return none;
+  const auto known = places_.find(node);
+  return known != places_.end() ? known->second
+                                : places_.emplace(node, Find(node, scene::kPlaceChannels)).first->second;
+}
+
+std::span<const KeyedChannel> Channels::LensOf(scene::NodeId camera) {
+  const auto known = lenses_.find(camera);
+  return (known != lenses_.end() ? known : lenses_.emplace(camera, Find(camera, kFocalLength)).first)
+      ->second.keyed;
+}
+
+Channels::Found Channels::Find(scene::NodeId node, std::span<const std::string_view> channels) const {
+  Found found;
   for (const std::string_view channel : channels) {
-    const std::optional<scene::Driver> driver = scene.SourceOf(scene.PlugOf(node, channel));
-    if (!driver || !IsImportedCurve(scene.node(driver->plug.node).type)) continue;
-    if (IsPath(scene, driver->connection->destinationPlace)) continue;
+    const std::optional<scene::Driver> driver = scene_.SourceOf({node, channel});
+    if (!driver) continue;
+    found.drivers.push_back({channel, *driver});
+    if (!IsImportedCurve(scene_.node(driver->plug.node).type)) continue;
+    if (IsPath(scene_, driver->connection->destinationPlace)) continue;
     KeyedChannel keyed{.channel = channel, .curve = driver->plug.node, .place = {}};
-    ReadKeys(scene, &keyed);
-    found.push_back(keyed);
+    ReadKeys(scene_, &keyed);
+    found.keyed.push_back(keyed);
   }
   return found;
 }

@@ -4,6 +4,7 @@
 #include <cstddef>
 #include <span>
 #include <string_view>
+#include <unordered_map>
 #include <vector>
 
 #include "scene/Scene.h"
@@ -23,9 +24,39 @@ struct KeyedChannel {
   diag::Range place;        // of the first keys
 };
 
-// In the order of the channels; only curves of times, which a path does not hide from the importer.
-std::vector<KeyedChannel> FindKeyedChannels(const scene::Scene& scene, scene::NodeId node,
-                                            std::span<const std::string_view> channels);
+// What drives one of the channels.
+struct DrivenChannel {
+  std::string_view channel;
+  scene::Driver driver;
+};
+
+// Finds what drives the channels of a node and reads the keys of its curves, once for all rules that ask.
+class Channels {
+ public:
+  explicit Channels(const scene::Scene& scene) : scene_(scene) {}
+
+  // Of the nine channels, in their order. It lasts as long as the object, as the next two do.
+  std::span<const DrivenChannel> DriversOf(scene::NodeId node) { return Of(node).drivers; }
+
+  // The same, but only curves of times, which a path does not hide from the importer.
+  std::span<const KeyedChannel> KeyedOf(scene::NodeId node) { return Of(node).keyed; }
+
+  // Of a camera's focal length: one or none.
+  std::span<const KeyedChannel> LensOf(scene::NodeId camera);
+
+ private:
+  struct Found {
+    std::vector<DrivenChannel> drivers;
+    std::vector<KeyedChannel> keyed;
+  };
+
+  const Found& Of(scene::NodeId node);
+  Found Find(scene::NodeId node, std::span<const std::string_view> channels) const;
+
+  const scene::Scene& scene_;
+  std::unordered_map<scene::NodeId, Found> places_;
+  std::unordered_map<scene::NodeId, Found> lenses_;
+};
 
 // Whether the importer makes a curve of the type.
 bool IsImportedCurve(std::string_view type);

@@ -15,8 +15,7 @@ using scene::NodeId;
 bool ReportUnequal(const Subject& subject, NodeId node) {
   const KeyedChannel* first = nullptr;
   bool reported = false;
-  const std::vector<KeyedChannel> channels = FindKeyedChannels(subject.scene, node, scene::kPlaceChannels);
-  for (const KeyedChannel& channel : channels) {
+  for (const KeyedChannel& channel : subject.channels.KeyedOf(node)) {
     if (channel.keys < 2) continue;
     if (first == nullptr) first = &channel;
     if (channel.keys == first->keys) continue;
@@ -50,7 +49,7 @@ void ReportKeyCounts(const Subject& subject) {
   const NodeId last = LastNode(subject);
   if (last != scene::kNoNode && ReportUnequal(subject, last)) return;
   for (NodeId id = 0; id < subject.scene.nodes().size(); ++id) {
-    if (!subject.scene.ConnectionsInto(id).empty() && ReportUnequal(subject, id)) return;
+    if (ReportUnequal(subject, id)) return;
   }
   ReportOtherStop(subject.scene.text(), subject.cameOver, &subject.diagnostics);
 }

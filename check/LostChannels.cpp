@@ -1,5 +1,4 @@
 // Channels whose motion does not come over.
-#include <array>
 #include <cmath>
 #include <map>
 #include <set>
@@ -16,8 +15,6 @@ namespace {
 
 using diag::Code;
 using scene::NodeId;
-
-constexpr std::array<std::string_view, 1> kFocalLength = {"focalLength"};
 
 std::string_view WrittenAt(const scene::Scene& scene, const diag::Range& range) {
   return scene.text().substr(static_cast<std::size_t>(range.offset), static_cast<std::size_t>(range.length));
@@ -64,11 +61,9 @@ void Add(std::string_view channel, std::string* channels) {
 void ReportDrivers(const Subject& subject, const Link& link) {
   const scene::Scene& scene = subject.scene;
   std::map<NodeId, Driven> drivers;
-  for (const std::string_view channel : scene::kPlaceChannels) {
-    const auto driver = scene.SourceOf(scene.PlugOf(link.node, channel));
-    if (!driver) continue;
-    const std::string_view type = scene.node(driver->plug.node).type;
-    const diag::Range place = driver->connection->destinationPlace;
+  for (const auto& [channel, driver] : subject.channels.DriversOf(link.node)) {
+    const std::string_view type = scene.node(driver.plug.node).type;
+    const diag::Range place = driver.connection->destinationPlace;
     if (IsImportedCurve(type)) {
       if (IsPath(scene, place))
         subject.diagnostics.Report(Code::ConnectionToPath, place, {WrittenAt(scene, place)});
@@ -76,7 +71,7 @@ void ReportDrivers(const Subject& subject, const Link& link) {
     }
     // Of a camera's look-at its own rule says what became of it.
     if (link.own && link.ofCamera && IsLookAt(type) && channel.starts_with("rotate")) continue;
-    Driven& driven = drivers.try_emplace(driver->plug.node, Driven{{}, place}).first->second;
+    Driven& driven = drivers.try_emplace(driver.plug.node, Driven{{}, place}).first->second;
     Add(channel, &driven.channels);
   }
   for (const auto& [id, driven] : drivers) {
@@ -92,7 +87,7 @@ void ReportDrivers(const Subject& subject, const Link& link) {
 void ReportOneKey(const Subject& subject, const Link& link) {
   std::string channels;
   diag::Range place;
-  for (const KeyedChannel& keyed : FindKeyedChannels(subject.scene, link.node, scene::kPlaceChannels)) {
+  for (const KeyedChannel& keyed : subject.channels.KeyedOf(link.node)) {
     if (keyed.keys > 1) return;
     const double stored = subject.scene.Number(link.node, keyed.channel).value_or(0.0);
     if (keyed.keys == 0 || std::fabs(stored - keyed.firstValue) <= 1e-9 * (1.0 + std::fabs(stored))) continue;
@@ -105,7 +100,7 @@ void ReportOneKey(const Subject& subject, const Link& link) {
 
 void ReportFocalLength(const Subject& subject, NodeId camera) {
   const scene::Scene& scene = subject.scene;
-  const auto driver = scene.SourceOf(scene.PlugOf(camera, kFocalLength[0]));
+  const auto driver = scene.SourceOf(scene.PlugOf(camera, "focalLength"));
   if (!driver) return;
   const scene::Node& source = scene.node(driver->plug.node);
   const diag::Range place = driver->connection->destinationPlace;

@@ -1,13 +1,17 @@
 // Names that are one for the importer, or none.
 #include <algorithm>
 #include <array>
+#include <cstddef>
+#include <cstdint>
+#include <deque>
 #include <string>
 #include <string_view>
-#include <unordered_map>
 #include <utility>
+#include <vector>
 
 #include "check/ReadingEnd.h"
 #include "check/RulesInternal.h"
+#include "scene/FlatMap.h"
 
 namespace check {
 namespace {
@@ -38,48 +42,72 @@ List ListOf(const scene::Node& node) {
   return found == kTypes.end() ? List::None : found->second;
 }
 
-std::string Lowered(std::string_view name) {
-  std::string lowered(name);
-  for (char& c : lowered) c = c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
-  return lowered;
-}
-
 // The names that decide how a camera or a null comes over: of what stands above it, and of what drives that.
-std::unordered_map<std::string, std::string_view> NamesThatCount(const Subject& subject) {
-  std::unordered_map<std::string, std::string_view>
-      names;  // without case: the first one of the file, when met
-  const auto add = [&](NodeId id) {
-    names.emplace(Lowered(ImportName(subject.scene, subject.scene.node(id))), "");
-  };
-  const auto addWithDrivers = [&](NodeId id) {
-    add(id);
-    for (const scene::Connection* const connection : subject.scene.ConnectionsInto(id))
-      add(connection->source.node);
-  };
-  for (const Camera& camera : subject.cameras) {
-    if (camera.taken) addWithDrivers(camera.shape);
+class NamesThatCount {
+ public:
+  explicit NamesThatCount(const Subject& subject) {
+    const auto add = [&](NodeId id) {
+      const std::string_view name = ImportName(subject.scene, subject.scene.node(id));
+      if (!name.empty()) Add(name);
+    };
+    const auto addWithDrivers = [&](NodeId id) {
+      add(id);
+      for (const scene::Connection* const connection : subject.scene.ConnectionsInto(id))
+        add(connection->source.node);
+    };
+    for (const Camera& camera : subject.cameras) {
+      if (camera.taken) addWithDrivers(camera.shape);
+    }
+    for (const Link& link : subject.links) addWithDrivers(link.node);
   }
-  for (const Link& link : subject.links) addWithDrivers(link.node);
-  names.erase("");
-  return names;
-}
+
+  // Takes in a node of the list. The name of the one that had the name before it; empty where none had, and
+  // where the name does not count.
+  std::string_view Meet(List list, std::string_view name) {
+    const std::uint32_t* const number = numbers_.Find(0, Lowered(name));
+    if (number == nullptr) return {};
+    std::string_view& first = met_[*number - 1][static_cast<std::size_t>(list)];
+    if (!first.empty()) return first;
+    first = name;
+    return {};
+  }
+
+ private:
+  static constexpr std::size_t kLists = 5;
+
+  // The name without case. Until the next call: every node of a scene is looked at, and none needs memory of
+  // its own.
+  std::string_view Lowered(std::string_view name) {
+    lowered_.assign(name);
+    for (char& c : lowered_) c = c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
+    return lowered_;
+  }
+
+  void Add(std::string_view name) {
+    if (numbers_.Find(0, Lowered(name)) != nullptr) return;
+    met_.emplace_back();
+    const auto number = static_cast<std::uint32_t>(met_.size());
+    numbers_.At(0, names_.emplace_back(lowered_)) = number;
+  }
+
+  std::string lowered_;
+  std::deque<std::string> names_;  // without case
+  scene::FlatMap<std::uint32_t> numbers_;
+  std::vector<std::array<std::string_view, kLists>> met_;  // by number and list, the first one of the file
+};
 
 void ReportNamesakes(const Subject& subject) {
-  std::unordered_map<std::string, std::string_view> counting = NamesThatCount(subject);
-  std::unordered_map<std::string, std::string_view> met;
+  NamesThatCount names(subject);
   for (const scene::Node& node : subject.scene.nodes()) {
     const List list = ListOf(node);
-    const std::string_view name = ImportName(subject.scene, node);
-    if (list == List::None || name.empty()) continue;
-    std::string key = Lowered(name);
-    if (!counting.contains(key)) continue;
-    key += static_cast<char>('0' + static_cast<int>(list));
-    const auto [first, added] = met.emplace(std::move(key), name);
-    if (added) continue;
-    if (first->second == name) {
+    const std::string_view name = list == List::None ? "" : ImportName(subject.scene, node);
+    if (name.empty()) continue;
+    const std::string_view first = names.Meet(list, name);
+    if (first.empty()) continue;
+    if (first == name) {
       subject.diagnostics.Report(Code::SameNames, node.place, {name});
     } else {
-      subject.diagnostics.Report(Code::NamesDifferInCase, node.place, {first->second, name});
+      subject.diagnostics.Report(Code::NamesDifferInCase, node.place, {first, name});
     }
   }
 }

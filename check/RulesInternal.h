@@ -7,6 +7,7 @@
 
 #include "check/CameOver.h"
 #include "check/Cameras.h"
+#include "check/Curves.h"
 #include "check/Links.h"
 #include "diag/Collector.h"
 #include "motion/Measures.h"
@@ -22,6 +23,7 @@ struct Subject {
   const CameOver& cameOver;
   const std::vector<Camera>& cameras;
   const std::vector<Link>& links;
+  Channels& channels;
   diag::Collector& diagnostics;
 };
 

@@ -4,6 +4,7 @@
 #include <cmath>
 #include <numbers>
 #include <optional>
+#include <span>
 #include <string>
 #include <vector>
 
@@ -21,8 +22,6 @@ namespace {
 using diag::Code;
 using scene::NodeId;
 
-constexpr std::array<std::string_view, 1> kFocalLength = {"focalLength"};
-
 // A time of a composition is a thousand times the frame, in 31 bits.
 constexpr double kLastFrame = 2147483.647;
 
@@ -35,13 +34,12 @@ constexpr std::array<std::string_view, 6> kFrameUnits = {"film", "pal", "ntsc", 
 // The keys of one node as the importer takes them.
 struct NodeKeys {
   NodeId node = scene::kNoNode;
-  std::vector<KeyedChannel> channels;
+  std::span<const KeyedChannel> channels;
   double first = 0.0;  // what its time begins with
 };
 
-std::optional<NodeKeys> KeysOf(const scene::Scene& scene, NodeId node,
-                               std::span<const std::string_view> channels, std::size_t fewest) {
-  NodeKeys keys{node, FindKeyedChannels(scene, node, channels), 0.0};
+std::optional<NodeKeys> KeysOf(NodeId node, std::span<const KeyedChannel> channels, std::size_t fewest) {
+  NodeKeys keys{node, channels, 0.0};
   const auto animated = [fewest](const KeyedChannel& channel) { return channel.keys >= fewest; };
   if (std::none_of(keys.channels.begin(), keys.channels.end(), animated)) return std::nullopt;
   const auto source = std::find_if(keys.channels.begin(), keys.channels.end(),
@@ -112,11 +110,11 @@ void ReportKeys(const Subject& subject, const NodeKeys& keys) {
 // Everything that is keyed above the shape, and its lens.
 std::vector<NodeKeys> ChainKeys(const Subject& subject, const Camera& camera) {
   std::vector<NodeKeys> chain;
-  if (auto lens = KeysOf(subject.scene, camera.shape, kFocalLength, 1)) chain.push_back(std::move(*lens));
+  if (auto lens = KeysOf(camera.shape, subject.channels.LensOf(camera.shape), 1)) chain.push_back(*lens);
   std::size_t length = 0;
   for (NodeId id = camera.transform; id != scene::kNoNode && ++length <= kLongestChain;
        id = subject.scene.node(id).parent) {
-    if (auto keys = KeysOf(subject.scene, id, scene::kPlaceChannels, 2)) chain.push_back(std::move(*keys));
+    if (auto keys = KeysOf(id, subject.channels.KeyedOf(id), 2)) chain.push_back(*keys);
   }
   return chain;
 }
@@ -163,12 +161,13 @@ std::optional<double> LastKey(const Subject& subject, const Camera& camera) {
 
 void ReportTimes(const Subject& subject) {
   for (const Link& link : subject.links) {
-    if (const auto keys = KeysOf(subject.scene, link.node, scene::kPlaceChannels, 2))
+    if (const auto keys = KeysOf(link.node, subject.channels.KeyedOf(link.node), 2))
       ReportKeys(subject, *keys);
   }
   for (const Camera& camera : subject.cameras) {
     if (!camera.taken) continue;
-    if (const auto keys = KeysOf(subject.scene, camera.shape, kFocalLength, 1)) ReportKeys(subject, *keys);
+    if (const auto keys = KeysOf(camera.shape, subject.channels.LensOf(camera.shape), 1))
+      ReportKeys(subject, *keys);
     if (CountsFrames(subject.scene)) ReportStarts(subject, camera);
   }
 }

@@ -27,17 +27,41 @@ class TransformRules {
   TransformRules(const Subject& subject, const Link& link) : subject_(subject), link_(link) {}
 
   void Report() {
-    ReportOrder();
-    ReportFirst(Code::RotateAxisLost, kRotateAxis, 0.0);
-    ReportFirst(Code::ShearLost, kShear, 0.0);
-    ReportFirst(Code::PivotTranslationLost, kPivotTranslations, 0.0);
-    ReportInheritance();
-    ReportScale();
+    const Touched touched = FindTouched();
+    if (touched.order) ReportOrder();
+    if (touched.rotateAxis) ReportFirst(Code::RotateAxisLost, kRotateAxis, 0.0);
+    if (touched.shear) ReportFirst(Code::ShearLost, kShear, 0.0);
+    if (touched.pivotTranslations) ReportFirst(Code::PivotTranslationLost, kPivotTranslations, 0.0);
+    if (touched.inheritance) ReportInheritance();
+    if (touched.scale) ReportScale();
   }
 
  private:
   const scene::Scene& scene() const { return subject_.scene; }
   std::string_view name() const { return scene().node(link_.node).name; }
+
+  // What the file says anything of. Of most nodes that is little, and a look costs less than the rules.
+  struct Touched {
+    bool order = false;
+    bool rotateAxis = false;
+    bool shear = false;
+    bool pivotTranslations = false;
+    bool inheritance = false;
+    bool scale = false;
+  };
+
+  Touched FindTouched() const {
+    Touched touched;
+    scene().ForEachTouched(link_.node, [&](std::string_view attribute) {
+      touched.order |= attribute == "rotateOrder";
+      touched.rotateAxis |= attribute.starts_with("rotateAxis");
+      touched.shear |= attribute.starts_with("shear");
+      touched.pivotTranslations |= attribute.find("PivotTranslate") != std::string_view::npos;
+      touched.inheritance |= attribute == "inheritsTransform";
+      touched.scale |= attribute.starts_with("scale");
+    });
+    return touched;
+  }
 
   // Where the file gives the attribute another value, or has something drive it.
   std::optional<diag::Range> Differs(std::string_view attribute, double neutral) const {

@@ -1,15 +1,27 @@
 #include "diag/Lines.h"
 
 #include <algorithm>
+#include <array>
 #include <cstddef>
+#include <numeric>
 
 namespace diag {
 namespace {
 
 constexpr std::size_t kBlock = 4096;
 
+// Counts in bytes, side by side: a compiler makes vector instructions of it, which it does not of one wide
+// counter. A block is short enough for the bytes to hold.
 std::uint32_t CountLineFeeds(std::string_view text) {
-  return static_cast<std::uint32_t>(std::count(text.begin(), text.end(), '\n'));
+  constexpr std::size_t kLanes = 64;
+  static_assert(kBlock / kLanes < 256);
+  std::array<std::uint8_t, kLanes> lanes{};
+  std::size_t at = 0;
+  for (; at + kLanes <= text.size(); at += kLanes) {
+    for (std::size_t lane = 0; lane < kLanes; ++lane) lanes[lane] += text[at + lane] == '\n';
+  }
+  const auto rest = std::count(text.begin() + static_cast<std::ptrdiff_t>(at), text.end(), '\n');
+  return std::accumulate(lanes.begin(), lanes.end(), static_cast<std::uint32_t>(rest));
 }
 
 // Where the line starts that goes on after the text, counted from the text's first byte.

@@ -4,10 +4,11 @@
 #include <cstddef>
 #include <deque>
 #include <initializer_list>
+#include <map>
 #include <span>
-#include <unordered_map>
 
 #include "scene/AttributeRowsInternal.h"
+#include "scene/FlatMap.h"
 
 namespace scene {
 namespace {
@@ -28,10 +29,7 @@ class AttributeTable {
   AttributeTable(const AttributeTable&) = delete;
   AttributeTable& operator=(const AttributeTable&) = delete;
 
-  const AttributeInfo* Find(std::string_view name) const {
-    const auto found = byName_.find(name);
-    return found == byName_.end() ? nullptr : found->second;
-  }
+  const std::deque<AttributeInfo>& attributes() const { return attributes_; }
 
  private:
   AttributeInfo& Add(const AttributeRow& row) {
@@ -39,8 +37,6 @@ class AttributeTable {
     attribute.longName = row.longName;
     attribute.shortName = row.shortName;
     if (!std::isnan(row.fallback)) attribute.fallback = row.fallback;
-    byName_[attribute.longName] = &attribute;
-    byName_.emplace(attribute.shortName, &attribute);
     return attribute;
   }
 
@@ -61,20 +57,15 @@ class AttributeTable {
   }
 
   std::deque<AttributeInfo> attributes_;  // their addresses stay
-  std::unordered_map<std::string_view, const AttributeInfo*> byName_;
 };
 
-// The tables that a node type has, looked through one after the other. A type is one line of AllTypes.
+// The tables that a node type has; where two have a name, the first counts. A type is one line of AllTypes.
 using TablesOfType = std::vector<const AttributeTable*>;
-using Types = std::unordered_map<std::string_view, TablesOfType>;
-
-const AttributeTable* TransformTable() {
-  static const AttributeTable table(TransformRows());
-  return &table;
-}
+using Types = std::map<std::string_view, TablesOfType>;
 
 Types AllTypes() {
-  const AttributeTable* const transform = TransformTable();
+  static const AttributeTable transformTable(TransformRows());
+  const AttributeTable* const transform = &transformTable;
   static const AttributeTable joint(JointRows()), camera(CameraRows()), stereoCamera(StereoCameraRows());
   static const AttributeTable stereoTransform(StereoTransformRows()), locator(LocatorRows());
   static const AttributeTable constraint(ConstraintRows()), curve(CurveRows());
@@ -118,25 +109,63 @@ Types AllTypes() {
   return types;
 }
 
-// Null where the type is not known.
-const TablesOfType* TablesOf(std::string_view nodeType) {
-  static const Types types = AllTypes();
-  const auto found = types.find(nodeType);
-  return found == types.end() ? nullptr : &found->second;
+// All types and their attributes. Every rule and every line of a scene asks for some.
+class AttributeIndex {
+ public:
+  AttributeIndex() {
+    for (const auto& [type, tables] : AllTypes()) Add(type, tables);
+    unknown_ = NumberOf("transform");
+  }
+
+  TypeNumber NumberOf(std::string_view nodeType) const {
+    const TypeNumber* const found = numbers_.Find(0, nodeType);
+    return found == nullptr ? TypeNumber::Unknown : *found;
+  }
+
+  const AttributeInfo* Find(TypeNumber type, std::string_view name) const {
+    const TypeNumber known = type == TypeNumber::Unknown ? unknown_ : type;
+    const AttributeInfo* const* const found = byName_.Find(static_cast<std::uint64_t>(known), name);
+    return found == nullptr ? nullptr : *found;
+  }
+
+ private:
+  void Add(std::string_view type, const TablesOfType& tables) {
+    const std::uint32_t number = ++count_;
+    numbers_.At(0, type) = TypeNumber{number};
+    // What is written last stays: the first table counts, and in it a long name more than a short one.
+    for (auto table = tables.rbegin(); table != tables.rend(); ++table) {
+      const std::deque<AttributeInfo>& attributes = (*table)->attributes();
+      for (auto at = attributes.rbegin(); at != attributes.rend(); ++at) {
+        byName_.At(number, at->shortName) = &*at;
+      }
+      for (const AttributeInfo& attribute : attributes) byName_.At(number, attribute.longName) = &attribute;
+    }
+  }
+
+  std::uint32_t count_ = 0;
+  TypeNumber unknown_ = TypeNumber::Unknown;  // what stands for a type that is not known
+  FlatMap<TypeNumber> numbers_;
+  FlatMap<const AttributeInfo*> byName_;  // long and short, by the numbers of the types
+};
+
+const AttributeIndex& Index() {
+  static const AttributeIndex index;
+  return index;
 }
 
 }  // namespace
 
-const AttributeInfo* FindAttribute(std::string_view nodeType, std::string_view name) {
-  const TablesOfType* const tables = TablesOf(nodeType);
-  if (tables == nullptr) return TransformTable()->Find(name);
-  for (const AttributeTable* table : *tables) {
-    if (const AttributeInfo* const found = table->Find(name)) return found;
-  }
-  return nullptr;
+TypeNumber TypeNumberOf(std::string_view nodeType) { return Index().NumberOf(nodeType); }
+
+const AttributeInfo* FindAttribute(TypeNumber nodeType, std::string_view name) {
+  return Index().Find(nodeType, name);
 }
 
-bool KeepsAttributes(std::string_view nodeType) { return TablesOf(nodeType) != nullptr; }
+const AttributeInfo* FindAttribute(std::string_view nodeType, std::string_view name) {
+  return FindAttribute(TypeNumberOf(nodeType), name);
+}
+
+bool KeepsAttributes(std::string_view nodeType) { return TypeNumberOf(nodeType) != TypeNumber::Unknown; }
 
 std::string_view TypeOfProgramNode(std::string_view name) {
   if (name == "time1") return "time";

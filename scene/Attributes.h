@@ -25,8 +25,13 @@ struct AttributeInfo {
 inline constexpr std::array<std::string_view, 9> kPlaceChannels = {
     "translateX", "translateY", "translateZ", "rotateX", "rotateY", "rotateZ", "scaleX", "scaleY", "scaleZ"};
 
+// A type of nodes, for many questions about one node. It is cheaper to look up once than by name each time.
+enum class TypeNumber : std::uint32_t { Unknown = 0 };
+TypeNumber TypeNumberOf(std::string_view nodeType);
+
 // The attribute by its long or short name; null where the type has none of the name that is known. Of a type
 // that is not known, what all transforms have: it may be a transform that a plug-in brings.
+const AttributeInfo* FindAttribute(TypeNumber nodeType, std::string_view name);
 const AttributeInfo* FindAttribute(std::string_view nodeType, std::string_view name);
 
 // Whether the type is one whose attributes are kept, all of them. Of other types those are kept that all

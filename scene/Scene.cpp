@@ -42,19 +42,20 @@ Plug Scene::PlugOf(NodeId node, std::string_view attribute) const {
 }
 
 Plug Scene::PlugOf(NodeId node, std::string_view attribute, std::int32_t index) const {
-  if (const AttributeInfo* const info = FindAttribute(nodes_[node].type, attribute)) {
+  if (const AttributeInfo* const info = InfoOf(node, attribute)) {
     return {node, info->longName, index};
   }
   if (const AddedAttribute* const added = Added(node, attribute)) return {node, added->longName, index};
   return {node, attribute, index};
 }
 
+Scene::Form Scene::FormOf(const AttributeInfo& info) {
+  const std::string_view compound = info.compound == nullptr ? std::string_view() : info.compound->longName;
+  return {compound, info.component, std::max<std::size_t>(1, info.components.size())};
+}
+
 Scene::Form Scene::FormOf(NodeId node, std::string_view attribute) const {
-  if (const AttributeInfo* const info = FindAttribute(nodes_[node].type, attribute)) {
-    const std::string_view compound =
-        info->compound == nullptr ? std::string_view() : info->compound->longName;
-    return {compound, info->component, std::max<std::size_t>(1, info->components.size())};
-  }
+  if (const AttributeInfo* const info = InfoOf(node, attribute)) return FormOf(*info);
   const AddedAttribute* const added = Added(node, attribute);
   if (added == nullptr) return {};
   return {added->compound, added->component, std::max<std::size_t>(1, added->components.size())};
@@ -63,7 +64,7 @@ Scene::Form Scene::FormOf(NodeId node, std::string_view attribute) const {
 // The name of a component; empty where the components are not known.
 std::string_view Scene::ComponentOf(NodeId node, std::string_view compound, int component) const {
   const auto place = static_cast<std::size_t>(component);
-  if (const AttributeInfo* const info = FindAttribute(nodes_[node].type, compound)) {
+  if (const AttributeInfo* const info = InfoOf(node, compound)) {
     return place < info->components.size() ? std::string_view(info->components[place]->longName)
                                            : std::string_view();
   }
@@ -79,8 +80,10 @@ Value Scene::ValueOf(const Setting& setting, std::size_t component) const {
 }
 
 std::optional<Value> Scene::Written(NodeId node, std::string_view attribute, std::int32_t index) const {
-  const Plug plug = PlugOf(node, attribute, index);
-  const Form form = FormOf(node, plug.attribute);
+  if (lists_[node].firstSetting == kNone) return std::nullopt;
+  const AttributeInfo* const info = InfoOf(node, attribute);
+  const Plug plug = info != nullptr ? Plug{node, info->longName, index} : PlugOf(node, attribute, index);
+  const Form form = info != nullptr ? FormOf(*info) : FormOf(node, plug.attribute);
   const std::uint32_t own = settingIndex_.Find(settings_, plug);
   const std::uint32_t whole =
       form.compound.empty() ? kNone : settingIndex_.Find(settings_, {node, form.compound, index});
@@ -95,17 +98,12 @@ std::optional<Value> Scene::Written(NodeId node, std::string_view attribute, std
 
 std::vector<std::string_view> Scene::TouchedAttributes(NodeId node) const {
   std::vector<std::string_view> touched;
-  for (std::uint32_t at = lists_[node].firstSetting; at != kNone; at = settings_[at].next) {
-    touched.push_back(settings_[at].attribute);
-  }
-  for (const Connection* const connection : ConnectionsInto(node)) {
-    touched.push_back(connection->destination.attribute);
-  }
+  ForEachTouched(node, [&touched](std::string_view attribute) { touched.push_back(attribute); });
   return touched;
 }
 
 std::optional<double> Scene::Default(NodeId node, std::string_view attribute) const {
-  if (const AttributeInfo* const info = FindAttribute(nodes_[node].type, attribute)) return info->fallback;
+  if (const AttributeInfo* const info = InfoOf(node, attribute)) return info->fallback;
   const AddedAttribute* const added = Added(node, attribute);
   return added == nullptr ? std::nullopt : added->fallback;
 }
@@ -135,6 +133,7 @@ const Connection* Scene::ConnectionTo(const Plug& plug) const {
 }
 
 std::optional<Driver> Scene::SourceOf(const Plug& plug) const {
+  if (!IsDriven(plug.node)) return std::nullopt;
   if (const Connection* const own = ConnectionTo(plug)) return Driver{own->source, -1, own};
   const Form form = FormOf(plug.node, plug.attribute);
   if (form.compound.empty()) return std::nullopt;

@@ -136,11 +136,25 @@ class Scene {
   // often as it is said.
   std::vector<std::string_view> TouchedAttributes(NodeId node) const;
 
+  // Hands each of them to `take`.
+  template <typename Take>
+  void ForEachTouched(NodeId node, Take take) const {
+    for (std::uint32_t at = lists_[node].firstSetting; at != kNone; at = settings_[at].next) {
+      take(settings_[at].attribute);
+    }
+    for (std::uint32_t at = lists_[node].firstInto; at != kNone; at = connectionLinks_[at].nextInto) {
+      take(connections_[at].destination.attribute);
+    }
+  }
+
   // The default alone: that of addAttr, or that of the node's type.
   std::optional<double> Default(NodeId node, std::string_view attribute) const;
 
   // All pieces of an array, in the order of the file.
   std::vector<Piece> Pieces(NodeId node, std::string_view attribute) const;
+
+  // Whether anything is connected into the node. Cheaper than to ask for a plug.
+  bool IsDriven(NodeId node) const { return lists_[node].firstInto != kNone; }
 
   // What drives the plug: itself, or its compound, of which it is then the component.
   std::optional<Driver> SourceOf(const Plug& plug) const;
@@ -194,13 +208,18 @@ class Scene {
     std::size_t width = 1;  // how many numbers an element has
   };
   Form FormOf(NodeId node, std::string_view attribute) const;
+  static Form FormOf(const AttributeInfo& info);
+  const AttributeInfo* InfoOf(NodeId node, std::string_view attribute) const {
+    return FindAttribute(types_[node], attribute);
+  }
   std::string_view ComponentOf(NodeId node, std::string_view compound, int component) const;
   Value ValueOf(const Setting& setting, std::size_t component) const;
   const Connection* ConnectionTo(const Plug& plug) const;
 
   std::string_view text_;
   std::vector<Node> nodes_;
-  std::vector<Lists> lists_;  // by node
+  std::vector<TypeNumber> types_;  // by node
+  std::vector<Lists> lists_;       // by node
   std::vector<Setting> settings_;
   SettingIndex settingIndex_;
   std::vector<Connection> connections_;

@@ -19,8 +19,7 @@ std::uint64_t KeyOf(const Plug& plug) {
 }  // namespace
 
 bool SceneBuilder::Keeps(NodeId node, std::string_view attribute) const {
-  const std::string_view type = scene_.nodes_[node].type;
-  return KeepsAttributes(type) || FindAttribute(type, attribute) != nullptr ||
+  return scene_.types_[node] != TypeNumber::Unknown || scene_.InfoOf(node, attribute) != nullptr ||
          scene_.Added(node, attribute) != nullptr;
 }
 
@@ -38,7 +37,7 @@ void SceneBuilder::Set(NodeId node, const AttributePath& path, std::uint32_t val
 
 // An attribute of a name that its type has already is that one.
 void SceneBuilder::AddAttribute(AddedAttribute attribute, NodeId node) {
-  if (FindAttribute(scene_.nodes_[node].type, attribute.longName) != nullptr) return;
+  if (scene_.InfoOf(node, attribute.longName) != nullptr) return;
   attribute.node = node;
   const auto index = static_cast<std::uint32_t>(scene_.added_.size());
   const AddedAttribute* const compound =

@@ -37,6 +37,7 @@ std::string_view SceneBuilder::Keep(std::string text) { return scene_.made_.empl
 NodeId SceneBuilder::AddNode(const Node& node) {
   const auto id = static_cast<NodeId>(scene_.nodes_.size());
   scene_.nodes_.push_back(node);
+  scene_.types_.push_back(TypeNumberOf(node.type));
   return id;
 }
 
