@@ -1,5 +1,6 @@
 #include "check/Curves.h"
 
+#include <algorithm>
 #include <array>
 #include <cmath>
 
@@ -60,8 +61,16 @@ std::span<const KeyedChannel> Channels::LensOf(scene::NodeId camera) {
 }
 
 Channels::Found Channels::Find(scene::NodeId node, std::span<const std::string_view> channels) const {
+  const std::vector<const scene::Connection*> into = scene_.ConnectionsInto(node);
+  // A channel can be driven by its own name, or by that of the whole: "rotateX" or "rotate".
+  const auto isDriven = [&into](std::string_view channel) {
+    return std::any_of(into.begin(), into.end(), [channel](const scene::Connection* connection) {
+      return channel.starts_with(connection->destination.attribute);
+    });
+  };
   Found found;
   for (const std::string_view channel : channels) {
+    if (!isDriven(channel)) continue;  // most are not, and this costs less than to look for a driver
     const std::optional<scene::Driver> driver = scene_.SourceOf({node, channel});
     if (!driver) continue;
     found.drivers.push_back({channel, *driver});
