@@ -20,7 +20,8 @@ CheckedScene checkScene(const std::string& path, const check::Options& options, 
                         Diagnostics& diagnostics) {
   CheckedScene checked;
   checked.path = path;
-  const auto text = SceneText::open(path, &checked.failure);
+  // The process is the scene's own.
+  const auto text = SceneText::map(path, &checked.failure);
   if (text == nullptr) {
     diagnostics.complain(path, checked.failure);
     return checked;
