@@ -63,6 +63,10 @@ VERBS = [
     VerbLimits("check", "nodes", by_import=2.5),
     VerbLimits("check", "composition", by_import=2.5),
     VerbLimits("check", "shot", by_import=2.5),
+    VerbLimits("export", "composition", "exported.glb", by_import=2.5, compositions=2.0),
+    VerbLimits("export", "composition", "exported.usda", compositions=2.0),
+    VerbLimits("export", "composition", "exported.csv", compositions=2.0),
+    VerbLimits("export", "shot", "exported.chan", compositions=2.0),
 ]
 
 

@@ -147,7 +147,8 @@ TEST(Arguments, WhatMakesNoSenseIsWrongUsage) {
   expectWrongUsage({}, "A subcommand is required");
   expectWrongUsage({"import"}, "SCENE is required");
   expectWrongUsage({"verify"}, "SCENE is required");
-  expectWrongUsage({"export", "a.ma"}, "A subcommand is required");
+  expectWrongUsage({"render", "a.ma"}, "A subcommand is required");
+  expectWrongUsage({"export", "a.ma"}, "--output is required");
   expectWrongUsage({"import", "--unknown", "a.ma"}, "--unknown");
   expectWrongUsage({"import", "a.ma", "--json"}, "--json");
   expectWrongUsage({"import", "a.ma", "--json", "x", "--json", "y"}, "--json");
