@@ -21,7 +21,7 @@ EPSILON = {"single": 2.0 ** -24, "double": 2.0 ** -53, "six digits": 5e-6}
 # two frames has its own.
 _ROUNDINGS = 16
 
-# How near a point may be, as a part of the camera's distance from the origin.
+# How near a point may be, as a part of the camera's reach.
 _NEAREST = 0.05
 
 
