@@ -33,6 +33,12 @@ TEST_F(DocumentedOutput, TheReadmeShowsWhatItsFirstCommandPrints) {
   EXPECT_THAT(readme, HasSubstr("```\n" + import.out + import.err + "```\n"));
 }
 
+TEST_F(DocumentedOutput, TheReadmeShowsTheReportOfARefusedScene) {
+  const ToolResult check = run({"check", "--quiet", "tests/scenes/production/path_without_quotes.ma"});
+  EXPECT_EQ(check.status, 1);
+  EXPECT_THAT(document("README.md"), HasSubstr("```\n" + check.out + "```\n"));
+}
+
 TEST_F(DocumentedOutput, ThePageOnCheckingShowsAReportAsItIsPrinted) {
   const ToolResult check = run({"check", "tests/scenes/production/path_without_quotes.ma"});
   EXPECT_THAT(document("docs/checking.md"), HasSubstr("```\n" + check.out + "```\n"));
