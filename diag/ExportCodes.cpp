@@ -11,14 +11,14 @@ constexpr Entry kExportCodes[] = {
      .sentence = "{0}: the {1} has a value that is no finite number",
      .meaning = "No format can hold such a value. Nothing is written of the scene.",
      .example = "",
-     .help = "Leave out --permissive, or find in the scene what computes the {1} of {0}."},
+     .help = "Find in the scene what computes the {1} of {0}."},
     {.code = Code::ExportPictureUnusable,
      .severity = Severity::Error,
      .symbol = "ExportPictureUnusable",
      .sentence = "the composition has no size, no frame rate or no frames",
      .meaning = "Without them no lens has an angle and no frame has a time. Nothing is written of the scene.",
      .example = "",
-     .help = "Leave out --permissive, and set resolution and frame rate in the scene."},
+     .help = "Set resolution and frame rate in the scene."},
     {.code = Code::ExportLensUnusable,
      .severity = Severity::Error,
      .symbol = "ExportLensUnusable",
@@ -37,9 +37,8 @@ constexpr Entry kExportCodes[] = {
      .severity = Severity::Error,
      .symbol = "ExportNumberTooLarge",
      .sentence = "{0}: a number is too large for {1}",
-     .meaning = "The format holds numbers up to a size of its own, and places in the world may be "
-                "beyond what a "
-                "number holds. Nothing is written of the scene.",
+     .meaning = "The format holds numbers up to a size of its own, and places in the world may be beyond "
+                "what a number holds. Nothing is written of the scene.",
      .example = "",
      .help = "Bring {0} closer to the origin, or make everything smaller with --scale."},
     {.code = Code::ExportTooManyFrames,
@@ -59,7 +58,9 @@ constexpr Entry kExportCodes[] = {
          "Files have values at whole frames, counted from the first one that is written. What the layer "
          "does between two frames is lost.",
      .example = "",
-     .help = "Leave out --step, or write a list of keys: -f csv --keys."},
+     .help =
+         "Choose other frames with --frames, or write a list of keys: -f csv --keys. With --bake leave out "
+         "--step."},
     {.code = Code::ExportNullsLeftOut,
      .severity = Severity::Note,
      .symbol = "ExportNullsLeftOut",
@@ -104,11 +105,11 @@ constexpr Entry kExportCodes[] = {
      .severity = Severity::Error,
      .symbol = "ExportTimesTooFine",
      .sentence = "the frames are too many, or their numbers too large, for the times of {0}",
-     .meaning =
-         "Two frames would have the same time: glTF has times of 32 bits, USD of 64. Nothing is written "
-         "of the scene.",
+     .meaning = "Two frames would have the same time: glTF has times of 32 bits. Frame numbers that are not "
+                "exact in "
+                "64 bits fit no format. Nothing is written of the scene.",
      .example = "",
-     .help = "Export fewer frames: --frames A:B."},
+     .help = "Export fewer frames, or frames with smaller numbers: --frames A:B."},
     {.code = Code::ExportZoomByExtension,
      .severity = Severity::Note,
      .symbol = "ExportZoomByExtension",

@@ -56,10 +56,14 @@ const Format* FormatOfPath(std::string_view path);
 inline constexpr double kSmallestMeasure = 1e-9;
 inline constexpr double kLargestMeasure = 1e12;
 
+// No frame of such a composition has a larger number, with or without its sign. Up to it a double holds every
+// whole number.
+inline constexpr double kLargestFrame = 0x1p53;
+
 // Whether a writer can be given it; an error is reported for each thing that keeps it from that. Then every
-// number is finite; the measures above are within their bounds; a channel that moves has a value for each
-// frame; every camera has a lens; no parents go in a circle. Places, rotations and scales may still be as
-// large as a double is.
+// number is finite; the measures and frames are within their bounds; a channel that moves has a value for
+// each frame; every camera has a lens; no parents go in a circle. Places, rotations and scales may still be
+// as large as a double is.
 bool IsWritable(const Composition& composition, diag::Collector* diagnostics);
 
 // Writes it in the format, where it is writable.

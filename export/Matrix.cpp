@@ -37,13 +37,6 @@ Matrix RotationAbout(std::size_t axis, double degrees) {
   return matrix;
 }
 
-Vector Normalised(const Vector& a) {
-  const double length = Length(a);
-  if (!(length > 0.0) || !std::isfinite(length)) return {};
-  // In two steps: the reciprocal of a tiny length is no number.
-  return {a.x / length, a.y / length, a.z / length};
-}
-
 bool IsNothing(const Vector& a) { return a == Vector{}; }
 
 // Of length 1 and square to `a`, which is of length 1.
@@ -102,6 +95,14 @@ double Distance(const Vector& a, const Vector& b) {
 }  // namespace
 
 double Length(const Vector& a) { return std::hypot(a.x, a.y, a.z); }
+
+Vector Normalised(const Vector& a) {
+  const double length = Length(a);
+  if (!(length > 0.0) || !std::isfinite(length)) return {};
+  // Numbers this small have few digits left, and the length fewer still: they are made larger first.
+  if (length < 0x1p-900) return Normalised(a * 0x1p500);
+  return {a.x / length, a.y / length, a.z / length};
+}
 
 bool IsFinite(const Vector& a) { return std::isfinite(a.x) && std::isfinite(a.y) && std::isfinite(a.z); }
 
@@ -162,15 +163,6 @@ Matrix Scaling(const Vector& by) {
   matrix.cell[1][1] = by.y;
   matrix.cell[2][2] = by.z;
   return matrix;
-}
-
-Matrix InverseOfRigid(const Matrix& rigid) {
-  Matrix inverse;
-  for (std::size_t row = 0; row < 3; ++row) {
-    for (std::size_t column = 0; column < 3; ++column) inverse.cell[row][column] = rigid.cell[column][row];
-  }
-  inverse.SetColumn(3, TransformPoint(inverse, rigid.Column(3)) * -1.0);
-  return inverse;
 }
 
 Matrix RigidOf(const Matrix& matrix) {

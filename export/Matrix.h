@@ -23,7 +23,8 @@ inline double Dot(const Vector& a, const Vector& b) { return a.x * b.x + a.y * b
 inline Vector Cross(const Vector& a, const Vector& b) {
   return {a.y * b.z - a.z * b.y, a.z * b.x - a.x * b.z, a.x * b.y - a.y * b.x};
 }
-double Length(const Vector& a);  // no overflow and no underflow on the way
+double Length(const Vector& a);      // no overflow and no underflow on the way
+Vector Normalised(const Vector& a);  // of length 1; of what has no length, or no finite one, no length
 bool IsFinite(const Vector& a);
 
 // A rotation: of length 1, x, y, z and then the real part.
@@ -55,9 +56,6 @@ bool IsFinite(const Matrix& matrix);
 Matrix RotationMatrix(const Vector& degrees);
 Matrix RotationMatrix(const Quaternion& rotation);
 Matrix Scaling(const Vector& by);
-
-// The inverse of a rotation and a place, without scale.
-Matrix InverseOfRigid(const Matrix& rigid);
 
 // The place, and the axes turned square to each other: the first keeps its direction and the second its
 // plane, all of length 1 and right-handed. An axis of no length takes what the others leave.

@@ -1,6 +1,5 @@
 #include "export/Places.h"
 
-#include <algorithm>
 #include <cmath>
 #include <numbers>
 
@@ -11,20 +10,15 @@ Vector At(const Channel (&channels)[3], std::size_t frame) {
   return {channels[0].at(frame), channels[1].at(frame), channels[2].at(frame)};
 }
 
-bool Moves(const Channel (&channels)[3]) {
-  return std::any_of(channels, channels + 3, [](const Channel& channel) { return channel.moves(); });
-}
-
 // Between the axes of the scene and those of the host y and z point the other way.
 Vector Turned(const Vector& a) { return {a.x, -a.y, -a.z}; }
 
 // The camera that looks from the origin along the direction, without a roll: its x is level. Straight up and
 // down x stays the scene's.
 Matrix TowardsInScene(const Vector& direction) {
-  const Vector z = direction * (-1.0 / Length(direction));
-  Vector x = Cross({0.0, 1.0, 0.0}, z);
-  const double level = Length(x);
-  x = level > 0.0 ? x * (1.0 / level) : Vector{1.0, 0.0, 0.0};
+  const Vector z = Normalised(direction) * -1.0;
+  Vector x = Normalised(Cross({0.0, 1.0, 0.0}, z));
+  if (x == Vector{}) x = {1.0, 0.0, 0.0};
   Matrix axes;
   axes.SetColumn(0, x);
   axes.SetColumn(1, Cross(z, x));
@@ -75,21 +69,6 @@ Matrix WorldAt(const Composition& composition, std::size_t layer, std::size_t fr
 
 Matrix ViewAt(const Composition& composition, std::size_t layer, std::size_t frame) {
   return RigidOf(WorldAt(composition, layer, frame));
-}
-
-bool MovesLocally(const Layer& layer) {
-  return Moves(layer.position) || Moves(layer.rotation) || Moves(layer.scale) ||
-         (layer.aimed && Moves(layer.interest));
-}
-
-bool MovesInWorld(const Composition& composition, std::size_t layer) {
-  if (MovesLocally(composition.layers[layer])) return true;
-  std::size_t steps = 0;
-  for (auto above = composition.layers[layer].parent; above && ++steps < composition.layers.size();
-       above = composition.layers[*above].parent) {
-    if (MovesLocally(composition.layers[*above])) return true;
-  }
-  return false;
 }
 
 double VerticalAngleAt(const Composition& composition, const Lens& lens, std::size_t frame) {

@@ -29,11 +29,6 @@ Matrix WorldAt(const Composition& composition, std::size_t layer, std::size_t fr
 // Place and rotation of a camera in the world, without scale: what its picture depends on, with the lens.
 Matrix ViewAt(const Composition& composition, std::size_t layer, std::size_t frame);
 
-// Whether its place against its parent, and its place in the world, are other than at the first frame
-// anywhere in the composition, by what moves: a channel that moves counts, whatever its values.
-bool MovesLocally(const Layer& layer);
-bool MovesInWorld(const Composition& composition, std::size_t layer);
-
 // The angle between the upper and the lower edge of the picture, in degrees.
 double VerticalAngleAt(const Composition& composition, const Lens& lens, std::size_t frame);
 

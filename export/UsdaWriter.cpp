@@ -187,11 +187,6 @@ class Usda {
 };
 
 bool IsTaken(const Composition& composition, diag::Collector* diagnostics) {
-  const double last = composition.FrameNumber(composition.frames - 1);
-  if (composition.frames > 1 && !(composition.FrameNumber(1) > composition.firstFrame && last > last - 1.0)) {
-    diagnostics->Report(Code::ExportTimesTooFine, {}, {"USD"});
-    return false;
-  }
   bool taken = true;
   for (const Layer& layer : composition.layers) {
     if (layer.kind != LayerKind::Camera || IsLensOfFloats(composition, *layer.lens)) continue;

@@ -77,6 +77,11 @@ bool IsPictureUsable(const Composition& composition) {
          composition.frames != 0;
 }
 
+// Whether the numbers of all frames differ from each other, and fit a whole number of 64 bits.
+bool AreFramesExact(const Composition& composition) {
+  return std::fabs(composition.firstFrame) <= kLargestFrame - static_cast<double>(composition.frames);
+}
+
 bool IsLayerUsable(const Layer& layer, std::size_t frames, diag::Collector* diagnostics) {
   const std::string_view unsound = UnsoundPart(layer, frames);
   if (!unsound.empty()) {
@@ -93,6 +98,10 @@ bool IsLayerUsable(const Layer& layer, std::size_t frames, diag::Collector* diag
 bool IsWritable(const Composition& composition, diag::Collector* diagnostics) {
   if (!IsPictureUsable(composition)) {
     diagnostics->Report(Code::ExportPictureUnusable, {});
+    return false;
+  }
+  if (!AreFramesExact(composition)) {
+    diagnostics->Report(Code::ExportTimesTooFine, {}, {"any format"});
     return false;
   }
   bool usable = true;

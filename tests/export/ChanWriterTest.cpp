@@ -132,6 +132,23 @@ TEST(ChanWriter, WhatItHasNoPlaceForIsNamed) {
   EXPECT_EQ(diagnostics.CountOf(Code::ExportFramesRounded), 1u);
 }
 
+TEST(ChanWriter, FrameNumbersAreWrittenUpToTheLargestThatIsExactAndNoFurther) {
+  Composition composition = Shot();
+  for (const double first :
+       {0x1p53 - 2.0, -0x1p53 + 2.0, 0x1p53 - 1.0, -0x1p53 + 1.0, 1e19, -1e19, 1e300, -1e300}) {
+    composition.firstFrame = first;
+    FilesInMemory files;
+    diag::Collector diagnostics("");
+    const bool exact = std::fabs(first) == 0x1p53 - 2.0;
+    EXPECT_EQ(Write(*FindFormat("chan"), composition, {}, "shot", files, &diagnostics), exact) << first;
+    EXPECT_EQ(diagnostics.CountOf(Code::ExportTimesTooFine), exact ? 0u : 1u) << first;
+    if (!exact) continue;
+    const auto rows = RowsOf(files.main());
+    ASSERT_TRUE(rows) << files.main();
+    EXPECT_EQ((*rows)[1][0], first + 1.0);
+  }
+}
+
 TEST(ChanWriter, HostAxesComeOutAsThoseOfTheScene) {
   Composition scene = Shot();
   Composition host = Shot();

@@ -122,6 +122,18 @@ TEST(CsvWriter, AnAimedCameraHasItsResultingAngles) {
   EXPECT_THAT((Row(rows[3].begin() + 6, rows[3].begin() + 9)), ElementsAre("0", "90", "0"));
 }
 
+TEST(CsvWriter, ACameraThatIsAimedAtWhatIsAsGoodAsNowhereHasItsAngles) {
+  for (const double way : {5e-324, 1e-320, 1e-310}) {
+    Composition composition = OneCamera();
+    Layer& camera = composition.layers[1];
+    camera.position[0] = camera.rotation[0] = 0.0;
+    camera.aimed = true;
+    camera.interest[0] = -4.0 * way;
+    const std::vector<Row> rows = Written(composition);
+    EXPECT_THAT((Row(rows[3].begin() + 6, rows[3].begin() + 9)), ElementsAre("0", "90", "0")) << way;
+  }
+}
+
 TEST(CsvWriter, ARowForEachKeyOfEachStream) {
   Composition composition = OneCamera();
   composition.layers[1].keys = {{"position", 3, {101, 103.5}, {1, 2, 3, 4, 5, 6}}, {"zoom", 1, {102}, {540}}};

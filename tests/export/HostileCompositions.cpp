@@ -33,7 +33,8 @@ class Maker {
     composition.height = OneIn(40) ? Any() : 1.0 + Whole(8192);
     composition.pixelAspect = OneIn(5) ? Pick({0.5, 2.0, 1.4587}) : 1.0;
     composition.framesPerSecond = OneIn(40) ? Any() : Pick({24.0, 23.976, 29.97, 25.0, 0.001, 6000.0});
-    composition.firstFrame = Pick({1.0, 0.0, -20.0, 1001.0, 0.25, 1e9});
+    composition.firstFrame = OneIn(20) ? Pick({1e300, -1e300, 1e19, -1e19, 0x1p53, -0x1p53 + 6.0})
+                                       : Pick({1.0, 0.0, -20.0, 1001.0, 0.25, 1e9});
     composition.frames = OneIn(3) ? 1 : 1 + static_cast<std::size_t>(Whole(12));
     composition.metersPerUnit = Pick({0.01, 1.0, 0.0254, 1e-6, 1609.344});
     composition.axes = OneIn(2) ? interchange::Axes::Scene : interchange::Axes::Host;

@@ -20,7 +20,8 @@ inline constexpr std::uint64_t kHostileCompositions = 1000;
 // The same composition for the same seed, on every platform. Names of any bytes, empty, long, the same twice,
 // formulas, markup, paths; numbers huge, tiny, and in some of them not finite; one frame and many, values
 // that stay, that move at every frame, and that have keys here and there; no layers, no camera; parents after
-// their children, deep chains, and circles in some; lenses and pictures of all sizes, and of none.
+// their children, deep chains, and circles in some; lenses and pictures of all sizes, and
+// of none; first frames that no number of 64 bits counts on from.
 interchange::Composition HostileComposition(std::uint64_t seed);
 
 // Outputs in memory.

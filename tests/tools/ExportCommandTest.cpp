@@ -12,6 +12,7 @@ namespace {
 using mayascene_test::ToolTest;
 using testing::ElementsAre;
 using testing::HasSubstr;
+using testing::Not;
 using testing::StartsWith;
 
 // A camera under a boom in the unit, keyed from frame 11 on.
@@ -117,12 +118,39 @@ TEST_F(ExportCommandTest, WhatDoesNotGoTogetherIsWrongUsage) {
                                                        {"-o", "x.chan", "--axes", "host"},
                                                        {"-o", "x.chan", "--keys"},
                                                        {"-o", "x.csv", "-f", "fbx"},
+                                                       {"-o", "x.ma", "-f", "csv"},
+                                                       {"-o", "x.MB", "-f", "csv"},
+                                                       {"-o", "x.gltf", "-f", "csv"},
+                                                       {"-o", "x.GLB", "-f", "gltf"},
                                                        {"-o", "x.csv", "--frames", "5:1"}};
   for (std::vector<std::string> words : wrong) {
     words.insert(words.begin(), {"export", "shot.ma"});
     EXPECT_EQ(run(words).status, 2) << words[3];
   }
   EXPECT_THAT(files(), ElementsAre("shot.ma"));
+}
+
+TEST_F(ExportCommandTest, AFolderIsCalledAsItLikesAndAFormatsOwnEndingInCapitalsToo) {
+  write("shot.ma", rig("cm"));
+  std::filesystem::create_directories(path("takes.ma"));
+  EXPECT_EQ(run({"export", "-f", "csv", "shot.ma", "-o", "takes.ma", "--quiet"}).status, 0);
+  EXPECT_TRUE(std::filesystem::exists(path("takes.ma/shot.csv")));
+  EXPECT_EQ(run({"export", "-f", "csv", "shot.ma", "-o", "x.CSV", "--quiet"}).status, 0);
+}
+
+TEST_F(ExportCommandTest, AReportAndAFurtherOutputAreNeverOneFileHoweverTheyAreNamed) {
+  write("shot.ma", rig("cm"));
+  std::filesystem::create_directories(path("real"));
+  std::filesystem::create_directory_symlink("real", path("link"));
+  for (const std::string& report : {path("r.bin").string(), std::string("real/../r.bin")}) {
+    const auto result = run({"export", "--bake", "--report", report, "shot.ma", "-o", "r.gltf"});
+    EXPECT_EQ(result.status, 5) << result.err;
+    EXPECT_THAT(result.err, HasSubstr("r.bin is a scene or the report"));
+    EXPECT_FALSE(std::filesystem::exists(path("r.gltf")));
+  }
+  const auto linked = run({"export", "--bake", "--report", "link/r.bin", "shot.ma", "-o", "real/r.gltf"});
+  EXPECT_EQ(linked.status, 5) << linked.err;
+  EXPECT_FALSE(std::filesystem::exists(path("real/r.gltf")));
 }
 
 TEST_F(ExportCommandTest, WhatCannotBeExportedLeavesNoFile) {
@@ -155,6 +183,22 @@ TEST_F(ExportCommandTest, KeysBetweenFramesAreAWarning) {
   std::vector<std::string> strict = words;
   strict.emplace_back("--strict");
   EXPECT_EQ(run(strict).status, 1);
+}
+
+TEST_F(ExportCommandTest, KeysBetweenFramesThatWereNotAskedForAreNoWarning) {
+  std::string scene = rig("cm");
+  for (const char* last : {" 13 4", " 13 -20"}) {
+    scene.replace(scene.find("-s 3 \".ktv[0:2]\""), 16, "-s 4 \".ktv[0:3]\"");
+    scene.insert(scene.find(last) + std::string(last).size(), " 20.25 5");
+  }
+  write("shot.ma", scene);
+  const auto some = run({"export", "shot.ma", "-o", "shot.csv", "--frames", "11:13", "--strict"});
+  EXPECT_EQ(some.status, 0);
+  EXPECT_THAT(some.err, Not(HasSubstr("MA1107")));
+  // The last frame that is written is 20, and the key lies in what was asked for.
+  const auto more = run({"export", "shot.ma", "-o", "shot.csv", "--frames", "11:20.5", "--strict"});
+  EXPECT_EQ(more.status, 1);
+  EXPECT_THAT(more.err, HasSubstr("MA1107"));
 }
 
 }  // namespace

@@ -45,11 +45,19 @@ ExitStatus refuse(const std::string& place, const char* why, std::string* failur
   return ExitStatus::WrongUsage;
 }
 
+// From the root, with the links of its folders followed; what it names need not be there.
+fs::path wholeName(const fs::path& path) {
+  std::error_code error;
+  const fs::path absolute = fs::absolute(path, error);
+  const fs::path whole = fs::weakly_canonical(absolute, error);
+  return error ? absolute.lexically_normal() : whole;
+}
+
 }  // namespace
 
 bool isSameFile(const fs::path& a, const fs::path& b) {
   std::error_code ignored;
-  return a.lexically_normal() == b.lexically_normal() || fs::equivalent(a, b, ignored);
+  return fs::equivalent(a, b, ignored) || wholeName(a) == wholeName(b);
 }
 
 ExitStatus placeOutputs(const std::vector<std::string>& scenes, const std::string& output,

@@ -35,8 +35,6 @@ class ExportFiles : public interchange::Files {
   const std::vector<std::string>& written() const { return written_; }
 
  private:
-  std::ostream* open(const std::string& place);
-
   std::string place_;
   TakenFiles* taken_;
   std::unique_ptr<OutputFile> main_;

@@ -37,9 +37,10 @@ class Describer {
             interchange::Composition* made)
       : inner_(inner), options_(options), made_(*made), length_(unitsPerPoint * options.scale) {}
 
-  // `offset`: the frame of the composition that is the first to be described.
-  void run(double offset, diag::Collector* diagnostics) {
+  // `offset`: the frame of the composition that is the first to be described. `span`: from there to the last.
+  void run(double offset, double span, diag::Collector* diagnostics) {
     offset_ = offset;
+    span_ = span;
     std::unordered_map<const refhost::Layer*, std::size_t> places;
     for (const refhost::Layer* layer : inner_.layers) {
       if (layer->kind == refhost::LayerKind::Composition) continue;
@@ -129,9 +130,11 @@ class Describer {
     return Channel(places, std::move(values));
   }
 
+  // Keys outside the frames that were chosen are not lost: nobody asked for them.
   void countBetween(const std::vector<double>& places) {
-    const auto between = std::count_if(places.begin(), places.end(),
-                                       [](double place) { return place != std::nearbyint(place); });
+    const auto between = std::count_if(places.begin(), places.end(), [this](double place) {
+      return place > 0.0 && place <= span_ && place != std::nearbyint(place);
+    });
     betweenFrames_ = std::max(betweenFrames_, static_cast<std::size_t>(between));
   }
 
@@ -197,6 +200,7 @@ class Describer {
   interchange::Composition& made_;
   double length_;
   double offset_ = 0.0;
+  double span_ = 0.0;
   std::size_t betweenFrames_ = 0;
   std::map<const std::vector<T_Time>*, Channel::Places> places_;
 };
@@ -228,7 +232,8 @@ std::optional<interchange::Composition> describe(const refhost::Folder& folder, 
   made.frames = options.keys ? 1 : std::max<std::size_t>(1, static_cast<std::size_t>(std::max(frames, 1.0)));
 
   const double unitsPerPoint = linearUnits == 0 ? 1.0 : 1.0 / check::PointsPerUnit(numbers.linearUnit);
-  Describer(inner, options, unitsPerPoint, &made).run(made.firstFrame - start, diagnostics);
+  Describer(inner, options, unitsPerPoint, &made)
+      .run(made.firstFrame - start, last - made.firstFrame + kFrameTolerance, diagnostics);
   return made;
 }
 

@@ -3,9 +3,12 @@
 #include <algorithm>
 #include <charconv>
 #include <cmath>
+#include <filesystem>
+#include <system_error>
 #include <vector>
 
 #include "export/Format.h"
+#include "export/SafeNames.h"
 #include "tools/mayascene/HostWords.h"
 
 namespace mayascene {
@@ -38,6 +41,21 @@ double scaleOf(const std::string& text) {
     throw CLI::ValidationError("--scale", text + ": a scale is a number between 1e-9 and 1e9");
   }
   return scale;
+}
+
+// An output whose end names something else than what is written to it. Folders are called as they like.
+void checkEnding(const ExportArguments& arguments) {
+  const std::string& output = arguments.output;
+  std::error_code ignored;
+  if (arguments.scenes.size() > 1 || std::filesystem::is_directory(output, ignored)) return;
+  const std::string lowered = interchange::Lowered(output);
+  if (lowered.ends_with(".ma") || lowered.ends_with(".mb")) {
+    throw CLI::ValidationError("--output", output + " ends as a scene does, and an export is none");
+  }
+  const interchange::Format* const ending = interchange::FormatOfPath(output);
+  if (ending == nullptr || arguments.format == nullptr || ending == arguments.format) return;
+  throw CLI::ValidationError("--format", output + " ends as " + std::string(ending->name) +
+                                             " does, and -f says " + std::string(arguments.format->name));
 }
 
 // What a format does not take. Of no format: the output has no suffix that names one.
@@ -98,6 +116,7 @@ void translateExportWords(const CLI::App& verb, const ExportWords& words, Export
   if (!words.bake.frames.empty()) arguments->frames = framesOf(words.bake.frames);
   if (words.bakes) translateBakeWords(words.bake, &arguments->bake.emplace());
   arguments->strict = words.bake.strict;
+  checkEnding(*arguments);
   checkFormat(*arguments);
 }
 

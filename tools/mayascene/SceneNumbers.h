@@ -24,8 +24,8 @@ std::string linearUnitOf(const scene::Scene& scene);
 // transforms above them. None where none of them has keys; 0 where the scene's time counts no frames.
 std::optional<double> firstKeyOf(const scene::Scene& scene);
 
-// Of a plain import. None where the file can no longer be
-// read, or the memory does not hold the scene beside the project.
+// Of a plain import. None where the file can no longer be read, or the memory does not hold the scene beside
+// the project.
 std::optional<SceneNumbers> numbersOf(const std::string& path, const refhost::Composition& composition);
 
 // Of an import of the bake.
