@@ -96,31 +96,21 @@ class NamesThatCount {
   std::vector<std::array<std::string_view, kLists>> met_;  // by number and list, the first one of the file
 };
 
-void ReportNamesakes(const Subject& subject) {
-  NamesThatCount names(subject);
-  for (const scene::Node& node : subject.scene.nodes()) {
-    const List list = ListOf(node);
-    const std::string_view name = list == List::None ? "" : ImportName(subject.scene, node);
-    if (name.empty()) continue;
-    const std::string_view first = names.Meet(list, name);
-    if (first.empty()) continue;
-    if (first == name) {
-      subject.diagnostics.Report(Code::SameNames, node.place, {name});
-    } else {
-      subject.diagnostics.Report(Code::NamesDifferInCase, node.place, {first, name});
-    }
+void ReportNamesake(const Subject& subject, const scene::Node& node, std::string_view name,
+                    std::string_view first) {
+  if (first == name) {
+    subject.diagnostics.Report(Code::SameNames, node.place, {name});
+  } else {
+    subject.diagnostics.Report(Code::NamesDifferInCase, node.place, {first, name});
   }
 }
 
-void ReportUnusableNames(const Subject& subject) {
-  for (const scene::Node& node : subject.scene.nodes()) {
-    if (ListOf(node) == List::None || !ImportName(subject.scene, node).empty()) continue;
-    // Of a node without a name the place is that of its type.
-    if (node.place.length > 252) {
-      subject.diagnostics.Report(Code::NameTooLong, node.place, {std::to_string(node.place.length)});
-    } else {
-      subject.diagnostics.Report(Code::NodeWithoutName, node.place, {node.type});
-    }
+// Of a node without a name the place is that of its type.
+void ReportUnusableName(const Subject& subject, const scene::Node& node) {
+  if (node.place.length > 252) {
+    subject.diagnostics.Report(Code::NameTooLong, node.place, {std::to_string(node.place.length)});
+  } else {
+    subject.diagnostics.Report(Code::NodeWithoutName, node.place, {node.type});
   }
 }
 
@@ -137,8 +127,17 @@ void ReportTextAfterNul(const Subject& subject) {
 }  // namespace
 
 void ReportNames(const Subject& subject) {
-  ReportNamesakes(subject);
-  ReportUnusableNames(subject);
+  NamesThatCount names(subject);
+  for (const scene::Node& node : subject.scene.nodes()) {
+    const List list = ListOf(node);
+    if (list == List::None) continue;
+    const std::string_view name = ImportName(subject.scene, node);
+    if (name.empty()) {
+      ReportUnusableName(subject, node);
+    } else if (const std::string_view first = names.Meet(list, name); !first.empty()) {
+      ReportNamesake(subject, node, name, first);
+    }
+  }
   ReportTextAfterNul(subject);
 }
 
