@@ -9,6 +9,7 @@
 #include <string>
 
 #include "export/Places.h"
+#include "export/ReportedLosses.h"
 #include "export/SafeNames.h"
 #include "export/TextWriter.h"
 #include "export/Writers.h"
@@ -50,16 +51,7 @@ void SayWhatIsLost(const Composition& composition, diag::Collector* diagnostics)
   const auto nulls = std::count_if(composition.layers.begin(), composition.layers.end(),
                                    [](const Layer& layer) { return layer.kind == LayerKind::Null; });
   if (nulls != 0) diagnostics->Report(Code::ExportNullsLeftOut, {}, {std::to_string(nulls)});
-  if (composition.pixelAspect != 1.0) {
-    diagnostics->Report(Code::ExportPartLost, {}, {composition.name, "the pixel aspect"});
-  }
-  for (const Layer& layer : composition.layers) {
-    if (!layer.lens) continue;
-    if (layer.lens->filmOffsetX || layer.lens->filmOffsetY) {
-      diagnostics->Report(Code::ExportPartLost, {}, {layer.name, "the film offset"});
-    }
-    if (layer.lens->squeeze) diagnostics->Report(Code::ExportPartLost, {}, {layer.name, "the lens squeeze"});
-  }
+  ReportLostExtras(composition, diagnostics);
   if (composition.firstFrame != std::floor(composition.firstFrame)) {
     diagnostics->Report(Code::ExportFramesRounded, {});
   }
@@ -67,8 +59,8 @@ void SayWhatIsLost(const Composition& composition, diag::Collector* diagnostics)
 
 }  // namespace
 
-bool WriteChan(const Composition& composition, const WriteOptions& /*options*/, std::string_view stem,
-               Files& files, diag::Collector* diagnostics) {
+bool WriteChan(const Composition& composition, const WriteOptions& /*options*/, Files& files,
+               diag::Collector* diagnostics) {
   const auto cameras = std::count_if(composition.layers.begin(), composition.layers.end(),
                                      [](const Layer& layer) { return layer.kind == LayerKind::Camera; });
   if (cameras == 0) {
@@ -81,10 +73,7 @@ bool WriteChan(const Composition& composition, const WriteOptions& /*options*/, 
     std::string name;
     // One camera has the output that was named; of several each has its name after it.
     std::ostream* const stream =
-        cameras == 1
-            ? files.Main()
-            : files.Beside(SafeName(std::string(stem) + '.' + SafeName(layer.name, "camera"), "camera"),
-                           ".chan", &name);
+        cameras == 1 ? files.Main() : files.Beside('.' + SafeName(layer.name, "camera"), ".chan", &name);
     if (stream == nullptr) return false;
     if (!WriteCamera(stream, composition, i)) {
       diagnostics->Report(Code::ExportNumberTooLarge, {}, {layer.name, "a place in the world"});

@@ -1,10 +1,16 @@
 // Comma-separated values: a row for each frame of each layer, or for each key of each stream. Quoted as RFC
 // 4180 says, with CR LF at the ends of lines; names are UTF-8.
+#include <algorithm>
+#include <array>
 #include <cstddef>
+#include <optional>
 #include <string>
+#include <vector>
 
 #include "diag/ShownText.h"
+#include "export/LayerTree.h"
 #include "export/Places.h"
+#include "export/ReportedLosses.h"
 #include "export/TextWriter.h"
 #include "export/Writers.h"
 
@@ -15,15 +21,21 @@ constexpr std::string_view kFrameHead =
     "layer,frame,seconds,tx,ty,tz,rx,ry,rz,sx,sy,sz,wx,wy,wz,zoom,focal,fov,number,parent\r\n";
 constexpr std::string_view kKeyHead = "layer,stream,frame,seconds,x,y,z,number\r\n";
 
-// A name as a cell. A spreadsheet takes text that begins so for a formula; an apostrophe in front keeps it
-// text.
+// Whether a spreadsheet takes the text for a formula: by its first sign, in full width too.
+bool IsFormula(std::string_view text) {
+  constexpr std::array<std::string_view, 8> kSigns = {
+      "=", "+", "-", "@", "\xef\xbc\x9d", "\xef\xbc\x8b", "\xef\xbc\x8d", "\xef\xbc\xa0"};
+  text.remove_prefix(std::min(text.find_first_not_of(' '), text.size()));
+  return std::any_of(kSigns.begin(), kSigns.end(),
+                     [&](std::string_view sign) { return text.starts_with(sign); });
+}
+
+// A name as a cell: an apostrophe in front of a formula keeps it text, and where a semicolon ends cells, one
+// within quotes does not.
 std::string Cell(std::string_view name) {
   std::string text = diag::ShownText(name);
-  constexpr std::string_view kFormula = "=+-@";
-  const std::size_t first = text.find_first_not_of(' ');
-  if (first != std::string::npos && kFormula.find(text[first]) != std::string_view::npos)
-    text.insert(0, 1, '\'');
-  if (text.find_first_of("\", ") == std::string::npos) return text;
+  if (IsFormula(text)) text.insert(0, 1, '\'');
+  if (text.find_first_of("\",; ") == std::string::npos) return text;
   std::string quoted = "\"";
   for (const char c : text) quoted.append(c == '"' ? 2 : 1, c);
   return quoted + '"';
@@ -45,31 +57,69 @@ void WriteLens(TextWriter& out, const Composition& composition, const Layer& lay
       << VerticalAngleAt(composition, *layer.lens, frame);
 }
 
-bool WriteFrames(TextWriter& out, const Composition& composition, std::size_t index) {
-  const Layer& layer = composition.layers[index];
-  const std::string name = Cell(layer.name);
-  const std::string parent = layer.parent ? std::to_string(*layer.parent + 1) : "";
-  Vector angles;
-  for (std::size_t frame = 0; frame < composition.frames; ++frame) {
-    const Vector place = {layer.position[0].at(frame), layer.position[1].at(frame),
-                          layer.position[2].at(frame)};
-    const Vector turned = {layer.rotation[0].at(frame), layer.rotation[1].at(frame),
-                           layer.rotation[2].at(frame)};
-    angles = layer.aimed ? AnglesOf(LocalRotationAt(composition, layer, frame), RotationOrder::XYZ, angles)
-                         : turned;
-    const Vector world = WorldAt(composition, index, frame).Column(3);
-    if (!IsFinite(world)) return false;
-    out << name << ',' << composition.FrameNumber(frame) << ','
-        << static_cast<double>(frame) / composition.framesPerSecond;
-    WriteVector(out, place);
-    WriteVector(out, angles);
-    WriteVector(out, {layer.scale[0].at(frame), layer.scale[1].at(frame), layer.scale[2].at(frame)});
-    WriteVector(out, world);
-    WriteLens(out, composition, layer, frame);
-    out << ',' << index + 1 << ',' << parent << "\r\n";
+// The rows of the frames. A layer's world matrix is that of its parent, which is there already, and its own
+// place: however deep the layers are nested, each is worked out once a frame.
+class Frames {
+ public:
+  Frames(const Composition& composition, TextWriter* out)
+      : composition_(composition),
+        order_(LayerTree(composition).ParentsFirst()),
+        worlds_(composition.layers.size()),
+        angles_(composition.layers.size()),
+        out_(*out) {
+    for (const Layer& layer : composition.layers) names_.push_back(Cell(layer.name));
   }
-  return true;
-}
+
+  // None, or the layer with a place that is no number.
+  std::optional<std::size_t> Write() {
+    for (std::size_t frame = 0; frame < composition_.frames; ++frame) {
+      for (const std::size_t index : order_) {
+        const Layer& layer = composition_.layers[index];
+        const Matrix local = LocalAt(composition_, layer, frame);
+        worlds_[index] = layer.parent ? worlds_[*layer.parent] * local : local;
+      }
+      for (std::size_t index = 0; index < names_.size(); ++index) {
+        if (!IsFinite(worlds_[index].Column(3))) return index;
+        WriteRow(index, frame);
+      }
+    }
+    return std::nullopt;
+  }
+
+ private:
+  void WriteRow(std::size_t index, std::size_t frame) {
+    const Layer& layer = composition_.layers[index];
+    out_ << names_[index] << ',' << composition_.FrameNumber(frame) << ','
+         << static_cast<double>(frame) / composition_.framesPerSecond;
+    WriteVector(out_, At(layer.position, frame));
+    WriteVector(out_, AnglesAt(index, frame));
+    WriteVector(out_, At(layer.scale, frame));
+    WriteVector(out_, worlds_[index].Column(3));
+    WriteLens(out_, composition_, layer, frame);
+    out_ << ',' << index + 1 << ',';
+    if (layer.parent) out_ << *layer.parent + 1;
+    out_ << "\r\n";
+  }
+
+  // Those of an aimed camera lie near those of the frame before.
+  Vector AnglesAt(std::size_t index, std::size_t frame) {
+    const Layer& layer = composition_.layers[index];
+    if (!layer.aimed) return At(layer.rotation, frame);
+    const Matrix rotation = LocalRotationAt(composition_, layer, frame);
+    return angles_[index] = AnglesOf(rotation, RotationOrder::XYZ, angles_[index]);
+  }
+
+  static Vector At(const Channel (&channels)[3], std::size_t frame) {
+    return {channels[0].at(frame), channels[1].at(frame), channels[2].at(frame)};
+  }
+
+  const Composition& composition_;
+  const std::vector<std::size_t> order_;
+  std::vector<Matrix> worlds_;
+  std::vector<Vector> angles_;
+  std::vector<std::string> names_;
+  TextWriter& out_;
+};
 
 void WriteKeys(TextWriter& out, const Composition& composition, std::size_t index) {
   const Layer& layer = composition.layers[index];
@@ -90,20 +140,20 @@ void WriteKeys(TextWriter& out, const Composition& composition, std::size_t inde
 
 }  // namespace
 
-bool WriteCsv(const Composition& composition, const WriteOptions& options, std::string_view /*stem*/,
-              Files& files, diag::Collector* diagnostics) {
+bool WriteCsv(const Composition& composition, const WriteOptions& options, Files& files,
+              diag::Collector* diagnostics) {
   std::ostream* const stream = files.Main();
   if (stream == nullptr) return false;
   TextWriter out(stream);
   out << (options.keys ? kKeyHead : kFrameHead);
-  for (std::size_t layer = 0; layer < composition.layers.size(); ++layer) {
-    if (options.keys) {
+  if (options.keys) {
+    for (std::size_t layer = 0; layer < composition.layers.size(); ++layer)
       WriteKeys(out, composition, layer);
-    } else if (!WriteFrames(out, composition, layer)) {
-      diagnostics->Report(diag::Code::ExportNumberTooLarge, {}, {composition.layers[layer].name, "CSV"});
-      return false;
-    }
+  } else if (const auto tooFar = Frames(composition, &out).Write()) {
+    diagnostics->Report(diag::Code::ExportNumberTooLarge, {}, {composition.layers[*tooFar].name, "CSV"});
+    return false;
   }
+  ReportLostExtras(composition, diagnostics);
   return true;
 }
 

@@ -22,9 +22,10 @@ class Files {
   // The output that the user named. Once.
   virtual std::ostream* Main() = 0;
 
-  // A further output beside it, called stem + suffix, or with a number between them where the run has such a
-  // file already. *name becomes its name, without a folder. The stem is safe (export/SafeNames.h).
-  virtual std::ostream* Beside(std::string_view stem, std::string_view suffix, std::string* name) = 0;
+  // A further output beside it. It has the name of the main output with part + suffix in place of the suffix,
+  // and a number between them where the run has such a file already. The part is empty or safe
+  // (export/SafeNames.h). *name becomes the name, without a folder: any bytes that the user chose.
+  virtual std::ostream* Beside(std::string_view part, std::string_view suffix, std::string* name) = 0;
 };
 
 struct WriteOptions {
@@ -38,11 +39,10 @@ struct Format {
   bool ownAxes = false;       // the axes are the format's own, whatever the user says
   bool listsKeys = false;     // takes WriteOptions::keys
 
-  // Writes a composition that IsWritable() takes. `stem` is the safe name of the main output, without its
-  // suffix. What the format cannot say is reported. False after an error, which is reported, or which the
-  // files keep.
-  bool (*write)(const Composition& composition, const WriteOptions& options, std::string_view stem,
-                Files& files, diag::Collector* diagnostics) = nullptr;
+  // Writes a composition that IsWritable() takes. What the format cannot say is reported. False after an
+  // error, which is reported, or which the files keep.
+  bool (*write)(const Composition& composition, const WriteOptions& options, Files& files,
+                diag::Collector* diagnostics) = nullptr;
 };
 
 // All formats, in the order of help. Lives as long as the program.
@@ -67,7 +67,7 @@ inline constexpr double kLargestFrame = 0x1p53;
 bool IsWritable(const Composition& composition, diag::Collector* diagnostics);
 
 // Writes it in the format, where it is writable.
-bool Write(const Format& format, const Composition& composition, const WriteOptions& options,
-           std::string_view stem, Files& files, diag::Collector* diagnostics);
+bool Write(const Format& format, const Composition& composition, const WriteOptions& options, Files& files,
+           diag::Collector* diagnostics);
 
 }  // namespace interchange

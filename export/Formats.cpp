@@ -50,9 +50,9 @@ const Format* FormatOfPath(std::string_view path) {
   return found == kFormats.end() ? nullptr : &*found;
 }
 
-bool Write(const Format& format, const Composition& composition, const WriteOptions& options,
-           std::string_view stem, Files& files, diag::Collector* diagnostics) {
-  return IsWritable(composition, diagnostics) && format.write(composition, options, stem, files, diagnostics);
+bool Write(const Format& format, const Composition& composition, const WriteOptions& options, Files& files,
+           diag::Collector* diagnostics) {
+  return IsWritable(composition, diagnostics) && format.write(composition, options, files, diagnostics);
 }
 
 }  // namespace interchange

@@ -64,8 +64,8 @@ double VerticalRadians(const Composition& composition, double zoom);
 // Whether every value that is said once is one that the format takes; what is not is reported.
 bool GltfTakesStill(const Composition& composition, diag::Collector* diagnostics);
 
-// The whole JSON. `dataName` is the name of the file with the data, empty where they follow in the same file.
-void WriteGltfJson(const GltfPlan& plan, std::string_view dataName, std::ostream& out);
+// The whole JSON. `dataUri` refers to the file with the data; empty where they follow in the same file.
+void WriteGltfJson(const GltfPlan& plan, std::string_view dataUri, std::ostream& out);
 
 // The data. False where a value is none that the format takes, which is reported.
 bool WriteGltfData(const GltfPlan& plan, std::ostream& out, diag::Collector* diagnostics);

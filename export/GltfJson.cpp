@@ -246,7 +246,7 @@ void PutAccessors(JsonWriter& json, const GltfPlan& plan) {
   json.endArray();
 }
 
-void PutBuffer(JsonWriter& json, const GltfPlan& plan, std::string_view dataName) {
+void PutBuffer(JsonWriter& json, const GltfPlan& plan, std::string_view dataUri) {
   const auto size = static_cast<std::size_t>(plan.DataSize());
   json.key("bufferViews");
   json.beginArray();
@@ -259,14 +259,14 @@ void PutBuffer(JsonWriter& json, const GltfPlan& plan, std::string_view dataName
   json.beginArray();
   json.beginObject();
   Put(json, "byteLength", size);
-  if (!dataName.empty()) Put(json, "uri", dataName);
+  if (!dataUri.empty()) Put(json, "uri", dataUri);
   json.endObject();
   json.endArray();
 }
 
 }  // namespace
 
-void WriteGltfJson(const GltfPlan& plan, std::string_view dataName, std::ostream& out) {
+void WriteGltfJson(const GltfPlan& plan, std::string_view dataUri, std::ostream& out) {
   const LayerTree tree(plan.composition());
   JsonWriter json(out);
   json.beginObject();
@@ -287,7 +287,7 @@ void WriteGltfJson(const GltfPlan& plan, std::string_view dataName, std::ostream
   if (!plan.tracks().empty()) {
     PutAnimation(json, plan);
     PutAccessors(json, plan);
-    PutBuffer(json, plan, dataName);
+    PutBuffer(json, plan, dataUri);
   }
   json.endObject();
 }

@@ -66,6 +66,22 @@ void PutWord(std::ostream& out, std::uint64_t word) {
 
 std::uint64_t RoundedUp(std::uint64_t size) { return (size + 3) / 4 * 4; }
 
+// The name of a file in the same folder as a reference to it: what a URI gives a meaning stands as %3A.
+std::string UriOf(std::string_view name) {
+  constexpr std::string_view kPlain = "abcdefghijklmnopqrstuvwxyzABCDEFGHIJKLMNOPQRSTUVWXYZ0123456789-._~";
+  constexpr std::string_view kDigits = "0123456789ABCDEF";
+  std::string uri;
+  for (const char c : name) {
+    if (kPlain.find(c) != std::string_view::npos) {
+      uri += c;
+    } else {
+      const auto byte = static_cast<unsigned char>(c);
+      uri += {'%', kDigits[byte >> 4U], kDigits[byte & 0xfU]};
+    }
+  }
+  return uri;
+}
+
 constexpr std::uint64_t kHeadSize = 12;
 constexpr std::uint64_t kChunkHeadSize = 8;
 constexpr std::uint64_t kMagic = 0x46546c67;      // "glTF"
@@ -74,24 +90,24 @@ constexpr std::uint64_t kDataChunk = 0x004e4942;  // "BIN"
 
 }  // namespace
 
-bool WriteGltf(const Composition& composition, const WriteOptions& /*options*/, std::string_view stem,
-               Files& files, diag::Collector* diagnostics) {
+bool WriteGltf(const Composition& composition, const WriteOptions& /*options*/, Files& files,
+               diag::Collector* diagnostics) {
   const GltfPlan plan(composition);
   if (!IsTaken(plan, diagnostics)) return false;
   std::ostream* const out = files.Main();
   if (out == nullptr) return false;
   std::string dataName;
   if (!plan.tracks().empty()) {
-    std::ostream* const data = files.Beside(stem, ".bin", &dataName);
+    std::ostream* const data = files.Beside("", ".bin", &dataName);
     if (data == nullptr || !WriteGltfData(plan, *data, diagnostics)) return false;
   }
-  WriteGltfJson(plan, dataName, *out);
+  WriteGltfJson(plan, UriOf(dataName), *out);
   return true;
 }
 
 // The sizes stand in front of what they measure, so the JSON is written twice: once to be counted.
-bool WriteGlb(const Composition& composition, const WriteOptions& /*options*/, std::string_view /*stem*/,
-              Files& files, diag::Collector* diagnostics) {
+bool WriteGlb(const Composition& composition, const WriteOptions& /*options*/, Files& files,
+              diag::Collector* diagnostics) {
   const GltfPlan plan(composition);
   if (!IsTaken(plan, diagnostics)) return false;
   const std::uint64_t jsonSize = JsonSize(plan);

@@ -13,4 +13,15 @@ LayerTree::LayerTree(const Composition& composition)
   }
 }
 
+std::vector<std::size_t> LayerTree::ParentsFirst() const {
+  std::vector<std::size_t> order;
+  order.reserve(firstChild_.size());
+  for (std::size_t root = firstRoot_; root != kNone; root = nextSibling_[root]) order.push_back(root);
+  for (std::size_t done = 0; done < order.size(); ++done) {
+    const std::size_t first = firstChild_[order[done]];
+    for (std::size_t child = first; child != kNone; child = nextSibling_[child]) order.push_back(child);
+  }
+  return order;
+}
+
 }  // namespace interchange

@@ -22,6 +22,9 @@ class LayerTree {
   std::size_t FirstChild(std::size_t layer) const { return firstChild_[layer]; }
   std::size_t NextSibling(std::size_t layer) const { return nextSibling_[layer]; }
 
+  // All layers, each after its parent.
+  std::vector<std::size_t> ParentsFirst() const;
+
  private:
   std::size_t firstRoot_ = kNone;
   std::vector<std::size_t> firstChild_;

@@ -49,4 +49,19 @@ void ReportCommonLosses(const Composition& composition, std::string_view format,
   }
 }
 
+void ReportLostExtras(const Composition& composition, diag::Collector* diagnostics) {
+  if (composition.pixelAspect != 1.0) {
+    diagnostics->Report(diag::Code::ExportPartLost, {}, {composition.name, "the pixel aspect"});
+  }
+  for (const Layer& layer : composition.layers) {
+    if (!layer.lens) continue;
+    if (layer.lens->filmOffsetX || layer.lens->filmOffsetY) {
+      diagnostics->Report(diag::Code::ExportPartLost, {}, {layer.name, "the film offset"});
+    }
+    if (layer.lens->squeeze) {
+      diagnostics->Report(diag::Code::ExportPartLost, {}, {layer.name, "the lens squeeze"});
+    }
+  }
+}
+
 }  // namespace interchange

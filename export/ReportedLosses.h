@@ -13,4 +13,7 @@ namespace interchange {
 void ReportCommonLosses(const Composition& composition, std::string_view format,
                         diag::Collector* diagnostics);
 
+// Pixel aspect, film offsets and squeezes, for a format that has a place for none of them.
+void ReportLostExtras(const Composition& composition, diag::Collector* diagnostics);
+
 }  // namespace interchange

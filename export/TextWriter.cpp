@@ -1,13 +1,24 @@
 #include "export/TextWriter.h"
 
 #include <charconv>
+#include <cmath>
+#include <cstdint>
 
 namespace interchange {
+namespace {
+
+constexpr double kLargestWhole = 0x1p53;
+
+}  // namespace
 
 void AppendNumber(std::string* text, double number) {
   char digits[32];
-  const double unsignedZero = number == 0.0 ? 0.0 : number;
-  text->append(digits, std::to_chars(digits, digits + sizeof digits, unsignedZero).ptr);
+  // Readers of frame numbers, and people, take 100000 for a whole number and 1e+05 for none.
+  const bool whole = std::fabs(number) < kLargestWhole && number == std::trunc(number);
+  const std::to_chars_result end =
+      whole ? std::to_chars(digits, digits + sizeof digits, static_cast<std::int64_t>(number))
+            : std::to_chars(digits, digits + sizeof digits, number);
+  text->append(digits, end.ptr);
 }
 
 void TextWriter::Flush() {

@@ -9,7 +9,8 @@
 
 namespace interchange {
 
-// A finite number: "1.5", "-0.25", "1e+300"; "0" for either zero.
+// A finite number: "1.5", "-0.25", "1e+300"; whole numbers below 2^53 without an exponent, "100000"; "0" for
+// either zero.
 void AppendNumber(std::string* text, double number);
 
 class TextWriter {

@@ -210,8 +210,8 @@ double FocalLength(const Composition& composition, const Lens& lens, std::size_t
   return HorizontalAperture(composition, lens) * (lens.zoom.at(frame) / composition.width);
 }
 
-bool WriteUsda(const Composition& composition, const WriteOptions& /*options*/, std::string_view /*stem*/,
-               Files& files, diag::Collector* diagnostics) {
+bool WriteUsda(const Composition& composition, const WriteOptions& /*options*/, Files& files,
+               diag::Collector* diagnostics) {
   if (!IsTaken(composition, diagnostics)) return false;
   ReportCommonLosses(composition, "USD", diagnostics);
   if (composition.axes == Axes::Host) diagnostics->Report(Code::ExportDownAxisLost, {});

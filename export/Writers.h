@@ -7,15 +7,15 @@
 
 namespace interchange {
 
-bool WriteGltf(const Composition& composition, const WriteOptions& options, std::string_view stem,
-               Files& files, diag::Collector* diagnostics);
-bool WriteGlb(const Composition& composition, const WriteOptions& options, std::string_view stem,
-              Files& files, diag::Collector* diagnostics);
-bool WriteUsda(const Composition& composition, const WriteOptions& options, std::string_view stem,
-               Files& files, diag::Collector* diagnostics);
-bool WriteChan(const Composition& composition, const WriteOptions& options, std::string_view stem,
-               Files& files, diag::Collector* diagnostics);
-bool WriteCsv(const Composition& composition, const WriteOptions& options, std::string_view stem,
-              Files& files, diag::Collector* diagnostics);
+bool WriteGltf(const Composition& composition, const WriteOptions& options, Files& files,
+               diag::Collector* diagnostics);
+bool WriteGlb(const Composition& composition, const WriteOptions& options, Files& files,
+              diag::Collector* diagnostics);
+bool WriteUsda(const Composition& composition, const WriteOptions& options, Files& files,
+               diag::Collector* diagnostics);
+bool WriteChan(const Composition& composition, const WriteOptions& options, Files& files,
+               diag::Collector* diagnostics);
+bool WriteCsv(const Composition& composition, const WriteOptions& options, Files& files,
+              diag::Collector* diagnostics);
 
 }  // namespace interchange

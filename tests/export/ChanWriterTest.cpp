@@ -70,7 +70,7 @@ Composition Shot() {
 TEST(ChanWriter, ALineForEachFrameInTheWorldWithoutScale) {
   FilesInMemory files;
   diag::Collector diagnostics("");
-  ASSERT_TRUE(Write(*FindFormat("chan"), Shot(), {}, "shot", files, &diagnostics));
+  ASSERT_TRUE(Write(*FindFormat("chan"), Shot(), {}, files, &diagnostics));
   const auto rows = RowsOf(files.main());
   ASSERT_TRUE(rows) << files.main();
   ASSERT_EQ(rows->size(), 2u);
@@ -88,7 +88,7 @@ TEST(ChanWriter, AnglesGoOnAcrossHalfATurn) {
   composition.layers[0].rotation[1] = Channel(std::vector<double>{170.0, 190.0});
   FilesInMemory files;
   diag::Collector diagnostics("");
-  ASSERT_TRUE(Write(*FindFormat("chan"), composition, {}, "shot", files, &diagnostics));
+  ASSERT_TRUE(Write(*FindFormat("chan"), composition, {}, files, &diagnostics));
   const auto rows = RowsOf(files.main());
   ASSERT_TRUE(rows);
   for (std::size_t i = 4; i < 7; ++i) EXPECT_LT(std::fabs((*rows)[1][i] - (*rows)[0][i]), 21.0) << i;
@@ -100,7 +100,7 @@ TEST(ChanWriter, SeveralCamerasHaveAFileEach) {
   composition.layers.push_back(Camera("cam"));
   FilesInMemory files;
   diag::Collector diagnostics("");
-  ASSERT_TRUE(Write(*FindFormat("chan"), composition, {}, "shot", files, &diagnostics));
+  ASSERT_TRUE(Write(*FindFormat("chan"), composition, {}, files, &diagnostics));
   EXPECT_FALSE(files.hasMain());
   std::vector<std::string> names;
   for (const auto& [name, text] : files.beside()) names.push_back(name);
@@ -112,7 +112,7 @@ TEST(ChanWriter, WithoutACameraThereIsNoFile) {
   composition.layers.pop_back();
   FilesInMemory files;
   diag::Collector diagnostics("");
-  EXPECT_FALSE(Write(*FindFormat("chan"), composition, {}, "shot", files, &diagnostics));
+  EXPECT_FALSE(Write(*FindFormat("chan"), composition, {}, files, &diagnostics));
   EXPECT_EQ(diagnostics.CountOf(Code::ExportWithoutCamera), 1u);
   EXPECT_FALSE(files.hasMain());
 }
@@ -127,7 +127,7 @@ TEST(ChanWriter, WhatItHasNoPlaceForIsNamed) {
   composition.layers[0].lens->squeeze = 2.0;
   FilesInMemory files;
   diag::Collector diagnostics("");
-  ASSERT_TRUE(Write(*FindFormat("chan"), composition, {}, "shot", files, &diagnostics));
+  ASSERT_TRUE(Write(*FindFormat("chan"), composition, {}, files, &diagnostics));
   EXPECT_EQ(diagnostics.CountOf(Code::ExportPartLost), 3u);
   EXPECT_EQ(diagnostics.CountOf(Code::ExportFramesRounded), 1u);
 }
@@ -140,7 +140,7 @@ TEST(ChanWriter, FrameNumbersAreWrittenUpToTheLargestThatIsExactAndNoFurther) {
     FilesInMemory files;
     diag::Collector diagnostics("");
     const bool exact = std::fabs(first) == 0x1p53 - 2.0;
-    EXPECT_EQ(Write(*FindFormat("chan"), composition, {}, "shot", files, &diagnostics), exact) << first;
+    EXPECT_EQ(Write(*FindFormat("chan"), composition, {}, files, &diagnostics), exact) << first;
     EXPECT_EQ(diagnostics.CountOf(Code::ExportTimesTooFine), exact ? 0u : 1u) << first;
     if (!exact) continue;
     const auto rows = RowsOf(files.main());
@@ -161,8 +161,8 @@ TEST(ChanWriter, HostAxesComeOutAsThoseOfTheScene) {
   }
   FilesInMemory sceneFiles, hostFiles;
   diag::Collector diagnostics("");
-  ASSERT_TRUE(Write(*FindFormat("chan"), scene, {}, "shot", sceneFiles, &diagnostics));
-  ASSERT_TRUE(Write(*FindFormat("chan"), host, {}, "shot", hostFiles, &diagnostics));
+  ASSERT_TRUE(Write(*FindFormat("chan"), scene, {}, sceneFiles, &diagnostics));
+  ASSERT_TRUE(Write(*FindFormat("chan"), host, {}, hostFiles, &diagnostics));
   const auto a = RowsOf(sceneFiles.main()), b = RowsOf(hostFiles.main());
   ASSERT_TRUE(a && b);
   for (std::size_t i = 0; i < 8; ++i) EXPECT_NEAR((*a)[1][i], (*b)[1][i], 1e-12) << i;
@@ -175,7 +175,7 @@ TEST(ChanWriter, HostileCompositionsGiveLinesOrAnError) {
     const Composition composition = HostileComposition(seed);
     FilesInMemory files;
     diag::Collector diagnostics("");
-    if (!Write(*FindFormat("chan"), composition, {}, "shot", files, &diagnostics)) {
+    if (!Write(*FindFormat("chan"), composition, {}, files, &diagnostics)) {
       ASSERT_GT(diagnostics.CountOf(diag::Severity::Error), 0u);
       continue;
     }

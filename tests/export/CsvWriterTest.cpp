@@ -3,6 +3,7 @@
 
 #include <charconv>
 #include <cmath>
+#include <ctime>
 #include <string>
 #include <vector>
 
@@ -67,7 +68,7 @@ bool IsNumber(const std::string& text) {
 std::vector<Row> Written(const Composition& composition, bool keys = false) {
   FilesInMemory files;
   diag::Collector diagnostics("");
-  EXPECT_TRUE(Write(*FindFormat("csv"), composition, {.keys = keys}, "shot", files, &diagnostics));
+  EXPECT_TRUE(Write(*FindFormat("csv"), composition, {.keys = keys}, files, &diagnostics));
   EXPECT_EQ(diagnostics.count(), 0u);
   EXPECT_TRUE(files.beside().empty());
   const auto rows = RowsOf(files.main());
@@ -108,6 +109,8 @@ TEST(CsvWriter, ARowForEachFrameOfEachLayer) {
                                    "sy", "sz", "wx", "wy", "wz", "zoom", "focal", "fov", "number", "parent"));
   EXPECT_THAT(rows[1], ElementsAre("arm", "101", "0", "0", "7", "0", "0", "0", "90", "1", "1", "1", "0", "7",
                                    "0", "", "", "", "1", ""));
+  EXPECT_EQ(rows[2][0], "cam");
+  EXPECT_EQ(rows[3][0], "arm");
   EXPECT_THAT(rows[4], ElementsAre("cam", "102", "0.04", "2.5", "0", "0", "370", "0", "0", "1", "1", "3", "0",
                                    "9.5", "0", "540", "9", "90", "2", "1"));
 }
@@ -119,7 +122,7 @@ TEST(CsvWriter, AnAimedCameraHasItsResultingAngles) {
   camera.aimed = true;
   camera.interest[0] = -1.0;
   const std::vector<Row> rows = Written(composition);
-  EXPECT_THAT((Row(rows[3].begin() + 6, rows[3].begin() + 9)), ElementsAre("0", "90", "0"));
+  EXPECT_THAT((Row(rows[2].begin() + 6, rows[2].begin() + 9)), ElementsAre("0", "90", "0"));
 }
 
 TEST(CsvWriter, ACameraThatIsAimedAtWhatIsAsGoodAsNowhereHasItsAngles) {
@@ -130,7 +133,7 @@ TEST(CsvWriter, ACameraThatIsAimedAtWhatIsAsGoodAsNowhereHasItsAngles) {
     camera.aimed = true;
     camera.interest[0] = -4.0 * way;
     const std::vector<Row> rows = Written(composition);
-    EXPECT_THAT((Row(rows[3].begin() + 6, rows[3].begin() + 9)), ElementsAre("0", "90", "0")) << way;
+    EXPECT_THAT((Row(rows[2].begin() + 6, rows[2].begin() + 9)), ElementsAre("0", "90", "0")) << way;
   }
 }
 
@@ -145,7 +148,14 @@ TEST(CsvWriter, ARowForEachKeyOfEachStream) {
 }
 
 TEST(CsvWriter, NamesAreNoFormulas) {
-  for (const std::string name : {"=1", "+1", "-1", "@x", "  =1"}) {
+  for (const std::string name : {"=1", "+1", "-1", "@x", "  =1",
+                                 "\xef\xbc\x9d"
+                                 "1",
+                                 "\xef\xbc\x8b"
+                                 "1",
+                                 "\xef\xbc\x8d"
+                                 "1",
+                                 " \xef\xbc\xa0x"}) {
     Composition composition = OneCamera();
     composition.layers[0].name = name;
     EXPECT_EQ(Written(composition)[1][0], '\'' + name);
@@ -158,7 +168,58 @@ TEST(CsvWriter, NamesAreQuotedAndWithoutControls) {
   composition.layers[1].name = "two\nlines\xff\t";
   const std::vector<Row> rows = Written(composition);
   EXPECT_EQ(rows[1][0], "a \"b\", c");
-  EXPECT_EQ(rows[3][0], "two\\nlines\\xff\\t");
+  EXPECT_EQ(rows[2][0], "two\\nlines\\xff\\t");
+}
+
+TEST(CsvWriter, ASemicolonStandsInQuotes) {
+  Composition composition = OneCamera();
+  composition.layers[0].name = "a;=1";
+  FilesInMemory files;
+  diag::Collector diagnostics("");
+  EXPECT_TRUE(Write(*FindFormat("csv"), composition, {}, files, &diagnostics));
+  EXPECT_THAT(files.main(), HasSubstr("\n\"a;=1\",101,"));
+}
+
+TEST(CsvWriter, WholeNumbersHaveNoExponent) {
+  Composition composition = OneCamera();
+  composition.firstFrame = 100000;
+  composition.layers[0].position[1] = -9007199254740991.0;
+  composition.layers[0].position[2] = 1e300;
+  const std::vector<Row> rows = Written(composition);
+  EXPECT_THAT((Row(rows[1].begin() + 1, rows[1].begin() + 6)),
+              ElementsAre("100000", "0", "0", "-9007199254740991", "1e+300"));
+}
+
+TEST(CsvWriter, WhatItHasNoPlaceForIsNamed) {
+  Composition composition = OneCamera();
+  composition.pixelAspect = 2.0;
+  composition.layers[1].lens->filmOffsetY = 0.1;
+  composition.layers[1].lens->squeeze = 1.5;
+  for (const bool keys : {false, true}) {
+    FilesInMemory files;
+    diag::Collector diagnostics("");
+    EXPECT_TRUE(Write(*FindFormat("csv"), composition, {.keys = keys}, files, &diagnostics));
+    EXPECT_EQ(diagnostics.CountOf(diag::Code::ExportPartLost), 3u);
+  }
+}
+
+TEST(CsvWriter, DeepParentsTakeNoLongerThanFlatOnes) {
+  Composition composition;
+  constexpr std::size_t kDepth = 20'000;
+  for (std::size_t i = 0; i < kDepth; ++i) {
+    Layer layer;
+    layer.name = "link";
+    layer.position[0] = 1.0;
+    if (i + 1 < kDepth) layer.parent = i + 1;
+    composition.layers.push_back(layer);
+  }
+  FilesInMemory files;
+  diag::Collector diagnostics("");
+  const std::clock_t begin = std::clock();
+  EXPECT_TRUE(Write(*FindFormat("csv"), composition, {}, files, &diagnostics));
+  // Worked out link by link for each of them it takes half a minute.
+  EXPECT_LT(std::clock() - begin, 3 * CLOCKS_PER_SEC);
+  EXPECT_THAT(files.main(), HasSubstr("\nlink,1,0,1,0,0,0,0,0,1,1,1," + std::to_string(kDepth) + ",0,0,"));
 }
 
 TEST(CsvWriter, HostileCompositionsGiveATableOrAnError) {
@@ -168,7 +229,7 @@ TEST(CsvWriter, HostileCompositionsGiveATableOrAnError) {
     const Composition composition = HostileComposition(seed);
     FilesInMemory files;
     diag::Collector diagnostics("");
-    if (!Write(*FindFormat("csv"), composition, {}, "shot", files, &diagnostics)) {
+    if (!Write(*FindFormat("csv"), composition, {}, files, &diagnostics)) {
       ASSERT_GT(diagnostics.CountOf(diag::Severity::Error), 0u);
       ++refused;
       continue;

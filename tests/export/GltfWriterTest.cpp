@@ -254,6 +254,13 @@ TEST(GltfFiles, TheDataAreInAFileBesideTheOther) {
   EXPECT_TRUE(WriteAs("glb", RigShot()).beside.empty());
 }
 
+TEST(GltfFiles, TheDataHaveTheNameOfTheOtherAndTheReferenceToThemIsAUri) {
+  const Written written = WriteAs("gltf", RigShot(), 0, "\xe5\xa0\xb4 a:b~%");
+  ASSERT_EQ(written.beside.size(), 1u);
+  EXPECT_EQ(written.beside.begin()->first, "\xe5\xa0\xb4 a:b~%.bin");
+  EXPECT_EQ(GltfJsonOf(written.file)["buffers"][0]["uri"], "%E5%A0%B4%20a%3Ab~%25.bin");
+}
+
 TEST(GltfFiles, AnOutputThatCannotBeMadeEndsTheWriting) {
   EXPECT_FALSE(WriteAs("gltf", RigShot(), 1).done);
   EXPECT_FALSE(WriteAs("gltf", RigShot(), 2).done);

@@ -179,11 +179,15 @@ std::ostream* FilesInMemory::Main() {
   return main_.get();
 }
 
-std::ostream* FilesInMemory::Beside(std::string_view stem, std::string_view suffix, std::string* name) {
-  EXPECT_EQ(interchange::SafeName(stem, ""), stem) << "the name of a file is safe";
-  *name = std::string(stem) + std::string(suffix);
+std::ostream* FilesInMemory::Beside(std::string_view part, std::string_view suffix, std::string* name) {
+  // A dot and a safe name, where anything is added to the name that the user gave.
+  const std::string_view added = part.substr(part.empty() ? 0 : 1);
+  EXPECT_TRUE(part.empty() || part.front() == '.');
+  EXPECT_EQ(interchange::SafeName(added, ""), added);
+  const std::string stem = stem_ + std::string(part);
+  *name = stem + std::string(suffix);
   for (int number = 2; beside_.count(*name) != 0; ++number) {
-    *name = std::string(stem) + '_' + std::to_string(number) + std::string(suffix);
+    *name = stem + '_' + std::to_string(number) + std::string(suffix);
   }
   return (beside_[*name] = std::make_unique<std::ostringstream>()).get();
 }

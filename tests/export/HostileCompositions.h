@@ -8,6 +8,7 @@
 #include <optional>
 #include <sstream>
 #include <string>
+#include <utility>
 
 #include "export/Composition.h"
 #include "export/Format.h"
@@ -27,8 +28,11 @@ interchange::Composition HostileComposition(std::uint64_t seed);
 // Outputs in memory.
 class FilesInMemory : public interchange::Files {
  public:
+  // `stem`: the name of the main output, without a suffix.
+  explicit FilesInMemory(std::string stem = "shot") : stem_(std::move(stem)) {}
+
   std::ostream* Main() override;
-  std::ostream* Beside(std::string_view stem, std::string_view suffix, std::string* name) override;
+  std::ostream* Beside(std::string_view part, std::string_view suffix, std::string* name) override;
 
   // What was written; empty where nothing was.
   std::string main() const { return main_ ? main_->str() : ""; }
@@ -36,6 +40,7 @@ class FilesInMemory : public interchange::Files {
   std::map<std::string, std::string> beside() const;  // by name
 
  private:
+  std::string stem_;
   std::unique_ptr<std::ostringstream> main_;
   std::map<std::string, std::unique_ptr<std::ostringstream>> beside_;
 };

@@ -1,5 +1,7 @@
 #include "tests/export/WrittenFiles.h"
 
+#include <utility>
+
 #include "tests/export/HostileCompositions.h"
 
 namespace exporttest {
@@ -7,11 +9,11 @@ namespace {
 
 class FailingFiles : public interchange_test::FilesInMemory {
  public:
-  explicit FailingFiles(std::size_t failing) : failing_(failing) {}
+  FailingFiles(std::size_t failing, std::string stem) : FilesInMemory(std::move(stem)), failing_(failing) {}
 
   std::ostream* Main() override { return Next() ? FilesInMemory::Main() : nullptr; }
-  std::ostream* Beside(std::string_view stem, std::string_view suffix, std::string* name) override {
-    return Next() ? FilesInMemory::Beside(stem, suffix, name) : nullptr;
+  std::ostream* Beside(std::string_view part, std::string_view suffix, std::string* name) override {
+    return Next() ? FilesInMemory::Beside(part, suffix, name) : nullptr;
   }
 
  private:
@@ -23,12 +25,12 @@ class FailingFiles : public interchange_test::FilesInMemory {
 
 }  // namespace
 
-Written WriteAs(std::string_view format, const interchange::Composition& composition, std::size_t failing) {
-  FailingFiles files(failing);
+Written WriteAs(std::string_view format, const interchange::Composition& composition, std::size_t failing,
+                std::string stem) {
+  FailingFiles files(failing, std::move(stem));
   diag::Collector diagnostics("");
   Written written;
-  written.done =
-      interchange::Write(*interchange::FindFormat(format), composition, {}, "shot", files, &diagnostics);
+  written.done = interchange::Write(*interchange::FindFormat(format), composition, {}, files, &diagnostics);
   written.file = files.main();
   written.beside = files.beside();
   for (const diag::Diagnostic& diagnostic : diagnostics.kept()) {

@@ -21,8 +21,9 @@ struct Written {
   std::uint64_t CountOf(diag::Code code) const { return counts.contains(code) ? counts.at(code) : 0; }
 };
 
-// In a format of the table. `failing`: which of the outputs, counted from 1, cannot be made.
-Written WriteAs(std::string_view format, const interchange::Composition& composition,
-                std::size_t failing = 0);
+// In a format of the table. `failing`: which of the outputs, counted from 1, cannot be made. `stem`: the name
+// of the main output, without a suffix.
+Written WriteAs(std::string_view format, const interchange::Composition& composition, std::size_t failing = 0,
+                std::string stem = "shot");
 
 }  // namespace exporttest

@@ -153,6 +153,23 @@ TEST_F(ExportCommandTest, AReportAndAFurtherOutputAreNeverOneFileHoweverTheyAreN
   EXPECT_FALSE(std::filesystem::exists(path("real/r.gltf")));
 }
 
+TEST_F(ExportCommandTest, TheDataOfTwoOutputsAreTwoFilesWhateverTheirLetters) {
+  write("shot.ma", rig("cm"));
+  const std::string one = "\xe5\xa0\xb4\xe4\xb8\x80", two = "\xe5\xa0\xb4\xe4\xba\x8c";
+  for (const std::string& name : {one, two}) {
+    EXPECT_EQ(run({"export", "shot.ma", "-o", name + ".gltf", "--quiet"}).status, 0);
+  }
+  EXPECT_THAT(files(), ElementsAre("shot.ma", one + ".bin", one + ".gltf", two + ".bin", two + ".gltf"));
+}
+
+TEST_F(ExportCommandTest, WhereOneOutputCannotBeWrittenNoneAppears) {
+  write("shot.ma", rig("cm"));
+  std::filesystem::create_symlink("/dev/full", path("full.gltf"));
+  const auto result = run({"export", "shot.ma", "-o", "full.gltf"});
+  EXPECT_EQ(result.status, 5) << result.err;
+  EXPECT_THAT(files(), ElementsAre("full.gltf", "shot.ma"));
+}
+
 TEST_F(ExportCommandTest, WhatCannotBeExportedLeavesNoFile) {
   write("empty.ma", "//Maya ASCII 2023 scene\ncreateNode transform -n \"rig\";\n");
   write("notes.ma", "just some notes\n");

@@ -98,7 +98,7 @@ class ExportRun {
                                        .keys = arguments_.keys},
                                       &collector);
     ExportFiles files(place, &taken_);
-    const bool written = composition && write(*composition, place, &files, &collector);
+    const bool written = composition && write(*composition, &files, &collector);
     show(report.path, collector, diagnostics_);
     if (!files.failure().empty()) {
       diagnostics_.complain("", files.failure());
@@ -110,10 +110,8 @@ class ExportRun {
     return warned ? ExitStatus::Refused : ExitStatus::Done;
   }
 
-  bool write(const interchange::Composition& composition, const std::string& place, ExportFiles* files,
-             diag::Collector* collector) {
-    const std::string stem = interchange::SafeName(fs::path(place).stem().string(), "scene");
-    return interchange::Write(format_, composition, {.keys = arguments_.keys}, stem, *files, collector) &&
+  bool write(const interchange::Composition& composition, ExportFiles* files, diag::Collector* collector) {
+    return interchange::Write(format_, composition, {.keys = arguments_.keys}, *files, collector) &&
            files->commit();
   }
 

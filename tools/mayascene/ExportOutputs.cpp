@@ -17,15 +17,16 @@ std::ostream* ExportFiles::Main() {
   return &main_->stream();
 }
 
-std::ostream* ExportFiles::Beside(std::string_view stem, std::string_view suffix, std::string* name) {
+std::ostream* ExportFiles::Beside(std::string_view part, std::string_view suffix, std::string* name) {
   if (place_ == kStandardOutput) {
     failure_ = "it is written as more than one file, which standard output cannot take";
     return nullptr;
   }
   const fs::path folder = fs::path(place_).parent_path();
+  const std::string stem = fs::path(place_).stem().string() + std::string(part);
   fs::path place;
   for (int number = 1;; ++number) {
-    *name = std::string(stem) + (number == 1 ? "" : '_' + std::to_string(number)) + std::string(suffix);
+    *name = stem + (number == 1 ? "" : '_' + std::to_string(number)) + std::string(suffix);
     place = folder / *name;
     if (taken_->outputs.insert(interchange::Lowered(place.lexically_normal().string())).second) break;
   }
@@ -41,10 +42,13 @@ std::ostream* ExportFiles::Beside(std::string_view stem, std::string_view suffix
 }
 
 bool ExportFiles::commit() {
-  for (const auto& output : beside_) {
-    if (!output->commit(&failure_)) return false;
-  }
-  return main_ == nullptr || main_->commit(&failure_);
+  std::vector<OutputFile*> all;
+  for (const auto& output : beside_) all.push_back(output.get());
+  if (main_ != nullptr) all.push_back(main_.get());
+  // A full disk is noticed before the first of them takes its place.
+  const auto finished = [this](OutputFile* output) { return output->finish(&failure_); };
+  const auto placed = [this](OutputFile* output) { return output->place(&failure_); };
+  return std::all_of(all.begin(), all.end(), finished) && std::all_of(all.begin(), all.end(), placed);
 }
 
 }  // namespace mayascene

@@ -26,7 +26,7 @@ class ExportFiles : public interchange::Files {
   ExportFiles(std::string place, TakenFiles* taken) : place_(std::move(place)), taken_(taken) {}
 
   std::ostream* Main() override;
-  std::ostream* Beside(std::string_view stem, std::string_view suffix, std::string* name) override;
+  std::ostream* Beside(std::string_view part, std::string_view suffix, std::string* name) override;
 
   // Puts all of them where they belong, the main one last. What is not committed leaves nothing.
   bool commit();

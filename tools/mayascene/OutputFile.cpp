@@ -140,21 +140,25 @@ std::unique_ptr<OutputFile> OutputFile::openLog(const std::string& target, std::
   return std::unique_ptr<OutputFile>(new OutputFile(std::move(state)));
 }
 
-bool OutputFile::commit(std::string* failure) {
+bool OutputFile::finish(std::string* failure) {
   State& state = *state_;
   state.stream.flush();
   int number = state.buffer->failure();
   if (state.closeDescriptor() != 0 && number == 0) number = errno;
-  if (number == 0 && !state.beside.empty()) {
-    if (std::rename(state.beside.c_str(), state.place.c_str()) != 0) {
-      number = errno;
-    } else {
-      forgetUnfinished(state.beside.c_str());
-      state.beside.clear();
-    }
-  }
   if (number != 0) *failure = cannotWrite(state.target, number);
   return number == 0;
+}
+
+bool OutputFile::place(std::string* failure) {
+  State& state = *state_;
+  if (state.beside.empty()) return true;
+  if (std::rename(state.beside.c_str(), state.place.c_str()) != 0) {
+    *failure = cannotWrite(state.target, errno);
+    return false;
+  }
+  forgetUnfinished(state.beside.c_str());
+  state.beside.clear();
+  return true;
 }
 
 }  // namespace mayascene

@@ -34,7 +34,12 @@ class OutputFile {
 
   // Puts everything written where it belongs; call it once, at the end. False with a sentence in *failure
   // when a write has failed or the file cannot take its place.
-  bool commit(std::string* failure);
+  bool commit(std::string* failure) { return finish(failure) && place(failure); }
+
+  // The two halves of commit(), for several outputs of which none is to appear where one fails: first all are
+  // finished, then all are placed. Finishing writes everything out and closes the file.
+  bool finish(std::string* failure);
+  bool place(std::string* failure);
 
  private:
   struct State;
