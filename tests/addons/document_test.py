@@ -29,6 +29,14 @@ class Documents(unittest.TestCase):
         later = compositions.document(unheard="of")
         self.assertEqual(document.read(later)[0].pictures, [])
 
+    def test_a_composition_without_layers_is_nothing(self):
+        for made in ([], [compositions.composition(1, [])]):
+            read = document.read(compositions.document(*made))[0]
+            self.assertEqual((read.outcome, read.pictures), ("nothing", []))
+        full = document.read(compositions.document(compositions.composition(
+            1, [compositions.layer(1, "null", "head")])))[0]
+        self.assertEqual(full.outcome, "imported")
+
     def test_an_error_is_a_complaint_with_its_line(self):
         failed = compositions.document()
         failed["scenes"][0]["error"] = {"code": 7, "name": "", "meaning": "",

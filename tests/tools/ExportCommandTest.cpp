@@ -173,11 +173,15 @@ TEST_F(ExportCommandTest, WhereOneOutputCannotBeWrittenNoneAppears) {
 TEST_F(ExportCommandTest, WhatCannotBeExportedLeavesNoFile) {
   write("empty.ma", "//Maya ASCII 2023 scene\ncreateNode transform -n \"rig\";\n");
   write("notes.ma", "just some notes\n");
+  write("persp.ma", mayascene_test::sceneText("createNode camera -n \"perspShape\";\n"));
   EXPECT_EQ(run({"export", "empty.ma", "-o", "x.csv"}).status, 1);
   EXPECT_EQ(run({"export", "notes.ma", "-o", "x.csv"}).status, 1);
+  const auto still = run({"export", "persp.ma", "-o", "x.csv"});
+  EXPECT_EQ(still.status, 1);
+  EXPECT_THAT(still.err, HasSubstr("persp.ma: nothing is written: it has no camera"));
   EXPECT_EQ(run({"export", "missing.ma", "-o", "x.csv"}).status, 3);
   EXPECT_EQ(run({"export", "empty.ma", "-o", "no/such/x.csv"}).status, 1);
-  EXPECT_THAT(files(), ElementsAre("empty.ma", "notes.ma"));
+  EXPECT_THAT(files(), ElementsAre("empty.ma", "notes.ma", "persp.ma"));
 }
 
 TEST_F(ExportCommandTest, ManyFramesAreWrittenOnlyWhereTheyAreAskedFor) {

@@ -67,9 +67,11 @@ class ExportRun {
       report = importOne(path, session, diagnostics_);
     }
     status = worse(status, judgeScene(report, false, diagnostics_));
-    if (report.outcome == Outcome::Imported) {
+    const bool imported = report.outcome == Outcome::Imported;
+    // A composition without layers is made of a default camera alone.
+    if (imported && !report.result.folder->compositions.front()->layers.empty()) {
       status = worse(status, writeImported(report, baked, place, session.host().linearUnits()));
-    } else if (report.outcome == Outcome::Nothing) {
+    } else if (imported || report.outcome == Outcome::Nothing) {
       diagnostics_.complain(path, "nothing is written: it has no camera");
       status = worse(status, ExitStatus::Refused);
     }

@@ -175,7 +175,10 @@ def _scene(scene):
         where = "" if error["line"] is None else f", line {error['line']}"
         meaning = error["meaning"] or f"error {error['code']}"
         complaints.append(f"{meaning}{where}")
-    return Scene(scene["path"], scene["outcome"], complaints,
+    outcome = scene["outcome"]
+    if outcome == "imported" and not pictures:
+        outcome = "nothing"  # a composition of a default camera has no layers
+    return Scene(scene["path"], outcome, complaints,
                  scene.get("linearUnit"), pictures)
 
 
