@@ -1,11 +1,9 @@
 #include "bake/FrameRange.h"
 
-#include <algorithm>
 #include <cmath>
 #include <string>
-#include <string_view>
 
-#include "motion/CurveReader.h"
+#include "motion/FrameEnds.h"
 #include "text/Numbers.h"
 
 namespace bake {
@@ -13,27 +11,12 @@ namespace {
 
 using scene::NodeId;
 
-// Times nearer to a whole frame than this count as that frame.
-constexpr double kFrameTolerance = 1e-6;
-
 // Later frames are no time that a composition could hold.
 constexpr double kMostTimes = 2'000'000;
 
-struct Ends {
-  double first = INFINITY;
-  double last = -INFINITY;
-
-  bool known() const { return first <= last; }
-  void TakeIn(double frame) {
-    if (!std::isfinite(frame)) return;
-    first = std::min(first, frame);
-    last = std::max(last, frame);
-  }
-};
-
 std::optional<FrameRange> RangeOf(double first, double last, double step, bool bounded,
                                   diag::Collector* diagnostics) {
-  const double count = std::floor((last - first) / step + kFrameTolerance) + 1.0;
+  const double count = std::floor((last - first) / step + motion::kFrameTolerance) + 1.0;
   const double most = bounded ? static_cast<double>(kMostFrames) : kMostTimes;
   if (!(count <= most) || !((count - 1.0) * step <= kMostTimes)) {
     diagnostics->Report(diag::Code::TooManyFrames, {},
@@ -51,21 +34,11 @@ std::optional<FrameRange> FindFrames(const scene::Scene& scene, const std::vecto
   if (options.frames) {
     return RangeOf(options.frames->first, options.frames->last, options.step, false, diagnostics);
   }
-  Ends ends;
-  if (head.playback) {
-    ends.TakeIn(head.playback->first);
-    ends.TakeIn(head.playback->last);
-  }
-  for (const NodeId node : nodes) {
-    // Driven keys have no time.
-    if (!scene.node(node).type.starts_with("animCurveT")) continue;
-    for (const motion::CurveKey& key : motion::ReadCurve(scene, node, measures).keys) {
-      ends.TakeIn(key.time * measures.framesPerSecond / head.unitsPerFrame);
-    }
-  }
-  if (!ends.known()) return FrameRange{};
-  return RangeOf(std::floor(ends.first + kFrameTolerance), std::ceil(ends.last - kFrameTolerance),
-                 options.step, true, diagnostics);
+  std::optional<motion::FrameEnds> played;
+  if (head.playback) played = motion::FrameEnds{head.playback->first, head.playback->last};
+  const auto ends = motion::FindFrameEnds(scene, played, nodes, measures);
+  if (!ends) return FrameRange{};
+  return RangeOf(ends->first, ends->last, options.step, true, diagnostics);
 }
 
 }  // namespace bake

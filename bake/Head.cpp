@@ -1,7 +1,6 @@
 #include "bake/Head.h"
 
 #include <algorithm>
-#include <array>
 #include <cmath>
 #include <string_view>
 
@@ -15,22 +14,14 @@ namespace {
 
 constexpr std::string_view kDefaultLength = "centimeter";
 constexpr std::string_view kDefaultRate = "film";
-constexpr double kDefaultFramesPerSecond = 24.0;
-
-// Units of time that count no frames.
-constexpr std::array<std::string_view, 4> kClockUnits = {"sec", "min", "hour", "millisec"};
-
-bool IsClockUnit(std::string_view word) {
-  return std::find(kClockUnits.begin(), kClockUnits.end(), word) != kClockUnits.end();
-}
 
 void ReadTimeUnit(const scene::Scene& scene, Head* head, diag::Collector* diagnostics) {
   const scene::UnitWord& unit = scene.timeUnit();
   head->timeUnit = kDefaultRate;
   if (unit.word.empty() || !scene::TimeUnitOf(unit.word)) return;
-  if (IsClockUnit(unit.word)) {
+  if (motion::IsClockUnit(unit.word)) {
     diagnostics->Report(diag::Code::ClockTimeUnit, unit.place, {unit.word});
-    head->unitsPerFrame = motion::MeasuresOf(scene).framesPerSecond / kDefaultFramesPerSecond;
+    head->unitsPerFrame = motion::UnitsPerFrame(scene);
   } else if (unit.word == "game") {
     head->timeUnit = "15fps";  // the importer takes the word for a unit that counts no frames
   } else {

@@ -5,31 +5,37 @@
 #include <cmath>
 
 #include "check/Cameras.h"
+#include "motion/Measures.h"
 
 namespace check {
 namespace {
 
 constexpr std::array<std::string_view, 1> kFocalLength = {"focalLength"};
 
-void TakeInTime(double time, KeyedChannel* channel) {
+// Nearer to a whole frame no composition can say it: its times are thousandths of a frame.
+constexpr double kWholeFrame = 1e-3;
+
+void TakeInTime(double time, double unitsPerFrame, KeyedChannel* channel) {
+  const double frame = time / unitsPerFrame;
   if (channel->keys == 0) channel->first = time;
-  if (channel->keys != 0 && std::fabs(time - channel->last - 1.0) > 1e-6) channel->whole = false;
-  if (!channel->fractional && std::fabs(time - std::round(time)) > 1e-3) {
+  const double step = frame - channel->last / unitsPerFrame;
+  if (channel->keys != 0 && std::fabs(step - 1.0) > kWholeFrame) channel->whole = false;
+  if (!channel->fractional && std::fabs(frame - std::round(frame)) > kWholeFrame) {
     channel->fractional = true;
-    channel->fraction = time;
+    channel->fraction = frame;
   }
   channel->last = time;
   ++channel->keys;
 }
 
-void ReadKeys(const scene::Scene& scene, KeyedChannel* channel) {
+void ReadKeys(const scene::Scene& scene, double unitsPerFrame, KeyedChannel* channel) {
   for (const scene::Piece& piece : scene.Pieces(channel->curve, "keyTimeValue")) {
     const std::vector<double> numbers = piece.value.Numbers();
     if (channel->keys == 0) {
       channel->place = piece.value.range();
       channel->firstValue = numbers.size() > 1 ? numbers[1] : 0.0;
     }
-    for (std::size_t i = 0; i < numbers.size(); i += 2) TakeInTime(numbers[i], channel);
+    for (std::size_t i = 0; i < numbers.size(); i += 2) TakeInTime(numbers[i], unitsPerFrame, channel);
   }
 }
 
@@ -45,6 +51,8 @@ bool IsPath(const scene::Scene& scene, const diag::Range& plug) {
   return text.substr(0, text.find('.')).find_first_of("|:") == 0 ||
          text.substr(0, text.find('.')).find('|') != std::string_view::npos;
 }
+
+Channels::Channels(const scene::Scene& scene) : scene_(scene), unitsPerFrame_(motion::UnitsPerFrame(scene)) {}
 
 const Channels::Found& Channels::Of(scene::NodeId node) {
   static const Found none;
@@ -77,7 +85,7 @@ Channels::Found Channels::Find(scene::NodeId node, std::span<const std::string_v
     if (!IsImportedCurve(scene_.node(driver->plug.node).type)) continue;
     if (IsPath(scene_, driver->connection->destinationPlace)) continue;
     KeyedChannel keyed{.channel = channel, .curve = driver->plug.node, .place = {}};
-    ReadKeys(scene_, &keyed);
+    ReadKeys(scene_, unitsPerFrame_, &keyed);
     found.keyed.push_back(keyed);
   }
   return found;

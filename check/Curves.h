@@ -20,7 +20,7 @@ struct KeyedChannel {
   double firstValue = 0.0;  // of the first key
   bool whole = true;        // a key at every frame from the first to the last
   bool fractional = false;  // a key lies at a fraction of a frame
-  double fraction = 0.0;    // the first that does
+  double fraction = 0.0;    // the first that does, in frames
   diag::Range place;        // of the first keys
 };
 
@@ -33,7 +33,7 @@ struct DrivenChannel {
 // Finds what drives the channels of a node and reads the keys of its curves, once for all rules that ask.
 class Channels {
  public:
-  explicit Channels(const scene::Scene& scene) : scene_(scene) {}
+  explicit Channels(const scene::Scene& scene);
 
   // Of the nine channels, in their order. It lasts as long as the object, as the next two do.
   std::span<const DrivenChannel> DriversOf(scene::NodeId node) { return Of(node).drivers; }
@@ -54,6 +54,7 @@ class Channels {
   Found Find(scene::NodeId node, std::span<const std::string_view> channels) const;
 
   const scene::Scene& scene_;
+  double unitsPerFrame_;
   std::unordered_map<scene::NodeId, Found> places_;
   std::unordered_map<scene::NodeId, Found> lenses_;
 };

@@ -1,12 +1,12 @@
 // What of a camera's lens and film the importer does not take.
 #include <array>
-#include <cmath>
+#include <optional>
 #include <string>
 
+#include "check/Difference.h"
 #include "check/RulesInternal.h"
 #include "motion/Camera.h"
 #include "motion/SceneCamera.h"
-#include "text/Numbers.h"
 
 namespace check {
 namespace {
@@ -29,8 +29,8 @@ class Lens {
   Lens(const Subject& subject, NodeId camera) : subject_(subject), camera_(camera) {}
 
   void Report() {
-    if (const auto place = FirstThatDiffers(kOffsets)) Say(Code::FilmOffsetLost, *place);
-    if (const auto place = FirstThatDiffers(kEffects)) Say(Code::PictureEffectLost, *place);
+    if (const auto offset = FirstThatDiffers(kOffsets)) Say(Code::FilmOffsetLost, offset->place);
+    if (const auto effect = FirstThatDiffers(kEffects)) Say(Code::PictureEffectLost, effect->place);
     ReportFactor("lensSqueezeRatio", Code::LensSqueezeLost);
     ReportFactor("cameraScale", Code::CameraScaleLost);
     ReportFit();
@@ -45,28 +45,21 @@ class Lens {
 
   void Say(Code code, const diag::Range& place) { subject_.diagnostics.Report(code, place, {name()}); }
 
-  // Where the file gives the attribute another value, or has something drive it.
-  std::optional<diag::Range> Differs(const Field& field) const {
-    if (const auto driver = scene().SourceOf(scene().PlugOf(camera_, field.attribute))) {
-      return driver->connection->destinationPlace;
-    }
-    const auto written = scene().Written(camera_, field.attribute);
-    const auto number = written ? written->Number() : std::nullopt;
-    if (!number || *number == field.neutral) return std::nullopt;
-    return written->range();
+  std::optional<Difference> Differs(const Field& field) const {
+    return DifferenceFrom(subject_, camera_, field.attribute, field.neutral);
   }
 
   template <std::size_t kCount>
-  std::optional<diag::Range> FirstThatDiffers(const std::array<Field, kCount>& fields) const {
+  std::optional<Difference> FirstThatDiffers(const std::array<Field, kCount>& fields) const {
     for (const Field& field : fields) {
-      if (const auto place = Differs(field)) return place;
+      if (auto difference = Differs(field)) return difference;
     }
     return std::nullopt;
   }
 
   void ReportFactor(std::string_view attribute, Code code) {
-    if (const auto place = Differs({attribute, 1.0})) {
-      subject_.diagnostics.Report(code, *place, {name(), text::RoundedNumber(Number(attribute, 1.0))});
+    if (const auto factor = Differs({attribute, 1.0})) {
+      subject_.diagnostics.Report(code, factor->place, {name(), factor->what});
     }
   }
 

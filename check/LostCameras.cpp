@@ -28,6 +28,8 @@ void ReportAttributes(const Subject& subject, NodeId camera) {
   const auto add = [&attributes](const char* what) {
     attributes += (attributes.empty() ? "" : ", ") + std::string(what);
   };
+  // The importer knows an orthographic camera by one word alone: with another one it comes over.
+  if (subject.scene.Number(camera, "orthographic").value_or(0.0) != 0.0) add("the orthographic view");
   if (IsOn(subject.scene, camera, "dof") || IsOn(subject.scene, camera, "depthOfField"))
     add("the depth of field");
   if (HasImagePlane(subject.scene, camera)) add("the image plane");

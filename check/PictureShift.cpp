@@ -1,142 +1,138 @@
-// How far the picture of an import is from the scene's.
+// How far the picture of an import is from the scene's: which cameras are measured, and at which frames.
 #include <algorithm>
 #include <cmath>
+#include <deque>
 #include <optional>
 #include <string>
+#include <vector>
 
-#include "check/ImportedPicture.h"
-#include "check/PointsPerUnit.h"
+#include "check/CameraShift.h"
 #include "check/RulesInternal.h"
-#include "check/Times.h"
 #include "motion/Evaluator.h"
-#include "motion/SceneCamera.h"
-#include "text/Numbers.h"
+#include "motion/FrameEnds.h"
 
 namespace check {
 namespace {
 
-using motion::Matrix;
-using motion::Vector;
-
-// A smaller shift is not seen.
-constexpr double kSmallestShift = 0.5;
-
-// More frames of a camera, and more layers times frames of all cameras, are not looked at.
+// More frames of a scene, and more layers times frames of all cameras, are not looked at.
 constexpr double kMostFrames = 100'000;
 constexpr double kMostSteps = 4'000'000;
 
-constexpr double kDistanceWithoutInterest = 100.0;
-
-struct Frames {
-  double first = 1.0;
-  double last = 1.0;
-};
-
-class Shift {
+class Shifts {
  public:
-  Shift(const Subject& subject, const Camera& camera)
+  explicit Shifts(const Subject& subject)
       : subject_(subject),
-        camera_(camera),
+        unreported_(subject.scene.text()),
         evaluator_(subject.scene, &subject.diagnostics),
-        lens_(&evaluator_, camera.shape),
-        world_(evaluator_.World(camera.shape)),
-        interest_(evaluator_.Number(camera.shape, "centerOfInterest")),
-        picture_(motion::PictureOf(subject.settings)),
-        imported_(
-            subject.cameOver, *camera.layer,
-            subject.cameOver.distancesConverted ? PointsPerUnit(subject.scene.linearUnit().word) : 1.0) {}
+        interests_(subject.scene, &unreported_),
+        unitsPerFrame_(motion::UnitsPerFrame(subject.scene)) {}
 
-  // Takes what it costs off the steps that are left.
-  void Report(double* steps) {
-    const Frames frames = FramesOf();
-    const double count = frames.last - frames.first + 1.0;
-    const double cost = count * static_cast<double>(imported_.layers());
-    if (!(count <= kMostFrames) || !(cost <= *steps)) return;
-    *steps -= cost;
-    const double start = FirstKey(subject_, camera_).value_or(frames.first);
-    for (double frame = frames.first; frame <= frames.last; ++frame) {
-      evaluator_.MoveTo(frame);
-      imported_.MoveTo((frame - start) / subject_.measures.framesPerSecond);
-      TakeIn(frame);
-    }
-    Say();
+  void Report() {
+    for (const Camera& camera : subject_.cameras) Ask(camera);
+    FindFrames();
+    Measure();
+    for (const CameraShift* const camera : measured_) camera->Report();
   }
 
  private:
-  // What the scene plays and all keys, outward to whole frames.
-  Frames FramesOf() const {
-    std::optional<double> first = FirstKey(subject_, camera_);
-    std::optional<double> last = LastKey(subject_, camera_);
-    if (const auto& playback = subject_.settings.playback) {
-      first = std::min(first.value_or(playback->value.first), playback->value.first);
-      last = std::max(last.value_or(playback->value.last), playback->value.last);
-    }
-    if (!first || !last) return {};
-    return {std::floor(*first + 1e-6), std::ceil(*last - 1e-6)};
+  void SayNotMeasured(const Camera& camera, std::string_view why) const {
+    const scene::Node& node = subject_.scene.node(camera.shape);
+    subject_.diagnostics.Report(diag::Code::ShiftNotMeasured, node.place, {node.name, why});
   }
 
-  // The points of the scene's picture at the frame, and where the import shows them.
-  void TakeIn(double frame) {
-    const Matrix& place = evaluator_.Value(world_);
-    if (!motion::IsFinite(place)) return;
-    Matrix toWorld = motion::RotationOf(place);
-    toWorld.origin = place.origin;
-    const motion::Camera camera = lens_.Now();
-    const motion::FilmWindow window = motion::FilmWindowOf(camera, picture_);
-    const bool written = subject_.scene.Written(camera_.shape, "centerOfInterest").has_value();
-    const double distance = written ? evaluator_.Value(interest_) : kDistanceWithoutInterest;
-    const double perInch = distance * motion::kMillimetresPerInch / motion::EffectiveFocalLength(camera);
-    if (!(distance > 0.0) || !std::isfinite(perInch)) return;
-    for (const double u : {0.0, 0.5, 1.0}) {
-      for (const double v : {0.0, 0.5, 1.0}) {
-        const Vector point{(window.centreX + (u - 0.5) * window.width) * perInch,
-                           (window.centreY + (v - 0.5) * window.height) * perInch, -distance};
-        Compare(u, v, motion::TransformPoint(point, toWorld), frame);
+  // Whether all layers of the camera were made: a stop leaves the last ones in the middle.
+  bool CameWhole(const Camera& camera) const {
+    if (camera.layer == nullptr) return false;
+    const auto& layers = subject_.cameOver.layers;
+    if (subject_.cameOver.stop == Stop::None) return true;
+    const CameOverLayer* layer = camera.layer;
+    for (std::size_t length = 0; length <= layers.size(); ++length) {
+      if (layer == &layers.back()) return false;
+      if (!layer->parent) return true;
+      layer = &layers[*layer->parent];
+    }
+    return false;
+  }
+
+  void Ask(const Camera& camera) {
+    if (!camera.taken) return;
+    if (CameWhole(camera)) {
+      cameras_.emplace_back(subject_, camera, &evaluator_, &interests_);
+    } else if (subject_.cameOver.stop != Stop::None) {
+      SayNotMeasured(camera, "the import stopped before the camera was whole");
+    }
+  }
+
+  // Those of the bake: what is played, and all keys of what the cameras depend on.
+  void FindFrames() {
+    std::optional<motion::FrameEnds> played;
+    if (const auto& playback = subject_.settings.playback) {
+      played =
+          motion::FrameEnds{playback->value.first / unitsPerFrame_, playback->value.last / unitsPerFrame_};
+    }
+    frames_ = motion::FindFrameEnds(subject_.scene, played, evaluator_.computingNodes(), subject_.measures)
+                  .value_or(motion::FrameEnds{});
+    const double count = frames_.last - frames_.first + 1.0;
+    double steps = kMostSteps;
+    for (CameraShift& camera : cameras_) {
+      const double cost = count * static_cast<double>(camera.layers());
+      if (!(count <= kMostFrames)) {
+        SayNotMeasured(camera.camera(), "the scene has more than 100000 frames");
+      } else if (!(cost <= steps)) {
+        SayNotMeasured(camera.camera(), "the scene has too many frames and layers");
+      } else {
+        steps -= cost;
+        measured_.push_back(&camera);
       }
     }
   }
 
-  void Compare(double u, double v, const Vector& point, double frame) {
-    motion::PicturePoint landed{};
-    double way = INFINITY;
-    if (imported_.Project(point, &landed)) {
-      way = std::hypot((landed.u - u) * picture_.width, (landed.v - v) * picture_.height);
+  // All frames of the cameras that depend on the same, then those of the others.
+  void Measure() {
+    std::vector<motion::Evaluator::Wanted> wanted;
+    std::vector<motion::Evaluator::Wanted> interests;
+    for (const CameraShift* const camera : measured_) {
+      wanted.push_back(camera->Wanted());
+      interests.push_back(camera->WantedOfInterest());
     }
-    if (!(way > largest_)) return;
-    largest_ = way;
-    frame_ = frame;
+    const std::vector<std::uint32_t> parts = evaluator_.Split(wanted);
+    partOfInterest_ = interests_.Split(interests);
+    std::vector<std::vector<std::size_t>> camerasOfPart(evaluator_.partCount());
+    for (std::size_t i = 0; i < parts.size(); ++i) camerasOfPart[parts[i]].push_back(i);
+    for (std::uint32_t part = 0; part < camerasOfPart.size(); ++part) {
+      if (!camerasOfPart[part].empty()) MeasurePart(part, camerasOfPart[part]);
+    }
   }
 
-  void Say() {
-    if (largest_ < kSmallestShift) return;
-    const double whole = std::hypot(picture_.width, picture_.height);
-    const std::string way =
-        largest_ > whole ? "more than the whole picture" : text::RoundedNumber(largest_) + " pixels";
-    const scene::Node& node = subject_.scene.node(camera_.shape);
-    subject_.diagnostics.Report(diag::Code::PictureShifts, node.place,
-                                {node.name, way, text::RoundedNumber(frame_)});
+  void MeasurePart(std::uint32_t part, const std::vector<std::size_t>& cameras) {
+    std::vector<double> frameOfInterest(interests_.partCount(), NAN);  // by part: where it stands
+    for (double frame = frames_.first; frame <= frames_.last; ++frame) {
+      const double time = frame * unitsPerFrame_;
+      evaluator_.MoveTo(time, part);
+      for (const std::size_t camera : cameras) {
+        const std::uint32_t interest = partOfInterest_[camera];
+        if (frameOfInterest[interest] != frame) interests_.MoveTo(time, interest);
+        frameOfInterest[interest] = frame;
+        measured_[camera]->TakeIn(frame, time);
+      }
+    }
   }
 
   const Subject& subject_;
-  const Camera& camera_;
+  diag::Collector unreported_;
   motion::Evaluator evaluator_;
-  motion::SceneCamera lens_;
-  motion::MatrixId world_;
-  motion::NumberId interest_;
-  motion::Picture picture_;
-  ImportedPicture imported_;
-  double largest_ = 0.0;
-  double frame_ = 0.0;
+  motion::Evaluator interests_;
+  double unitsPerFrame_;
+  std::deque<CameraShift> cameras_;
+  motion::FrameEnds frames_;
+  std::vector<CameraShift*> measured_;
+  std::vector<std::uint32_t> partOfInterest_;  // by camera that is measured
 };
 
 }  // namespace
 
 void ReportShifts(const Subject& subject) {
-  if (subject.cameOver.stop != Stop::None || !subject.cameOver.composition) return;
-  double steps = kMostSteps;
-  for (const Camera& camera : subject.cameras) {
-    if (camera.layer != nullptr) Shift(subject, camera).Report(&steps);
-  }
+  if (subject.cameOver.composition) Shifts(subject).Report();
 }
 
 }  // namespace check

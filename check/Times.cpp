@@ -52,7 +52,7 @@ std::optional<NodeKeys> KeysOf(NodeId node, std::span<const KeyedChannel> channe
 bool IsCurved(const Subject& subject, const KeyedChannel& channel) {
   const motion::Curve curve(motion::ReadCurve(subject.scene, channel.curve, subject.measures));
   const std::vector<motion::CurveKey>& keys = curve.Data().keys;
-  const double rate = subject.measures.framesPerSecond;
+  const double rate = subject.measures.framesPerSecond / motion::UnitsPerFrame(subject.scene);
   motion::CurveCursor cursor;
   double looked = 0.0;
   for (std::size_t i = 0; i + 1 < keys.size() && looked < kMostFrames; ++i) {
@@ -83,6 +83,7 @@ bool TurnsFar(const Subject& subject, const KeyedChannel& channel) {
 
 void ReportKeys(const Subject& subject, const NodeKeys& keys) {
   const std::string_view name = subject.scene.node(keys.node).name;
+  const double unit = motion::UnitsPerFrame(subject.scene);
   const auto say = [&](Code code, const KeyedChannel& channel, double number) {
     subject.diagnostics.Report(code, channel.place, {name, text::RoundedNumber(number)});
   };
@@ -94,12 +95,12 @@ void ReportKeys(const Subject& subject, const NodeKeys& keys) {
         return channel.keys > 1 && !channel.whole &&
                (IsCurved(subject, channel) || TurnsFar(subject, channel));
       })) {
-    subject.diagnostics.Report(
-        Code::KeysAreNoBake, bad->place,
-        {name, std::to_string(bad->keys), text::RoundedNumber(bad->last - bad->first + 1.0)});
+    const double frames = std::ceil(bad->last / unit - 1e-6) - std::floor(bad->first / unit + 1e-6) + 1.0;
+    subject.diagnostics.Report(Code::KeysAreNoBake, bad->place,
+                               {name, std::to_string(bad->keys), text::RoundedNumber(frames)});
   }
   if (const auto* const bad = first([](const KeyedChannel& one) { return one.keys != 0 && one.first < 0.0; }))
-    say(Code::NegativeFrames, *bad, bad->first);
+    say(Code::NegativeFrames, *bad, bad->first / unit);
   if (const auto* const bad = first([](const KeyedChannel& one) { return one.fractional; }))
     say(Code::FractionalFrames, *bad, bad->fraction);
   if (const auto* const bad =
@@ -147,16 +148,6 @@ std::optional<double> FirstKey(const Subject& subject, const Camera& camera) {
   for (const NodeKeys& keys : ChainKeys(subject, camera))
     first = std::min(first.value_or(keys.first), keys.first);
   return first;
-}
-
-std::optional<double> LastKey(const Subject& subject, const Camera& camera) {
-  std::optional<double> last;
-  for (const NodeKeys& keys : ChainKeys(subject, camera)) {
-    for (const KeyedChannel& channel : keys.channels) {
-      if (channel.keys != 0) last = std::max(last.value_or(channel.last), channel.last);
-    }
-  }
-  return last;
 }
 
 void ReportTimes(const Subject& subject) {

@@ -15,9 +15,8 @@ inline constexpr std::size_t kLongestChain = 64;
 // 0 of the composition.
 bool CountsFrames(const scene::Scene& scene);
 
-// The smallest first key and the largest last key of the camera and what stands above it, in the scene's
-// unit. None where nothing is keyed.
+// The smallest first key of the camera and what stands above it, in the scene's unit. None where nothing is
+// keyed.
 std::optional<double> FirstKey(const Subject& subject, const Camera& camera);
-std::optional<double> LastKey(const Subject& subject, const Camera& camera);
 
 }  // namespace check

@@ -5,6 +5,7 @@
 #include <string>
 #include <string_view>
 
+#include "check/Difference.h"
 #include "check/RulesInternal.h"
 
 namespace check {
@@ -63,15 +64,9 @@ class TransformRules {
     return touched;
   }
 
-  // Where the file gives the attribute another value, or has something drive it.
   std::optional<diag::Range> Differs(std::string_view attribute, double neutral) const {
-    if (const auto driver = scene().SourceOf(scene().PlugOf(link_.node, attribute))) {
-      return driver->connection->destinationPlace;
-    }
-    const auto written = scene().Written(link_.node, attribute);
-    const auto number = written ? written->Number() : std::nullopt;
-    if (!number || *number == neutral) return std::nullopt;
-    return written->range();
+    const auto difference = DifferenceFrom(subject_, link_.node, attribute, neutral);
+    return difference ? std::optional(difference->place) : std::nullopt;
   }
 
   template <std::size_t kCount>

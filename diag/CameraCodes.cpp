@@ -91,11 +91,11 @@ constexpr Entry kCameraCodes[] = {
     {.code = Code::LocatorsLeftOut,
      .severity = Severity::Note,
      .symbol = "LocatorsLeftOut",
-     .sentence = "{0} locators have no mark and are left out",
+     .sentence = "locators without a mark are left out: {0}",
      .meaning = "The importer makes a null layer of a locator whose name contains \"null\", \"NULL\" or "
                 "\"Null\". No other locator comes over.",
      .example = "createNode locator -n \"pointShape\" -p \"point\";",
-     .help = "Use --locators all to have all of them."},
+     .help = "To have all of them: mayascene bake SCENE -o OUT --locators all."},
     {.code = Code::CameraUneven,
      .severity = Severity::Warning,
      .symbol = "CameraUneven",

@@ -136,6 +136,7 @@ enum class Code : std::uint16_t {
   NegativeFrames = 916,
   FractionalFrames = 917,
   RateDiffers = 918,
+  ShiftNotMeasured = 919,
   // What keeps a check from its end: diag/ProcessCodes.cpp
   CheckTimedOut = 1001,
   CheckBrokeOff = 1002,

@@ -46,18 +46,17 @@ constexpr Entry kLossCodes[] = {
      .severity = Severity::Warning,
      .symbol = "ParentNotImported",
      .sentence = "\"{0}\" loses its place: the import does not have its parent \"{1}\"{2}",
-     .meaning =
-         "A node above the camera is in a referenced file, or nowhere. Its place is not known, so the camera "
-         "comes over as if it stood at the origin.",
+     .meaning = "A node above the camera is in a referenced file, or nowhere, or is of a type that the "
+                "importer does "
+                "not know, as a joint. The camera comes over as if that node stood at the origin.",
      .example = "file -r -ns \"rig\" -rfn \"rigRN\" \"rig.ma\";\ncreateNode transform -n \"shotCam\" -p "
                 "\"rig:root\";",
-     .help = "Import the reference into the scene before the export, or export the camera with all that "
-             "stands above "
-             "it."},
+     .help = "Where the parent is a node of this scene: mayascene bake SCENE -o OUT. Where it is in another "
+             "file: import the reference into the scene before the export."},
     {.code = Code::ChannelsOfOneKey,
      .severity = Severity::Warning,
      .symbol = "ChannelsOfOneKey",
-     .sentence = "\"{0}\" does not get the values of its keys: {1} have one key each",
+     .sentence = "\"{0}\" does not get the values of its keys: one key alone in {1}",
      .meaning = "The importer takes a node for animated when one of its curves has two keys. This node has "
                 "curves of "
                 "one key alone. It comes over with the values that the scene stores beside them, which are "
@@ -141,8 +140,10 @@ constexpr Entry kLossCodes[] = {
      .severity = Severity::Note,
      .symbol = "AttributesWithoutPlace",
      .sentence = "a composition has no place for {1} of \"{0}\"",
-     .meaning = "The camera has settings that the importer does not take: depth of field, an image plane, "
-                "visibility.",
+     .meaning =
+         "The camera has settings that the importer does not take: depth of field, an image plane, "
+         "visibility. An orthographic camera that is written with another word than \"yes\" comes over "
+         "as one with a perspective.",
      .example = "setAttr \".dof\" yes;",
      .help = "Set the same in the composition, where it is wanted."},
 };

@@ -15,7 +15,8 @@ constexpr Entry kPictureCodes[] = {
          "the scene has none), are followed over the frames of the scene. The shift is the largest way, "
          "in pixels of the scene's resolution, between where the scene shows a point and where the "
          "import does. Time 0 of the composition is the first key of the camera and of what stands "
-         "above it; between keys the import counts as straight. The other diagnostics of the camera name "
+         "above it, or time 0 of a scene that does not count time in frames; between keys the import counts "
+         "as straight. The other diagnostics of the camera name "
          "the reasons.",
      .example = "setAttr -s 2 \".ktv[0:1]\" 1 0 48 100;",
      .help =
@@ -65,9 +66,10 @@ constexpr Entry kPictureCodes[] = {
     {.code = Code::InheritanceOff,
      .severity = Severity::Warning,
      .symbol = "InheritanceOff",
-     .sentence = "\"{0}\" takes nothing over from above in the scene, and does in the import",
-     .meaning =
-         "The node does not inherit the transforms above it. The importer makes its layer a child of theirs.",
+     .sentence = "\"{0}\" does not inherit the transforms above it; the import lets it inherit",
+     .meaning = "The importer makes the layer of the node a child of the layers of what stands above it, "
+                "whatever the "
+                "scene says.",
      .example = "setAttr \".it\" no;",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
     {.code = Code::FitDiffers,
@@ -82,7 +84,7 @@ constexpr Entry kPictureCodes[] = {
     {.code = Code::LensSqueezeLost,
      .severity = Severity::Warning,
      .symbol = "LensSqueezeLost",
-     .sentence = "the lens squeeze {1} of \"{0}\" is lost",
+     .sentence = "the lens squeeze of \"{0}\" is lost: {1}",
      .meaning =
          "The camera has an anamorphic lens, which takes in a wider picture. The importer does not read it.",
      .example = "setAttr \".lsr\" 2;",
@@ -90,7 +92,7 @@ constexpr Entry kPictureCodes[] = {
     {.code = Code::CameraScaleLost,
      .severity = Severity::Warning,
      .symbol = "CameraScaleLost",
-     .sentence = "the camera scale {1} of \"{0}\" is lost",
+     .sentence = "the camera scale of \"{0}\" is lost: {1}",
      .meaning = "The camera scale makes the lens longer or shorter. The importer does not read it.",
      .example = "setAttr \".cs\" 2;",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
@@ -101,9 +103,8 @@ constexpr Entry kPictureCodes[] = {
      .meaning =
          "A scale above a camera moves it. An uneven one also bends its axes, which no layer can show.",
      .example = "setAttr \".s\" -type \"double3\" 2 2 2 ;",
-     .help =
-         "Take the scale out of the rig, or write the camera against the world: mayascene bake SCENE -o OUT "
-         "--world."},
+     .help = "Take the scale out of the rig, or write the camera in world space: mayascene bake SCENE -o OUT "
+             "--world."},
     {.code = Code::PictureSizeAssumed,
      .severity = Severity::Warning,
      .symbol = "PictureSizeAssumed",
@@ -125,7 +126,7 @@ constexpr Entry kPictureCodes[] = {
     {.code = Code::OtherLengthUnit,
      .severity = Severity::Warning,
      .symbol = "OtherLengthUnit",
-     .sentence = "the scene measures in {0}: a unit of length becomes a point of the composition",
+     .sentence = "the scene's unit of length is \"{0}\": one unit becomes a point of the composition",
      .meaning =
          "The importer takes distances as they stand in the file. Scenes in other units come over in another "
          "size than one in centimetres.",
@@ -169,6 +170,16 @@ constexpr Entry kPictureCodes[] = {
          "The scene does not say a frame rate, or says a unit of time that the importer takes otherwise.",
      .example = "currentUnit -l centimeter -a degree -t sec;",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT. Or set the frame rate in the scene."},
+    {.code = Code::ShiftNotMeasured,
+     .severity = Severity::Note,
+     .symbol = "ShiftNotMeasured",
+     .sentence = "how far the picture of \"{0}\" shifts is not measured: {1}",
+     .meaning =
+         "At most 100000 frames of a scene are measured, and at most 4000000 frames of layers: each frame "
+         "counts once for the camera and once for each layer above it. A camera that the import "
+         "made before it stopped is measured; the one at which it stopped, and those after it, are not.",
+     .example = "setAttr -s 2 \".ktv[0:1]\" 1 0 3000000 10;",
+     .help = "Write the shot alone: mayascene bake SCENE -o OUT --frames A:B."},
 };
 
 }  // namespace

@@ -160,7 +160,8 @@ constexpr Entry kStopCodes[] = {
      .sentence = "the import stops here: the number \"{0}\" is too large",
      .meaning = "No number may be larger than about 1.8e308. Nothing comes over.",
      .example = "setAttr \".t\" -type \"double3\" 1e999 0 0 ;",
-     .help = "Look in the scene for what has gone astray to such a value, and export the scene again."},
+     .help = "Look in the scene for the node that has such a value, set it to a smaller one, and export the "
+             "scene again."},
     {.code = Code::NumberUnreadable,
      .severity = Severity::Error,
      .symbol = "NumberUnreadable",

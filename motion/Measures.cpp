@@ -1,6 +1,7 @@
 #include "motion/Measures.h"
 
 #include <algorithm>
+#include <array>
 #include <iterator>
 
 #include "scene/Units.h"
@@ -9,6 +10,9 @@ namespace motion {
 namespace {
 
 constexpr double kTicksPerSecond = 6000.0;
+constexpr double kFilmFramesPerSecond = 24.0;
+
+constexpr std::array<std::string_view, 4> kClockUnits = {"sec", "min", "hour", "millisec"};
 
 // Without the X, Y or Z at the end.
 constexpr std::string_view kLengths[] = {
@@ -143,6 +147,15 @@ Measures MeasuresOf(const scene::Scene& scene) {
   if (const auto length = scene::LinearUnitOf(scene.linearUnit().word)) measures.centimetres = *length;
   if (scene::AngularUnitOf(scene.angularUnit().word) == scene::AngularUnit::Radian) measures.radians = 1.0;
   return measures;
+}
+
+bool IsClockUnit(std::string_view word) {
+  return std::find(kClockUnits.begin(), kClockUnits.end(), word) != kClockUnits.end();
+}
+
+double UnitsPerFrame(const scene::Scene& scene) {
+  if (!IsClockUnit(scene.timeUnit().word)) return 1.0;
+  return MeasuresOf(scene).framesPerSecond / kFilmFramesPerSecond;
 }
 
 Kind KindOf(const scene::Scene& scene, const scene::Plug& plug) {

@@ -17,6 +17,13 @@ struct Measures {
 
 Measures MeasuresOf(const scene::Scene& scene);
 
+// Whether a word of a scene's unit of time is one that counts no frames: seconds, minutes …
+bool IsClockUnit(std::string_view word);
+
+// One frame in the scene's unit of time. Where the unit counts no frames, a frame is one of film, 24 a
+// second.
+double UnitsPerFrame(const scene::Scene& scene);
+
 // What a plug's number measures.
 enum class Kind : std::uint8_t { kPlain, kLength, kAngle, kTime };
 

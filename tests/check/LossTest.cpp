@@ -29,7 +29,7 @@ TEST(LossTest, LocatorsWithoutAMarkAreCounted) {
                         "createNode transform -n \"a\";\ncreateNode locator -n \"aShape\" -p \"a\";\n"
                         "createNode locator -n \"nullShape\" -p \"a\";\n"
                         "createNode locator -n \"bShape\" -p \"a\";\n");
-  EXPECT_THAT(checked.SentenceOf(Code::LocatorsLeftOut), HasSubstr("2 locators"));
+  EXPECT_THAT(checked.SentenceOf(Code::LocatorsLeftOut), HasSubstr("are left out: 2"));
 }
 
 TEST(LossTest, AParentThatIsGivenAsAPath) {
@@ -80,6 +80,7 @@ TEST(LossTest, AParentOfATypeThatTheImporterDoesNotKnow) {
                         "createNode camera -n \"shotCamShape\" -p \"shotCam\";\n" +
                         kResolution);
   EXPECT_THAT(checked.SentenceOf(Code::ParentNotImported), HasSubstr("of the type joint"));
+  EXPECT_THAT(diag::EntryOf(Code::ParentNotImported).help, HasSubstr("mayascene bake SCENE -o OUT"));
 }
 
 TEST(LossTest, ChannelsOfOneKeyEach) {
@@ -87,7 +88,7 @@ TEST(LossTest, ChannelsOfOneKeyEach) {
                                     CurveOf("moveX", "1 12.5", "shotCam.tx") +
                                         CurveOf("moveY", "1 0", "shotCam.ty") +
                                         CurveOf("turnZ", "1 30", "shotCam.rz", "animCurveTA")));
-  EXPECT_THAT(checked.SentenceOf(Code::ChannelsOfOneKey), HasSubstr("translateX, rotateZ have one key each"));
+  EXPECT_THAT(checked.SentenceOf(Code::ChannelsOfOneKey), HasSubstr("one key alone in translateX, rotateZ"));
 }
 
 TEST(LossTest, AKeyThatIsTheStoredValueLosesNothing) {
@@ -174,6 +175,14 @@ TEST(LossTest, SettingsThatACompositionHasNoPlaceFor) {
   const Checked checked(CameraScene("", "\tsetAttr \".dof\" yes;\n"));
   EXPECT_THAT(checked.SentenceOf(Code::AttributesWithoutPlace),
               HasSubstr("the depth of field of \"shotCamShape\""));
+}
+
+TEST(LossTest, AnOrthographicCameraThatComesOverWithAPerspective) {
+  const Checked checked(CameraScene("", "\tsetAttr \".o\" on;\n"));
+  ASSERT_EQ(checked.cameOver().layers.size(), 1u);
+  EXPECT_EQ(checked.SentenceOf(Code::AttributesWithoutPlace),
+            "a composition has no place for the orthographic view of \"shotCamShape\"");
+  EXPECT_EQ(Checked(CameraScene("", "\tsetAttr \".o\" off;\n")).CountOf(Code::AttributesWithoutPlace), 0u);
 }
 
 }  // namespace

@@ -166,9 +166,9 @@ TEST(PictureTest, WhatOfALensIsLost) {
                 .CountOf(Code::FilmOffsetLost),
             1u);
   EXPECT_THAT(Checked(CameraScene("", "\tsetAttr \".lsr\" 2;\n")).SentenceOf(Code::LensSqueezeLost),
-              HasSubstr("squeeze 2"));
+              HasSubstr("is lost: it is 2"));
   EXPECT_THAT(Checked(CameraScene("", "\tsetAttr \".cs\" 1.5;\n")).SentenceOf(Code::CameraScaleLost),
-              HasSubstr("scale 1.5"));
+              HasSubstr("is lost: it is 1.5"));
   EXPECT_EQ(Checked(CameraScene("", "\tsetAttr \".ptsc\" 2;\n")).CountOf(Code::PictureEffectLost), 1u);
 }
 
@@ -188,7 +188,7 @@ TEST(PictureTest, AResolutionThatTheFileLeavesOut) {
 TEST(PictureTest, TheUnitAndTheRate) {
   std::string metres = CameraScene("");
   metres.replace(metres.find("centimeter"), 10, "meter");
-  EXPECT_THAT(Checked(metres).SentenceOf(Code::OtherLengthUnit), HasSubstr("measures in meter"));
+  EXPECT_THAT(Checked(metres).SentenceOf(Code::OtherLengthUnit), HasSubstr("unit of length is \"meter\""));
   EXPECT_EQ(Checked(metres, {}, true).CountOf(Code::OtherLengthUnit), 0u);
   std::string silent = CameraScene("");
   silent.erase(silent.find(" -t film"), 8);
@@ -209,6 +209,49 @@ TEST(PictureTest, ACameraThatLandsSomewhereElseShowsNothingOfThePicture) {
   const Checked checked(CameraScene("", "", CurveOf("turnY", "1 180", "shotCam.ry", "animCurveTA")));
   EXPECT_EQ(checked.CountOf(Code::ChannelsOfOneKey), 1u);
   EXPECT_THAT(checked.SentenceOf(Code::PictureShifts), HasSubstr("more than the whole picture"));
+}
+
+TEST(PictureTest, NumbersAsNearAsARoundingErrorDoNotDiffer) {
+  const auto all = [](const char* transform, const char* shape) {
+    return Checked(CameraScene(transform, shape)).All();
+  };
+  EXPECT_EQ(all("\tsetAttr \".rpt\" -type \"double3\" 1e-14 -5e-7 2e-17 ;\n", ""), "");
+  EXPECT_EQ(all("\tsetAttr \".ra\" -type \"double3\" 1e-10 0 0 ;\n", ""), "");
+  EXPECT_EQ(all("", "\tsetAttr \".lsr\" 1.0000000001;\n"), "");
+  EXPECT_NE(all("\tsetAttr \".rpt\" -type \"double3\" 2e-6 0 0 ;\n", ""), "");
+  EXPECT_NE(all("\tsetAttr \".ra\" -type \"double3\" 2e-9 0 0 ;\n", ""), "");
+}
+
+TEST(PictureTest, KeysAtTheNeutralValueDoNotDiffer) {
+  const auto rig = [](std::string_view keys) {
+    return Checked(kHead +
+                   "createNode transform -n \"rig\";\ncreateNode transform -n \"shotCam\" -p \"rig\";\n"
+                   "createNode camera -n \"shotCamShape\" -p \"shotCam\";\n" +
+                   kLens + kResolution + CurveOf("sizeX", keys, "rig.sx", "animCurveTU"));
+  };
+  EXPECT_EQ(rig("1 1 2 1 3 1").CountOf(Code::ChainScaled), 0u);
+  EXPECT_EQ(rig("1 1 2 1 3 1.5").CountOf(Code::ChainScaled), 1u);
+  const auto squeeze = [](std::string_view keys) {
+    return Checked(CameraScene("", "", CurveOf("wide", keys, "shotCamShape.lsr", "animCurveTU")));
+  };
+  EXPECT_EQ(squeeze("1 1 2 1").All(), "");
+  EXPECT_EQ(squeeze("1 1 2 1.5").SentenceOf(Code::LensSqueezeLost),
+            "the lens squeeze of \"shotCamShape\" is lost: it has keys, one at 1.5");
+}
+
+TEST(PictureTest, AFactorThatAnotherNodeDrivesIsSaidByThatNode) {
+  const Checked checked(CameraScene("", "",
+                                    "createNode transform -n \"control\";\n"
+                                    "\taddAttr -ln \"wide\" -at double -dv 1.5;\n"
+                                    "connectAttr \"control.wide\" \"shotCamShape.lsr\";\n"));
+  EXPECT_EQ(checked.SentenceOf(Code::LensSqueezeLost),
+            "the lens squeeze of \"shotCamShape\" is lost: \"control\" drives it");
+}
+
+TEST(PictureTest, TheFramesBetweenKeysAreWholeOnes) {
+  const Checked checked(
+      CameraScene("", "", CurveOf("moveX", "1 0 64.5 100", "shotCam.tx", "animCurveTL", 3)));
+  EXPECT_THAT(checked.SentenceOf(Code::KeysAreNoBake), HasSubstr("2 keys over 65 frames"));
 }
 
 }  // namespace

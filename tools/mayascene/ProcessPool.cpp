@@ -163,7 +163,7 @@ class Run {
     keep(one->number, std::move(end));
   }
 
-  // A process that the child left behind may hold the streams open: what is there counts, no more.
+  // A process that the child started may outlive it and hold the streams open: what is there counts, no more.
   void readToEnd(ChildProcess* child) const {
     for (std::size_t before = ~std::size_t{0}; !tooMuch(*child);) {
       const std::size_t size = child->out().text.size() + child->err().text.size();

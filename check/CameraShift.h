@@ -1,0 +1,55 @@
+// The picture of one camera: the scene's against that of the import.
+#pragma once
+
+#include <vector>
+
+#include "check/ImportedPicture.h"
+#include "check/RulesInternal.h"
+#include "motion/Camera.h"
+#include "motion/Evaluator.h"
+#include "motion/SceneCamera.h"
+
+namespace check {
+
+// Nine points of the picture, followed over the frames. What it is given must outlive it.
+class CameraShift {
+ public:
+  // `interests` gives the distance of the centre of interest alone: nothing is reported of what drives that.
+  CameraShift(const Subject& subject, const Camera& camera, motion::Evaluator* evaluator,
+              motion::Evaluator* interests);
+
+  const Camera& camera() const { return camera_; }
+
+  // How many layers the import's picture depends on.
+  std::size_t layers() const { return imported_.layers(); }
+
+  // What the evaluators are asked for.
+  motion::Evaluator::Wanted Wanted() const { return {lens_.Numbers(), {world_}}; }
+  motion::Evaluator::Wanted WantedOfInterest() const { return {{interest_}, {}}; }
+
+  // Both evaluators stand at the frame, which has the time in the scene's unit. `frame` is what is said of
+  // it.
+  void TakeIn(double frame, double time);
+
+  // The largest shift of the frames that were taken in.
+  void Report() const;
+
+ private:
+  void Compare(double u, double v, const motion::Vector& point, double frame);
+
+  const Subject& subject_;
+  const Camera& camera_;
+  motion::Evaluator& evaluator_;
+  motion::Evaluator& interests_;
+  motion::SceneCamera lens_;
+  motion::MatrixId world_;
+  motion::NumberId interest_;
+  motion::Picture picture_;
+  ImportedPicture imported_;
+  double start_;  // the time of the scene that is time 0 of the composition
+  bool seen_ = false;
+  double largest_ = 0.0;  // pixels
+  double frame_ = 0.0;    // where it is the largest
+};
+
+}  // namespace check

@@ -1,0 +1,146 @@
+// Which cameras' pictures are measured, at which frames, and what is said of the others.
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <string>
+
+#include "tests/check/CheckedText.h"
+
+namespace check_test {
+namespace {
+
+using diag::Code;
+using testing::HasSubstr;
+
+std::string CameraOf(const std::string& name, const std::string& transform = "",
+                     const std::string& parent = "") {
+  return "createNode transform -n \"" + name + "\"" + (parent.empty() ? "" : " -p \"" + parent + "\"") +
+         ";\n" + transform + "createNode camera -n \"" + name + "Shape\" -p \"" + name + "\";\n" + kLens;
+}
+
+std::string Playback(int first, int last) {
+  return "createNode script -n \"sceneConfigurationScriptNode\";\n\tsetAttr \".b\" -type \"string\" "
+         "\"playbackOptions -min " +
+         std::to_string(first) + " -max " + std::to_string(last) + " -ast " + std::to_string(first) +
+         " -aet " + std::to_string(last) + " \";\n\tsetAttr \".st\" 6;\n";
+}
+
+TEST(ShiftTest, WhatDrivesManyCamerasIsReportedOnce) {
+  std::string text = kHead +
+                     "createNode transform -n \"rig\";\ncreateNode expression -n \"drive\";\n"
+                     "connectAttr \"drive.out[0]\" \"rig.tx\";\n";
+  for (int i = 0; i < 3; ++i) text += CameraOf("shot" + std::to_string(i), "", "rig");
+  EXPECT_EQ(Checked(text + kResolution).CountOf(Code::UnsupportedDriver), 1u);
+}
+
+TEST(ShiftTest, NothingIsReportedOfWhatDrivesTheCentreOfInterest) {
+  const Checked checked(CameraScene("", "",
+                                    "createNode lookAt -n \"view\";\n"
+                                    "connectAttr \"view.distanceBetween\" \"shotCamShape.coi\";\n"));
+  EXPECT_EQ(checked.All(), "");
+}
+
+TEST(ShiftTest, TheCentreOfInterestIsTakenAtEachFrame) {
+  // The nearer the points, the further they shift.
+  const std::string offset = "\tsetAttr \".rpt\" -type \"double3\" 1 0 0 ;\n";
+  const auto shift = [&](const std::string& rest) {
+    return std::stod(
+        Checked(CameraScene(offset, "", rest)).Only(Code::PictureShifts).diagnostic.arguments.at(1));
+  };
+  const double still = shift("");
+  EXPECT_NEAR(shift(Playback(1, 5) + CurveOf("reach", "1 10 5 5", "shotCamShape.coi")), 2.0 * still, 0.01);
+}
+
+TEST(ShiftTest, KeysOfWhatDrivesTheCameraAreMeasured) {
+  // Nothing is played, and no curve drives a channel of the camera itself.
+  const Checked checked(CameraScene("", "",
+                                    "createNode transform -n \"guide\";\n" +
+                                        CurveOf("lead", "1 0 40 30", "guide.tx") +
+                                        "connectAttr \"guide.tx\" \"shotCam.tx\";\n"));
+  const auto& arguments = checked.Only(Code::PictureShifts).diagnostic.arguments;
+  ASSERT_EQ(arguments.size(), 3u);
+  EXPECT_EQ(arguments[2], "40");
+}
+
+TEST(ShiftTest, AllCamerasAreMeasuredOverTheSameFrames) {
+  // The second camera has no key; its picture stands still.
+  const std::string text = kHead + CameraOf("first") +
+                           CameraOf("second", "\tsetAttr \".rpt\" -type \"double3\" 3 0 0 ;\n") +
+                           kResolution + CurveOf("moveX", "1 0 2000000 5", "first.tx");
+  const Checked checked(text);
+  EXPECT_EQ(checked.CountOf(Code::ShiftNotMeasured), 2u);
+  EXPECT_EQ(checked.CountOf(Code::PictureShifts), 0u);
+}
+
+TEST(ShiftTest, TooManyFramesAreSaid) {
+  const Checked checked(CameraScene("", "", CurveOf("moveX", "1 0 100001 1", "shotCam.tx")));
+  EXPECT_EQ(checked.SentenceOf(Code::ShiftNotMeasured),
+            "how far the picture of \"shotCamShape\" shifts is not measured: the scene has more than 100000 "
+            "frames");
+  EXPECT_EQ(Checked(CameraScene("", "", CurveOf("moveX", "1 0 100000 1", "shotCam.tx")))
+                .CountOf(Code::ShiftNotMeasured),
+            0u);
+}
+
+TEST(ShiftTest, TooManyFramesOfLayersAreSaidForTheCameraThatHasThem) {
+  // 41 layers above each other, at 100,000 frames. The other camera has one.
+  std::string text = kHead + "createNode transform -n \"rig0\";\n";
+  for (int i = 1; i < 40; ++i) {
+    text +=
+        "createNode transform -n \"rig" + std::to_string(i) + "\" -p \"rig" + std::to_string(i - 1) + "\";\n";
+  }
+  text += CameraOf("deep", "", "rig39") + CameraOf("flat") + kResolution + Playback(1, 100'000);
+  const Checked checked(text);
+  EXPECT_EQ(checked.MarkedBy(Code::ShiftNotMeasured), "deepShape");
+  EXPECT_THAT(checked.SentenceOf(Code::ShiftNotMeasured), HasSubstr("too many frames and layers"));
+}
+
+TEST(ShiftTest, AfterAStopTheCamerasBeforeItAreMeasured) {
+  const std::string moved = "\tsetAttr \".rpt\" -type \"double3\" 3 0 0 ;\n";
+  const std::string text = kHead + CameraOf("before", moved) + CameraOf("at", moved) +
+                           CameraOf("after", moved) + kResolution + CurveOf("x", "1 0 2 1", "at.tx") +
+                           CurveOf("y", "1 0 2 1 3 2", "at.ty");
+  const Checked checked(text);
+  ASSERT_EQ(checked.cameOver().stop, check::Stop::UnequalKeys);
+  EXPECT_EQ(checked.MarkedBy(Code::PictureShifts), "beforeShape");
+  EXPECT_EQ(checked.CountOf(Code::ShiftNotMeasured), 2u);
+}
+
+TEST(ShiftTest, ACameraWithoutAUsablePlaceIsSaid) {
+  const Checked checked(CameraScene("", "\tsetAttr \".coi\" -1;\n"));
+  EXPECT_THAT(checked.SentenceOf(Code::ShiftNotMeasured), HasSubstr("no usable number"));
+}
+
+std::string InSeconds(std::string text) { return text.replace(text.find("-t film"), 7, "-t sec"); }
+
+TEST(ShiftTest, SecondsAreLookedAtFrameByFrame) {
+  // Level at both ends: the straight way leaves the curve between the two keys, which are a second apart.
+  const Checked checked(
+      InSeconds(CameraScene("", "", CurveOf("moveX", "0 0 1 100", "shotCam.tx", "animCurveTL", 3))));
+  EXPECT_THAT(checked.SentenceOf(Code::KeysAreNoBake), HasSubstr("2 keys over 25 frames"));
+  EXPECT_EQ(checked.CountOf(Code::PictureShifts), 1u) << checked.All();
+}
+
+TEST(ShiftTest, KeysOfEachSecondAreNoBakeAndThoseOfEachFrameAre) {
+  const auto keyedAt = [](int step) {
+    std::string keys;
+    for (int frame = 0; frame <= 48; frame += step) {
+      keys += (keys.empty() ? "" : " ") + std::to_string(frame / 24.0) + ' ' +
+              std::to_string(0.001 * frame * frame);
+    }
+    return InSeconds(CameraScene("", "", CurveOf("moveX", keys, "shotCam.tx", "animCurveTL", 9)));
+  };
+  const Checked seconds(keyedAt(24));
+  EXPECT_EQ(seconds.CountOf(Code::KeysAreNoBake), 1u) << seconds.All();
+  const Checked frames(keyedAt(1));
+  EXPECT_EQ(frames.CountOf(Code::KeysAreNoBake) + frames.CountOf(Code::FractionalFrames), 0u);
+  EXPECT_EQ(frames.CountOf(Code::PictureShifts), 0u) << frames.All();
+}
+
+TEST(ShiftTest, ASceneInSecondsKeepsItsTimes) {
+  const Checked checked(InSeconds(CameraScene("", "", CurveOf("moveX", "1 0 3 100", "shotCam.tx"))));
+  EXPECT_EQ(checked.CountOf(Code::PictureShifts), 0u) << checked.All();
+}
+
+}  // namespace
+}  // namespace check_test
