@@ -170,6 +170,29 @@ TEST_F(ExportCommandTest, WhereOneOutputCannotBeWrittenNoneAppears) {
   EXPECT_THAT(files(), ElementsAre("full.gltf", "shot.ma"));
 }
 
+TEST_F(ExportCommandTest, FilmOffsetAndSqueezeAreThoseOfTheSceneAndNoneIsGivenTwice) {
+  std::string scene = rig("cm");
+  scene.insert(scene.find("createNode animCurveTL"),
+               "\tsetAttr \".hfo\" 0.25;\n\tsetAttr \".vfo\" -0.125;\n\tsetAttr \".lsr\" 1.5;\n");
+  write("shot.ma", scene);
+  EXPECT_EQ(run({"export", "shot.ma", "-o", "shot.usda", "--quiet"}).status, 0);
+  EXPECT_THAT(read("shot.usda"), HasSubstr("float horizontalApertureOffset = 6.35\n"));
+  EXPECT_THAT(read("shot.usda"), HasSubstr("float verticalApertureOffset = -3.175\n"));
+  EXPECT_THAT(read("shot.usda"), HasSubstr("custom double squeeze = 1.5\n"));
+  EXPECT_EQ(run({"export", "--bake", "shot.ma", "-o", "baked.usda", "--quiet"}).status, 0);
+  EXPECT_THAT(read("baked.usda"), HasSubstr("float horizontalApertureOffset = 6.35\n"));
+  EXPECT_THAT(read("baked.usda"), HasSubstr("float verticalApertureOffset = -3.175\n"));
+  EXPECT_THAT(read("baked.usda"), Not(HasSubstr("squeeze")));
+}
+
+TEST_F(ExportCommandTest, AFilmOffsetThatMovesIsNotKnown) {
+  std::string scene = rig("cm");
+  scene.insert(scene.find("createNode animCurveTL"), "\tsetAttr \".hfo\" 0.25;\n");
+  write("shot.ma", scene + "connectAttr \"c1.o\" \"camShape.vfo\";\n");
+  EXPECT_EQ(run({"export", "shot.ma", "-o", "shot.usda", "--quiet"}).status, 0);
+  EXPECT_THAT(read("shot.usda"), Not(HasSubstr("ApertureOffset")));
+}
+
 TEST_F(ExportCommandTest, WhatCannotBeExportedLeavesNoFile) {
   write("empty.ma", "//Maya ASCII 2023 scene\ncreateNode transform -n \"rig\";\n");
   write("notes.ma", "just some notes\n");

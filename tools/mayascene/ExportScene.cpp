@@ -33,9 +33,13 @@ double quotientOf(const HostRatio& ratio) {
 // One composition on its way into a description.
 class Describer {
  public:
-  Describer(const refhost::Composition& inner, const DescriptionOptions& options, double unitsPerPoint,
-            interchange::Composition* made)
-      : inner_(inner), options_(options), made_(*made), length_(unitsPerPoint * options.scale) {}
+  Describer(const refhost::Composition& inner, const LensExtrasByCamera& extras,
+            const DescriptionOptions& options, double unitsPerPoint, interchange::Composition* made)
+      : inner_(inner),
+        extras_(extras),
+        options_(options),
+        made_(*made),
+        length_(unitsPerPoint * options.scale) {}
 
   // `offset`: the frame of the composition that is the first to be described. `span`: from there to the last.
   void run(double offset, double span, diag::Collector* diagnostics) {
@@ -155,6 +159,13 @@ class Describer {
       lens.filmWidth = layer.filmDirection == HOST_FILM_VERTICAL ? film / aspect : kDefaultFilmWidth;
     }
     lens.filmHeight = lens.filmWidth * aspect;
+    const auto extras = extras_.find(layer.name);
+    if (extras == extras_.end()) return lens;
+    lens.squeeze = extras->second.squeeze;
+    // Of a film whose size is not known an offset shifts nobody knows how much.
+    if (layer.filmDirection != HOST_FILM_HORIZONTAL && layer.filmDirection != HOST_FILM_VERTICAL) return lens;
+    lens.filmOffsetX = extras->second.filmOffsetX;
+    lens.filmOffsetY = extras->second.filmOffsetY;
     return lens;
   }
 
@@ -196,6 +207,7 @@ class Describer {
   }
 
   const refhost::Composition& inner_;
+  const LensExtrasByCamera& extras_;
   const DescriptionOptions& options_;
   interchange::Composition& made_;
   double length_;
@@ -232,7 +244,7 @@ std::optional<interchange::Composition> describe(const refhost::Folder& folder, 
   made.frames = options.keys ? 1 : std::max<std::size_t>(1, static_cast<std::size_t>(std::max(frames, 1.0)));
 
   const double unitsPerPoint = linearUnits == 0 ? 1.0 : 1.0 / check::PointsPerUnit(numbers.linearUnit);
-  Describer(inner, options, unitsPerPoint, &made)
+  Describer(inner, numbers.lenses, options, unitsPerPoint, &made)
       .run(made.firstFrame - start, last - made.firstFrame + kFrameTolerance, diagnostics);
   return made;
 }

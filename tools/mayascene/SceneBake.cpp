@@ -67,6 +67,7 @@ BakedScene bakeScene(const std::string& path, const BakeArguments& arguments, Di
   const bake::Origin origin{std::string("mayascene ") + kVersion,
                             std::filesystem::path(path).filename().string(), arguments.words};
   baked.linearUnit = linearUnitOf(scene);
+  baked.lenses = lensExtrasByPath(scene);
   baked.report = bake::Bake(scene, arguments.options, origin, &collector, out);
   gather(collector, &baked);
   const bool allWritten = std::all_of(baked.report.cameras.begin(), baked.report.cameras.end(),

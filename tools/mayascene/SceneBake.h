@@ -11,6 +11,7 @@
 #include "tools/mayascene/BakeCommand.h"
 #include "tools/mayascene/Diagnostics.h"
 #include "tools/mayascene/ExitStatus.h"
+#include "tools/mayascene/LensExtras.h"
 
 namespace mayascene {
 
@@ -19,7 +20,8 @@ struct BakedScene {
   std::string path;    // as the user named it; bytes
   std::string output;  // the bake's, empty where there is none
   ExitStatus status = ExitStatus::Unreadable;
-  std::string linearUnit;  // of the scene's lengths, as SceneNumbers has it
+  std::string linearUnit;       // of the scene's lengths, as SceneNumbers has it
+  LensExtrasByCamera lenses{};  // by the paths of the scene's cameras
   bake::Report report;
   std::vector<diag::Diagnostic> diagnostics;  // with their places, the worst first
   std::uint64_t errors = 0;

@@ -49,6 +49,7 @@ std::optional<SceneNumbers> numbersOf(const std::string& path, const refhost::Co
     const scene::Scene scene = scene::Read(text->text(), ignored);
     SceneNumbers numbers;
     numbers.linearUnit = linearUnitOf(scene);
+    numbers.lenses = lensExtrasByName(scene);
     const auto last = lastKeyOf(composition);
     if (!last) return numbers;
     numbers.firstFrame = firstKeyOf(scene);
@@ -62,6 +63,13 @@ std::optional<SceneNumbers> numbersOf(const std::string& path, const refhost::Co
 SceneNumbers numbersOf(const BakedScene& baked) {
   SceneNumbers numbers;
   numbers.linearUnit = baked.linearUnit;
+  for (const bake::CameraReport& camera : baked.report.cameras) {
+    const auto lens = baked.lenses.find(camera.path);
+    if (!camera.written || lens == baked.lenses.end()) continue;
+    LensExtras extras = lens->second;
+    extras.squeeze.reset();  // the bake has it in the aperture
+    addLens(camera.name, extras, &numbers.lenses);
+  }
   if (!baked.report.frames) return numbers;
   numbers.firstFrame = baked.report.frames->first;
   numbers.lastFrame = baked.report.frames->Last();

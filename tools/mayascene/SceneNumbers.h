@@ -1,4 +1,4 @@
-// A composition's times and lengths in the scene's own numbers.
+// A composition's times, lengths and lenses in the scene's own numbers.
 #pragma once
 
 #include <optional>
@@ -6,6 +6,7 @@
 
 #include "refhost/Project.h"
 #include "scene/Scene.h"
+#include "tools/mayascene/LensExtras.h"
 #include "tools/mayascene/SceneBake.h"
 
 namespace mayascene {
@@ -14,7 +15,8 @@ struct SceneNumbers {
   // The frame at time 0 of the composition, and that of its last key. None where nothing is keyed.
   std::optional<double> firstFrame;
   std::optional<double> lastFrame;
-  std::string linearUnit;  // "cm", "meter", …: as the scene says it, "cm" where it says none
+  LensExtrasByCamera lenses{};  // by the names of the layers
+  std::string linearUnit;       // "cm", "meter", …: as the scene says it, "cm" where it says none
 };
 
 // A known unit of length; "cm" where the scene says none, or one that is not known.
