@@ -68,7 +68,10 @@ class Lens {
     camera.horizontalAperture = Number("horizontalFilmAperture", camera.horizontalAperture);
     camera.verticalAperture = Number("verticalFilmAperture", camera.verticalAperture);
     camera.lensSqueeze = Number("lensSqueezeRatio", 1.0);
-    camera.filmFit = static_cast<int>(Number("filmFit", motion::filmfit::kHorizontal));
+    const double fit = Number("filmFit", motion::filmfit::kHorizontal);
+    if (!(fit >= motion::filmfit::kFill && fit <= motion::filmfit::kOverscan))
+      return;  // any number can be written
+    camera.filmFit = static_cast<int>(fit);
     if (camera.filmFit != motion::filmfit::kFill && camera.filmFit != motion::filmfit::kOverscan) return;
     if (motion::ResolvedFit(camera, motion::PictureOf(subject_.settings)) != motion::filmfit::kVertical)
       return;

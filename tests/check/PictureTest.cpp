@@ -156,6 +156,10 @@ TEST(PictureTest, ANodeThatDoesNotInheritAndAScaleAboveTheCamera) {
 TEST(PictureTest, AFitThatIsNotHorizontal) {
   // The film is 1.5 wide, the picture 1.78: fill takes the width, overscan the height.
   EXPECT_EQ(Checked(CameraScene("", "\tsetAttr \".ff\" 0;\n")).All(), "");
+  for (const char* noFit : {"1e308", "-1e308", "4", "-1"}) {
+    const Checked checked(CameraScene("", std::string("\tsetAttr \".ff\" ") + noFit + ";\n"));
+    EXPECT_EQ(checked.All(), "") << noFit;
+  }
   const Checked overscan(CameraScene("", "\tsetAttr \".ff\" 3;\n"));
   EXPECT_THAT(overscan.SentenceOf(Code::FitDiffers), HasSubstr("the fit is overscan"));
   EXPECT_GT(PixelsOf(overscan), 10.0);
