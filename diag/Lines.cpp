@@ -32,20 +32,22 @@ std::uint64_t LastLineStart(std::string_view text, std::uint64_t before, std::ui
 
 }  // namespace
 
-void Lines::Prepare() {
-  blocks_.reserve(text_.size() / kBlock + 1);
-  Block block{0, 0};
-  for (std::size_t at = 0; at <= text_.size(); at += kBlock) {
-    blocks_.push_back(block);
-    const std::string_view text = text_.substr(at, kBlock);
+// Counts what lies before `at` and has not been counted.
+void Lines::CountTo(std::size_t at) {
+  if (blocks_.empty()) blocks_.push_back({0, 0});
+  while (blocks_.size() <= at / kBlock) {
+    Block block = blocks_.back();
+    const std::size_t start = (blocks_.size() - 1) * kBlock;
+    const std::string_view text = text_.substr(start, kBlock);
     block.lineFeeds += CountLineFeeds(text);
-    block.lineStart = LastLineStart(text, at, block.lineStart);
+    block.lineStart = LastLineStart(text, start, block.lineStart);
+    blocks_.push_back(block);
   }
 }
 
 LineAndColumn Lines::At(std::uint64_t offset) {
-  if (blocks_.empty()) Prepare();
   const std::size_t at = std::min<std::uint64_t>(offset, text_.size());
+  CountTo(at);
   const Block& block = blocks_[at / kBlock];
   const std::size_t blockStart = at / kBlock * kBlock;
   const std::string_view before = text_.substr(blockStart, at - blockStart);

@@ -1,6 +1,7 @@
 // Lines and columns of a text, found from byte offsets.
 #pragma once
 
+#include <cstddef>
 #include <cstdint>
 #include <string_view>
 #include <vector>
@@ -15,8 +16,8 @@ struct LineAndColumn {
   bool operator==(const LineAndColumn&) const = default;
 };
 
-// Refers to the text, which must outlive it. The first question costs one pass over the text, every further
-// one a look at a few thousand bytes of it.
+// Refers to the text, which must outlive it. A question costs one pass over what lies before its offset and
+// after those asked for before, and a look at a few thousand bytes.
 class Lines {
  public:
   explicit Lines(std::string_view text) : text_(text) {}
@@ -30,10 +31,10 @@ class Lines {
     std::uint64_t lineStart;  // of the line that its first byte stands in
   };
 
-  void Prepare();
+  void CountTo(std::size_t at);
 
   std::string_view text_;
-  std::vector<Block> blocks_;
+  std::vector<Block> blocks_;  // as far as counted
 };
 
 }  // namespace diag

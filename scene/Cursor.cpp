@@ -21,6 +21,19 @@ constexpr std::string_view kCommands[] = {
 
 constexpr std::size_t kShortestCommand = 4;
 
+// A line that begins with a number, or with fewer letters than any command has, is neither a command nor a
+// conflict mark. Most lines of a large scene do: the points, edges and faces of its meshes.
+bool IsLineOfData(const char* at, const char* end) {
+  while (at != end && (*at == '\t' || *at == ' ')) ++at;
+  if (at == end) return false;
+  if (!IsByte(*at, kLetterByte)) return IsByte(*at, kDigitByte) || *at == '-' || *at == '.';
+  for (std::size_t letters = 1; letters < kShortestCommand; ++letters) {
+    if (++at == end) return false;
+    if (!IsByte(*at, kLetterByte)) return true;
+  }
+  return false;
+}
+
 constexpr std::string_view kConflictMarks[] = {"<<<<<<<", "=======", ">>>>>>>", "|||||||"};
 
 }  // namespace
@@ -144,7 +157,10 @@ bool Cursor::CommandAt(const char* at) const {
 }
 
 const char* Cursor::FindPause(bool strange) const {
-  if (!strange) return FindAnyOf<';', '"', '/', '\n'>(at_, end_);
+  if (!strange) {
+    return FindAnyOf<';', '"', '/', '\n'>(
+        at_, end_, [this](const char* found) { return *found != '\n' || !IsLineOfData(found + 1, end_); });
+  }
   const char* at = at_;
   while (at != end_ && !IsByte(*at, kPauseByte | kStrangeByte | kBraceByte)) ++at;
   return at;

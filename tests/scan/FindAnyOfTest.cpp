@@ -51,5 +51,30 @@ TEST(FindAnyOfTest, OfTwoTheFirstIsFound) {
   }
 }
 
+// With every second of the wanted bytes passed over, or all of them, at the edge of what may be read.
+void ExpectTheSameStops(const std::string& text) {
+  const GuardedText guarded(text.substr(0, text.size() - 1));
+  *const_cast<char*>(guarded.end()) = text.back();
+  const char* const begin = guarded.begin();
+  const char* const end = begin + text.size();
+  const auto atOddPlace = [begin](const char* found) { return (found - begin) % 2 == 1; };
+  for (const char* at = begin; at != end; ++at) {
+    const char* plain = at;
+    while (plain != end && ((*plain != ';' && *plain != '\xff') || !atOddPlace(plain))) ++plain;
+    ASSERT_EQ((scan::FindAnyOf<';', '\xff'>(at, end, atOddPlace)) - begin, plain - begin)
+        << text << ' ' << at - begin;
+    ASSERT_EQ((scan::FindAnyOf<';', '\xff'>(at, end, [](const char*) { return false; })), end);
+  }
+}
+
+TEST(FindAnyOfTest, WhatDoesNotStopIsPassedOver) {
+  for (std::size_t size = 1; size <= 140; ++size) {
+    ExpectTheSameStops(std::string(size, ';'));
+    std::string text(size, 'x');
+    for (std::size_t at = 0; at < size; at += 3) text[at] = at % 2 == 0 ? ';' : '\xff';
+    ExpectTheSameStops(text);
+  }
+}
+
 }  // namespace
 }  // namespace testsupport

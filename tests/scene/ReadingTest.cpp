@@ -97,6 +97,24 @@ TEST_F(ReadingTest, ACommandWithoutAnEndIsPassedOver) {
   }
 }
 
+TEST_F(ReadingTest, DataPassedOverEndBeforeEveryCommand) {
+  const std::string_view commands[] = {
+      "addAttr", "applyMetadata", "connectAttr",  "createNode", "currentUnit", "dataStructure",
+      "file",    "fileInfo",      "lockNode",     "namespace",  "parent",      "disconnectAttr",
+      "rename",  "requires",      "relationship", "select",     "setAttr",
+  };
+  for (const std::string_view command : commands) {
+    for (const std::string_view indent : {"", "\t", " \t  "}) {
+      Read("someData 1 2\n\tf 3 0 1 2\n\t\tmu 0 3\n\tfil 1\n\t\t-5 .5\n" + std::string(indent) +
+           std::string(command) + " ;");
+      ASSERT_FALSE(Diagnostics().empty()) << command;
+      EXPECT_EQ(Diagnostics().front(),
+                "1:1: the command \"someData\" has no \";\" before the next command [MA0104]")
+          << command;
+    }
+  }
+}
+
 TEST_F(ReadingTest, AFileThatEndsInACommandIsReported) {
   for (const char* bad :
        {"setAttr \".tx\" 5", "setAttr", "createNode camera -n \"x\"", "someCommand 5 ", "file -r"}) {
