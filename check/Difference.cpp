@@ -10,7 +10,7 @@
 namespace check {
 namespace {
 
-// What programs leave behind when they compute lengths, and any other number.
+// Rounding errors are smaller: of lengths, and of any other number.
 constexpr double kSameLength = 1e-6;
 constexpr double kSameNumber = 1e-9;
 

@@ -4,7 +4,6 @@ Its one argument is a JSON file: the add-on's folder, the tool, and the jobs:
 a scene, whether to bake, the frames, and where to write.
 """
 
-import json
 import sys
 
 import bpy
@@ -12,13 +11,10 @@ import bpy
 sys.path.insert(0, sys.argv[sys.argv.index("--") + 1])
 
 from blender_measure import measure, write  # noqa: E402
+from blender_session import begin, read_job  # noqa: E402
 
 
 def _import(job):
-    bpy.ops.wm.read_factory_settings(use_empty=True)
-    bpy.ops.preferences.addon_enable(module="mayascene_import")
-    addon = bpy.context.preferences.addons["mayascene_import"]
-    addon.preferences.tool = job["tool"]
     bpy.ops.import_scene.mayascene(filepath=job["scene"], bake=job["bake"],
                                    metres=job["metres"])
 
@@ -41,10 +37,9 @@ def _run(job):
 
 
 def main():
-    with open(sys.argv[sys.argv.index("--") + 2], encoding="utf-8") as file:
-        jobs = json.load(file)
-    sys.path.insert(0, jobs["addons"])
+    jobs = read_job()
     for job in jobs["jobs"]:
+        begin(jobs["addons"], job["tool"])
         _run(job)
 
 

@@ -1,6 +1,5 @@
 """Runs inside Blender: imports glTF files and measures them."""
 
-import json
 import sys
 
 import bpy
@@ -8,6 +7,7 @@ import bpy
 sys.path.insert(0, sys.argv[sys.argv.index("--") + 1])
 
 from blender_measure import measure, write  # noqa: E402
+from blender_session import read_job  # noqa: E402
 
 
 def _run(job):
@@ -25,6 +25,5 @@ def _run(job):
     write(job["output"], {"frames": measure(frames, named)})
 
 
-with open(sys.argv[sys.argv.index("--") + 2], encoding="utf-8") as jobs:
-    for one in json.load(jobs):
-        _run(one)
+for one in read_job():
+    _run(one)

@@ -4,12 +4,15 @@ The crane shot as the add-on imports it: rods along its chain of nulls, the
 camera's way over all frames, and what it sees at one of them.
 """
 
-import json
 import math
 import sys
 
 import bpy
 from mathutils import Vector
+
+sys.path.insert(0, sys.argv[sys.argv.index("--") + 1])
+
+from blender_session import begin, read_job  # noqa: E402
 
 _FRAMES_SHOWN = (0.0, 0.25, 0.5, 0.75, 1.0)
 _SIZE = (720, 405)
@@ -101,13 +104,8 @@ def _render(scene, path):
 
 
 def main():
-    with open(sys.argv[sys.argv.index("--") + 2], encoding="utf-8") as file:
-        job = json.load(file)
-    sys.path.insert(0, job["addons"])
-    bpy.ops.wm.read_factory_settings(use_empty=True)
-    bpy.ops.preferences.addon_enable(module="mayascene_import")
-    addon = bpy.context.preferences.addons["mayascene_import"]
-    addon.preferences.tool = job["tool"]
+    job = read_job()
+    begin(job["addons"], job["tool"])
     bpy.ops.import_scene.mayascene(filepath=job["scene"])
     scene = bpy.context.scene
     camera = scene.camera

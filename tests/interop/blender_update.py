@@ -10,6 +10,10 @@ import sys
 
 import bpy
 
+sys.path.insert(0, sys.argv[sys.argv.index("--") + 1])
+
+from blender_session import begin, read_job  # noqa: E402
+
 
 def _import(job, scene):
     shutil.copyfile(scene, job["place"])
@@ -66,13 +70,8 @@ def _facts(items, camera):
 
 
 def main():
-    with open(sys.argv[sys.argv.index("--") + 2], encoding="utf-8") as file:
-        job = json.load(file)
-    sys.path.insert(0, job["addons"])
-    bpy.ops.wm.read_factory_settings(use_empty=True)
-    bpy.ops.preferences.addon_enable(module="mayascene_import")
-    addon = bpy.context.preferences.addons["mayascene_import"]
-    addon.preferences.tool = job["tool"]
+    job = read_job()
+    begin(job["addons"], job["tool"])
     _import(job, job["before"])
     items, camera = _state()
     facts = [_facts(items, camera)]
