@@ -29,18 +29,6 @@ TEST_F(OutputFileTest, TheFileAppearsWithTheCommitAndNothingElseStays) {
   EXPECT_EQ(files(), Names{"out.json"});
 }
 
-TEST_F(OutputFileTest, AFinishedOutputIsWholeAndStandsNowhereUntilItIsPlaced) {
-  write("out.json", "before");
-  const auto output = OutputFile::open(target, &failure);
-  ASSERT_NE(output, nullptr) << failure;
-  output->stream() << "after";
-  ASSERT_TRUE(output->finish(&failure)) << failure;
-  EXPECT_EQ(read("out.json"), "before");
-  ASSERT_TRUE(output->place(&failure)) << failure;
-  EXPECT_EQ(read("out.json"), "after");
-  EXPECT_EQ(files(), Names{"out.json"});
-}
-
 TEST_F(OutputFileTest, WithoutACommitWhatLayThereStays) {
   write("out.json", "before");
   {

@@ -45,10 +45,7 @@ bool ExportFiles::commit() {
   std::vector<OutputFile*> all;
   for (const auto& output : beside_) all.push_back(output.get());
   if (main_ != nullptr) all.push_back(main_.get());
-  // A full disk is noticed before the first of them takes its place.
-  const auto finished = [this](OutputFile* output) { return output->finish(&failure_); };
-  const auto placed = [this](OutputFile* output) { return output->place(&failure_); };
-  return std::all_of(all.begin(), all.end(), finished) && std::all_of(all.begin(), all.end(), placed);
+  return OutputFile::commitAll(all, &failure_);
 }
 
 }  // namespace mayascene

@@ -18,8 +18,8 @@ namespace {
 
 constexpr std::array kSignals = {SIGINT, SIGTERM, SIGHUP, SIGPIPE};
 
-// As many as there can be outputs at a time, and to spare.
-std::array<std::atomic<const char*>, 8> unfinished{};
+// As many as a process may usually have open: an export can have a file for each camera.
+std::array<std::atomic<const char*>, 1024> unfinished{};
 static_assert(std::atomic<const char*>::is_always_lock_free, "a signal handler reads them");
 
 std::array<std::atomic<pid_t>, kMostChildren> children{};

@@ -11,6 +11,7 @@
 #include <optional>
 #include <system_error>
 #include <utility>
+#include <vector>
 
 #include "tools/mayascene/DescriptorBuffer.h"
 #include "tools/mayascene/Interruption.h"
@@ -88,9 +89,39 @@ struct OutputFile::State {
     return existing == nullptr || ::fchmod(opened, existing->st_mode & kPermissionBits) == 0;
   }
 
+  // Gives a file that lies at the place a second name. It keeps the first one where the file system has hard
+  // links, so that there is a whole file at any moment. What is no file stays: placing says what is wrong.
+  bool keep() {
+    struct stat existing {};
+    if (beside.empty() || ::lstat(place.c_str(), &existing) != 0 || !S_ISREG(existing.st_mode)) return true;
+    kept = nameBeside(place);
+    if (::link(place.c_str(), kept.c_str()) == 0 || std::rename(place.c_str(), kept.c_str()) == 0)
+      return true;
+    kept.clear();
+    return false;
+  }
+
+  void dropKept() {
+    if (!kept.empty()) ::unlink(kept.c_str());
+  }
+
+  // Makes it as it was before keep(). Where the file that was kept cannot take its place again it stays under
+  // its second name, which is reported.
+  void putBack(std::string* failure) {
+    if (kept.empty()) {
+      if (beside.empty() && !place.empty()) ::unlink(place.c_str());
+    } else if (std::rename(kept.c_str(), place.c_str()) == 0) {
+      // Of two names of one file rename takes neither away.
+      ::unlink(kept.c_str());
+    } else {
+      *failure += "; what was in " + target + " is in " + kept;
+    }
+  }
+
   std::string target;  // as the user named it
   std::string place;   // where the file belongs
   std::string beside;  // where it is written until it is whole; empty: written as it is, or whole already
+  std::string kept;    // what lay at the place, until all outputs have theirs; empty: nothing did
   int descriptor = -1;
   bool log = false;
   std::optional<DescriptorBuffer> buffer;
@@ -159,6 +190,26 @@ bool OutputFile::place(std::string* failure) {
   forgetUnfinished(state.beside.c_str());
   state.beside.clear();
   return true;
+}
+
+bool OutputFile::commitAll(const std::vector<OutputFile*>& outputs, std::string* failure) {
+  // A full disk is noticed before the first of them takes its place.
+  for (OutputFile* output : outputs) {
+    if (!output->finish(failure)) return false;
+  }
+  const HeldSignals held;
+  std::vector<State*> touched;
+  bool all = true;
+  for (OutputFile* output : outputs) {
+    State& state = *output->state_;
+    touched.push_back(&state);
+    all = state.keep();
+    if (!all) *failure = cannotWrite(state.target, errno);
+    all = all && output->place(failure);
+    if (!all) break;
+  }
+  for (State* state : touched) all ? state->dropKept() : state->putBack(failure);
+  return all;
 }
 
 }  // namespace mayascene

@@ -5,6 +5,7 @@
 #include <memory>
 #include <ostream>
 #include <string>
+#include <vector>
 
 namespace mayascene {
 
@@ -36,12 +37,15 @@ class OutputFile {
   // when a write has failed or the file cannot take its place.
   bool commit(std::string* failure) { return finish(failure) && place(failure); }
 
-  // The two halves of commit(), for several outputs of which none is to appear where one fails: first all are
-  // finished, then all are placed. Finishing writes everything out and closes the file.
+  // The same for several outputs, all or none: where one cannot take its place, those before it are taken
+  // away again and what lay there is back. Signals that end the run wait meanwhile.
+  static bool commitAll(const std::vector<OutputFile*>& outputs, std::string* failure);
+
+ private:
+  // Writes everything out and closes the file.
   bool finish(std::string* failure);
   bool place(std::string* failure);
 
- private:
   struct State;
   explicit OutputFile(std::unique_ptr<State> state);
   std::unique_ptr<State> state_;
