@@ -6,9 +6,9 @@ import subprocess
 
 import assimp
 import blender
+import browser
 import exports
 import gltf
-import node
 from comparison import compare
 from scenes import ROOT
 
@@ -55,7 +55,7 @@ def through_three(scenes, files, folder):
              "frames": _frames(scene, files[scene.name]),
              "output": os.path.join(folder, scene.name + ".three.json")}
             for scene in scenes]
-    node.run("three_measure.mjs", jobs, folder)
+    browser.run(jobs, folder)
     for scene, job in zip(scenes, jobs):
         found = blender.read(job["output"])
         yield scene, _held(scene, found["frames"], in_metres(scene))

@@ -12,10 +12,10 @@ import addon_test
 import addon_update_test
 import assimp
 import blender
+import browser
 import chan_test
 import exports
 import gltf_test
-import node
 import scenes
 import usd_test
 import usda
@@ -98,7 +98,7 @@ def _gltf(run):
     _remark_lens(run, "glTF", gltf_test.lens_problems(run.scenes, gltf))
     ways = ((f".gltf, Blender {blender.version()}",
              gltf_test.through_blender, gltf),
-            (f".glb, three {node.version_of('three')}",
+            (f".glb, {browser.version()}",
              gltf_test.through_three, glb),
             (f".gltf, assimp {assimp.version()}",
              gltf_test.through_assimp, gltf))
@@ -110,7 +110,7 @@ def _gltf(run):
 def _usd(run):
     files = _exported(run, ".usda")
     _remark_lens(run, "USD", usd_test.lens_problems(run.scenes, files))
-    through = f".usda, three {node.version_of('three')}"
+    through = f".usda, {browser.version()}"
     for scene, result in usd_test.through_three(run.scenes, files,
                                                 run.folder):
         run.take(scene, through, result)
@@ -125,7 +125,7 @@ def _chan(run):
 
 
 _FAILURES = (assimp.AssimpFailed, blender.BlenderFailed,
-             exports.ExportFailed, node.NodeFailed, usda.NoUsda)
+             exports.ExportFailed, browser.BrowserFailed, usda.NoUsda)
 
 _PARTS = {"addon": _addon, "gltf": _gltf, "usd": _usd, "chan": _chan}
 

@@ -4,8 +4,8 @@
 import os
 
 import blender
+import browser
 import exports
-import node
 import usda
 from comparison import compare
 from gltf_test import in_metres
@@ -112,7 +112,7 @@ def through_three(scenes, files, folder):
                 composition.number_of(composition.start) / composition.rate,
                 1.0 / composition.rate),
             "output": os.path.join(folder, scene.name + ".usd.json")})
-    node.run("three_measure.mjs", jobs, folder)
+    browser.run(jobs, folder)
     for scene, stage, job in zip(scenes, stages, jobs):
         found = blender.read(job["output"])
         yield scene, compare(scene.composition, found["frames"],
