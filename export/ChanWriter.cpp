@@ -5,8 +5,10 @@
 #include <algorithm>
 #include <cmath>
 #include <cstddef>
+#include <optional>
 #include <ostream>
 #include <string>
+#include <vector>
 
 #include "export/Places.h"
 #include "export/ReportedLosses.h"
@@ -19,31 +21,43 @@ namespace {
 
 using diag::Code;
 
-Matrix ViewInScene(const Composition& composition, std::size_t layer, std::size_t frame) {
-  const Matrix view = ViewAt(composition, layer, frame);
-  if (composition.axes == Axes::Scene) return view;
-  const Matrix turned = Scaling({1.0, -1.0, -1.0});
-  return turned * view * turned;
+struct CameraFile {
+  std::size_t layer;
+  std::ostream* stream;
+  Vector angles;  // those of the frame before
+};
+
+void WriteLine(CameraFile& camera, Matrix view, const Composition& composition, std::size_t frame) {
+  if (composition.axes == Axes::Host) {
+    const Matrix turned = Scaling({1.0, -1.0, -1.0});
+    view = turned * view * turned;
+  }
+  const auto first = static_cast<long long>(std::floor(composition.firstFrame));
+  const Vector place = view.Column(3);
+  camera.angles = AnglesOf(view, RotationOrder::XYZ, camera.angles);
+  const Vector& angles = camera.angles;
+  std::string line = std::to_string(first + static_cast<long long>(frame));
+  for (const double value : {place.x, place.y, place.z, angles.x, angles.y, angles.z,
+                             VerticalAngleAt(composition, *composition.layers[camera.layer].lens, frame)}) {
+    line += '\t';
+    AppendNumber(&line, value);
+  }
+  line += '\n';
+  camera.stream->write(line.data(), static_cast<std::streamsize>(line.size()));
 }
 
-bool WriteCamera(std::ostream* stream, const Composition& composition, std::size_t index) {
-  TextWriter out(stream);
-  const Layer& layer = composition.layers[index];
-  const double first = std::floor(composition.firstFrame);
-  Vector angles;
+// None, or the camera with a place that is no number.
+std::optional<std::size_t> WriteFrames(std::vector<CameraFile>& cameras, const Composition& composition) {
+  Worlds worlds(composition, true);
   for (std::size_t frame = 0; frame < composition.frames; ++frame) {
-    const Matrix view = ViewInScene(composition, index, frame);
-    if (!IsFinite(view)) return false;
-    const Vector place = view.Column(3);
-    angles = AnglesOf(view, RotationOrder::XYZ, angles);
-    out << std::to_string(static_cast<long long>(first) + static_cast<long long>(frame));
-    for (const double value : {place.x, place.y, place.z, angles.x, angles.y, angles.z,
-                               VerticalAngleAt(composition, *layer.lens, frame)}) {
-      out << '\t' << value;
+    worlds.GoTo(frame);
+    for (CameraFile& camera : cameras) {
+      const Matrix view = worlds.ViewOf(camera.layer);
+      if (!IsFinite(view)) return camera.layer;
+      WriteLine(camera, view, composition, frame);
     }
-    out << '\n';
   }
-  return true;
+  return std::nullopt;
 }
 
 void SayWhatIsLost(const Composition& composition, diag::Collector* diagnostics) {
@@ -61,24 +75,27 @@ void SayWhatIsLost(const Composition& composition, diag::Collector* diagnostics)
 
 bool WriteChan(const Composition& composition, const WriteOptions& /*options*/, Files& files,
                diag::Collector* diagnostics) {
-  const auto cameras = std::count_if(composition.layers.begin(), composition.layers.end(),
-                                     [](const Layer& layer) { return layer.kind == LayerKind::Camera; });
-  if (cameras == 0) {
+  const auto count = std::count_if(composition.layers.begin(), composition.layers.end(),
+                                   [](const Layer& layer) { return layer.kind == LayerKind::Camera; });
+  if (count == 0) {
     diagnostics->Report(Code::ExportWithoutCamera, {});
     return false;
   }
+  std::vector<CameraFile> cameras;
   for (std::size_t i = 0; i < composition.layers.size(); ++i) {
     const Layer& layer = composition.layers[i];
     if (layer.kind != LayerKind::Camera) continue;
     std::string name;
     // One camera has the output that was named; of several each has its name after it.
     std::ostream* const stream =
-        cameras == 1 ? files.Main() : files.Beside('.' + SafeName(layer.name, "camera"), ".chan", &name);
+        count == 1 ? files.Main() : files.Beside('.' + SafeName(layer.name, "camera"), ".chan", &name);
     if (stream == nullptr) return false;
-    if (!WriteCamera(stream, composition, i)) {
-      diagnostics->Report(Code::ExportNumberTooLarge, {}, {layer.name, "a place in the world"});
-      return false;
-    }
+    cameras.push_back({i, stream, {}});
+  }
+  if (const auto tooFar = WriteFrames(cameras, composition)) {
+    diagnostics->Report(Code::ExportNumberTooLarge, {},
+                        {composition.layers[*tooFar].name, "a place in the world"});
+    return false;
   }
   SayWhatIsLost(composition, diagnostics);
   return true;

@@ -8,7 +8,6 @@
 #include <vector>
 
 #include "diag/ShownText.h"
-#include "export/LayerTree.h"
 #include "export/Places.h"
 #include "export/ReportedLosses.h"
 #include "export/TextWriter.h"
@@ -57,29 +56,20 @@ void WriteLens(TextWriter& out, const Composition& composition, const Layer& lay
       << VerticalAngleAt(composition, *layer.lens, frame);
 }
 
-// The rows of the frames. A layer's world matrix is that of its parent, which is there already, and its own
-// place: however deep the layers are nested, each is worked out once a frame.
+// The rows of the frames.
 class Frames {
  public:
   Frames(const Composition& composition, TextWriter* out)
-      : composition_(composition),
-        order_(LayerTree(composition).ParentsFirst()),
-        worlds_(composition.layers.size()),
-        angles_(composition.layers.size()),
-        out_(*out) {
+      : composition_(composition), worlds_(composition), angles_(composition.layers.size()), out_(*out) {
     for (const Layer& layer : composition.layers) names_.push_back(Cell(layer.name));
   }
 
   // None, or the layer with a place that is no number.
   std::optional<std::size_t> Write() {
     for (std::size_t frame = 0; frame < composition_.frames; ++frame) {
-      for (const std::size_t index : order_) {
-        const Layer& layer = composition_.layers[index];
-        const Matrix local = LocalAt(composition_, layer, frame);
-        worlds_[index] = layer.parent ? worlds_[*layer.parent] * local : local;
-      }
+      worlds_.GoTo(frame);
       for (std::size_t index = 0; index < names_.size(); ++index) {
-        if (!IsFinite(worlds_[index].Column(3))) return index;
+        if (!IsFinite(worlds_.Of(index).Column(3))) return index;
         WriteRow(index, frame);
       }
     }
@@ -94,7 +84,7 @@ class Frames {
     WriteVector(out_, At(layer.position, frame));
     WriteVector(out_, AnglesAt(index, frame));
     WriteVector(out_, At(layer.scale, frame));
-    WriteVector(out_, worlds_[index].Column(3));
+    WriteVector(out_, worlds_.Of(index).Column(3));
     WriteLens(out_, composition_, layer, frame);
     out_ << ',' << index + 1 << ',';
     if (layer.parent) out_ << *layer.parent + 1;
@@ -114,8 +104,7 @@ class Frames {
   }
 
   const Composition& composition_;
-  const std::vector<std::size_t> order_;
-  std::vector<Matrix> worlds_;
+  Worlds worlds_;
   std::vector<Vector> angles_;
   std::vector<std::string> names_;
   TextWriter& out_;

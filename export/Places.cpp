@@ -2,6 +2,10 @@
 
 #include <cmath>
 #include <numbers>
+#include <optional>
+#include <vector>
+
+#include "export/LayerTree.h"
 
 namespace interchange {
 namespace {
@@ -57,18 +61,27 @@ Matrix LocalAt(const Composition& composition, const Layer& layer, std::size_t f
   return local;
 }
 
-Matrix WorldAt(const Composition& composition, std::size_t layer, std::size_t frame) {
-  Matrix world = LocalAt(composition, composition.layers[layer], frame);
-  std::size_t steps = 0;
-  for (auto above = composition.layers[layer].parent; above && ++steps < composition.layers.size();
-       above = composition.layers[*above].parent) {
-    world = LocalAt(composition, composition.layers[*above], frame) * world;
+Worlds::Worlds(const Composition& composition, bool camerasAlone)
+    : composition_(composition),
+      order_(LayerTree(composition).ParentsFirst()),
+      matrices_(composition.layers.size()) {
+  if (!camerasAlone) return;
+  std::vector<bool> wanted(matrices_.size());
+  // Children come before their parents here.
+  for (auto layer = order_.rbegin(); layer != order_.rend(); ++layer) {
+    const Layer& one = composition.layers[*layer];
+    if (one.kind == LayerKind::Camera) wanted[*layer] = true;
+    if (wanted[*layer] && one.parent) wanted[*one.parent] = true;
   }
-  return world;
+  std::erase_if(order_, [&](std::size_t layer) { return !wanted[layer]; });
 }
 
-Matrix ViewAt(const Composition& composition, std::size_t layer, std::size_t frame) {
-  return RigidOf(WorldAt(composition, layer, frame));
+void Worlds::GoTo(std::size_t frame) {
+  for (const std::size_t layer : order_) {
+    const std::optional<std::size_t>& parent = composition_.layers[layer].parent;
+    const Matrix local = LocalAt(composition_, composition_.layers[layer], frame);
+    matrices_[layer] = parent ? matrices_[*parent] * local : local;
+  }
 }
 
 double VerticalAngleAt(const Composition& composition, const Lens& lens, std::size_t frame) {
