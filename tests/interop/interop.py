@@ -8,6 +8,7 @@ import os
 import sys
 import tempfile
 
+import addon_refusals_test
 import addon_test
 import addon_update_test
 import assimp
@@ -43,7 +44,8 @@ class Run:
         self.examples = scenes.examples(self.tool)
         self.shots, self.absent = scenes.shots(self.tool)
         self.scenes = self.examples + self.shots
-        for scene in self.scenes:
+        self.exported = self.scenes + [scenes.before_zero(self.tool, folder)]
+        for scene in self.exported:
             if not scene.imported:
                 self.problems.append(f"{scene.name} is not imported")
 
@@ -72,6 +74,7 @@ def _addon(run):
         results = addon_test.measure(taken, run.tool, _ADDONS, run.folder)
         for scene, result in zip(taken, results):
             run.take(scene, f"{through}, Blender {blender.version()}", result)
+    run.problems += addon_refusals_test.problems(run.tool, _ADDONS, run.folder)
     lens = next(scene for scene in run.examples if scene.name == "dolly_zoom")
     run.problems += [
         f"second import: {text}" for text in addon_update_test.problems(
@@ -80,7 +83,7 @@ def _addon(run):
 
 def _exported(run, suffix):
     return {scene.name: exports.export(run.tool, scene, suffix, run.folder)
-            for scene in run.scenes}
+            for scene in run.exported}
 
 
 def _remark_lens(run, format_name, found):
@@ -95,7 +98,7 @@ def _gltf(run):
     run.problems += gltf_test.validator_problems(
         [*gltf.values(), *glb.values()])
     run.remarks.append(f"glTF: {2 * len(gltf)} files go to the validator")
-    _remark_lens(run, "glTF", gltf_test.lens_problems(run.scenes, gltf))
+    _remark_lens(run, "glTF", gltf_test.lens_problems(run.exported, gltf))
     ways = ((f".gltf, Blender {blender.version()}",
              gltf_test.through_blender, gltf),
             (f".glb, {browser.version()}",
@@ -103,15 +106,15 @@ def _gltf(run):
             (f".gltf, assimp {assimp.version()}",
              gltf_test.through_assimp, gltf))
     for through, way, files in ways:
-        for scene, result in way(run.scenes, files, run.folder):
+        for scene, result in way(run.exported, files, run.folder):
             run.take(scene, through, result)
 
 
 def _usd(run):
     files = _exported(run, ".usda")
-    _remark_lens(run, "USD", usd_test.lens_problems(run.scenes, files))
+    _remark_lens(run, "USD", usd_test.lens_problems(run.exported, files))
     through = f".usda, {browser.version()}"
-    for scene, result in usd_test.through_three(run.scenes, files,
+    for scene, result in usd_test.through_three(run.exported, files,
                                                 run.folder):
         run.take(scene, through, result)
 
@@ -119,7 +122,7 @@ def _usd(run):
 def _chan(run):
     files = _exported(run, ".chan")
     through = f".chan, Blender {blender.version()}"
-    for scene, result in chan_test.through_blender(run.scenes, files,
+    for scene, result in chan_test.through_blender(run.exported, files,
                                                    run.folder):
         run.take(scene, through, result)
 

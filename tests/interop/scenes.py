@@ -45,6 +45,38 @@ def examples(tool, bake=True):
             for name in sorted(os.listdir(folder)) if name.endswith(".ma")]
 
 
+# A camera on a rig that turns, with a lens that moves, before frame 0.
+_BEFORE_ZERO = """//Maya ASCII 2023 scene
+currentUnit -l centimeter -a degree -t film;
+createNode transform -n "rig";
+\tsetAttr ".t" -type "double3" 30 120 -40;
+createNode transform -n "before" -p "rig";
+createNode camera -n "beforeShape" -p "before";
+createNode animCurveTL -n "before_tz";
+\tsetAttr ".tan" 2;
+\tsetAttr -s 2 ".ktv[0:1]"  -36 250 -12 130;
+createNode animCurveTA -n "rig_ry";
+\tsetAttr ".tan" 2;
+\tsetAttr -s 3 ".ktv[0:2]"  -36 0 -24 40 -12 -25;
+createNode animCurveTU -n "before_fl";
+\tsetAttr ".tan" 2;
+\tsetAttr -s 2 ".ktv[0:1]"  -36 35 -12 50;
+createNode script -n "sceneConfigurationScriptNode";
+\tsetAttr ".b" -type "string" "playbackOptions -min -36 -max -12";
+\tsetAttr ".st" 6;
+connectAttr "before_tz.o" "before.tz";
+connectAttr "rig_ry.o" "rig.ry";
+connectAttr "before_fl.o" "beforeShape.fl";
+"""
+
+
+def before_zero(tool, folder):
+    path = os.path.join(folder, "frames_before_zero.ma")
+    with open(path, "w", encoding="utf-8") as file:
+        file.write(_BEFORE_ZERO)
+    return Scene(path, tool)
+
+
 def shots(tool):
     """Those that are there, and how many are not."""
     folder = os.path.join(os.path.dirname(ROOT), "shared", "shots")
