@@ -63,6 +63,7 @@ struct HostOptions {
 struct Leftover {
   std::string description;  // such as "stream:3 (position of layer:2)"
   bool keptByDesign = false;
+  bool importFile = false;  // the file object that every import keeps
 };
 
 // What came of one callback. The texts are UTF-8.

@@ -62,12 +62,10 @@ struct UtilityVisit {
 void visitUtilityObject(void* context, std::int32_t kind, const char* description,
                         std::int32_t releaseFailed) {
   UtilityVisit& visit = *static_cast<UtilityVisit*>(context);
-  bool kept = releaseFailed != 0;
-  if (!kept && kind == HOST_LEDGER_FILE && visit.mayKeepFile) {
-    kept = true;
-    visit.mayKeepFile = false;
-  }
-  visit.leftovers->push_back({shownText(description), kept});
+  const bool releaseWasMadeToFail = releaseFailed != 0;
+  const bool importFile = !releaseWasMadeToFail && kind == HOST_LEDGER_FILE && visit.mayKeepFile;
+  if (importFile) visit.mayKeepFile = false;
+  visit.leftovers->push_back({shownText(description), releaseWasMadeToFail || importFile, importFile});
 }
 
 }  // namespace

@@ -39,7 +39,7 @@ class Runs(unittest.TestCase):
 
     def test_without_a_bake_its_lines_are_remarks(self):
         tool = self.tool_that_says(
-            0, "mayascene: a.ma: kept by design: file a.ma\nline 4: no keys")
+            0, "\nline 4: no keys")
         self.assertEqual(runner.run(tool, "a.ma", False).remarks,
                          [("warning", "line 4: no keys")])
 

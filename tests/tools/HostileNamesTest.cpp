@@ -24,7 +24,7 @@ class HostileNames : public ToolTest {
     return json::parse(result.out)["scenes"][0]["compositions"][0]["layers"][0]["name"];
   }
 
-  std::string outline() { return run({"import", "named.ma"}).out; }
+  std::string outline() { return run({"import", "-v", "named.ma"}).out; }
 };
 
 TEST_F(HostileNames, EscapeSequencesDoNotReachTheTerminal) {

@@ -1,25 +1,64 @@
 #include "tools/mayascene/Outline.h"
 
-#include <gtest/gtest.h>
+#include <gmock/gmock.h>
 
+#include <cstdint>
+#include <memory>
 #include <sstream>
 #include <string>
+#include <utility>
+#include <vector>
 
+#include "hostapi/LayerStreams.h"
 #include "tests/tools/HandBuiltScene.h"
 
 namespace mayascene {
 namespace {
 
 using mayascene_test::HandBuiltScene;
+using ::testing::HasSubstr;
 
-std::string outlineOf(const SceneReport& report) {
+std::string outlineOf(const SceneReport& report, Detail detail = Detail::Properties) {
   std::ostringstream out;
-  printOutline(out, report, Style(false));
+  printOutline(out, report, detail, Style(false));
   return out.str();
 }
 
 bool contains(const std::string& text, const std::string& part) {
   return text.find(part) != std::string::npos;
+}
+
+TEST(Outline, InShortALayerIsALineWithItsLensAndWhatIsAnimatedWhen) {
+  HandBuiltScene scene;
+  EXPECT_EQ(outlineOf(scene.report, Detail::Layers),
+            "shots/crane.ma: 1 composition, 1 camera, 2 nulls, 4 keys\n"
+            "\n"
+            "\"crane\"   1920 x 1080 px, pixel aspect 1, 24 fps, 2 s (48 frames)\n"
+            "  null \"base\"   still\n"
+            "    null \"arm\"   position animated, frames 0 to 47\n"
+            "      camera \"shotcamShape\", aimed at its point of interest   lens 24.7 mm   still\n");
+}
+
+TEST(Outline, InShortKeysOfOneValueAreStillAndTheWidestSpanOfFramesIsShown) {
+  HandBuiltScene scene;
+  refhost::Layer& camera = scene.layers[0];
+  camera.filmDirection = refhost::kFilmNeverSet;
+  const auto animate = [&](std::int32_t id, std::vector<T_Time> times, std::vector<double> values) {
+    for (refhost::Stream& stream : camera.streams) {
+      if (stream.id != id) continue;
+      stream.keys = std::make_unique<refhost::KeyColumns>();
+      stream.keys->times = refhost::KeyTimes(std::move(times));
+      stream.keys->values = std::move(values);
+    }
+  };
+  animate(HOST_STREAM_ZOOM, {{3000, 24000}, {4000, 24000}, {5000, 24000}}, {700, 800, 640});
+  animate(HOST_STREAM_ROTATION_X, {{1, 24}, {7, 24}}, {1, 2});
+  animate(HOST_STREAM_ROTATION_Z, {{2, 24}, {11, 24}}, {3, 4});
+  animate(HOST_STREAM_ROTATION_Y, {{0, 24}, {40, 24}}, {5, 5});
+  animate(HOST_STREAM_ANCHOR_POINT, {{6, 24}, {8, 24}}, {0, 0, 0, 0, 0, 9});
+  EXPECT_THAT(
+      outlineOf(scene.report, Detail::Layers),
+      HasSubstr("   zoom 640 to 800 px   zoom, rotation, point of interest animated, frames 1 to 11\n"));
 }
 
 TEST(Outline, LayersFormATreeOfParentsWithValuesAndKeys) {
@@ -88,13 +127,15 @@ TEST(Outline, HostileNamesAreEscapedWhereverTheyStand) {
   scene.composition.name = "b\nc";
   scene.layers[0].name = "d\x1b]0;e\a";
   scene.report.result.messages = {"f\x1bg"};
-  const std::string outline = outlineOf(scene.report);
-  EXPECT_EQ(outline.find('\x1b'), std::string::npos);
-  EXPECT_EQ(outline.find('\a'), std::string::npos);
-  EXPECT_TRUE(contains(outline, "a\\x1b[2J.ma: 1 composition"));
-  EXPECT_TRUE(contains(outline, "\"b\\nc\"   1920"));
-  EXPECT_TRUE(contains(outline, "camera \"d\\x1b]0;e\\x07\""));
-  EXPECT_TRUE(contains(outline, "  f\\x1bg\n"));
+  for (const Detail detail : {Detail::Layers, Detail::Properties}) {
+    const std::string outline = outlineOf(scene.report, detail);
+    EXPECT_EQ(outline.find('\x1b'), std::string::npos);
+    EXPECT_EQ(outline.find('\a'), std::string::npos);
+    EXPECT_TRUE(contains(outline, "a\\x1b[2J.ma: 1 composition"));
+    EXPECT_TRUE(contains(outline, "\"b\\nc\"   1920"));
+    EXPECT_TRUE(contains(outline, "camera \"d\\x1b]0;e\\x07\""));
+    EXPECT_TRUE(contains(outline, "  f\\x1bg\n"));
+  }
 }
 
 TEST(Outline, AChainOfTwentyThousandParentsIsShownInDepthsAndDoesNotGrowTheLines) {

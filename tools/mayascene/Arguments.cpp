@@ -174,6 +174,7 @@ struct CommandLine {
     addScenes(importVerb, &import.scenes);
     importVerb->add_option("--json", import.json, "write all of it, keys included; - is standard output")
         ->option_text("FILE");
+    importVerb->add_flag("-v,--verbose", import.verbose, "show every property in the outline");
     importVerb->add_flag("-q,--quiet", import.quiet, "print nothing but errors");
     importVerb->add_flag("--bake", importBakes, "bake each scene first: see mayascene bake");
     addHostOptions(importVerb, &import.host, &importHostWords);

@@ -39,6 +39,7 @@ struct ImportArguments {
   std::vector<std::string> scenes;
   std::string json;  // empty: none; "-": standard output
   bool quiet = false;
+  bool verbose = false;               // the outline shows every property; not with quiet
   std::optional<BakeArguments> bake;  // bake each scene first; its scenes and its output are not set
 };
 

@@ -19,15 +19,15 @@ std::string describeFailure(const refhost::CallbackResult& result) {
 
 }  // namespace
 
-Diagnostics::Diagnostics(std::ostream& stream, Style style, bool quiet)
-    : stream_(stream), style_(style), quiet_(quiet) {}
+Diagnostics::Diagnostics(std::ostream& stream, Style style, Volume volume)
+    : stream_(stream), style_(style), volume_(volume) {}
 
 void Diagnostics::complain(std::string_view subject, std::string_view sentence) {
   line(subject, sentence, true);
 }
 
 void Diagnostics::remark(std::string_view subject, std::string_view sentence) {
-  if (!quiet_) line(subject, sentence, false);
+  if (volume_ != Volume::Quiet) line(subject, sentence, false);
 }
 
 void Diagnostics::close(std::string_view subject, std::string_view sentence) {
@@ -36,7 +36,7 @@ void Diagnostics::close(std::string_view subject, std::string_view sentence) {
 
 void Diagnostics::show(std::string_view file, const diag::Diagnostic& diagnostic) {
   const bool error = diag::EntryOf(diagnostic.code).severity == diag::Severity::Error;
-  if (quiet_ && !error) return;
+  if (volume_ == Volume::Quiet && !error) return;
   const std::string text = diag::Render(file, diagnostic);
   stream_ << (error ? style_.alarm(text) : text) << std::flush;
 }
@@ -45,6 +45,7 @@ ExitStatus Diagnostics::judge(std::string_view subject, const refhost::CallbackR
   for (const std::string& refusal : result.refusals) complain(subject, "the host refused: " + refusal);
   if (result.code != 0) complain(subject, describeFailure(result));
   for (const refhost::Leftover& leftover : result.leftovers) {
+    if (leftover.importFile && volume_ != Volume::Verbose) continue;
     if (leftover.keptByDesign) {
       remark(subject, "kept by design: " + leftover.description);
     } else {

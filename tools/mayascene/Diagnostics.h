@@ -12,10 +12,16 @@
 
 namespace mayascene {
 
+enum class Volume {
+  Quiet,  // errors only
+  Usual,
+  Verbose,  // what an import keeps by design, too
+};
+
 class Diagnostics {
  public:
-  // The stream outlives the object. Quiet: errors only.
-  Diagnostics(std::ostream& stream, Style style, bool quiet);
+  // The stream outlives the object.
+  Diagnostics(std::ostream& stream, Style style, Volume volume);
 
   // "mayascene: SUBJECT: SENTENCE"; without the subject where that is empty. Both may hold anything.
   void complain(std::string_view subject, std::string_view sentence);
@@ -29,7 +35,8 @@ class Diagnostics {
   void show(std::string_view file, const diag::Diagnostic& diagnostic);
 
   // What was wrong with a callback: the code that it returned, what the host refused, what it left behind.
-  // Refused where the code is not 0 or the ledger is not clean.
+  // The file object that every import keeps is no news, and shown when verbose alone. Refused where the code
+  // is not 0 or the ledger is not clean.
   ExitStatus judge(std::string_view subject, const refhost::CallbackResult& result);
 
   // The messages that the host showed, for runs that print no outline.
@@ -40,7 +47,7 @@ class Diagnostics {
 
   std::ostream& stream_;
   Style style_;
-  bool quiet_;
+  Volume volume_;
 };
 
 }  // namespace mayascene

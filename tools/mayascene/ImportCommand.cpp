@@ -73,7 +73,7 @@ ExitStatus importAll(const ImportArguments& arguments, HostSession& session, Out
     if (outputs.outline && report.outcome != Outcome::Unreadable && !report.explained) {
       std::ostream& out = outputs.outline->stream();
       if (!std::exchange(first, false)) out << '\n';
-      printOutline(out, report, style);
+      printOutline(out, report, arguments.verbose ? Detail::Properties : Detail::Layers, style);
       out.flush();
     }
     if (outputs.json) report.numbers = numbersOf(report, arguments.bake ? &run->bakes.back() : nullptr);

@@ -9,6 +9,7 @@
 
 #include "hostapi/CameraSuite.h"
 #include "hostapi/LayerStreams.h"
+#include "tools/mayascene/LayerSummary.h"
 #include "tools/mayascene/Quantities.h"
 #include "tools/mayascene/StreamWords.h"
 
@@ -77,11 +78,7 @@ std::string layerTitle(const Layer& layer, const Style& style) {
   return "null " + name;
 }
 
-void printLayer(std::ostream& out, const Layer& layer, std::size_t depth, const Style& style) {
-  const std::string indent(kStep * (1 + std::min(depth, kDeepest)), ' ');
-  out << indent;
-  if (depth > kDeepest) out << style.faint("[depth " + std::to_string(depth) + "] ");
-  out << layerTitle(layer, style) << '\n';
+void printProperties(std::ostream& out, const Layer& layer, const std::string& indent, const Style& style) {
   const std::vector<Row> rows = rowsOf(layer);
   std::size_t widest = 0;
   for (const Row& row : rows) {
@@ -97,9 +94,19 @@ void printLayer(std::ostream& out, const Layer& layer, std::size_t depth, const 
   }
 }
 
+void printLayer(std::ostream& out, const Layer& layer, std::size_t depth, Detail detail, const Style& style) {
+  const std::string indent(kStep * (1 + std::min(depth, kDeepest)), ' ');
+  out << indent;
+  if (depth > kDeepest) out << style.faint("[depth " + std::to_string(depth) + "] ");
+  out << layerTitle(layer, style);
+  if (detail == Detail::Layers && layer.kind != LayerKind::Composition) out << "   " << layerSummary(layer);
+  out << '\n';
+  if (detail == Detail::Properties) printProperties(out, layer, indent, style);
+}
+
 // Parents before their children, and what stands on one level in the order in which it was made. Written
 // without recursion: a chain of parents can be longer than the stack is deep.
-void printLayers(std::ostream& out, const Composition& composition, const Style& style) {
+void printLayers(std::ostream& out, const Composition& composition, Detail detail, const Style& style) {
   std::unordered_map<const Layer*, std::vector<const Layer*>> children;
   for (const Layer* layer : composition.layers) children[layer->parent].push_back(layer);
   struct Pending {
@@ -118,19 +125,19 @@ void printLayers(std::ostream& out, const Composition& composition, const Style&
   while (!pending.empty()) {
     const Pending next = pending.back();
     pending.pop_back();
-    printLayer(out, *next.layer, next.depth, style);
+    printLayer(out, *next.layer, next.depth, detail, style);
     push(next.layer, next.depth + 1);
   }
 }
 
-void printComposition(std::ostream& out, const Composition& composition, const Style& style) {
+void printComposition(std::ostream& out, const Composition& composition, Detail detail, const Style& style) {
   out << '\n'
       << style.strong(quotedTerminalText(composition.name)) << "   " << composition.width << " x "
       << composition.height << " px, pixel aspect " << ratioText(composition.pixelAspect) << ", "
       << ratioText(composition.frameRate) << " fps, "
       << durationText(composition.duration, composition.frameRate) << '\n';
   if (composition.layers.empty()) out << "  no layers\n";
-  printLayers(out, composition, style);
+  printLayers(out, composition, detail, style);
 }
 
 // "1 composition, 1 camera, 2 nulls, 840 keys"
@@ -169,11 +176,11 @@ std::string headline(const SceneReport& scene) {
 
 }  // namespace
 
-void printOutline(std::ostream& out, const SceneReport& scene, const Style& style) {
+void printOutline(std::ostream& out, const SceneReport& scene, Detail detail, const Style& style) {
   out << terminalText(scene.path) << ": " << headline(scene) << '\n';
   if (madeSomething(scene)) {
     for (const Composition* composition : scene.result.folder->compositions) {
-      printComposition(out, *composition, style);
+      printComposition(out, *composition, detail, style);
     }
   }
   if (scene.result.messages.empty()) return;

@@ -8,8 +8,13 @@
 
 namespace mayascene {
 
-// The compositions of the scene's folder, their layers in order as a tree of parents with values and keys,
-// then the messages that the host showed. Names and messages are escaped.
-void printOutline(std::ostream& out, const SceneReport& scene, const Style& style);
+enum class Detail {
+  Layers,      // a line each: its lens, what is animated, and over which frames
+  Properties,  // and below it a line for each property, with its value and keys
+};
+
+// The compositions of the scene's folder, their layers in order as a tree of parents, then the messages that
+// the host showed. Names and messages are escaped.
+void printOutline(std::ostream& out, const SceneReport& scene, Detail detail, const Style& style);
 
 }  // namespace mayascene

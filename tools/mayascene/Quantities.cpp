@@ -3,6 +3,7 @@
 #include <array>
 #include <charconv>
 #include <cmath>
+#include <cstdint>
 #include <string_view>
 #include <vector>
 
@@ -43,6 +44,12 @@ std::string frameText(const T_Time& time, const HostRatio& rate) {
 std::string secondsText(const T_Time& time) {
   if (!hasSeconds(time)) return std::to_string(time.value) + "/0 s";
   return numberText(seconds(time)) + " s";
+}
+
+bool isSameTime(const T_Time& a, const T_Time& b) { return a.value == b.value && a.scale == b.scale; }
+
+std::string secondsSpan(const T_Time& first, const T_Time& last) {
+  return isSameTime(first, last) ? secondsText(first) : secondsText(first) + " to " + secondsText(last);
 }
 
 // Whether the keys, of which there are several, hold one value but for rounding noise.
@@ -86,15 +93,24 @@ std::string keysText(const refhost::Stream& stream, const HostRatio& rate) {
   const refhost::KeyColumns& keys = *stream.keys;
   const T_Time& first = keys.times.front();
   const T_Time& last = keys.times.back();
-  const bool single = keys.times.size() == 1;
-  const std::string span = single ? secondsText(first) : secondsText(first) + " to " + secondsText(last);
+  const std::string span = secondsSpan(first, last);
   const std::string text = countText(keys.times.size(), "key") + ", ";
   const std::string ending = isConstant(stream) ? ", constant" : "";
   if (!hasFrames(first, rate) || !hasFrames(last, rate)) return text + span + ending;
-  const std::string frames = single ? "frame " + frameText(first, rate)
-                                    : "frames " + frameText(first, rate) + " to " + frameText(last, rate);
-  return text + frames + " (" + span + ')' + ending;
+  return text + spanText(first, last, rate) + " (" + span + ')' + ending;
 }
+
+std::string spanText(const T_Time& first, const T_Time& last, const HostRatio& rate) {
+  if (!hasFrames(first, rate) || !hasFrames(last, rate)) return secondsSpan(first, last);
+  if (isSameTime(first, last)) return "frame " + frameText(first, rate);
+  return "frames " + frameText(first, rate) + " to " + frameText(last, rate);
+}
+
+bool isEarlier(const T_Time& one, const T_Time& other) {
+  return std::int64_t{one.value} * other.scale < std::int64_t{other.value} * one.scale;
+}
+
+bool isStill(const refhost::Stream& stream) { return stream.keyCount() < 2 || isConstant(stream); }
 
 std::string valueText(const refhost::Stream& stream) {
   std::string text;

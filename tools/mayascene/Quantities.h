@@ -26,6 +26,14 @@ std::string durationText(const T_Time& duration, const HostRatio& rate);
 // several keys have one value. The stream has keys.
 std::string keysText(const refhost::Stream& stream, const HostRatio& rate);
 
+// "frames 0 to 119", "frame 0"; seconds where the rate gives no frames.
+std::string spanText(const T_Time& first, const T_Time& last, const HostRatio& rate);
+
+bool isEarlier(const T_Time& one, const T_Time& other);
+
+// Whether the stream has one value at all times, but for rounding noise: by no key, by one, or by several.
+bool isStill(const refhost::Stream& stream);
+
 // "12, -3.5, 0"
 std::string valueText(const refhost::Stream& stream);
 

@@ -23,6 +23,7 @@ namespace {
 using mayascene::Arguments;
 using mayascene::Diagnostics;
 using mayascene::ExitStatus;
+using mayascene::Volume;
 
 ExitStatus run(int argc, const char* const* argv) {
   const Arguments arguments = mayascene::parseArguments(argc, argv, std::cout, std::cerr);
@@ -32,7 +33,9 @@ ExitStatus run(int argc, const char* const* argv) {
       (arguments.exported && arguments.exported->quiet);
   const bool colour =
       mayascene::colourAllowed(STDERR_FILENO) || (arguments.check && arguments.check->colourComplaints);
-  Diagnostics diagnostics(std::cerr, mayascene::Style(colour), quiet);
+  const bool verbose = arguments.import && arguments.import->verbose;
+  const Volume volume = quiet ? Volume::Quiet : verbose ? Volume::Verbose : Volume::Usual;
+  Diagnostics diagnostics(std::cerr, mayascene::Style(colour), volume);
   if (arguments.import) return mayascene::runImport(*arguments.import, diagnostics);
   if (arguments.bake) return mayascene::runBake(*arguments.bake, diagnostics);
   if (arguments.exported) return mayascene::runExport(*arguments.exported, diagnostics);
