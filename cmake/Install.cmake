@@ -1,5 +1,6 @@
-# What `cmake --install` puts where: tool, module, utility library, the headers of a host, examples and documents. All
-# of it finds its parts from where it lies, so that the folder can be moved as a whole.
+# What `cmake --install` puts where: tool, module, utility library, the headers of a host, examples and documents;
+# tools/mayascene adds manual pages and completions. All of it finds its parts from where it lies, so that the folder
+# can be moved as a whole.
 include(CMakePackageConfigHelpers)
 
 set(MAYASCENE_PACKAGE lib/cmake/mayascene)

@@ -192,7 +192,45 @@ TEST(Arguments, HelpAndVersionGoToStandardOutput) {
     EXPECT_EQ(result.err, "");
   }
   EXPECT_EQ(parsed({"--version"}).out, "mayascene 1.0.0\n");
-  EXPECT_NE(parsed({"import", "--help"}).out.find("--fail-at K[+]=CODE"), std::string::npos);
+}
+
+// What a line of the help begins with, after its blanks.
+bool hasLine(const std::string& help, const std::string& begin) {
+  return help.find("\n  " + begin) != std::string::npos;
+}
+
+TEST(Arguments, HelpBeginsWithTwoExamplesAndHelpAllHasTheDevelopersOptionsToo) {
+  for (const char* verb : {"import", "bake", "export", "check", "verify", "prefs"}) {
+    const std::string help = parsed({verb, "--help"}).out, all = parsed({verb, "--help-all"}).out;
+    const std::string example = std::string("  mayascene ") + verb;
+    EXPECT_EQ(help.find("Examples:\n" + example), 0u) << help;
+    const std::size_t second = help.find('\n' + example, 12);
+    EXPECT_EQ(help.find("\n\n"), help.find('\n', second + 1)) << help;
+    const bool imports = all.find("  --fail-at K[+]=CODE ...") != std::string::npos;
+    EXPECT_EQ(imports, std::string("import verify").find(verb) != std::string::npos);
+    EXPECT_EQ(help == all,
+              help.find("mayascene " + std::string(verb) + " --help-all\n") == std::string::npos);
+    for (const char* further :
+         {"--trace", "--fail ", "--throw-at", "--during", "--most-keys", "--permissive"})
+      EXPECT_FALSE(hasLine(help, further)) << verb << further;
+  }
+  for (const char* usual : {"--json FILE", "--bake", "--frames A:B", "-q,--quiet", "--linear-units N"})
+    EXPECT_TRUE(hasLine(parsed({"import", "--help"}).out, usual)) << usual;
+  EXPECT_TRUE(hasLine(parsed({"export", "--help-all"}).out, "--most-keys N"));
+  EXPECT_NE(parsed({"prefs", "set", "--help"}).out.find("Usage: mayascene prefs set "), std::string::npos);
+}
+
+TEST(Arguments, HelpShowsNothingOfWhatTheToolSaysToItself) {
+  const std::string all = parsed({"check", "--help-all"}).out;
+  EXPECT_EQ(all.find("--child"), std::string::npos);
+  EXPECT_EQ(all.find("--colour"), std::string::npos);
+}
+
+TEST(Arguments, CodesAreTakenInAnyCaseAndOthersAreWrongUsage) {
+  const Parsed result = parsed({"check", "--only", "ma0701", "--only", "MA0711", "a.ma"});
+  ASSERT_TRUE(result.arguments.check) << result.err;
+  EXPECT_EQ(result.arguments.check->options.only.size(), 2u);
+  expectWrongUsage({"check", "--only", "MA9999", "a.ma"}, "mayascene: --only: MA9999: no such code\n");
 }
 
 }  // namespace

@@ -201,22 +201,27 @@ TEST_F(ExitStatusTest, TheHighestOfSeveralBakesWins) {
   EXPECT_EQ(run({"import", "--bake", "-q", "missing.ma", "notes.txt", "good.ma"}).status, 3);
 }
 
-TEST_F(ExitStatusTest, TheHelpShowsTheTable) {
-  const std::string help = run({"--help"}).out;
-  EXPECT_NE(
-      help.find("Exit status:\n"
-                "  0  done, warnings included\n"
-                "  1  an error in a scene, a file that is not taken, something asked for that was not done, "
-                "memory or\n"
-                "     handles that the importer kept, or warnings with --strict\n"
-                "  2  wrong usage\n"
-                "  3  a file cannot be read\n"
-                "  4  the import module cannot be loaded\n"
-                "  5  an output cannot be written, or the memory is exhausted\n"
-                "With several scenes it is the highest of theirs. A run that a signal ends has 128 and the "
-                "number\nof the signal.\n"),
-      std::string::npos)
-      << help;
+TEST_F(ExitStatusTest, TheHelpOfEveryVerbShowsTheTable) {
+  for (const char* const verb : {"", "import", "bake", "export", "check", "verify", "prefs"}) {
+    std::vector<std::string> words = {verb, "--help"};
+    if (words.front().empty()) words.erase(words.begin());
+    const std::string help = run(words).out;
+    EXPECT_NE(
+        help.find(
+            "Exit status:\n"
+            "  0  done, warnings included\n"
+            "  1  an error in a scene, a file that is not taken, something asked for that was not done, "
+            "memory or\n"
+            "     handles that the importer kept, or warnings with --strict\n"
+            "  2  wrong usage\n"
+            "  3  a file cannot be read\n"
+            "  4  the import module cannot be loaded\n"
+            "  5  an output cannot be written, or the memory is exhausted\n"
+            "With several scenes it is the highest of theirs. A run that a signal ends has 128 and the "
+            "number of\nthe signal.\n"),
+        std::string::npos)
+        << help;
+  }
 }
 
 // Sanitizers need more address space than there is memory.

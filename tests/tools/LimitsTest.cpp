@@ -74,7 +74,7 @@ TEST_F(Limits, ANumberThatIsNoneIsWrongUsage) {
 
 TEST_F(Limits, TheHelpNamesTheDefaults) {
   const refhost::HostOptions defaults;
-  const std::string help = run({"import", "--help"}).out;
+  const std::string help = run({"import", "--help-all"}).out;
   EXPECT_THAT(help, HasSubstr("layers that the project takes (" + std::to_string(defaults.mostLayers) + ")"));
   EXPECT_THAT(help, HasSubstr("keys that the project takes (" + std::to_string(defaults.mostKeys) + ")"));
   EXPECT_THAT(help,

@@ -9,7 +9,9 @@
 #include <system_error>
 
 #include "tools/mayascene/BakeWords.h"
+#include "tools/mayascene/CommandRows.h"
 #include "tools/mayascene/ExportWords.h"
+#include "tools/mayascene/HelpText.h"
 #include "tools/mayascene/HostWords.h"
 #include "tools/mayascene/Interruption.h"
 #include "tools/mayascene/OutputFile.h"
@@ -21,30 +23,6 @@ namespace {
 
 constexpr double kLeastTimeout = 0.001;
 constexpr double kMostTimeout = 1e6;
-constexpr std::size_t kNameColumn = 36;
-
-// A text in lines of at most `width`, all but the first after `indent` blanks.
-std::string wrapped(std::string_view text, std::size_t indent, std::size_t width) {
-  std::string lines;
-  while (indent + text.size() > width) {
-    const std::size_t blank = text.rfind(' ', width - indent);
-    lines.append(text.substr(0, blank)).append("\n").append(indent, ' ');
-    text.remove_prefix(blank + 1);
-  }
-  return lines.append(text);
-}
-
-// The table of exit statuses, as help shows it.
-std::string exitStatuses() {
-  constexpr std::size_t kIndent = 5, kWidth = 100;
-  std::string text = "Exit status:\n";
-  for (const ExitMeaning& row : kExitMeanings) {
-    text += "  " + std::to_string(static_cast<int>(row.status)) + "  " +
-            wrapped(row.meaning, kIndent, kWidth) + '\n';
-  }
-  return text + "With several scenes it is the highest of theirs. A run that a signal ends has " +
-         std::to_string(kSignalStatus) + " and the number\nof the signal.";
-}
 
 // The library's own range takes "nan" for a number in it.
 CLI::Validator timeoutWord() {
@@ -57,17 +35,21 @@ CLI::Validator timeoutWord() {
   return CLI::Validator(check, "");
 }
 
-// "MA0701", in capitals or not.
-std::vector<diag::Code> codesOf(const std::vector<std::string>& words) {
-  std::vector<diag::Code> codes;
-  for (const std::string& word : words) {
-    const auto entry = std::find_if(diag::Table().begin(), diag::Table().end(), [&](const diag::Entry& one) {
-      return CLI::detail::to_lower(diag::NameOf(one.code)) == CLI::detail::to_lower(word);
-    });
-    if (entry == diag::Table().end()) throw CLI::ValidationError("--only", word + ": no such code");
-    codes.push_back(entry->code);
+// "MA0701", in capitals or not; null where there is none.
+const diag::Entry* entryOf(const std::string& word) {
+  for (const diag::Entry& entry : diag::Table()) {
+    if (CLI::detail::to_lower(diag::NameOf(entry.code)) == CLI::detail::to_lower(word)) return &entry;
   }
-  return codes;
+  return nullptr;
+}
+
+// One that says all codes by its description, as the library's own set of words does, and none by its
+// complaint.
+CLI::Validator codeWord() {
+  std::string all;
+  for (const diag::Entry& entry : diag::Table()) all += (all.empty() ? "{" : ",") + diag::NameOf(entry.code);
+  const auto check = [](const std::string& word) { return entryOf(word) ? "" : word + ": no such code"; };
+  return CLI::Validator(check, all + '}');
 }
 
 bool sameFile(const std::string& a, const std::string& b) {
@@ -150,11 +132,10 @@ struct CommandLine {
   CLI::App* setVerb = nullptr;
 
   CommandLine() {
-    app.get_formatter()->column_width(kNameColumn);
     app.set_version_flag("--version", std::string("mayascene ") + kVersion, "show the version and leave");
-    app.set_help_flag("-h,--help", "show this help and leave");
+    app.set_help_flag("-h,--help", "show the usual options and leave");
+    app.set_help_all_flag("--help-all", "show all options and leave");
     app.require_subcommand(1);
-    app.footer(exitStatuses());
     addImport();
     addBake();
     addExport();
@@ -212,7 +193,8 @@ struct CommandLine {
     checkVerb->add_flag("--strict", check.strict, "warnings make the exit status 1");
     checkVerb->add_option("--only", onlyCodes, "this code alone, such as MA0701")
         ->allow_extra_args(false)
-        ->option_text("CODE ...");
+        ->option_text("CODE ...")
+        ->check(codeWord());
     checkVerb->add_flag("--all", check.options.all, "show all diagnostics, not 20 of each code");
     checkVerb->add_flag("-v,--verbose", check.verbose, "a line for each scene on standard error");
     checkVerb->add_flag("-q,--quiet", check.quiet, "print nothing but errors");
@@ -242,7 +224,6 @@ struct CommandLine {
 
   void addPrefs() {
     prefsVerb = app.add_subcommand("prefs", "show the preference, or set it");
-    prefsVerb->footer("");
     addPreferences(prefsVerb, &prefs.preferences);
     setVerb = prefsVerb->add_subcommand("set", "set a preference");
     setVerb->fallthrough();
@@ -264,6 +245,17 @@ struct CommandLine {
       throw CLI::ValidationError(given.front(), "goes with --bake");
     }
     if (importBakes) translateBakeWords(importBakeWords, &import.bake.emplace());
+  }
+
+  // The command that was typed, as far as its verbs go.
+  CommandTable named() const {
+    const CLI::App* verb = &app;
+    std::string command = app.get_name();
+    while (!verb->get_subcommands().empty()) {
+      verb = verb->get_subcommands().back();
+      command += ' ' + verb->get_name();
+    }
+    return tableOf(*verb, command);
   }
 
   Arguments parse(std::vector<std::string> words) {
@@ -289,7 +281,7 @@ struct CommandLine {
                    exported.scenes);
       arguments.exported = exported;
     } else if (checkVerb->parsed()) {
-      check.options.only = codesOf(onlyCodes);
+      for (const std::string& word : onlyCodes) check.options.only.push_back(entryOf(word)->code);
       checkOutputs({{"--json", check.json}}, check.scenes);
       arguments.check = check;
     } else if (verifyVerb->parsed()) {
@@ -306,10 +298,21 @@ struct CommandLine {
 
 }  // namespace
 
+CommandTable commandTable() {
+  const CommandLine line;
+  return tableOf(line.app, line.app.get_name());
+}
+
 Arguments parseArguments(int argc, const char* const* argv, std::ostream& out, std::ostream& err) {
   CommandLine line;
   try {
     return line.parse(wordsOf(argc, argv));
+  } catch (const CLI::CallForHelp&) {
+    out << helpText(line.named(), false);
+    return {};
+  } catch (const CLI::CallForAllHelp&) {
+    out << helpText(line.named(), true);
+    return {};
   } catch (const CLI::Success& shown) {
     line.app.exit(shown, out, err);
     return {};

@@ -29,13 +29,18 @@ inline constexpr ExitMeaning kExitMeanings[] = {
     {ExitStatus::Done, "done, warnings included"},
     {ExitStatus::Refused,
      "an error in a scene, a file that is not taken, something asked for that was not done, memory or "
-     "handles "
-     "that the importer kept, or warnings with --strict"},
+     "handles that the importer kept, or warnings with --strict"},
     {ExitStatus::WrongUsage, "wrong usage"},
     {ExitStatus::Unreadable, "a file cannot be read"},
     {ExitStatus::NoModule, "the import module cannot be loaded"},
     {ExitStatus::CannotWrite, "an output cannot be written, or the memory is exhausted"},
 };
+
+// What the table does not show.
+inline constexpr std::string_view kExitRules =
+    "With several scenes it is the highest of theirs. A run that a signal ends has 128 and the number of the "
+    "signal.";
+static_assert(kSignalStatus == 128);
 
 inline ExitStatus worse(ExitStatus a, ExitStatus b) { return std::max(a, b); }
 

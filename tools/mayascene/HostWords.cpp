@@ -7,6 +7,7 @@
 #include <utility>
 
 #include "refhost/Rehearsal.h"
+#include "tools/mayascene/CommandTable.h"
 
 namespace mayascene {
 namespace {
@@ -51,16 +52,21 @@ void addUnits(CLI::App* verb, HostArguments* host) {
 
 void addHostOptions(CLI::App* verb, HostArguments* host, HostWords* words) {
   addUnits(verb, host);
+  const std::string own(kHostGroup), group(kRehearsalGroup);
   verb->add_option("--translations", host->translations, "the host's translations, lines of KEY=TEXT")
-      ->option_text("FILE");
+      ->option_text("FILE")
+      ->group(own);
   verb->add_option("--module", host->module, "the import module, instead of the one beside the tool")
-      ->option_text("FILE");
+      ->option_text("FILE")
+      ->group(own);
   verb->add_option("--trace", host->trace, "write every call of the importer; - is standard output")
-      ->option_text("FILE");
-  verb->add_option("--plugin-id", host->pluginId, "the plug-in id that the host gives (1)")->option_text("N");
-  verb->add_flag("--permissive", host->permissive, "record any number instead of refusing it");
+      ->option_text("FILE")
+      ->group(own);
+  verb->add_option("--plugin-id", host->pluginId, "the plug-in id that the host gives (1)")
+      ->option_text("N")
+      ->group(own);
+  verb->add_flag("--permissive", host->permissive, "record any number instead of refusing it")->group(own);
 
-  constexpr const char* group = "Rehearsing failures";
   addRepeated(verb, "--fail", &words->fail, "OPERATION:NTH=CODE",
               "the NTH call (0: each) of the operation fails with CODE")
       ->group(group);
@@ -86,7 +92,7 @@ void addHostOptions(CLI::App* verb, HostArguments* host, HostWords* words) {
 
 // The defaults that the texts name are those of refhost::HostOptions.
 void addLimits(CLI::App* verb, HostArguments* host) {
-  constexpr const char* group = "Limits";
+  const std::string group(kLimitsGroup);
   verb->add_option("--most-layers", host->mostLayers, "layers that the project takes (2000000)")
       ->option_text("N")
       ->check(CLI::NonNegativeNumber)
