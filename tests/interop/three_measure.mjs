@@ -25,7 +25,13 @@ async function loadUsd(url) {
   return { root, clips: root.animations, named };
 }
 
+// A mixer plays no times below 0: there all are moved up.
 function framesOf(loaded, frames) {
+  const up = Math.max(0, -frames[0].time);
+  for (const clip of loaded.clips) {
+    for (const track of clip.tracks) track.shift(up);
+    clip.resetDuration();
+  }
   const mixer = new AnimationMixer(loaded.root);
   const actions = loaded.clips.map((clip) => mixer.clipAction(clip));
   const measured = {};
@@ -36,7 +42,7 @@ function framesOf(loaded, frames) {
       action.clampWhenFinished = true;
       action.play();
     }
-    mixer.setTime(time);
+    mixer.setTime(time + up);
     loaded.root.updateMatrixWorld(true);
     const layers = {};
     for (const [name, object] of loaded.named) {
