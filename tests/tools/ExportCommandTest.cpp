@@ -130,6 +130,18 @@ TEST_F(ExportCommandTest, WhatDoesNotGoTogetherIsWrongUsage) {
   EXPECT_THAT(files(), ElementsAre("shot.ma"));
 }
 
+TEST_F(ExportCommandTest, EveryFormatTakesTheAxesOfTheScene) {
+  write("shot.ma", rig("cm"));
+  for (const std::string format : {"gltf", "glb", "usda", "chan", "csv"}) {
+    const auto plain = run({"export", "shot.ma", "-o", "plain." + format, "--quiet"});
+    const auto said = run({"export", "shot.ma", "-o", "said." + format, "--axes", "scene", "--quiet"});
+    EXPECT_EQ(plain.status, 0) << plain.err;
+    EXPECT_EQ(said.status, 0) << said.err;
+    if (format == "gltf") continue;  // it names the file of its data
+    EXPECT_EQ(read("plain." + format), read("said." + format));
+  }
+}
+
 TEST_F(ExportCommandTest, AFolderIsCalledAsItLikesAndAFormatsOwnEndingInCapitalsToo) {
   write("shot.ma", rig("cm"));
   std::filesystem::create_directories(path("takes.ma"));

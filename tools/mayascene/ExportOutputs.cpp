@@ -19,7 +19,7 @@ std::ostream* ExportFiles::Main() {
 
 std::ostream* ExportFiles::Beside(std::string_view part, std::string_view suffix, std::string* name) {
   if (place_ == kStandardOutput) {
-    failure_ = "it is written as more than one file, which standard output cannot take";
+    failure_ = "standard output cannot take the several files that this scene is written as";
     return nullptr;
   }
   const fs::path folder = fs::path(place_).parent_path();

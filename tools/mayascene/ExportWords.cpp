@@ -67,8 +67,8 @@ void checkFormat(const ExportArguments& arguments) {
                                arguments.output + " ends as none of the formats does; name one with -f");
   }
   const std::string name(format->name);
-  if (format->ownAxes && arguments.axes) {
-    throw CLI::ValidationError("--axes", name + " has axes of its own");
+  if (format->ownAxes && arguments.axes == interchange::Axes::Host) {
+    throw CLI::ValidationError("--axes", name + " has axes of its own, which are those of the scene");
   }
   if (!format->listsKeys && arguments.keys) {
     throw CLI::ValidationError("--keys", name + " has values at frames; a list of keys is for csv");
