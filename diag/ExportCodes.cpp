@@ -143,7 +143,9 @@ constexpr Entry kExportCodes[] = {
      .severity = Severity::Note,
      .symbol = "ExportPartLost",
      .sentence = "{0}: {1} is not written: the format has no place for it",
-     .meaning = "What is written is right without it, for square pixels and a film that is not shifted.",
+     .meaning =
+         "What is written is right without it: for square pixels, a film that is not shifted, and a camera "
+         "whose scale takes no part in its picture.",
      .example = "",
      .help = "Set it by hand where the file is read, or take a format that holds it."},
     {.code = Code::ExportFramesRounded,

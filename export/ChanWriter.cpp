@@ -65,6 +65,7 @@ void SayWhatIsLost(const Composition& composition, diag::Collector* diagnostics)
   const auto nulls = std::count_if(composition.layers.begin(), composition.layers.end(),
                                    [](const Layer& layer) { return layer.kind == LayerKind::Null; });
   if (nulls != 0) diagnostics->Report(Code::ExportNullsLeftOut, {}, {std::to_string(nulls)});
+  ReportLostScales(composition, diagnostics);
   ReportLostExtras(composition, diagnostics);
   if (composition.firstFrame != std::floor(composition.firstFrame)) {
     diagnostics->Report(Code::ExportFramesRounded, {});

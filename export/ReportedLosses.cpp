@@ -49,6 +49,16 @@ void ReportCommonLosses(const Composition& composition, std::string_view format,
   }
 }
 
+void ReportLostScales(const Composition& composition, diag::Collector* diagnostics) {
+  UnevenScale scale(composition);
+  for (std::size_t index = 0; index < composition.layers.size(); ++index) {
+    const Layer& layer = composition.layers[index];
+    if (layer.kind == LayerKind::Camera && scale.IsOver(index)) {
+      diagnostics->Report(diag::Code::ExportPartLost, {}, {layer.name, "its uneven scale"});
+    }
+  }
+}
+
 void ReportLostExtras(const Composition& composition, diag::Collector* diagnostics) {
   if (composition.pixelAspect != 1.0) {
     diagnostics->Report(diag::Code::ExportPartLost, {}, {composition.name, "the pixel aspect"});

@@ -13,6 +13,9 @@ namespace interchange {
 void ReportCommonLosses(const Composition& composition, std::string_view format,
                         diag::Collector* diagnostics);
 
+// Cameras under uneven scale, for a format that has no place for scale.
+void ReportLostScales(const Composition& composition, diag::Collector* diagnostics);
+
 // Pixel aspect, film offsets and squeezes, for a format that has a place for none of them.
 void ReportLostExtras(const Composition& composition, diag::Collector* diagnostics);
 

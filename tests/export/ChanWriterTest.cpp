@@ -80,7 +80,8 @@ TEST(ChanWriter, ALineForEachFrameInTheWorldWithoutScale) {
   for (std::size_t i = 0; i < expected.size(); ++i) EXPECT_NEAR((*rows)[1][i], expected[i], 1e-12) << i;
   EXPECT_EQ(diagnostics.CountOf(Code::ExportRotationOrder), 1u);
   EXPECT_EQ(diagnostics.CountOf(Code::ExportNullsLeftOut), 1u);
-  EXPECT_EQ(diagnostics.count(), 2u);
+  EXPECT_EQ(diagnostics.CountOf(Code::ExportPartLost), 1u);
+  EXPECT_EQ(diagnostics.count(), 3u);
 }
 
 TEST(ChanWriter, AnglesGoOnAcrossHalfATurn) {
