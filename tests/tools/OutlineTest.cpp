@@ -2,6 +2,7 @@
 
 #include <gmock/gmock.h>
 
+#include <algorithm>
 #include <cstdint>
 #include <memory>
 #include <sstream>
@@ -44,12 +45,12 @@ TEST(Outline, InShortKeysOfOneValueAreStillAndTheWidestSpanOfFramesIsShown) {
   refhost::Layer& camera = scene.layers[0];
   camera.filmDirection = refhost::kFilmNeverSet;
   const auto animate = [&](std::int32_t id, std::vector<T_Time> times, std::vector<double> values) {
-    for (refhost::Stream& stream : camera.streams) {
-      if (stream.id != id) continue;
-      stream.keys = std::make_unique<refhost::KeyColumns>();
-      stream.keys->times = refhost::KeyTimes(std::move(times));
-      stream.keys->values = std::move(values);
-    }
+    const auto stream = std::find_if(camera.streams.begin(), camera.streams.end(),
+                                     [id](const refhost::Stream& one) { return one.id == id; });
+    ASSERT_NE(stream, camera.streams.end());
+    stream->keys = std::make_unique<refhost::KeyColumns>();
+    stream->keys->times = refhost::KeyTimes(std::move(times));
+    stream->keys->values = std::move(values);
   };
   animate(HOST_STREAM_ZOOM, {{3000, 24000}, {4000, 24000}, {5000, 24000}}, {700, 800, 640});
   animate(HOST_STREAM_ROTATION_X, {{1, 24}, {7, 24}}, {1, 2});

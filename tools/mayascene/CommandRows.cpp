@@ -79,35 +79,55 @@ std::string usageOf(const CommandTable& table) {
   return usage + (alone ? " [VERB]" : " VERB");
 }
 
+std::vector<const CLI::App*> verbsOf(const CLI::App& app) {
+  return app.get_subcommands([](const CLI::App*) { return true; });
+}
+
 bool isFurther(std::string_view title) {
   return title == kHostGroup || title == kRehearsalGroup || title == kLimitsGroup;
 }
 
-}  // namespace
-
-CommandTable tableOf(const CLI::App& app, const std::string& command) {
-  CommandTable table;
-  table.command = command;
-  table.sentence = app.get_description();
-  table.notes = app.get_footer();
+// All but the rows of the verbs below, of which only the commands are set.
+void fill(const CLI::App& app, CommandTable* table) {
+  table->sentence = app.get_description();
+  table->notes = app.get_footer();
   for (const Examples& one : kExamples) {
-    if (one.command == command) table.examples.assign(std::begin(one.two), std::end(one.two));
+    if (one.command == table->command) table->examples.assign(std::begin(one.two), std::end(one.two));
   }
   for (const std::string& title : app.get_groups()) {
     OptionGroup group{title, isFurther(title), {}};
     for (const CLI::Option* option : app.get_options()) {
       if (option->get_group() != title || title.empty()) continue;
-      (option->get_positional() ? table.positionals : group.options).push_back(rowOf(*option));
+      (option->get_positional() ? table->positionals : group.options).push_back(rowOf(*option));
     }
-    if (!group.options.empty()) table.groups.push_back(std::move(group));
+    if (!group.options.empty()) table->groups.push_back(std::move(group));
   }
-  for (const CLI::App* verb : app.get_subcommands([](const CLI::App*) { return true; })) {
-    table.verbs.push_back(tableOf(*verb, command + ' ' + verb->get_name()));
-  }
-  std::stable_partition(table.groups.begin(), table.groups.end(),
+  std::stable_partition(table->groups.begin(), table->groups.end(),
                         [](const OptionGroup& group) { return !group.further; });
-  table.usage = usageOf(table);
-  return table;
+  for (const CLI::App* verb : verbsOf(app)) {
+    table->verbs.emplace_back().command = table->command + ' ' + verb->get_name();
+  }
+  table->usage = usageOf(*table);
+}
+
+}  // namespace
+
+CommandTable tableOf(const CLI::App& app, const std::string& command) {
+  struct Pending {
+    const CLI::App* app;
+    CommandTable* table;
+  };
+  CommandTable whole;
+  whole.command = command;
+  std::vector<Pending> pending = {{&app, &whole}};
+  while (!pending.empty()) {
+    const Pending next = pending.back();
+    pending.pop_back();
+    fill(*next.app, next.table);
+    const std::vector<const CLI::App*> verbs = verbsOf(*next.app);
+    for (std::size_t i = 0; i < verbs.size(); ++i) pending.push_back({verbs[i], &next.table->verbs[i]});
+  }
+  return whole;
 }
 
 }  // namespace mayascene

@@ -1,6 +1,7 @@
 #include "tools/mayascene/CommandTable.h"
 
 #include <algorithm>
+#include <cstddef>
 
 namespace mayascene {
 
@@ -12,8 +13,10 @@ std::string CommandTable::verb() const { return command.substr(command.rfind(' '
 
 std::vector<const CommandTable*> allTables(const CommandTable& table) {
   std::vector<const CommandTable*> all = {&table};
-  for (const CommandTable& verb : table.verbs) {
-    for (const CommandTable* one : allTables(verb)) all.push_back(one);
+  for (std::size_t at = 0; at < all.size(); ++at) {
+    const std::vector<CommandTable>& verbs = all[at]->verbs;
+    auto place = all.begin() + static_cast<std::ptrdiff_t>(at) + 1;
+    for (const CommandTable& verb : verbs) place = all.insert(place, &verb) + 1;
   }
   return all;
 }
