@@ -5,7 +5,7 @@
 namespace mayascene {
 namespace {
 
-std::string quoted(std::string_view text) {
+std::string inQuotes(std::string_view text) {
   std::string out = "'";
   for (const char c : text) {
     if (c == '\'' || c == '\\') out += '\\';
@@ -32,7 +32,7 @@ std::string conditionOf(const CommandTable& table) {
   std::string below;
   for (const CommandTable& verb : table.verbs) below += ' ' + verb.verb();
   if (!below.empty()) add("not __fish_seen_subcommand_from" + below);
-  return quoted(text);
+  return inQuotes(text);
 }
 
 std::string optionLine(const std::string& begin, const OptionRow& row) {
@@ -41,8 +41,8 @@ std::string optionLine(const std::string& begin, const OptionRow& row) {
     line += name.starts_with("--") ? " -l " + name.substr(2) : " -s " + name.substr(1);
   }
   if (!row.form.empty()) line += row.isFile() ? " -r -F" : " -x";
-  if (!row.words.empty()) line += " -a " + quoted(joined(row.words));
-  return line + " -d " + quoted(row.text) + '\n';
+  if (!row.words.empty()) line += " -a " + inQuotes(joined(row.words));
+  return line + " -d " + inQuotes(row.text) + '\n';
 }
 
 }  // namespace
@@ -52,14 +52,14 @@ std::string fishCompletion(const CommandTable& tool) {
   for (const CommandTable* table : allTables(tool)) {
     const std::string begin = "complete -c mayascene -n " + conditionOf(*table);
     for (const CommandTable& verb : table->verbs) {
-      text += begin + " -a " + verb.verb() + " -d " + quoted(verb.sentence) + '\n';
+      text += begin + " -a " + verb.verb() + " -d " + inQuotes(verb.sentence) + '\n';
     }
     for (const OptionGroup& group : table->groups) {
       for (const OptionRow& row : group.options) text += optionLine(begin, row);
     }
     for (const OptionRow& row : table->positionals) {
       if (row.isFile()) text += begin + " -k -a '(__fish_complete_suffix .ma)'\n";
-      if (!row.words.empty()) text += begin + " -a " + quoted(joined(row.words)) + '\n';
+      if (!row.words.empty()) text += begin + " -a " + inQuotes(joined(row.words)) + '\n';
     }
   }
   return text;
