@@ -16,7 +16,7 @@ ALLOWED_IN_RUNNER = ("plugin/Entry.h", "plugin/Globals.h")
 
 # What works out the prediction meets the host's options and nothing that the host does.
 OPTIONS = "refhost/Host.h"
-RUNS_THE_HOST = ("SceneRun.cpp", "SceneRun.h", "SeededScenesTest.cpp")
+RUNS_THE_HOST = ("SceneRun.cpp", "SceneRun.h", "FailureSweepTest.cpp", "SeededScenesTest.cpp")
 
 
 def included(path):

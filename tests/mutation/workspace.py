@@ -22,9 +22,10 @@ OWN_TESTS = {
 }
 WHOLE_IMPORTS = ("golden_trace_test", "conversion_test", "second_reader_test", "plugin_entry_test")
 EVERYTHING = ("plugin_services_test", "plugin_module_test", "maya_test", "comp_test", "hostutil_tests", "scan_tests",
-              "refhost_test", "example_scenes_test", "tool_command_tests", "docs_peculiarities_test", "comp_failure_test")
+              "refhost_test", "example_scenes_test", "tool_command_tests", "docs_peculiarities_test", "comp_failure_test",
+              "failure_sweep_test")
 OTHER_TARGETS = ("number-campaign", "fuzz_targets", "mayascene", "MayaImport")
-OTHER_TESTS = r"^(scan\.number_campaign|TracesAgreeWithTheIndependentModel|fuzz\.|scaling\.)"
+OTHER_TESTS = r"^(scan\.number_campaign|fuzz\.|scaling\.)"
 
 # What takes half a minute is run when all else has passed.
 SLOW_TESTS = "*TwoGigabytes*:SkipTextTest.RandomHostileTextsAreSeenAlike:*EveryByteReplaced*:*CutAtEveryByte*"

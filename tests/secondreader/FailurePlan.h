@@ -28,10 +28,7 @@ class FailurePlan {
 
   // In the callback that runs or ran last.
   std::int64_t suiteCalls() const { return calls_; }
-  std::int64_t count(const std::string& name) const {
-    const auto found = counts_.find(name);
-    return found == counts_.end() ? 0 : found->second;
-  }
+  const std::map<std::string, std::int64_t>& counts() const { return counts_; }
 
  private:
   const refhost::HostOptions& options_;

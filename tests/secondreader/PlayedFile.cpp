@@ -38,7 +38,7 @@ HostError PlayedFile::size(std::size_t* size) {
 
 HostError PlayedFile::dispose() {
   HostError code = HOST_ERR_NONE;
-  host_->serviceFails("FileDispose", &code);
+  if (!host_->serviceFails("FileDispose", &code)) --host_->files;
   return code;
 }
 

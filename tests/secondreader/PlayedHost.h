@@ -5,6 +5,8 @@
 #include <array>
 #include <cstdint>
 #include <exception>
+#include <map>
+#include <set>
 #include <string>
 #include <utility>
 #include <vector>
@@ -26,8 +28,9 @@ struct OpenBatch {
   Handle number = 0;
   Handle layer = 0;
   std::int32_t stream = 0;
-  std::int32_t keys = 0;
-  bool excused = false;  // the ledger does not report it: its end was made to fail
+  std::vector<T_Time> keys = {};
+  std::set<std::int32_t> valued = {};  // the keys that have a value
+  bool excused = false;                // the ledger does not report it: its end was made to fail
 };
 
 struct HeldStream {
@@ -39,6 +42,12 @@ struct HeldStream {
 
 struct PlayedLayer {
   bool camera = false;
+};
+
+struct Earlier {
+  bool operator()(const T_Time& a, const T_Time& b) const {
+    return std::int64_t{a.value} * b.scale < std::int64_t{b.value} * a.scale;
+  }
 };
 
 class PlayedHost {
@@ -101,6 +110,16 @@ class PlayedHost {
   std::int32_t linearUnits = 0;
   bool importerUsable = false;
   bool deathHook = false;
+
+  std::string importerName;
+  std::size_t extensions = 0;
+  std::map<std::pair<Handle, std::int32_t>, std::set<T_Time, Earlier>>
+      keys;  // of the project, by layer and stream
+
+  // What a failure of its own end left over; the ledger lists it as kept by design.
+  std::set<std::size_t> keptSuites;
+  std::size_t keptMemory = 0;
+  std::size_t files = 0;  // that are there
 
   Handle items = 0;
   Handle comps = 0;

@@ -23,7 +23,19 @@ struct Results {
   refhost::CallbackResult verify;
   std::vector<refhost::CallbackResult> imports;
   refhost::CallbackResult death;
+  Made made;
 };
+
+Made madeBy(const refhost::Host& host) {
+  const refhost::Project& project = host.project();
+  Made made{host.importerName(), host.importerExtensions().size(), project.compositions().size(),
+            project.layers().size()};
+  for (const refhost::Layer& layer : project.layers()) {
+    for (const refhost::Stream& stream : layer.streams) made.keys += stream.keyCount();
+  }
+  made.linearUnits = G_use_linear_unitsL;
+  return made;
+}
 
 Results runHost(refhost::HostOptions options, const std::string& path, int imports, std::ostream& trace) {
   options.trace = &trace;
@@ -34,7 +46,9 @@ Results runHost(refhost::HostOptions options, const std::string& path, int impor
     host.load(&MayaImportEntry, &results.entry);
     results.verify = host.verifyScene(path);
     for (int i = 0; i < imports; ++i) results.imports.push_back(host.importScene(path));
+    results.made = madeBy(host);
     results.death = host.unload();
+    results.made.stringTable = Maya_Import_G_zref != nullptr;
   }
   // What a death hook that could not be registered left.
   DeathHook(0);
@@ -62,6 +76,10 @@ void compare(std::ostringstream& words, const char* callback, const PredictedCal
   for (const std::string& refusal : result.refusals) {
     if (refusal == "an exception left the plug-in") words << callback << ": " << refusal << '\n';
   }
+  if (predicted.leftovers != result.leftovers.size()) {
+    words << callback << ": " << predicted.leftovers << " leftovers predicted, found "
+          << result.leftovers.size() << '\n';
+  }
   std::vector<std::string> leftBehind;
   for (const refhost::Leftover& leftover : result.leftovers) {
     if (leftover.keptByDesign) continue;
@@ -71,6 +89,16 @@ void compare(std::ostringstream& words, const char* callback, const PredictedCal
   for (const std::string& held : predicted.leftBehind)
     words << callback << ": predicted left: " << held << '\n';
   for (const std::string& held : leftBehind) words << callback << ": left behind: " << held << '\n';
+}
+
+void compareMade(std::ostringstream& words, const Made& predicted, const Made& made) {
+  if (predicted == made) return;
+  for (const auto& [what, each] : {std::pair{"predicted", &predicted}, std::pair{"found", &made}}) {
+    words << what << ": importer \"" << each->importerName << "\" with " << each->extensions
+          << " extensions, " << each->compositions << " compositions, " << each->layers << " layers, "
+          << each->keys << " keys, units " << each->linearUnits
+          << (each->stringTable ? ", a table of strings" : "") << '\n';
+  }
 }
 
 std::string describe(const refhost::HostOptions& options) {
@@ -102,6 +130,9 @@ void compareReturn(std::ostringstream& words, const Prediction& prediction,
     compare(words, "import", prediction.imports[i], results.imports[i]);
   }
   compare(words, "death", prediction.death, results.death);
+  Made made = results.made;
+  if (options.permissive) made.keys = prediction.made.keys;  // times may be no numbers
+  compareMade(words, prediction.made, made);
 }
 
 void compareEnd(std::ostringstream& words, const Prediction& prediction, const refhost::HostOptions& options,
@@ -155,9 +186,10 @@ SeedReport runSeed(SceneRunner& runner, std::uint64_t seed, bool failures) {
     }
     return run.prediction.imports.front();
   };
-  const PredictedCallback plain = runOnce();
+  PredictedCallback plain = runOnce();
   if (!failures || report.disagreement) return report;
-  planFailures(seed ^ kFailureSeeds, {plain.suiteCalls, plain.numberScans}, &scene.options);
+  planFailures(seed ^ kFailureSeeds, {plain.suiteCalls, static_cast<int>(plain.counts["NumberScan"])},
+               &scene.options);
   runOnce();
   return report;
 }

@@ -98,13 +98,18 @@ PredictedCallback Callbacks::run(refhost::Callback callback, Work work) {
                            canImport_,
                            std::move(host_.messages),
                            std::move(leftBehind),
+                           host_.heldStreams.size() + host_.openBatches.size() +
+                               (host_.heldMemory != 0 ? 1 : 0) + host_.keptSuites.size() + host_.keptMemory +
+                               host_.files,
                            static_cast<int>(host_.plan.suiteCalls()),
-                           static_cast<int>(host_.plan.count("NumberScan"))};
+                           host_.plan.counts()};
   host_.messages.clear();
   host_.silent = false;
   host_.heldStreams.clear();
   host_.openBatches.clear();
   host_.heldMemory = 0;
+  host_.keptSuites.clear();
+  host_.keptMemory = host_.files = 0;
   canImport_ = false;
   return result;
 }
@@ -124,6 +129,15 @@ Prediction Callbacks::predict(int imports) {
   } catch (const ProcessEnds&) {
     prediction.processEnds = true;
   }
+  std::size_t keys = 0;
+  for (const auto& [stream, times] : host_.keys) keys += times.size();
+  prediction.made = {host_.importerName,
+                     host_.extensions,
+                     static_cast<std::size_t>(host_.comps),
+                     host_.layers.size(),
+                     keys,
+                     host_.linearUnits,
+                     host_.stringTable && !host_.deathHook};
   prediction.trace = std::move(host_.lines);
   return prediction;
 }
@@ -153,6 +167,7 @@ std::optional<PlayedFile> Callbacks::makeFile() {
   check(code);
   if (noFile) return std::nullopt;
   check(noText ? HOST_ERR_UTILITY_NULL : HOST_ERR_NONE);
+  ++host_.files;
   return PlayedFile(host_, bytes_);
 }
 

@@ -2,6 +2,8 @@
 // host.
 #pragma once
 
+#include <cstdint>
+#include <map>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -17,8 +19,22 @@ struct PredictedCallback {
   bool canImport = false;
   std::vector<std::string> messages;
   std::vector<std::string> leftBehind;  // by handle; empty but for an exception of an unknown type
+  std::size_t leftovers = 0;            // on the ledger, with those that are kept by design
   int suiteCalls = 0;
-  int numberScans = 0;  // counted only in the callback that the rehearsal is for
+  std::map<std::string, std::int64_t> counts;  // by call and service; only in the callback of the rehearsal
+};
+
+// What is there after all callbacks.
+struct Made {
+  std::string importerName;
+  std::size_t extensions = 0;
+  std::size_t compositions = 0;
+  std::size_t layers = 0;
+  std::size_t keys = 0;
+  std::int32_t linearUnits = 0;
+  bool stringTable = false;  // after the death hook
+
+  bool operator==(const Made&) const = default;
 };
 
 // The callbacks in their order: the entry, the header test, the imports, the death hook.
@@ -28,6 +44,7 @@ struct Prediction {
   PredictedCallback verify;
   std::vector<PredictedCallback> imports;
   PredictedCallback death;
+  Made made;
   bool processEnds = false;  // in one of them; then nothing else is predicted
 };
 

@@ -38,7 +38,10 @@ SuiteName SuiteUser::use(Suite suite) {
 void SuiteUser::releaseAll() {
   try {
     for (std::size_t suite = 0; suite < kSuiteCount; ++suite) {
-      if (held_[suite]) PlayedCall(host_, "ReleaseSuiteByName", kNames[suite]).finish();
+      if (!held_[suite]) continue;
+      PlayedCall call(host_, "ReleaseSuiteByName", kNames[suite]);
+      if (!call.goesOn()) host_.keptSuites.insert(suite);
+      call.finish();
     }
   } catch (const std::exception&) {
     throw ProcessEnds{};
@@ -78,6 +81,7 @@ HostError SuiteUser::newMemHandle(std::int64_t size, Handle* handle) {
 
 HostError SuiteUser::freeMemHandle(Handle handle) {
   PlayedCall call(host_, "FreeMemHandle", use(kMemory1));
+  if (!call.goesOn()) ++host_.keptMemory;
   host_.heldMemory = 0;  // nor is it reported where the call was made to fail
   call.line().handle("handle", "mem", handle);
   return call.finish();
@@ -128,7 +132,10 @@ HostError SuiteUser::registerDeathHook() {
 
 HostError SuiteUser::registerImporterName(const std::string& name, Handle* importer) {
   PlayedCall call(host_, "RegisterImporterName", use(kFileImportManager3));
-  if (call.goesOn() && call.demand(!name.empty(), HOST_ERR_REGISTRATION)) *importer = 1;
+  if (call.goesOn() && call.demand(!name.empty(), HOST_ERR_REGISTRATION)) {
+    *importer = 1;
+    host_.importerName = name;
+  }
   call.line().text("name", name);
   call.handed("importer", "importer", *importer);
   return call.finish();
@@ -136,7 +143,7 @@ HostError SuiteUser::registerImporterName(const std::string& name, Handle* impor
 
 HostError SuiteUser::registerImporterTypes(Handle importer) {
   PlayedCall call(host_, "RegisterImporterTypes", use(kFileImportManager3));
-  if (call.goesOn()) call.demand(importer != 0, HOST_ERR_BAD_HANDLE);
+  if (call.goesOn() && call.demand(importer != 0, HOST_ERR_BAD_HANDLE)) host_.extensions = 1;
   call.line().handle("importer", "importer", importer);
   call.line().plain("types", R"([{"type":"MAYA","creator":"MaYa"}])").plain("extensions", R"([".ma"])");
   return call.finish();

@@ -1,6 +1,7 @@
 // Compositions, layers and the camera, as far as the played host looks at them.
 #include <cmath>
 
+#include "hostapi/LayerStreams.h"
 #include "tests/secondreader/SuiteUser.h"
 
 namespace secondreader {
@@ -50,6 +51,9 @@ HostError SuiteUser::newCameraLayer(const std::string& name, Handle comp, Handle
   if (call.goesOn() && call.demand(comp != 0, HOST_ERR_BAD_HANDLE)) {
     host_.layers.push_back({true});
     *layer = static_cast<Handle>(host_.layers.size());
+    for (std::int32_t key = 0; key < host_.options.zoomKeys; ++key) {
+      host_.keys[{*layer, HOST_STREAM_ZOOM}].insert({key, 1});
+    }
   }
   call.line().text("name", name).handle("comp", "comp", comp).numbers("center", {kAnywhere, kAnywhere});
   call.handed("layer", "layer", *layer);

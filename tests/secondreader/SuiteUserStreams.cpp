@@ -101,7 +101,7 @@ HostError SuiteUser::beginKeyframeBatch(Handle stream, Handle* batch) {
         call.demand(std::none_of(host_.openBatches.begin(), host_.openBatches.end(), isOnIt),
                     HOST_ERR_BATCH_OPEN)) {
       *batch = ++host_.batches;
-      host_.openBatches.push_back({*batch, held->layer, held->stream, 0});
+      host_.openBatches.push_back({*batch, held->layer, held->stream});
     }
   }
   call.line().handle("stream", "stream", stream);
@@ -116,7 +116,8 @@ HostError SuiteUser::addBatchKeyframe(Handle batch, T_Time time, std::int32_t* i
     OpenBatch* open = find(host_.openBatches, batch);
     if (call.demand(open != nullptr, HOST_ERR_BAD_HANDLE) &&
         call.demand(time.scale != 0 || host_.options.permissive, HOST_ERR_BAD_TIME)) {
-      *index = open->keys++;
+      *index = static_cast<std::int32_t>(open->keys.size());
+      open->keys.push_back(time);
     }
   }
   call.line().handle("batch", "batch", batch).integer("timeMode", 0);
@@ -129,11 +130,12 @@ HostError SuiteUser::setBatchKeyframeValue(Handle batch, std::int32_t index, Han
                                            const Value& value) {
   PlayedCall call(host_, "SetBatchKeyframeValue", use(kKeyframe4));
   if (call.goesOn()) {
-    const OpenBatch* open = find(host_.openBatches, batch);
+    OpenBatch* open = find(host_.openBatches, batch);
     const HeldStream* held = find(host_.heldStreams, stream);
     if (call.demand(open != nullptr && held != nullptr, HOST_ERR_BAD_HANDLE) &&
-        call.demand(index < open->keys, HOST_ERR_BATCH_KEY) && !host_.options.permissive) {
-      call.demand(areFinite(value, open->stream), HOST_ERR_BAD_VALUE);
+        call.demand(static_cast<std::size_t>(index) < open->keys.size(), HOST_ERR_BATCH_KEY) &&
+        call.demand(host_.options.permissive || areFinite(value, open->stream), HOST_ERR_BAD_VALUE)) {
+      open->valued.insert(index);
     }
   }
   call.line().handle("batch", "batch", batch).integer("index", index).handle("stream", "stream", stream);
@@ -144,12 +146,14 @@ HostError SuiteUser::setBatchKeyframeValue(Handle batch, std::int32_t index, Han
 
 HostError SuiteUser::endKeyframeBatch(Handle batch) {
   PlayedCall call(host_, "EndKeyframeBatch", use(kKeyframe3));
-  if (call.goesOn()) {
-    const auto gone =
-        std::erase_if(host_.openBatches, [&](const auto& open) { return open.number == batch; });
-    call.demand(gone != 0, HOST_ERR_BAD_HANDLE);
-  } else if (OpenBatch* open = find(host_.openBatches, batch)) {
-    open->excused = true;
+  OpenBatch* const open = find(host_.openBatches, batch);
+  if (!call.goesOn()) {
+    if (open != nullptr) open->excused = true;
+  } else if (call.demand(open != nullptr, HOST_ERR_BAD_HANDLE)) {
+    for (const std::int32_t index : open->valued) {
+      host_.keys[{open->layer, open->stream}].insert(open->keys[static_cast<std::size_t>(index)]);
+    }
+    host_.openBatches.erase(host_.openBatches.begin() + (open - host_.openBatches.data()));
   }
   call.line().integer("commit", 1).handle("batch", "batch", batch);
   return call.finish();

@@ -92,8 +92,6 @@ void HeldByCallback::Take(std::string_view line, bool failed) {
     if (!failed && Field(line, "count") != "0") streams_.back().left = true;
   } else if (call == "BeginKeyframeBatch") {
     if (!failed) batches_.emplace_back(Field(line, "batch"));
-  } else if (call == "AddBatchKeyframe") {
-    if (!failed) keyed_.emplace(Field(line, "batch"));
   } else if (call == "EndKeyframeBatch") {
     std::erase(batches_, Field(line, "batch"));
   }
@@ -106,7 +104,6 @@ void HeldByCallback::TakeStream(std::string_view line) {
   const int before = acquisitions_[{layer, id}]++;
   const bool camera = cameraLayers_.count(layer) != 0;
   const bool unguarded = camera && before == 0 && (id == "1" || id == "11");
-  if (unguarded) unguarded_.insert(handle);
   streams_.push_back({handle, unguarded, id == "11" && !unguarded, false});
 }
 
@@ -150,10 +147,6 @@ std::vector<std::string> HeldByCallback::CleanUp() const {
   return calls;
 }
 
-bool HeldByCallback::IsUnguarded(std::string_view stream) const {
-  return unguarded_.count(std::string(stream)) != 0;
-}
-
 std::size_t LeftOpen(const refhost::CallbackResult& result) {
   const auto& leftovers = result.leftovers;
   return static_cast<std::size_t>(
@@ -164,18 +157,6 @@ HeldByCallback HeldAfter(const std::vector<std::string>& trace, std::size_t coun
   HeldByCallback held;
   for (std::size_t i = 0; i < count; ++i) held.Take(trace[i], lastFailed && i + 1 == count);
   return held;
-}
-
-bool IsCodeIgnored(std::string_view line, const HeldByCallback& before) {
-  const std::string call = CallName(line);
-  if (call == "ReleaseStream") return !before.IsUnguarded(Field(line, "stream"));
-  return call == "ReleaseSuiteByName" || call == "ShowMessage" || call == "EndKeyframeBatch" ||
-         call == "UnlockMemHandle" || call == "FreeMemHandle" || call == "GetAppPrefsBlob" ||
-         call == "GetPrefLong" || call == "RegisterDeathHook";
-}
-
-bool IsCodeIgnored(const std::vector<std::string>& trace, std::size_t index) {
-  return IsCodeIgnored(trace[index], HeldAfter(trace, index, false));
 }
 
 CallFacts::CallFacts(std::string_view line) : call(CallName(line)), batch(Field(line, "batch")) {

@@ -41,8 +41,6 @@ inline constexpr Way kExceptions[] = {
 // An exception of a type that nobody knows, which is not.
 inline constexpr Way kOther = {refhost::Failure::Kind::Other, HOST_ERR_EXCEPTION_OTHER, "\"other\""};
 
-inline constexpr Way kAllExceptions[] = {kExceptions[0], kExceptions[1], kOther};
-
 // Follows a trace line by line and knows what is held.
 class HeldByCallback {
  public:
@@ -59,16 +57,6 @@ class HeldByCallback {
 
   // How much then stays open that is reported as left behind: batches, the zoom stream and the text.
   std::size_t LeftOpen() const;
-
-  // Whether silent errors have begun and not ended.
-  bool IsSilent() const { return silent_; }
-
-  // Whether the handle's value is set without a guard: the first position and the first zoom of a camera
-  // layer.
-  bool IsUnguarded(std::string_view stream) const;
-
-  // Whether the batch has no key yet.
-  bool IsEmptyBatch(std::string_view batch) const { return keyed_.count(std::string(batch)) == 0; }
 
  private:
   struct Stream {
@@ -90,18 +78,12 @@ class HeldByCallback {
   bool unlocked_ = false;
   std::set<std::string> cameraLayers_;
   std::map<std::pair<std::string, std::string>, int> acquisitions_;  // by layer and stream number
-  std::set<std::string> unguarded_;
   std::vector<Stream> streams_;
   std::vector<std::string> batches_;
-  std::set<std::string> keyed_;
 };
 
 // What is held after the first `count` calls of the trace; with `lastFailed` the last of them had failed.
 HeldByCallback HeldAfter(const std::vector<std::string>& trace, std::size_t count, bool lastFailed);
-
-// Whether a code that the call gives back changes nothing.
-bool IsCodeIgnored(std::string_view line, const HeldByCallback& before);
-bool IsCodeIgnored(const std::vector<std::string>& trace, std::size_t index);
 
 // How many of the leftovers of a callback are not kept by design.
 std::size_t LeftOpen(const refhost::CallbackResult& result);

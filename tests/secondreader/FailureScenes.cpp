@@ -1,4 +1,4 @@
-#include "tests/comp/FailureScenes.h"
+#include "tests/secondreader/FailureScenes.h"
 
 #include "tests/support/BuilderScene.h"
 
