@@ -21,7 +21,7 @@ std::string placeHolder(std::int64_t reference, std::int64_t number) {
 // From the root of the referenced file down to a control; some lie deeper than others.
 std::string controlPath(std::int64_t reference, std::int64_t control) {
   constexpr std::int64_t kLevels = 5;
-  const std::string inside = "|" + nameSpace(reference) + ":";
+  const std::string inside = '|' + nameSpace(reference) + ':';
   std::string path = inside + "root_grp" + inside + "motion_ctrl";
   for (std::int64_t level = 0; level < control % kLevels; ++level) {
     path += inside + numbered("limb_", control / kLevels) + numbered("_offset_", level);

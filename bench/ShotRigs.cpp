@@ -120,7 +120,7 @@ void connectJoint(SceneText& scene, std::int64_t rig, std::int64_t number) {
   scene.connect(holder + ".w0", holder + ".tg[0].tw");
   scene.connect(handle + ".bulge", drivenCurveName(rig, number) + ".i");
   scene.connect(drivenCurveName(rig, number) + ".o", bone + ".sy");
-  const std::string index = "[" + std::to_string(number) + "]";
+  const std::string index = '[' + std::to_string(number) + ']';
   scene.connect(bone + ".wm", skinName(rig) + ".ma" + index);
   scene.connect(bone + ".liw", skinName(rig) + ".lw" + index);
 }

@@ -55,8 +55,8 @@ bool IsPath(const scene::Scene& scene, const diag::Range& plug) {
 Channels::Channels(const scene::Scene& scene) : scene_(scene), unitsPerFrame_(motion::UnitsPerFrame(scene)) {}
 
 const Channels::Found& Channels::Of(scene::NodeId node) {
-  static const Found none;
-  if (!scene_.IsDriven(node)) return none;
+  static const Found kNothing;
+  if (!scene_.IsDriven(node)) return kNothing;
   const auto known = places_.find(node);
   return known != places_.end() ? known->second
                                 : places_.emplace(node, Find(node, scene::kPlaceChannels)).first->second;

@@ -32,11 +32,8 @@ target_compile_options(
   mayascene_common_options
   INTERFACE -Wall
             -Wextra
-            -Werror
             -Wconversion
             -Wshadow
-            # Warns of overlaps inside the standard library's strings that cannot happen, in GCC 12.
-            $<$<COMPILE_LANG_AND_ID:CXX,GNU>:-Wno-restrict>
             # Arithmetic gives the same bits on every processor.
             -ffp-contract=off)
 # Tests are compiled more often than run: not to optimise them is the faster way to know.

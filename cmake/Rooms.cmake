@@ -12,17 +12,3 @@ function(add_room name kind)
     target_compile_options(${name} PRIVATE --coverage -fno-weak -w)
   endif()
 endfunction()
-
-# precompile_headers(NAME [HEADER...]): has the sources of a library begin with these headers, compiled once; with those
-# of refhost where none are named. What a source uses it includes nevertheless: the fuzz preset and scripts/determinism
-# build without them.
-function(precompile_headers name)
-  if(ARGN)
-    target_precompile_headers(${name} PRIVATE ${ARGN})
-  else()
-    target_precompile_headers(${name} REUSE_FROM refhost)
-  endif()
-  # GCC 12 forgets there that the standard library is not ours, and sees overflows in its strings that cannot happen.
-  set(mistaken -Wno-array-bounds -Wno-stringop-overflow -Wno-stringop-overread)
-  target_compile_options(${name} PRIVATE "$<$<COMPILE_LANG_AND_ID:CXX,GNU>:${mistaken}>")
-endfunction()

@@ -6,6 +6,7 @@
 
 #include <sys/mman.h>
 
+#include <cstdint>
 #include <cstdlib>
 #include <cstring>
 
@@ -14,12 +15,12 @@
 namespace hostutil {
 namespace {
 
-constexpr int64_t kLargeBlock = int64_t{4} << 20;
-constexpr int64_t kLargePage = int64_t{2} << 20;
+constexpr std::int64_t kLargeBlock = std::int64_t{4} << 20;
+constexpr std::int64_t kLargePage = std::int64_t{2} << 20;
 
-bool IsLarge(int64_t size) { return size >= kLargeBlock; }
+bool IsLarge(std::int64_t size) { return size >= kLargeBlock; }
 
-std::size_t WholePages(int64_t size) {
+std::size_t WholePages(std::int64_t size) {
   constexpr auto page = static_cast<std::size_t>(kLargePage);
   return (static_cast<std::size_t>(size) + page - 1) / page * page;
 }
@@ -38,13 +39,13 @@ char* ReservePages(std::size_t size) {
   return first + before;
 }
 
-void* TakePages(int64_t size) {
+void* TakePages(std::int64_t size) {
   char* const block = ReservePages(WholePages(size));
-  if (block != nullptr) HostAdviseLargePages(block, static_cast<int64_t>(WholePages(size)));
+  if (block != nullptr) HostAdviseLargePages(block, static_cast<std::int64_t>(WholePages(size)));
   return block;
 }
 
-void* MovePages(void* block, int64_t size, int64_t newSize) {
+void* MovePages(void* block, std::int64_t size, std::int64_t newSize) {
   if (WholePages(size) == WholePages(newSize)) return block;
   char* const target = ReservePages(WholePages(newSize));
   if (target == nullptr) return nullptr;
@@ -58,7 +59,7 @@ void* MovePages(void* block, int64_t size, int64_t newSize) {
 
 }  // namespace
 
-void* GrowBlock(void* block, int64_t size, int64_t newSize) {
+void* GrowBlock(void* block, std::int64_t size, std::int64_t newSize) {
   if (!IsLarge(newSize)) return std::realloc(block, static_cast<std::size_t>(newSize));
   if (IsLarge(size)) return MovePages(block, size, newSize);
   void* const grown = TakePages(newSize);
@@ -68,7 +69,7 @@ void* GrowBlock(void* block, int64_t size, int64_t newSize) {
   return grown;
 }
 
-void FreeBlock(void* block, int64_t size) {
+void FreeBlock(void* block, std::int64_t size) {
   if (IsLarge(size)) {
     munmap(block, WholePages(size));
   } else {

@@ -12,11 +12,12 @@ template <typename Unit>
 class BoundedText {
  public:
   // A null buffer has no room at all.
-  BoundedText(Unit* buffer, int64_t capacity) : buffer_(buffer), capacity_(buffer != nullptr ? capacity : 0) {
+  BoundedText(Unit* buffer, std::int64_t capacity)
+      : buffer_(buffer), capacity_(buffer != nullptr ? capacity : 0) {
     if (capacity_ > 0) buffer_[0] = 0;
   }
 
-  void Append(const Unit* piece, int64_t count) {
+  void Append(const Unit* piece, std::int64_t count) {
     if (Fits() && count < capacity_ - needed_) {
       std::memcpy(buffer_ + needed_, piece, static_cast<std::size_t>(count) * sizeof(Unit));
       written_ = needed_ + count;
@@ -26,7 +27,7 @@ class BoundedText {
   }
 
   // The units of all pieces, without the NUL.
-  int64_t Needed() const { return needed_; }
+  std::int64_t Needed() const { return needed_; }
 
   bool Fits() const { return capacity_ > 0 && needed_ == written_; }
 
@@ -36,9 +37,9 @@ class BoundedText {
 
  private:
   Unit* buffer_;
-  int64_t capacity_;
-  int64_t needed_ = 0;
-  int64_t written_ = 0;
+  std::int64_t capacity_;
+  std::int64_t needed_ = 0;
+  std::int64_t written_ = 0;
 };
 
 }  // namespace hostutil

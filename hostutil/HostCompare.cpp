@@ -1,6 +1,8 @@
 #include "hostutil/HostCompare.h"
 
-int32_t HostCompareNoCase(const char* a, const char* b) {
+#include <cstdint>
+
+std::int32_t HostCompareNoCase(const char* a, const char* b) {
   if (a == nullptr) a = "";
   if (b == nullptr) b = "";
   for (;; ++a, ++b) {

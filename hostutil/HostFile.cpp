@@ -7,6 +7,7 @@
 
 #include <algorithm>
 #include <cerrno>
+#include <cstdint>
 #include <cstring>
 #include <new>
 #include <string>
@@ -22,7 +23,7 @@
 namespace {
 
 constexpr int kClosed = -1;
-constexpr int64_t kLargestSize = INT32_MAX;
+constexpr std::int64_t kLargestSize = INT32_MAX;
 constexpr HostUTF16Unit kSlash = '/';
 
 // By which a handle is known to be a file of this library.
@@ -74,7 +75,7 @@ bool Query(const HostFile& file, struct stat* status) {
 }
 
 // False when the file ends, or fails, before all bytes are there.
-bool ReadWhole(int descriptor, char* buffer, int64_t count) {
+bool ReadWhole(int descriptor, char* buffer, std::int64_t count) {
   while (count > 0) {
     const ssize_t got = read(descriptor, buffer, static_cast<std::size_t>(count));
     if (got < 0 && errno == EINTR) continue;
@@ -109,7 +110,7 @@ HostError HostFileCreate(const UTF16String* path, HostFile** file) {
   return HOST_ERR_NONE;
 }
 
-HostError HostFileOpen(HostFile* file, int32_t mode) {
+HostError HostFileOpen(HostFile* file, std::int32_t mode) {
   if (HostError code; hostutil::Rehearsed(HOST_UTILITY_FileOpen, &code)) return code;
   if (!IsFile(file)) return HOST_ERR_UTILITY_NULL;
   if (file->descriptor != kClosed) return HOST_ERR_FILE_STATE;
@@ -122,7 +123,7 @@ HostError HostFileOpen(HostFile* file, int32_t mode) {
   return HOST_ERR_FILE_OPEN;
 }
 
-HostError HostFileSize(HostFile* file, int64_t* size) {
+HostError HostFileSize(HostFile* file, std::int64_t* size) {
   if (HostError code; hostutil::Rehearsed(HOST_UTILITY_FileSize, &code)) {
     hostutil::HandOutNothing(size);
     return code;
@@ -136,7 +137,7 @@ HostError HostFileSize(HostFile* file, int64_t* size) {
   return HOST_ERR_NONE;
 }
 
-HostError HostFileRead(HostFile* file, int64_t count, void* buffer) {
+HostError HostFileRead(HostFile* file, std::int64_t count, void* buffer) {
   if (HostError code; hostutil::Rehearsed(HOST_UTILITY_FileRead, &code)) {
     if (buffer != nullptr && count > 0) std::memset(buffer, 0, static_cast<std::size_t>(count));
     return code;

@@ -2,6 +2,8 @@
 // of ratios.
 #include "hostutil/HostNumbers.h"
 
+#include <cstdint>
+
 #include "hostapi/ErrorCodes.h"
 #include "hostutil/RehearsalInternal.h"
 #include "scan/Decimal.h"
@@ -9,8 +11,9 @@
 namespace {
 
 // Reads up to `capacity` plain numbers and moves *at to right after the last one. Returns how many.
-int64_t ReadRun(const char** at, const char* end, char terminator, double* numbers, int64_t capacity) {
-  int64_t count = 0;
+std::int64_t ReadRun(const char** at, const char* end, char terminator, double* numbers,
+                     std::int64_t capacity) {
+  std::int64_t count = 0;
   for (; count < capacity; ++count) {
     const char* const next = scan::ReadPlainNumber(*at, end, terminator, &numbers[count]);
     if (next == nullptr) break;
@@ -21,7 +24,7 @@ int64_t ReadRun(const char** at, const char* end, char terminator, double* numbe
 
 }  // namespace
 
-HostError HostNumberScan(const char* text, int64_t length, double* value) {
+HostError HostNumberScan(const char* text, std::int64_t length, double* value) {
   if (HostError code; hostutil::Rehearsed(HOST_UTILITY_NumberScan, &code)) {
     hostutil::HandOutNothing(value);
     return code;
@@ -39,12 +42,12 @@ HostError HostNumberScan(const char* text, int64_t length, double* value) {
 }
 
 HostError HostNumberScanRun(const char* text, const char* end, char terminator, double* numbers,
-                            int64_t capacity, int64_t* count, const char** after) {
+                            std::int64_t capacity, std::int64_t* count, const char** after) {
   *count = 0;
   *after = text;
   for (;;) {
-    const int64_t sound = hostutil::CallsBeforeFailure(HOST_UTILITY_NumberScan, capacity - *count);
-    const int64_t read = ReadRun(after, end, terminator, numbers + *count, sound);
+    const std::int64_t sound = hostutil::CallsBeforeFailure(HOST_UTILITY_NumberScan, capacity - *count);
+    const std::int64_t read = ReadRun(after, end, terminator, numbers + *count, sound);
     hostutil::CountCalls(HOST_UTILITY_NumberScan, read);
     *count += read;
     if (read < sound || *count == capacity) return HOST_ERR_NONE;
@@ -60,7 +63,7 @@ HostError HostNumberScanRun(const char* text, const char* end, char terminator, 
   }
 }
 
-HostError HostRatioCompare(const HostRatio* a, const HostRatio* b, int32_t* order) {
+HostError HostRatioCompare(const HostRatio* a, const HostRatio* b, std::int32_t* order) {
   if (HostError code; hostutil::Rehearsed(HOST_UTILITY_RatioCompare, &code)) {
     hostutil::HandOutNothing(order);
     return code;
@@ -68,8 +71,8 @@ HostError HostRatioCompare(const HostRatio* a, const HostRatio* b, int32_t* orde
   if (a == nullptr || b == nullptr || order == nullptr) return HOST_ERR_UTILITY_NULL;
   if (a->denominator == 0 || b->denominator == 0) return HOST_ERR_NUMBER_RANGE;
   // A signed and an unsigned 32-bit factor: the product always fits 64 bits.
-  const int64_t left = int64_t{a->numerator} * int64_t{b->denominator};
-  const int64_t right = int64_t{b->numerator} * int64_t{a->denominator};
+  const std::int64_t left = std::int64_t{a->numerator} * std::int64_t{b->denominator};
+  const std::int64_t right = std::int64_t{b->numerator} * std::int64_t{a->denominator};
   *order = left < right ? -1 : left > right ? 1 : 0;
   return HOST_ERR_NONE;
 }

@@ -2,6 +2,7 @@
 // line.
 #include "hostutil/HostReport.h"
 
+#include <cstdint>
 #include <cstring>
 
 #include "hostapi/ErrorCodes.h"
@@ -15,10 +16,10 @@ HostReporter currentReporter = nullptr;
 void* currentContext = nullptr;
 
 HostError notedCode = HOST_ERR_NONE;
-int64_t notedLine = 0;
+std::int64_t notedLine = 0;
 
 // The memory may be exhausted: the message is built in place, and cut after its last character that fits.
-constexpr int64_t kMessageCapacity = 1024;
+constexpr std::int64_t kMessageCapacity = 1024;
 
 consteval const char* SentenceOf(HostError code) {
   switch (code) {
@@ -43,7 +44,7 @@ void AppendShown(hostutil::BoundedText<char>* out, const char* text) {
 
 }  // namespace
 
-HostError HostTranslateAndReport(int32_t kind, const char* what) {
+HostError HostTranslateAndReport(std::int32_t kind, const char* what) {
   const bool memory = kind == HOST_EXCEPTION_MEMORY;
   const HostError code = memory ? HOST_ERR_EXCEPTION_MEMORY : HOST_ERR_EXCEPTION_OTHER;
   if (currentReporter == nullptr) return code;
@@ -63,13 +64,13 @@ void HostSetReporter(HostReporter reporter, void* context) {
   currentContext = context;
 }
 
-void HostNoteLine(HostError code, int64_t line) {
+void HostNoteLine(HostError code, std::int64_t line) {
   notedCode = code;
   notedLine = line;
 }
 
-int64_t HostTakeNotedLine(HostError code) {
-  const int64_t line = code == notedCode ? notedLine : 0;
+std::int64_t HostTakeNotedLine(HostError code) {
+  const std::int64_t line = code == notedCode ? notedLine : 0;
   HostNoteLine(HOST_ERR_NONE, 0);
   return line;
 }

@@ -2,6 +2,7 @@
 #include "hostutil/HostStrings.h"
 
 #include <algorithm>
+#include <cstdint>
 #include <cstring>
 #include <map>
 #include <memory>
@@ -38,8 +39,8 @@ bool NameTaken(const char* name) {
 }
 
 // False when an entry has no "=". The key ends at the first one.
-bool ReadEntries(const char* const* entries, int32_t count, HostStringTable* table) {
-  for (int32_t i = 0; i < count; ++i) {
+bool ReadEntries(const char* const* entries, std::int32_t count, HostStringTable* table) {
+  for (std::int32_t i = 0; i < count; ++i) {
     const char* equals = entries[i] != nullptr ? std::strchr(entries[i], '=') : nullptr;
     if (equals == nullptr) return false;
     table->entries.push_back({std::string(entries[i], equals), std::string(equals + 1)});
@@ -47,7 +48,7 @@ bool ReadEntries(const char* const* entries, int32_t count, HostStringTable* tab
   return true;
 }
 
-int64_t LengthOf(const char* text) { return static_cast<int64_t>(std::strlen(text)); }
+std::int64_t LengthOf(const char* text) { return static_cast<std::int64_t>(std::strlen(text)); }
 
 HostError Finish(hostutil::BoundedText<char>* out) {
   if (out->Fits()) return HOST_ERR_NONE;
@@ -55,13 +56,13 @@ HostError Finish(hostutil::BoundedText<char>* out) {
   return HOST_ERR_TEXT_TOO_LONG;
 }
 
-void HandOutEmptyText(char* buffer, int64_t capacity) {
+void HandOutEmptyText(char* buffer, std::int64_t capacity) {
   if (buffer != nullptr && capacity > 0) buffer[0] = '\0';
 }
 
 }  // namespace
 
-HostError HostRegisterStringTable(const char* name, const char* const* entries, int32_t count,
+HostError HostRegisterStringTable(const char* name, const char* const* entries, std::int32_t count,
                                   HostStringTable** table) {
   if (HostError code; hostutil::Rehearsed(HOST_UTILITY_RegisterStringTable, &code)) {
     hostutil::HandOutNothing(table);
@@ -91,7 +92,7 @@ HostError HostUnregisterStringTable(HostStringTable* table) {
   return HOST_ERR_NONE;
 }
 
-const char* HostLocalizedString(const HostStringTable* table, int32_t id) {
+const char* HostLocalizedString(const HostStringTable* table, std::int32_t id) {
   if (FindTable(table) == tables.end()) return "";
   if (id < 0 || static_cast<std::size_t>(id) >= table->entries.size()) return "";
   const HostStringTable::Entry& entry = table->entries[static_cast<std::size_t>(id)];
@@ -99,19 +100,19 @@ const char* HostLocalizedString(const HostStringTable* table, int32_t id) {
   return translated != translations.end() ? translated->second.c_str() : entry.text.c_str();
 }
 
-HostError HostStringCopy(char* buffer, int64_t capacity, const char* text) {
+HostError HostStringCopy(char* buffer, std::int64_t capacity, const char* text) {
   if (HostError code; hostutil::Rehearsed(HOST_UTILITY_StringCopy, &code)) {
     HandOutEmptyText(buffer, capacity);
     return code;
   }
   if (buffer == nullptr || text == nullptr) return HOST_ERR_UTILITY_NULL;
-  const int64_t length = LengthOf(text);
+  const std::int64_t length = LengthOf(text);
   hostutil::BoundedText<char> out(buffer, capacity);
   out.Append(text, length);
   return Finish(&out);
 }
 
-HostError HostStringFormat(char* buffer, int64_t capacity, const char* pattern, const char* argument1,
+HostError HostStringFormat(char* buffer, std::int64_t capacity, const char* pattern, const char* argument1,
                            const char* argument2) {
   if (HostError code; hostutil::Rehearsed(HOST_UTILITY_StringFormat, &code)) {
     HandOutEmptyText(buffer, capacity);

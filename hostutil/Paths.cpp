@@ -1,6 +1,7 @@
 // Conversion between UTF-8 and UTF-16 that loses no byte of a path.
 #include "hostutil/PathsInternal.h"
 
+#include <cstdint>
 #include <cstdio>
 
 #include "hostutil/BoundedTextInternal.h"
@@ -140,7 +141,7 @@ std::string ShownLine(const HostUTF16Unit* units) {
 
 }  // namespace hostutil
 
-int64_t HostPathToUnits(const char* path, HostUTF16Unit* units, int64_t capacity) {
+std::int64_t HostPathToUnits(const char* path, HostUTF16Unit* units, std::int64_t capacity) {
   hostutil::BoundedText<HostUTF16Unit> out(units, capacity);
   while (path != nullptr && *path != '\0') {
     const hostutil::DecodedCharacter character = hostutil::DecodeBytes(path);
@@ -151,7 +152,7 @@ int64_t HostPathToUnits(const char* path, HostUTF16Unit* units, int64_t capacity
   return out.Needed();
 }
 
-int64_t HostUnitsToShownText(const HostUTF16Unit* units, char* text, int64_t capacity) {
+std::int64_t HostUnitsToShownText(const HostUTF16Unit* units, char* text, std::int64_t capacity) {
   hostutil::BoundedText<char> out(text, capacity);
   while (units != nullptr && *units != 0) {
     const hostutil::DecodedCharacter character = hostutil::DecodeUnits(units);

@@ -3,6 +3,7 @@
 
 #include <algorithm>
 #include <cstddef>
+#include <cstdint>
 #include <cstring>
 #include <new>
 #include <string>
@@ -16,15 +17,15 @@
 namespace {
 
 // What distinguishes a list from other memory.
-constexpr uint64_t kListMark = 0x5265634C69737431;
+constexpr std::uint64_t kListMark = 0x5265634C69737431;
 
 // The size of a time and a value, the records that are copied most: by a copy of known size.
-constexpr int64_t kKeySize = 2 * sizeof(double);
+constexpr std::int64_t kKeySize = 2 * sizeof(double);
 
 }  // namespace
 
 struct RecordList final : hostutil::LiveObject {
-  RecordList(int64_t recordBytes, int64_t growthStep)
+  RecordList(std::int64_t recordBytes, std::int64_t growthStep)
       : LiveObject(Kind::List), recordSize(recordBytes), growth(growthStep) {}
   ~RecordList() override { hostutil::FreeBlock(records, capacity * recordSize); }
 
@@ -32,21 +33,23 @@ struct RecordList final : hostutil::LiveObject {
     return "list of " + std::to_string(count) + " records of " + std::to_string(recordSize) + " bytes";
   }
 
-  bool Holds(int64_t index) const { return static_cast<uint64_t>(index) < static_cast<uint64_t>(count); }
-  unsigned char* At(int64_t index) const { return records + index * recordSize; }
+  bool Holds(std::int64_t index) const {
+    return static_cast<std::uint64_t>(index) < static_cast<std::uint64_t>(count);
+  }
+  unsigned char* At(std::int64_t index) const { return records + index * recordSize; }
 
-  const uint64_t mark = kListMark;
+  const std::uint64_t mark = kListMark;
   unsigned char* records = nullptr;
-  int64_t count = 0;
-  int64_t capacity = 0;
-  const int64_t recordSize;
-  const int64_t growth;
-  int64_t locks = 0;  // of all records
+  std::int64_t count = 0;
+  std::int64_t capacity = 0;
+  const std::int64_t recordSize;
+  const std::int64_t growth;
+  std::int64_t locks = 0;  // of all records
 
   // Locks of one record at a time are counted in place; those of further records beside them, in the map.
-  int64_t firstLocked = 0;
-  int64_t firstLocks = 0;
-  std::unordered_map<int64_t, int64_t> furtherLocks;
+  std::int64_t firstLocked = 0;
+  std::int64_t firstLocks = 0;
+  std::unordered_map<std::int64_t, std::int64_t> furtherLocks;
 };
 
 namespace {
@@ -56,13 +59,13 @@ __attribute__((no_sanitize("vptr"))) bool IsList(const RecordList* list) {
   return list != nullptr && list->mark == kListMark;
 }
 
-int64_t MostRecords(int64_t recordSize) { return PTRDIFF_MAX / recordSize; }
+std::int64_t MostRecords(std::int64_t recordSize) { return PTRDIFF_MAX / recordSize; }
 
-std::size_t ByteCount(int64_t records, int64_t recordSize) {
+std::size_t ByteCount(std::int64_t records, std::int64_t recordSize) {
   return static_cast<std::size_t>(records) * static_cast<std::size_t>(recordSize);
 }
 
-bool SetCapacity(RecordList* list, int64_t capacity) {
+bool SetCapacity(RecordList* list, std::int64_t capacity) {
   void* records =
       hostutil::GrowBlock(list->records, list->capacity * list->recordSize, capacity * list->recordSize);
   if (records == nullptr) return false;
@@ -73,16 +76,17 @@ bool SetCapacity(RecordList* list, int64_t capacity) {
 
 // Makes room for `wanted` more records: doubles the list, and adds the growth step or what is wanted where
 // that is more. False when it cannot grow so far.
-bool Grow(RecordList* list, int64_t wanted) {
-  const int64_t room = MostRecords(list->recordSize) - list->capacity;
-  const int64_t least = std::max(list->growth, wanted);
+bool Grow(RecordList* list, std::int64_t wanted) {
+  const std::int64_t room = MostRecords(list->recordSize) - list->capacity;
+  const std::int64_t least = std::max(list->growth, wanted);
   if (room < least) return false;
   return SetCapacity(list, list->capacity + std::min(room, std::max(least, list->capacity)));
 }
 
 }  // namespace
 
-HostError RecordListCreate(int64_t recordSize, int64_t growth, int64_t initial, RecordList** list) {
+HostError RecordListCreate(std::int64_t recordSize, std::int64_t growth, std::int64_t initial,
+                           RecordList** list) {
   if (HostError code; hostutil::Rehearsed(HOST_UTILITY_ListCreate, &code)) {
     hostutil::HandOutNothing(list);
     return code;
@@ -108,7 +112,7 @@ HostError RecordListCreate(int64_t recordSize, int64_t growth, int64_t initial, 
 
 namespace {
 
-HostError AppendRecords(RecordList* list, const void* records, int64_t count) {
+HostError AppendRecords(RecordList* list, const void* records, std::int64_t count) {
   if (!IsList(list) || records == nullptr || count < 0) return HOST_ERR_UTILITY_NULL;
   if (list->locks != 0) return HOST_ERR_LIST_LOCKED;
   if (count == 0) return HOST_ERR_NONE;
@@ -125,19 +129,19 @@ HostError RecordListAppend(RecordList* list, const void* record) {
   return AppendRecords(list, record, 1);
 }
 
-HostError RecordListAppendRun(RecordList* list, const void* records, int64_t count) {
+HostError RecordListAppendRun(RecordList* list, const void* records, std::int64_t count) {
   if (HostError code; hostutil::Rehearsed(HOST_UTILITY_ListAppend, &code)) return code;
   return AppendRecords(list, records, count);
 }
 
-void RecordListReserve(RecordList* list, int64_t count) {
+void RecordListReserve(RecordList* list, std::int64_t count) {
   if (!IsList(list) || list->locks != 0 || count <= list->capacity - list->count) return;
   if (count <= MostRecords(list->recordSize) - list->count) SetCapacity(list, list->count + count);
 }
 
 namespace {
 
-HostError CopyRecord(const RecordList* list, int64_t index, void* record) {
+HostError CopyRecord(const RecordList* list, std::int64_t index, void* record) {
   if (!IsList(list) || record == nullptr) return HOST_ERR_UTILITY_NULL;
   if (!list->Holds(index)) return HOST_ERR_LIST_INDEX;
   if (list->recordSize == kKeySize) [[likely]] {
@@ -148,20 +152,21 @@ HostError CopyRecord(const RecordList* list, int64_t index, void* record) {
   return HOST_ERR_NONE;
 }
 
-[[gnu::noinline]] HostError GetInRehearsal(const RecordList* list, int64_t index, void* record) {
+[[gnu::noinline]] HostError GetInRehearsal(const RecordList* list, std::int64_t index, void* record) {
   HostError code = HOST_ERR_NONE;
   return hostutil::IsPlannedToFail(HOST_UTILITY_ListGet, &code) ? code : CopyRecord(list, index, record);
 }
 
 }  // namespace
 
-HostError RecordListGet(const RecordList* list, int64_t index, void* record) {
+HostError RecordListGet(const RecordList* list, std::int64_t index, void* record) {
   if (hostutil::MayBePlanned(HOST_UTILITY_ListGet)) [[unlikely]]
     return GetInRehearsal(list, index, record);
   return CopyRecord(list, index, record);
 }
 
-HostError RecordListGetRun(const RecordList* list, int64_t index, int64_t count, const void** records) {
+HostError RecordListGetRun(const RecordList* list, std::int64_t index, std::int64_t count,
+                           const void** records) {
   if (HostError code; hostutil::Rehearsed(HOST_UTILITY_ListGet, &code)) {
     hostutil::HandOutNothing(records);
     return code;
@@ -174,7 +179,7 @@ HostError RecordListGetRun(const RecordList* list, int64_t index, int64_t count,
   return HOST_ERR_NONE;
 }
 
-HostError RecordListLock(RecordList* list, int64_t index, void** record) {
+HostError RecordListLock(RecordList* list, std::int64_t index, void** record) {
   if (HostError code; hostutil::Rehearsed(HOST_UTILITY_ListLock, &code)) {
     hostutil::HandOutNothing(record);
     return code;
@@ -198,7 +203,7 @@ HostError RecordListLock(RecordList* list, int64_t index, void** record) {
   return HOST_ERR_NONE;
 }
 
-HostError RecordListUnlock(RecordList* list, int64_t index) {
+HostError RecordListUnlock(RecordList* list, std::int64_t index) {
   if (HostError code; hostutil::Rehearsed(HOST_UTILITY_ListUnlock, &code)) return code;
   if (!IsList(list)) return HOST_ERR_UTILITY_NULL;
   if (list->firstLocks > 0 && list->firstLocked == index) {
@@ -212,11 +217,11 @@ HostError RecordListUnlock(RecordList* list, int64_t index) {
   return HOST_ERR_NONE;
 }
 
-const void* RecordListPeek(const RecordList* list, int64_t index) {
+const void* RecordListPeek(const RecordList* list, std::int64_t index) {
   return IsList(list) && list->Holds(index) ? list->At(index) : nullptr;
 }
 
-HostError RecordListCount(const RecordList* list, int64_t* count) {
+HostError RecordListCount(const RecordList* list, std::int64_t* count) {
   if (HostError code; hostutil::Rehearsed(HOST_UTILITY_ListCount, &code)) {
     hostutil::HandOutNothing(count);
     return code;

@@ -1,4 +1,5 @@
 // The registry of live objects, and the ledger that the host draws up from it.
+#include <cstdint>
 #include <new>
 #include <string>
 
@@ -59,7 +60,7 @@ void HostVisitLedger(HostLedgerVisitor visitor, void* context) {
   for (const hostutil::LiveObject* object = hostutil::held.first; object != nullptr;
        object = object->Next()) {
     const std::string description = hostutil::DescribeOrName(*object);
-    visitor(context, static_cast<int32_t>(object->GetKind()), description.c_str(),
+    visitor(context, static_cast<std::int32_t>(object->GetKind()), description.c_str(),
             object->ReleaseFailed() ? 1 : 0);
   }
 }

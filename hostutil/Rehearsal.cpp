@@ -1,6 +1,7 @@
 // Rehearsal of failures: which call of which service is to fail, and how often each was called.
 #include <algorithm>
 #include <array>
+#include <cstdint>
 #include <new>
 #include <stdexcept>
 #include <vector>
@@ -13,14 +14,14 @@ namespace hostutil {
 
 constinit bool rehearsalRunning = false;
 constinit bool failuresPlanned = false;
-constinit std::array<int64_t, HOST_UTILITY_COUNT> callCounts{};
+constinit std::array<std::int64_t, HOST_UTILITY_COUNT> callCounts{};
 
 namespace {
 
-constexpr int64_t kEveryCall = 0;
+constexpr std::int64_t kEveryCall = 0;
 
 std::array<std::vector<HostUtilityFailure>, HOST_UTILITY_COUNT> failures;
-bool IsService(int32_t service) { return service >= 0 && service < HOST_UTILITY_COUNT; }
+bool IsService(std::int32_t service) { return service >= 0 && service < HOST_UTILITY_COUNT; }
 
 bool IsSound(const HostUtilityFailure& failure) {
   return IsService(failure.service) && failure.nth >= kEveryCall && failure.thrown >= HOST_THROW_NOTHING &&
@@ -32,9 +33,9 @@ struct OtherException {};
 
 }  // namespace
 
-bool IsPlannedToFail(int32_t service, HostError* code) {
+bool IsPlannedToFail(std::int32_t service, HostError* code) {
   const auto slot = static_cast<std::size_t>(service);
-  const int64_t call = callCounts[slot];
+  const std::int64_t call = callCounts[slot];
   for (const HostUtilityFailure& failure : failures[slot]) {
     if (failure.nth != kEveryCall && failure.nth != call) continue;
     if (failure.thrown == HOST_THROW_BAD_ALLOC) throw std::bad_alloc();
@@ -46,11 +47,11 @@ bool IsPlannedToFail(int32_t service, HostError* code) {
   return false;
 }
 
-int64_t CallsBeforePlanned(int32_t service, int64_t calls) {
+std::int64_t CallsBeforePlanned(std::int32_t service, std::int64_t calls) {
   const auto slot = static_cast<std::size_t>(service);
   for (const HostUtilityFailure& failure : failures[slot]) {
     if (failure.nth == kEveryCall) return 0;
-    const int64_t before = failure.nth - callCounts[slot] - 1;
+    const std::int64_t before = failure.nth - callCounts[slot] - 1;
     if (before >= 0) calls = std::min(calls, before);
   }
   return calls;
@@ -81,6 +82,6 @@ void HostBeginRehearsal(void) {
 
 void HostEndRehearsal(void) { hostutil::rehearsalRunning = false; }
 
-int64_t HostUtilityCallCount(int32_t service) {
+std::int64_t HostUtilityCallCount(std::int32_t service) {
   return hostutil::IsService(service) ? hostutil::callCounts[static_cast<std::size_t>(service)] : 0;
 }

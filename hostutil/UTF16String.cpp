@@ -2,6 +2,7 @@
 #include "hostutil/UTF16String.h"
 
 #include <algorithm>
+#include <cstdint>
 #include <new>
 #include <utility>
 #include <vector>
@@ -19,13 +20,13 @@ constexpr HostUTF16Unit kDot = '.';
 
 using Units = std::vector<HostUTF16Unit>;
 
-int64_t LengthOf(const HostUTF16Unit* units) {
-  int64_t length = 0;
+std::int64_t LengthOf(const HostUTF16Unit* units) {
+  std::int64_t length = 0;
   while (units[length] != 0) ++length;
   return length;
 }
 
-void Append(Units* units, const HostUTF16Unit* piece, int64_t count) {
+void Append(Units* units, const HostUTF16Unit* piece, std::int64_t count) {
   units->insert(units->end(), piece, piece + count);
 }
 
@@ -53,10 +54,10 @@ HostError MakeText(UTF16String** text, Fill fill) {
 }
 
 // Where the extension begins: at the last dot, or at the end.
-int64_t ExtensionStart(const UTF16String* text) {
+std::int64_t ExtensionStart(const UTF16String* text) {
   const HostUTF16Unit* units = UTF16StringUnits(text);
-  const int64_t length = UTF16StringLength(text);
-  for (int64_t i = length; i > 0; --i) {
+  const std::int64_t length = UTF16StringLength(text);
+  for (std::int64_t i = length; i > 0; --i) {
     if (units[i - 1] == kDot) return i - 1;
   }
   return length;
@@ -107,13 +108,13 @@ HostError UTF16StringFormat(const char* pattern, const UTF16String* argument1, c
   });
 }
 
-HostError HostStripExtension(const UTF16String* text, int32_t flag, UTF16String** stripped) {
+HostError HostStripExtension(const UTF16String* text, std::int32_t flag, UTF16String** stripped) {
   if (HostError code; hostutil::Rehearsed(HOST_UTILITY_StripExtension, &code)) {
     hostutil::HandOutNothing(stripped);
     return code;
   }
   if (stripped == nullptr) return HOST_ERR_UTILITY_NULL;
-  const int64_t kept = flag != 0 ? ExtensionStart(text) : UTF16StringLength(text);
+  const std::int64_t kept = flag != 0 ? ExtensionStart(text) : UTF16StringLength(text);
   return MakeText(stripped, [&](Units* out) { Append(out, UTF16StringUnits(text), kept); });
 }
 
@@ -121,8 +122,8 @@ const HostUTF16Unit* UTF16StringUnits(const UTF16String* text) {
   return text != nullptr ? text->units.data() : kNoUnits;
 }
 
-int64_t UTF16StringLength(const UTF16String* text) {
-  return text != nullptr ? static_cast<int64_t>(text->units.size()) - 1 : 0;
+std::int64_t UTF16StringLength(const UTF16String* text) {
+  return text != nullptr ? static_cast<std::int64_t>(text->units.size()) - 1 : 0;
 }
 
 void UTF16StringRetain(UTF16String* text) {

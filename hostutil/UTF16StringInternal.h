@@ -18,5 +18,5 @@ struct UTF16String final : hostutil::LiveObject {
   std::string Describe() const override { return "text"; }  // GCOVR_EXCL_LINE
 
   const std::vector<HostUTF16Unit> units;
-  int64_t references = 1;
+  std::int64_t references = 1;
 };

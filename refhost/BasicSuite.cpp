@@ -9,7 +9,7 @@ namespace refhost {
 namespace {
 
 std::string shown(const char* name, std::int32_t version) {
-  return "\"" + shownText(name) + "\" in version " + std::to_string(version);
+  return '"' + shownText(name) + "\" in version " + std::to_string(version);
 }
 
 void acquireSuite(Call& call, const char* name, std::int32_t version, const void** suite) {

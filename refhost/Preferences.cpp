@@ -73,7 +73,7 @@ bool Preferences::write(std::string* failure) const {
   if (error) target = file_;
   if (target.has_parent_path()) fs::create_directories(target.parent_path(), error);
   fs::path beside = target;
-  beside += "." + std::to_string(getpid()) + ".new";
+  beside += '.' + std::to_string(getpid()) + ".new";
   std::ofstream out(beside, std::ios::binary | std::ios::trunc);
   for (const auto& [section, entries] : sections_) {
     if (!fitsALine(section)) continue;

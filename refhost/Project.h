@@ -22,7 +22,7 @@ struct Composition;
 struct Layer;
 
 // The film direction of a camera without a film size.
-inline constexpr int32_t kFilmNeverSet = 0;
+inline constexpr std::int32_t kFilmNeverSet = 0;
 
 // The keys of one stream, sorted by time, no two at one time. values holds `dimension` numbers per key.
 struct KeyColumns {
@@ -32,10 +32,10 @@ struct KeyColumns {
 
 // One animatable property of a layer.
 struct Stream {
-  int32_t id = HOST_STREAM_ANCHOR_POINT;  // LayerStreamId
-  int32_t dimension = 0;                  // 1 or 3
-  double value[3] = {0.0, 0.0, 0.0};      // the static value; stays when keys are added
-  std::unique_ptr<KeyColumns> keys;       // null when the stream has none
+  std::int32_t id = HOST_STREAM_ANCHOR_POINT;  // LayerStreamId
+  std::int32_t dimension = 0;                  // 1 or 3
+  double value[3] = {0.0, 0.0, 0.0};           // the static value; stays when keys are added
+  std::unique_ptr<KeyColumns> keys;            // null when the stream has none
 
   std::size_t keyCount() const { return keys ? keys->times.size() : 0; }
 };
@@ -43,28 +43,28 @@ struct Stream {
 enum class LayerKind { Camera, Null, Composition };
 
 struct Layer {
-  int32_t number = 0;
+  std::int32_t number = 0;
   LayerKind kind = LayerKind::Null;
   std::string name;  // bytes as the importer gave them; may be empty or no UTF-8
   Composition* composition = nullptr;
-  Layer* parent = nullptr;                // null: none
-  Composition* source = nullptr;          // what a nested composition layer shows; else null
-  bool threeDimensional = false;          // layer flag 0x800
-  bool aimed = false;                     // layer flag 8192: a camera that looks at its point of interest
-  int32_t childCount = 0;                 // layers whose parent this one is
-  int32_t filmDirection = kFilmNeverSet;  // camera: HOST_FILM_HORIZONTAL or HOST_FILM_VERTICAL
-  double filmSize = 0.0;                  // camera: points; 0 when never set
-  std::vector<Stream> streams;            // camera: 0, 1, 2, 3, 8, 9, 11; others: 0, 1, 2, 3, 8, 9
+  Layer* parent = nullptr;        // null: none
+  Composition* source = nullptr;  // what a nested composition layer shows; else null
+  bool threeDimensional = false;  // layer flag 0x800
+  bool aimed = false;             // layer flag 8192: a camera that looks at its point of interest
+  std::int32_t childCount = 0;    // layers whose parent this one is
+  std::int32_t filmDirection = kFilmNeverSet;  // camera: HOST_FILM_HORIZONTAL or HOST_FILM_VERTICAL
+  double filmSize = 0.0;                       // camera: points; 0 when never set
+  std::vector<Stream> streams;                 // camera: 0, 1, 2, 3, 8, 9, 11; others: 0, 1, 2, 3, 8, 9
 
-  const Stream* findStream(int32_t id) const;  // null when the layer has none of that id
+  const Stream* findStream(std::int32_t id) const;  // null when the layer has none of that id
 };
 
 struct Composition {
-  int32_t number = 0;
-  int32_t itemNumber = 0;  // 0 until the composition was asked for its item
-  std::string name;        // UTF-8; what cannot be decoded is U+FFFD
-  int32_t width = 0;       // pixels
-  int32_t height = 0;      // pixels
+  std::int32_t number = 0;
+  std::int32_t itemNumber = 0;  // 0 until the composition was asked for its item
+  std::string name;             // UTF-8; what cannot be decoded is U+FFFD
+  std::int32_t width = 0;       // pixels
+  std::int32_t height = 0;      // pixels
   HostRatio pixelAspect{1, 1};
   T_Time duration{0, 1};
   HostRatio frameRate{1, 1};
@@ -73,7 +73,7 @@ struct Composition {
 
 // A folder of the project: each imported scene has one of its own.
 struct Folder {
-  int32_t itemNumber = 0;
+  std::int32_t itemNumber = 0;
   std::vector<Composition*> compositions;  // in the order in which they were made
 };
 

@@ -1,5 +1,6 @@
 #include "refhost/ProjectEditor.h"
 
+#include <cstdint>
 #include <set>
 #include <utility>
 
@@ -7,7 +8,7 @@
 
 namespace refhost {
 
-const Stream* Layer::findStream(int32_t id) const {
+const Stream* Layer::findStream(std::int32_t id) const {
   for (const Stream& stream : streams) {
     if (stream.id == id) return &stream;
   }
@@ -17,13 +18,13 @@ const Stream* Layer::findStream(int32_t id) const {
 Folder& ProjectEditor::addFolder() {
   Folder& folder = project_.folders_.emplace_back();
   items_.push_back({&folder, nullptr});
-  folder.itemNumber = static_cast<int32_t>(items_.size());
+  folder.itemNumber = static_cast<std::int32_t>(items_.size());
   return folder;
 }
 
 Composition& ProjectEditor::addComposition(Folder& folder, CompositionSettings settings) {
   Composition& composition = project_.compositions_.emplace_back();
-  composition.number = static_cast<int32_t>(project_.compositions_.size());
+  composition.number = static_cast<std::int32_t>(project_.compositions_.size());
   composition.name = std::move(settings.name);
   composition.width = settings.width;
   composition.height = settings.height;
@@ -37,13 +38,13 @@ Composition& ProjectEditor::addComposition(Folder& folder, CompositionSettings s
 void ProjectEditor::makeItem(Composition& composition) {
   if (composition.itemNumber != 0) return;
   items_.push_back({nullptr, &composition});
-  composition.itemNumber = static_cast<int32_t>(items_.size());
+  composition.itemNumber = static_cast<std::int32_t>(items_.size());
 }
 
 Layer& ProjectEditor::addLayer(Composition& composition, LayerKind kind, std::string name) {
   Layer& layer = project_.layers_.emplace_back();
   layers_.push_back(&layer);
-  layer.number = static_cast<int32_t>(project_.layers_.size());
+  layer.number = static_cast<std::int32_t>(project_.layers_.size());
   layer.kind = kind;
   layer.name = std::move(name);
   layer.composition = &composition;
@@ -53,7 +54,7 @@ Layer& ProjectEditor::addLayer(Composition& composition, LayerKind kind, std::st
 }
 
 Layer& ProjectEditor::addCameraLayer(Composition& composition, const char* name, const double (&interest)[2],
-                                     int32_t zoomKeys) {
+                                     std::int32_t zoomKeys) {
   Layer& layer = addLayer(composition, LayerKind::Camera, name);
   for (Stream& stream : layer.streams) {
     if (stream.id == HOST_STREAM_ANCHOR_POINT) {
@@ -64,7 +65,7 @@ Layer& ProjectEditor::addCameraLayer(Composition& composition, const char* name,
       if (zoomKeys < 1) continue;
       std::vector<T_Time> times;
       times.reserve(static_cast<std::size_t>(zoomKeys));
-      for (int32_t key = 0; key < zoomKeys; ++key) times.push_back({key, 1});
+      for (std::int32_t key = 0; key < zoomKeys; ++key) times.push_back({key, 1});
       const std::vector<double> values(times.size(), stream.value[0]);
       stream.keys = std::make_unique<KeyColumns>(KeyColumns{KeyTimes(std::move(times)), values});
     }
@@ -88,12 +89,12 @@ void ProjectEditor::setParent(Layer& layer, Layer& parent) {
   ++parent.childCount;
 }
 
-void ProjectEditor::setFlag(Layer& layer, int32_t flag, bool on) {
+void ProjectEditor::setFlag(Layer& layer, std::int32_t flag, bool on) {
   if ((flag & HOST_LAYER_FLAG_3D) != 0) layer.threeDimensional = on;
   if ((flag & HOST_LAYER_FLAG_AIMED) != 0) layer.aimed = on;
 }
 
-void ProjectEditor::setFilm(Layer& camera, int32_t direction, double size) {
+void ProjectEditor::setFilm(Layer& camera, std::int32_t direction, double size) {
   camera.filmDirection = direction;
   camera.filmSize = size;
 }
@@ -101,7 +102,7 @@ void ProjectEditor::setFilm(Layer& camera, int32_t direction, double size) {
 void ProjectEditor::commit(Batch& batch) { commitKeys(batch, batch.stream->keys, &lastTimes_); }
 
 void ProjectEditor::setValue(Stream& stream, const double* value) {
-  for (int32_t i = 0; i < stream.dimension; ++i) stream.value[i] = value[i];
+  for (std::int32_t i = 0; i < stream.dimension; ++i) stream.value[i] = value[i];
 }
 
 bool ProjectEditor::isSameOrAbove(const Layer& layer, const Layer& other) {

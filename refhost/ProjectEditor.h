@@ -2,6 +2,7 @@
 #pragma once
 
 #include <cstddef>
+#include <cstdint>
 #include <string>
 #include <vector>
 
@@ -19,8 +20,8 @@ struct Item {
 
 struct CompositionSettings {
   std::string name;
-  int32_t width = 0;
-  int32_t height = 0;
+  std::int32_t width = 0;
+  std::int32_t height = 0;
   HostRatio pixelAspect{};
   T_Time duration{};
   HostRatio frameRate{};
@@ -43,18 +44,19 @@ class ProjectEditor {
 
   // The layers' streams are there at once, with their defaults. interest is a camera's point of interest.
   Layer& addCameraLayer(Composition& composition, const char* name, const double (&interest)[2],
-                        int32_t zoomKeys);
+                        std::int32_t zoomKeys);
   Layer& addNullLayer(Composition& composition, const char* name);
   Layer& addCompositionLayer(Composition& composition, Composition& source);
 
   static void setParent(Layer& layer, Layer& parent);
-  static void setFlag(Layer& layer, int32_t flag, bool on);  // flags that mean nothing here are forgotten
-  static void setFilm(Layer& camera, int32_t direction, double size);
+  static void setFlag(Layer& layer, std::int32_t flag,
+                      bool on);  // flags that mean nothing here are forgotten
+  static void setFilm(Layer& camera, std::int32_t direction, double size);
   static void setValue(Stream& stream, const double* value);
   void commit(Batch& batch);
 
   // Null when the layer has none of that id.
-  static Stream* findStream(Layer& layer, int32_t id) {
+  static Stream* findStream(Layer& layer, std::int32_t id) {
     const std::size_t place = streamPlace(id);
     if (place == kNoStreamPlace) return nullptr;
     Stream* const found = layer.streams.data() + place;  // or after the last: a zoom is a camera's alone

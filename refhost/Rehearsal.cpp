@@ -32,7 +32,7 @@ std::optional<Integer> integerOf(std::string_view text, Integer least) {
 }
 
 bool complain(std::string* complaint, std::string_view text, std::string_view what) {
-  *complaint = "\"" + std::string(text) + "\": " + std::string(what);
+  *complaint = '"' + std::string(text) + "\": " + std::string(what);
   return false;
 }
 

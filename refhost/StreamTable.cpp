@@ -1,6 +1,7 @@
 #include "refhost/StreamTable.h"
 
 #include <cstddef>
+#include <cstdint>
 
 namespace refhost {
 namespace {
@@ -8,8 +9,8 @@ namespace {
 constexpr double kFullScale = 100.0;  // percent
 
 struct StreamFacts {
-  int32_t id;
-  int32_t dimension;
+  std::int32_t id;
+  std::int32_t dimension;
   double standard;  // the default of each component
   const char* name;
 };
@@ -42,14 +43,14 @@ std::vector<Stream> makeStreams(LayerKind kind) {
   for (std::size_t i = 0; i < count; ++i) {
     streams[i].id = kStreams[i].id;
     streams[i].dimension = kStreams[i].dimension;
-    for (int32_t component = 0; component < kStreams[i].dimension; ++component) {
+    for (std::int32_t component = 0; component < kStreams[i].dimension; ++component) {
       streams[i].value[component] = kStreams[i].standard;
     }
   }
   return streams;
 }
 
-const char* streamName(int32_t id, LayerKind kind) {
+const char* streamName(std::int32_t id, LayerKind kind) {
   if (id == HOST_STREAM_ANCHOR_POINT && kind == LayerKind::Camera) return "point of interest";
   for (const StreamFacts& facts : kStreams) {
     if (facts.id == id) return facts.name;

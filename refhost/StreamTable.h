@@ -17,11 +17,11 @@ std::vector<Stream> makeStreams(LayerKind kind);
 inline constexpr std::uint8_t kNoStreamPlace = 7;
 inline constexpr std::uint8_t kStreamPlaces[] = {
     0, 1, 2, 3, kNoStreamPlace, kNoStreamPlace, kNoStreamPlace, kNoStreamPlace, 4, 5, kNoStreamPlace, 6};
-constexpr std::size_t streamPlace(int32_t id) {
+constexpr std::size_t streamPlace(std::int32_t id) {
   return static_cast<std::uint32_t>(id) < sizeof kStreamPlaces ? kStreamPlaces[id] : kNoStreamPlace;
 }
 
 // "position"; a camera's anchor point is its "point of interest".
-const char* streamName(int32_t id, LayerKind kind);
+const char* streamName(std::int32_t id, LayerKind kind);
 
 }  // namespace refhost

@@ -4,6 +4,7 @@
 #include <gtest/gtest.h>
 
 #include <cstddef>
+#include <cstdint>
 #include <type_traits>
 
 #include "hostapi/FileImportManagerSuite.h"
@@ -18,24 +19,24 @@ constexpr bool kIsPlain = std::is_trivial_v<Value>&& std::is_standard_layout_v<V
 
 TEST(HostTypesTest, ATimeIsASignedValueOverAnUnsignedScale) {
   static_assert(kIsPlain<T_Time> && sizeof(T_Time) == 8);
-  static_assert(std::is_same_v<decltype(T_Time::value), int32_t>);
-  static_assert(std::is_same_v<decltype(T_Time::scale), uint32_t>);
+  static_assert(std::is_same_v<decltype(T_Time::value), std::int32_t>);
+  static_assert(std::is_same_v<decltype(T_Time::scale), std::uint32_t>);
   EXPECT_EQ(offsetof(T_Time, value), 0u);
   EXPECT_EQ(offsetof(T_Time, scale), 4u);
 }
 
 TEST(HostTypesTest, ARatioIsASignedNumeratorOverAnUnsignedDenominator) {
   static_assert(kIsPlain<HostRatio> && sizeof(HostRatio) == 8);
-  static_assert(std::is_same_v<decltype(HostRatio::numerator), int32_t>);
-  static_assert(std::is_same_v<decltype(HostRatio::denominator), uint32_t>);
+  static_assert(std::is_same_v<decltype(HostRatio::numerator), std::int32_t>);
+  static_assert(std::is_same_v<decltype(HostRatio::denominator), std::uint32_t>);
   EXPECT_EQ(offsetof(HostRatio, numerator), 0u);
   EXPECT_EQ(offsetof(HostRatio, denominator), 4u);
 }
 
 TEST(HostTypesTest, CodesUnitsAndImporterIdsHaveTheirWidths) {
-  static_assert(std::is_same_v<HostError, int32_t>);
-  static_assert(std::is_same_v<HostUTF16Unit, uint16_t>);
-  static_assert(std::is_same_v<HostImporterId, int32_t>);
+  static_assert(std::is_same_v<HostError, std::int32_t>);
+  static_assert(std::is_same_v<HostUTF16Unit, std::uint16_t>);
+  static_assert(std::is_same_v<HostImporterId, std::int32_t>);
 }
 
 TEST(HostTypesTest, AStreamValueIsAHandleAndFourDoubles) {

@@ -1,5 +1,8 @@
 // What the services do when there is no memory: each allocation of each is made to fail in turn.
 #include "LimitedMemory.h"
+
+#include <cstdint>
+
 #include "UtilityTest.h"
 
 namespace hostutil_tests {
@@ -153,7 +156,7 @@ TEST_F(ExhaustedMemoryTest, TheLedgerStillNamesTheKinds) {
   {
     const LimitedMemory none(0);
     HostVisitLedger(
-        [](void* context, int32_t, const char* description, int32_t) {
+        [](void* context, std::int32_t, const char* description, std::int32_t) {
           auto* const into = static_cast<Seen*>(context);
           ++into->lines;
           into->isFile = into->isFile || std::string_view(description) == "file";

@@ -4,6 +4,7 @@
 #include <unistd.h>
 
 #include <chrono>
+#include <cstdint>
 #include <filesystem>
 #include <string>
 #include <vector>
@@ -28,7 +29,7 @@ class HostFileSystemTest : public UtilityTest {
   void ExpectNoRegularFile(const std::string& path) {
     HostFile* file = MakeFile(path);
     EXPECT_EQ(HostFileOpen(file, HOST_FILE_READ), HOST_ERR_FILE_OPEN) << path;
-    int64_t size = 9;
+    std::int64_t size = 9;
     EXPECT_EQ(HostFileSize(file, &size), HOST_ERR_FILE_SIZE) << path;
     EXPECT_EQ(size, 0);
     char byte = '?';
@@ -65,21 +66,21 @@ TEST_F(HostFileSystemTest, ALinkToAFileOpens) {
 }
 
 TEST_F(HostFileSystemTest, TwoGigabytesLessOneByteAreTakenAndTwoGigabytesAreNot) {
-  const int64_t most = 2147483647;
+  const std::int64_t most = 2147483647;
   const struct {
-    int64_t size;
+    std::int64_t size;
     HostError code;
   } cases[] = {{most, HOST_ERR_NONE},
                {most + 1, HOST_ERR_FILE_SIZE},
-               {int64_t{1} << 32, HOST_ERR_FILE_SIZE},
-               {(int64_t{1} << 32) + 5, HOST_ERR_FILE_SIZE}};
+               {std::int64_t{1} << 32, HOST_ERR_FILE_SIZE},
+               {(std::int64_t{1} << 32) + 5, HOST_ERR_FILE_SIZE}};
   for (const auto& one : cases) {
     HostFile* file = MakeFile(folder_.WriteSparse("large.ma", one.size));
     for (const bool open : {false, true}) {
       if (open) {
         EXPECT_EQ(HostFileOpen(file, HOST_FILE_READ), HOST_ERR_NONE);
       }
-      int64_t size = 9;
+      std::int64_t size = 9;
       EXPECT_EQ(HostFileSize(file, &size), one.code) << one.size;
       EXPECT_EQ(size, one.code == HOST_ERR_NONE ? one.size : 0);
     }
@@ -90,7 +91,7 @@ TEST_F(HostFileSystemTest, TwoGigabytesLessOneByteAreTakenAndTwoGigabytesAreNot)
 TEST_F(HostFileSystemTest, AFileThatShrinksAfterItsSizeWasAskedIsAShortRead) {
   const std::string path = folder_.Write("scene.ma", std::string(100000, 'x'));
   file_ = MakeFile(path);
-  int64_t size = 0;
+  std::int64_t size = 0;
   ASSERT_EQ(HostFileSize(file_, &size), HOST_ERR_NONE);
   ASSERT_EQ(HostFileOpen(file_, HOST_FILE_READ), HOST_ERR_NONE);
   ASSERT_EQ(truncate(path.c_str(), 70000), 0);
@@ -104,7 +105,7 @@ TEST_F(HostFileSystemTest, AFileThatIsRemovedWhileOpenIsStillSizedAndRead) {
   file_ = MakeFile(path);
   ASSERT_EQ(HostFileOpen(file_, HOST_FILE_READ), HOST_ERR_NONE);
   std::filesystem::remove(path);
-  int64_t size = 0;
+  std::int64_t size = 0;
   EXPECT_EQ(HostFileSize(file_, &size), HOST_ERR_NONE);
   EXPECT_EQ(size, 3);
   char bytes[3];
@@ -132,7 +133,7 @@ TEST_F(HostFileSystemTest, PathsOfAnyBytesAreFoundAgain) {
     HostFile* file = MakeFile(folder_.Write(name, name));
     EXPECT_EQ(HostFileOpen(file, HOST_FILE_READ), HOST_ERR_NONE) << name;
     std::string bytes(name.size(), '?');
-    EXPECT_EQ(HostFileRead(file, static_cast<int64_t>(name.size()), bytes.data()), HOST_ERR_NONE);
+    EXPECT_EQ(HostFileRead(file, static_cast<std::int64_t>(name.size()), bytes.data()), HOST_ERR_NONE);
     EXPECT_EQ(bytes, name);
     EXPECT_EQ(HostFileDispose(file), HOST_ERR_NONE);
   }

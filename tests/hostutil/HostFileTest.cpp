@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include <array>
+#include <cstdint>
 #include <string>
 
 #include "TemporaryFolder.h"
@@ -20,7 +21,7 @@ class HostFileTest : public UtilityTest {
     UtilityTest::TearDown();
   }
 
-  std::string Read(int64_t count) {
+  std::string Read(std::int64_t count) {
     std::string bytes(static_cast<std::size_t>(count), '?');
     EXPECT_EQ(HostFileRead(file_, count, bytes.data()), HOST_ERR_NONE);
     return bytes;
@@ -33,7 +34,7 @@ class HostFileTest : public UtilityTest {
 TEST_F(HostFileTest, AFileIsOpenedSizedReadAndClosed) {
   file_ = MakeFile(folder_.Write("scene.ma", "//Maya ASCII 8.5 scene"));
   ASSERT_EQ(HostFileOpen(file_, HOST_FILE_READ), HOST_ERR_NONE);
-  int64_t size = -1;
+  std::int64_t size = -1;
   EXPECT_EQ(HostFileSize(file_, &size), HOST_ERR_NONE);
   EXPECT_EQ(size, 22);
   EXPECT_EQ(Read(22), "//Maya ASCII 8.5 scene");
@@ -73,7 +74,7 @@ TEST_F(HostFileTest, AFileThatEndsBeforeIsAShortReadAndTheBufferHoldsWhatCame) {
 
 TEST_F(HostFileTest, AnEmptyFileHasSizeZeroAndReadsNoBytes) {
   file_ = MakeFile(folder_.Write("empty.ma", ""));
-  int64_t size = -1;
+  std::int64_t size = -1;
   EXPECT_EQ(HostFileSize(file_, &size), HOST_ERR_NONE);
   EXPECT_EQ(size, 0);
   ASSERT_EQ(HostFileOpen(file_, HOST_FILE_READ), HOST_ERR_NONE);
@@ -92,7 +93,7 @@ TEST_F(HostFileTest, ANegativeCountIsAShortRead) {
 
 TEST_F(HostFileTest, TheSizeIsGivenOpenOrClosed) {
   file_ = MakeFile(folder_.Write("scene.ma", std::string(12345, 'x')));
-  int64_t size = 0;
+  std::int64_t size = 0;
   EXPECT_EQ(HostFileSize(file_, &size), HOST_ERR_NONE);
   EXPECT_EQ(size, 12345);
   ASSERT_EQ(HostFileOpen(file_, HOST_FILE_READ), HOST_ERR_NONE);
@@ -103,7 +104,7 @@ TEST_F(HostFileTest, TheSizeIsGivenOpenOrClosed) {
 
 TEST_F(HostFileTest, OnlyTheReadingModeOpens) {
   file_ = MakeFile(folder_.Write("scene.ma", "abc"));
-  for (const int32_t mode : {0, 2, -1}) EXPECT_EQ(HostFileOpen(file_, mode), HOST_ERR_FILE_OPEN) << mode;
+  for (const std::int32_t mode : {0, 2, -1}) EXPECT_EQ(HostFileOpen(file_, mode), HOST_ERR_FILE_OPEN) << mode;
   EXPECT_EQ(HostFileOpen(file_, HOST_FILE_READ), HOST_ERR_NONE);
 }
 
@@ -170,7 +171,7 @@ TEST_F(HostFileTest, AnOpenFileCanBeDisposedOf) {
 
 // Every operation on a handle that is none.
 void ExpectRefused(HostFile* file) {
-  int64_t size = 9;
+  std::int64_t size = 9;
   char byte = '?';
   auto* name = reinterpret_cast<UTF16String*>(1);
   EXPECT_EQ(HostFileOpen(file, HOST_FILE_READ), HOST_ERR_UTILITY_NULL);

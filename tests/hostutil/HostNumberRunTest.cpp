@@ -2,6 +2,7 @@
 // are plain is the scanner's (tests/scan/PlainNumberTest.cpp).
 #include <gtest/gtest.h>
 
+#include <cstdint>
 #include <new>
 #include <stdexcept>
 #include <string>
@@ -14,25 +15,25 @@
 namespace hostutil_tests {
 namespace {
 
-constexpr int64_t kCapacity = 64;
+constexpr std::int64_t kCapacity = 64;
 constexpr double kUntouched = 4711.25;
 
 // What a call left behind, also when it threw.
 struct Numbers {
   HostError code = -1;
   std::vector<double> values;
-  int64_t taken = -1;  // bytes up to *after
+  std::int64_t taken = -1;  // bytes up to *after
   bool nothingElseWritten = true;
 };
 
 class HostNumberRunTest : public UtilityTest {
  protected:
   // The page after the text may not be touched, so that a byte too far ends the program.
-  Numbers Scan(const std::string& text, int64_t capacity = kCapacity, char terminator = ';') {
+  Numbers Scan(const std::string& text, std::int64_t capacity = kCapacity, char terminator = ';') {
     const testsupport::GuardedText guarded(text);
     std::vector<double> numbers(static_cast<std::size_t>(kCapacity), kUntouched);
     const char* after = nullptr;
-    int64_t count = -1;
+    std::int64_t count = -1;
     Numbers run;
     try {
       run.code = HostNumberScanRun(guarded.begin(), guarded.end(), terminator, numbers.data(), capacity,
@@ -43,7 +44,7 @@ class HostNumberRunTest : public UtilityTest {
       run.code = -3;
     }
     run.taken = after - guarded.begin();
-    for (int64_t i = 0; i < kCapacity; ++i) {
+    for (std::int64_t i = 0; i < kCapacity; ++i) {
       const double number = numbers[static_cast<std::size_t>(i)];
       if (i < count) {
         run.values.push_back(number);
@@ -100,13 +101,13 @@ TEST_F(HostNumberRunTest, EveryNumberThatIsTakenCountsAsOneScan) {
   EXPECT_EQ(HostUtilityCallCount(HOST_UTILITY_NumberScan), 7);
 }
 
-constexpr int64_t kNumbers = 5;
+constexpr std::int64_t kNumbers = 5;
 const char* const kText = "1 2.5\n-3 4 5;";
 const Values kValues = {1, 2.5, -3, 4, 5};
-constexpr int64_t kPlaces[] = {0, 1, 5, 8, 10, 12};  // after so many numbers
+constexpr std::int64_t kPlaces[] = {0, 1, 5, 8, 10, 12};  // after so many numbers
 
 TEST_F(HostNumberRunTest, EveryNumberCanFailAndThoseBeforeItAreHandedOut) {
-  for (int64_t nth = 1; nth <= kNumbers; ++nth) {
+  for (std::int64_t nth = 1; nth <= kNumbers; ++nth) {
     WithFailure({HOST_UTILITY_NumberScan, nth, 4711, HOST_THROW_NOTHING}, [&] {
       const Numbers run = Scan(kText);
       EXPECT_EQ(run.code, 4711) << nth;
@@ -119,8 +120,8 @@ TEST_F(HostNumberRunTest, EveryNumberCanFailAndThoseBeforeItAreHandedOut) {
 }
 
 TEST_F(HostNumberRunTest, EveryNumberCanThrowAndThoseBeforeItAreHandedOut) {
-  for (int64_t nth = 1; nth <= kNumbers; ++nth) {
-    for (const int32_t thrown : {HOST_THROW_BAD_ALLOC, HOST_THROW_RUNTIME_ERROR}) {
+  for (std::int64_t nth = 1; nth <= kNumbers; ++nth) {
+    for (const std::int32_t thrown : {HOST_THROW_BAD_ALLOC, HOST_THROW_RUNTIME_ERROR}) {
       WithFailure({HOST_UTILITY_NumberScan, nth, 4711, thrown}, [&] {
         const Numbers run = Scan(kText);
         EXPECT_EQ(run.code, thrown == HOST_THROW_BAD_ALLOC ? -2 : -3) << nth;
@@ -133,7 +134,7 @@ TEST_F(HostNumberRunTest, EveryNumberCanThrowAndThoseBeforeItAreHandedOut) {
 }
 
 TEST_F(HostNumberRunTest, WithCodeZeroANumberIsZeroAndTheReadingGoesOn) {
-  for (int64_t nth = 1; nth <= kNumbers; ++nth) {
+  for (std::int64_t nth = 1; nth <= kNumbers; ++nth) {
     WithFailure({HOST_UTILITY_NumberScan, nth, 0, HOST_THROW_NOTHING}, [&] {
       Values expected = kValues;
       expected[static_cast<std::size_t>(nth - 1)] = 0;

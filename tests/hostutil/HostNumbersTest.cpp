@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include <cmath>
+#include <cstdint>
 #include <limits>
 
 #include "UtilityTest.h"
@@ -31,8 +32,8 @@ TEST(HostNumberScanTest, NullPointersAndNegativeLengthsAreRefused) {
   EXPECT_EQ(value, kUntouched);
 }
 
-int32_t Order(const HostRatio& a, const HostRatio& b) {
-  int32_t order = 9;
+std::int32_t Order(const HostRatio& a, const HostRatio& b) {
+  std::int32_t order = 9;
   EXPECT_EQ(HostRatioCompare(&a, &b, &order), HOST_ERR_NONE);
   return order;
 }
@@ -48,7 +49,7 @@ TEST(HostRatioCompareTest, RatiosAreComparedByValue) {
 }
 
 TEST(HostRatioCompareTest, TheLargestValuesAreComparedExactly) {
-  const uint32_t largest = UINT32_MAX;
+  const std::uint32_t largest = UINT32_MAX;
   EXPECT_EQ(Order({INT32_MAX, largest}, {INT32_MAX, largest - 1}), -1);
   EXPECT_EQ(Order({INT32_MIN, largest}, {INT32_MIN, largest - 1}), 1);
   EXPECT_EQ(Order({INT32_MIN, 1}, {INT32_MAX, largest}), -1);
@@ -60,7 +61,7 @@ TEST(HostRatioCompareTest, TheLargestValuesAreComparedExactly) {
 TEST(HostRatioCompareTest, AZeroDenominatorIsOutOfRangeAndTheOrderStays) {
   const HostRatio sound{1, 1};
   const HostRatio broken{1, 0};
-  int32_t order = 9;
+  std::int32_t order = 9;
   EXPECT_EQ(HostRatioCompare(&sound, &broken, &order), HOST_ERR_NUMBER_RANGE);
   EXPECT_EQ(HostRatioCompare(&broken, &sound, &order), HOST_ERR_NUMBER_RANGE);
   EXPECT_EQ(order, 9);

@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include <cstdint>
 #include <string>
 
 #include "UtilityTest.h"
@@ -9,7 +10,7 @@
 namespace hostutil_tests {
 namespace {
 
-constexpr int64_t kBuffer = 1024;
+constexpr std::int64_t kBuffer = 1024;
 
 class HostStringsTest : public UtilityTest {
  protected:
@@ -209,7 +210,7 @@ TEST(HostStringFormatTest, ANullArgumentCountsAsTheEmptyText) {
 TEST(HostStringFormatTest, EveryLengthUpToTheBufferFitsAndNoLongerOne) {
   const std::string argument(10, 'x');
   const std::string whole = "abc" + argument + "def" + argument;
-  for (int64_t capacity = 1; capacity <= 40; ++capacity) {
+  for (std::int64_t capacity = 1; capacity <= 40; ++capacity) {
     std::string buffer(41, '?');
     const HostError code =
         HostStringFormat(buffer.data(), capacity, "abc^^1def^^2", argument.c_str(), argument.c_str());

@@ -5,6 +5,7 @@
 
 #include <cerrno>
 #include <cstdarg>
+#include <cstdint>
 #include <string>
 
 #include "TemporaryFolder.h"
@@ -66,7 +67,7 @@ class InterruptedFileTest : public UtilityTest {
     UtilityTest::TearDown();
   }
 
-  std::string Read(int64_t count, HostError expected = HOST_ERR_NONE) {
+  std::string Read(std::int64_t count, HostError expected = HOST_ERR_NONE) {
     std::string bytes(static_cast<std::size_t>(count), '?');
     EXPECT_EQ(HostFileRead(file_, count, bytes.data()), expected);
     return bytes;

@@ -5,6 +5,7 @@
 
 #include <cerrno>
 #include <cstdarg>
+#include <cstdint>
 #include <cstring>
 #include <vector>
 
@@ -34,7 +35,7 @@ extern "C" __attribute__((visibility("default"))) void* mremap(void* block, size
 namespace hostutil_tests {
 namespace {
 
-constexpr int64_t kMegabyte = int64_t{1} << 20;
+constexpr std::int64_t kMegabyte = std::int64_t{1} << 20;
 
 // A list of five records of a megabyte each, which takes three large pages of two.
 class LargeListsTest : public UtilityTest {
@@ -42,7 +43,7 @@ class LargeListsTest : public UtilityTest {
   void SetUp() override {
     ASSERT_EQ(RecordListCreate(kMegabyte, 1, 0, &list_), HOST_ERR_NONE);
     RecordListReserve(list_, kRecords);
-    for (int64_t i = 0; i < kRecords; ++i) ASSERT_EQ(Append(i), HOST_ERR_NONE);
+    for (std::int64_t i = 0; i < kRecords; ++i) ASSERT_EQ(Append(i), HOST_ERR_NONE);
     first_ = RecordListPeek(list_, 0);
   }
   void TearDown() override {
@@ -50,21 +51,21 @@ class LargeListsTest : public UtilityTest {
     UtilityTest::TearDown();
   }
 
-  static std::vector<unsigned char> Record(int64_t number) {
+  static std::vector<unsigned char> Record(std::int64_t number) {
     return std::vector<unsigned char>(kMegabyte, static_cast<unsigned char>(number + 1));
   }
-  HostError Append(int64_t number) { return RecordListAppend(list_, Record(number).data()); }
+  HostError Append(std::int64_t number) { return RecordListAppend(list_, Record(number).data()); }
 
-  void ExpectRecords(int64_t count) {
-    int64_t counted = 0;
+  void ExpectRecords(std::int64_t count) {
+    std::int64_t counted = 0;
     EXPECT_EQ(RecordListCount(list_, &counted), HOST_ERR_NONE);
     EXPECT_EQ(counted, count);
-    for (int64_t i = 0; i < count; ++i) {
+    for (std::int64_t i = 0; i < count; ++i) {
       EXPECT_EQ(std::memcmp(RecordListPeek(list_, i), Record(i).data(), kMegabyte), 0) << i;
     }
   }
 
-  static constexpr int64_t kRecords = 5;
+  static constexpr std::int64_t kRecords = 5;
   RecordList* list_ = nullptr;
   const void* first_ = nullptr;
 };
@@ -77,12 +78,12 @@ TEST_F(LargeListsTest, AListGrowsInItsPlaceUpToTheEndOfItsLastPage) {
 }
 
 TEST_F(LargeListsTest, AListThatGrowsBeyondItTakesItsRecordsAlong) {
-  for (int64_t i = kRecords; i < 3 * kRecords; ++i) ASSERT_EQ(Append(i), HOST_ERR_NONE);
+  for (std::int64_t i = kRecords; i < 3 * kRecords; ++i) ASSERT_EQ(Append(i), HOST_ERR_NONE);
   ExpectRecords(3 * kRecords);
 }
 
 TEST_F(LargeListsTest, AListForWhichThereAreNoAddressesStaysAsItIs) {
-  constexpr int64_t kBeyondTheAddressSpace = int64_t{1} << 42;
+  constexpr std::int64_t kBeyondTheAddressSpace = std::int64_t{1} << 42;
   RecordListReserve(list_, kBeyondTheAddressSpace);
   EXPECT_EQ(RecordListAppendRun(list_, first_, kBeyondTheAddressSpace), HOST_ERR_LIST_MEMORY);
   EXPECT_EQ(RecordListPeek(list_, 0), first_);

@@ -1,5 +1,6 @@
 #include <gtest/gtest.h>
 
+#include <cstdint>
 #include <string>
 #include <vector>
 
@@ -11,7 +12,7 @@ namespace {
 
 class LedgerTest : public UtilityTest {};
 
-RecordList* MakeList(int64_t recordSize, int64_t initial) {
+RecordList* MakeList(std::int64_t recordSize, std::int64_t initial) {
   RecordList* list = nullptr;
   EXPECT_EQ(RecordListCreate(recordSize, 10, initial, &list), HOST_ERR_NONE);
   return list;

@@ -1,14 +1,15 @@
 #include "LimitedMemory.h"
 
+#include <cstdint>
 #include <cstdlib>
 #include <new>
 
 namespace {
 
-constexpr int64_t kUnlimited = -1;
+constexpr std::int64_t kUnlimited = -1;
 
-int64_t allocationsLeft = kUnlimited;
-int64_t refused = 0;
+std::int64_t allocationsLeft = kUnlimited;
+std::int64_t refused = 0;
 
 }  // namespace
 
@@ -36,13 +37,13 @@ void operator delete(void* memory, std::size_t) noexcept { std::free(memory); }
 
 namespace hostutil_tests {
 
-LimitedMemory::LimitedMemory(int64_t allocations) {
+LimitedMemory::LimitedMemory(std::int64_t allocations) {
   allocationsLeft = allocations;
   refused = 0;
 }
 
 LimitedMemory::~LimitedMemory() { allocationsLeft = kUnlimited; }
 
-int64_t RefusedAllocations() { return refused; }
+std::int64_t RefusedAllocations() { return refused; }
 
 }  // namespace hostutil_tests

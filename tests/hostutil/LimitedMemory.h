@@ -8,13 +8,13 @@ namespace hostutil_tests {
 // While it lives, that many allocations by operator new succeed, and all others throw std::bad_alloc.
 class LimitedMemory {
  public:
-  explicit LimitedMemory(int64_t allocations);
+  explicit LimitedMemory(std::int64_t allocations);
   ~LimitedMemory();
   LimitedMemory(const LimitedMemory&) = delete;
   LimitedMemory& operator=(const LimitedMemory&) = delete;
 };
 
 // How many allocations the last LimitedMemory refused.
-int64_t RefusedAllocations();
+std::int64_t RefusedAllocations();
 
 }  // namespace hostutil_tests

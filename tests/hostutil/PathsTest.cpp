@@ -1,5 +1,6 @@
 #include <gtest/gtest.h>
 
+#include <cstdint>
 #include <string>
 #include <vector>
 
@@ -12,7 +13,7 @@ namespace {
 using Units = std::vector<HostUTF16Unit>;
 
 Units PathUnits(const std::string& path) {
-  const int64_t length = HostPathToUnits(path.c_str(), nullptr, 0);
+  const std::int64_t length = HostPathToUnits(path.c_str(), nullptr, 0);
   Units units(static_cast<std::size_t>(length) + 1, 0x7777);
   EXPECT_EQ(HostPathToUnits(path.c_str(), units.data(), length + 1), length);
   EXPECT_EQ(units.back(), 0);
@@ -22,7 +23,7 @@ Units PathUnits(const std::string& path) {
 
 std::string ShownUnits(Units units) {
   units.push_back(0);
-  const int64_t length = HostUnitsToShownText(units.data(), nullptr, 0);
+  const std::int64_t length = HostUnitsToShownText(units.data(), nullptr, 0);
   std::string text(static_cast<std::size_t>(length) + 1, '?');
   EXPECT_EQ(HostUnitsToShownText(units.data(), text.data(), length + 1), length);
   text.pop_back();
@@ -117,7 +118,7 @@ TEST(PathsTest, ASmallCapacityTakesWholeCharactersAndTheirNul) {
   const std::size_t wholeCharactersAt[] = {0, 0, 1, 1, 3, 4, 4};  // units written at each capacity
   for (std::size_t capacity = 0; capacity <= 6; ++capacity) {
     Units units(8, 0x7777);
-    EXPECT_EQ(HostPathToUnits(path, units.data(), static_cast<int64_t>(capacity)), 4);
+    EXPECT_EQ(HostPathToUnits(path, units.data(), static_cast<std::int64_t>(capacity)), 4);
     const std::size_t written = wholeCharactersAt[capacity];
     for (std::size_t i = 0; i < written; ++i) EXPECT_EQ(units[i], whole[i]);
     if (capacity > 0) {
@@ -128,7 +129,7 @@ TEST(PathsTest, ASmallCapacityTakesWholeCharactersAndTheirNul) {
   const std::size_t bytesAt[] = {0, 0, 1, 1, 1, 1, 5, 6};
   for (std::size_t capacity = 0; capacity <= 7; ++capacity) {
     std::string text(9, '?');
-    EXPECT_EQ(HostUnitsToShownText(whole.data(), text.data(), static_cast<int64_t>(capacity)), 6);
+    EXPECT_EQ(HostUnitsToShownText(whole.data(), text.data(), static_cast<std::int64_t>(capacity)), 6);
     EXPECT_EQ(text.substr(0, bytesAt[capacity]), std::string(path).substr(0, bytesAt[capacity]));
     if (capacity > 0) {
       EXPECT_EQ(text[bytesAt[capacity]], '\0') << capacity;

@@ -15,13 +15,13 @@ namespace {
 class RecordListGrowthTest : public UtilityTest {};
 
 TEST_F(RecordListGrowthTest, TheGrowthStepIsAMinimum) {
-  for (const int64_t growth : {1, 10, 1000, 100000}) {
+  for (const std::int64_t growth : {1, 10, 1000, 100000}) {
     RecordList* list = nullptr;
     ASSERT_EQ(RecordListCreate(16, growth, 0, &list), HOST_ERR_NONE);
     const std::array<double, 2> record{1, 2};
     ASSERT_EQ(RecordListAppend(list, record.data()), HOST_ERR_NONE);
     const void* first = RecordListPeek(list, 0);
-    for (int64_t i = 1; i < growth; ++i) ASSERT_EQ(RecordListAppend(list, record.data()), HOST_ERR_NONE);
+    for (std::int64_t i = 1; i < growth; ++i) ASSERT_EQ(RecordListAppend(list, record.data()), HOST_ERR_NONE);
     EXPECT_EQ(RecordListPeek(list, 0), first) << "one step holds " << growth << " records";
     EXPECT_EQ(RecordListDispose(list), HOST_ERR_NONE);
   }
@@ -62,16 +62,16 @@ TEST_F(RecordListGrowthTest, AMillionAppendsGrowTheListAFewTimesOnly) {
 }
 
 TEST_F(RecordListGrowthTest, AListOfManyMegabytesKeepsItsRecordsAsItGrows) {
-  constexpr int64_t kRecords = 5000;
+  constexpr std::int64_t kRecords = 5000;
   constexpr std::size_t kSize = 10000;  // 50 MB in all
   RecordList* list = nullptr;
   ASSERT_EQ(RecordListCreate(kSize, 1, 0, &list), HOST_ERR_NONE);
   std::vector<unsigned char> record(kSize);
-  for (int64_t i = 0; i < kRecords; ++i) {
+  for (std::int64_t i = 0; i < kRecords; ++i) {
     std::fill(record.begin(), record.end(), static_cast<unsigned char>(i % 251 + 1));
     ASSERT_EQ(RecordListAppend(list, record.data()), HOST_ERR_NONE);
   }
-  for (int64_t i = 0; i < kRecords; ++i) {
+  for (std::int64_t i = 0; i < kRecords; ++i) {
     ASSERT_EQ(RecordListGet(list, i, record.data()), HOST_ERR_NONE);
     ASSERT_EQ(std::count(record.begin(), record.end(), static_cast<unsigned char>(i % 251 + 1)),
               static_cast<std::ptrdiff_t>(kSize))
@@ -83,7 +83,7 @@ TEST_F(RecordListGrowthTest, AListOfManyMegabytesKeepsItsRecordsAsItGrows) {
 TEST_F(RecordListGrowthTest, EveryRecordSizeIsKeptByteForByte) {
   for (std::size_t size = 1; size <= 300; ++size) {
     RecordList* list = nullptr;
-    ASSERT_EQ(RecordListCreate(static_cast<int64_t>(size), 3, 0, &list), HOST_ERR_NONE);
+    ASSERT_EQ(RecordListCreate(static_cast<std::int64_t>(size), 3, 0, &list), HOST_ERR_NONE);
     for (int i = 0; i < 10; ++i) {
       std::vector<unsigned char> record(size);
       for (std::size_t at = 0; at < size; ++at) {
@@ -102,10 +102,10 @@ TEST_F(RecordListGrowthTest, EveryRecordSizeIsKeptByteForByte) {
 TEST_F(RecordListGrowthTest, InitialRecordsAreThereAndZero) {
   RecordList* list = nullptr;
   ASSERT_EQ(RecordListCreate(24, 1, 7, &list), HOST_ERR_NONE);
-  int64_t count = 0;
+  std::int64_t count = 0;
   ASSERT_EQ(RecordListCount(list, &count), HOST_ERR_NONE);
   EXPECT_EQ(count, 7);
-  for (int64_t i = 0; i < 7; ++i) {
+  for (std::int64_t i = 0; i < 7; ++i) {
     std::array<unsigned char, 24> record;
     record.fill(0xAA);
     ASSERT_EQ(RecordListGet(list, i, record.data()), HOST_ERR_NONE);
@@ -123,7 +123,7 @@ TEST_F(RecordListGrowthTest, InitialRecordsAreThereAndZero) {
 
 TEST_F(RecordListGrowthTest, SizesOutOfRangeAreRefused) {
   const struct {
-    int64_t recordSize, growth, initial;
+    std::int64_t recordSize, growth, initial;
   } cases[] = {
       {0, 10, 0},
       {-1, 10, 0},
@@ -133,7 +133,7 @@ TEST_F(RecordListGrowthTest, SizesOutOfRangeAreRefused) {
       {16, 10, INT64_MAX},
       {INT64_MAX, 1, 2},
       {INT64_MIN, INT64_MIN, INT64_MIN},
-      {int64_t{1} << 62, 1, 2},
+      {std::int64_t{1} << 62, 1, 2},
       {2, 10, INT64_MAX / 2 + 1},
   };
   for (const auto& one : cases) {
@@ -146,20 +146,20 @@ TEST_F(RecordListGrowthTest, SizesOutOfRangeAreRefused) {
 
 TEST_F(RecordListGrowthTest, WithoutTheMemoryForTheInitialRecordsThereIsNoList) {
   RecordList* list = nullptr;
-  EXPECT_EQ(RecordListCreate(int64_t{1} << 20, 1, int64_t{1} << 42, &list), HOST_ERR_LIST_MEMORY);
+  EXPECT_EQ(RecordListCreate(std::int64_t{1} << 20, 1, std::int64_t{1} << 42, &list), HOST_ERR_LIST_MEMORY);
   EXPECT_EQ(list, nullptr);
   EXPECT_TRUE(Ledger().empty());
 }
 
 TEST_F(RecordListGrowthTest, AListThatCannotGrowStaysAsItIs) {
   // The first step overflows the address space, the second only the memory.
-  for (const int64_t growth : {INT64_MAX, INT64_MAX / 16 + 1, int64_t{1} << 57}) {
+  for (const std::int64_t growth : {INT64_MAX, INT64_MAX / 16 + 1, std::int64_t{1} << 57}) {
     RecordList* list = nullptr;
     ASSERT_EQ(RecordListCreate(16, growth, 2, &list), HOST_ERR_NONE);
     const void* first = RecordListPeek(list, 0);
     const std::array<double, 2> record{3, 4};
     EXPECT_EQ(RecordListAppend(list, record.data()), HOST_ERR_LIST_MEMORY) << growth;
-    int64_t count = 0;
+    std::int64_t count = 0;
     EXPECT_EQ(RecordListCount(list, &count), HOST_ERR_NONE);
     EXPECT_EQ(count, 2);
     EXPECT_EQ(RecordListPeek(list, 0), first);

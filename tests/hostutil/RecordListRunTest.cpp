@@ -12,18 +12,18 @@ namespace {
 
 class RecordListRunTest : public UtilityTest {
  protected:
-  void SetUp() override { ASSERT_EQ(RecordListCreate(sizeof(int64_t), 4, 0, &list_), HOST_ERR_NONE); }
+  void SetUp() override { ASSERT_EQ(RecordListCreate(sizeof(std::int64_t), 4, 0, &list_), HOST_ERR_NONE); }
   void TearDown() override {
     EXPECT_EQ(RecordListDispose(list_), HOST_ERR_NONE);
     UtilityTest::TearDown();
   }
 
-  std::vector<int64_t> Records() const {
-    int64_t count = 0;
+  std::vector<std::int64_t> Records() const {
+    std::int64_t count = 0;
     EXPECT_EQ(RecordListCount(list_, &count), HOST_ERR_NONE);
-    std::vector<int64_t> records;
-    for (int64_t i = 0; i < count; ++i) {
-      records.push_back(*static_cast<const int64_t*>(RecordListPeek(list_, i)));
+    std::vector<std::int64_t> records;
+    for (std::int64_t i = 0; i < count; ++i) {
+      records.push_back(*static_cast<const std::int64_t*>(RecordListPeek(list_, i)));
     }
     return records;
   }
@@ -32,21 +32,21 @@ class RecordListRunTest : public UtilityTest {
 };
 
 TEST_F(RecordListRunTest, ARunIsAppendedInItsOrder) {
-  const std::array<int64_t, 3> first = {1, 2, 3};
-  const std::array<int64_t, 9> second = {4, 5, 6, 7, 8, 9, 10, 11, 12};
+  const std::array<std::int64_t, 3> first = {1, 2, 3};
+  const std::array<std::int64_t, 9> second = {4, 5, 6, 7, 8, 9, 10, 11, 12};
   ASSERT_EQ(RecordListAppendRun(list_, first.data(), 3), HOST_ERR_NONE);
   ASSERT_EQ(RecordListAppendRun(list_, second.data(), 9), HOST_ERR_NONE);
-  EXPECT_EQ(Records(), (std::vector<int64_t>{1, 2, 3, 4, 5, 6, 7, 8, 9, 10, 11, 12}));
+  EXPECT_EQ(Records(), (std::vector<std::int64_t>{1, 2, 3, 4, 5, 6, 7, 8, 9, 10, 11, 12}));
 }
 
 TEST_F(RecordListRunTest, ARunOfNoneChangesNothing) {
-  const int64_t record = 1;
+  const std::int64_t record = 1;
   EXPECT_EQ(RecordListAppendRun(list_, &record, 0), HOST_ERR_NONE);
   EXPECT_TRUE(Records().empty());
 }
 
 TEST_F(RecordListRunTest, WhatIsNoRunIsRefused) {
-  const int64_t record = 1;
+  const std::int64_t record = 1;
   EXPECT_EQ(RecordListAppendRun(nullptr, &record, 1), HOST_ERR_UTILITY_NULL);
   EXPECT_EQ(RecordListAppendRun(list_, nullptr, 1), HOST_ERR_UTILITY_NULL);
   EXPECT_EQ(RecordListAppendRun(list_, &record, -1), HOST_ERR_UTILITY_NULL);
@@ -54,16 +54,16 @@ TEST_F(RecordListRunTest, WhatIsNoRunIsRefused) {
 }
 
 TEST_F(RecordListRunTest, ARunThatDoesNotFitTheMemoryChangesNothing) {
-  const int64_t record = 1;
+  const std::int64_t record = 1;
   ASSERT_EQ(RecordListAppend(list_, &record), HOST_ERR_NONE);
   EXPECT_EQ(RecordListAppendRun(list_, &record, INT64_MAX), HOST_ERR_LIST_MEMORY);
   EXPECT_EQ(RecordListAppendRun(list_, &record, INT64_MAX / 8), HOST_ERR_LIST_MEMORY);
-  EXPECT_EQ(RecordListAppendRun(list_, &record, int64_t{1} << 58), HOST_ERR_LIST_MEMORY);
-  EXPECT_EQ(Records(), (std::vector<int64_t>{1}));
+  EXPECT_EQ(RecordListAppendRun(list_, &record, std::int64_t{1} << 58), HOST_ERR_LIST_MEMORY);
+  EXPECT_EQ(Records(), (std::vector<std::int64_t>{1}));
 }
 
 TEST_F(RecordListRunTest, ALockedListTakesNoRunAndMakesNoRoom) {
-  const std::array<int64_t, 2> run = {1, 2};
+  const std::array<std::int64_t, 2> run = {1, 2};
   ASSERT_EQ(RecordListAppendRun(list_, run.data(), 2), HOST_ERR_NONE);
   void* address = nullptr;
   ASSERT_EQ(RecordListLock(list_, 0, &address), HOST_ERR_NONE);
@@ -71,33 +71,33 @@ TEST_F(RecordListRunTest, ALockedListTakesNoRunAndMakesNoRoom) {
   RecordListReserve(list_, 1000000);
   EXPECT_EQ(RecordListPeek(list_, 0), address);
   ASSERT_EQ(RecordListUnlock(list_, 0), HOST_ERR_NONE);
-  EXPECT_EQ(Records(), (std::vector<int64_t>{1, 2}));
+  EXPECT_EQ(Records(), (std::vector<std::int64_t>{1, 2}));
 }
 
 TEST_F(RecordListRunTest, WhatRoomWasMadeForIsAppendedWithoutGrowing) {
-  constexpr int64_t kCount = 100000;
+  constexpr std::int64_t kCount = 100000;
   RecordListReserve(list_, kCount);
   EXPECT_TRUE(Records().empty());
-  const int64_t record = 7;
+  const std::int64_t record = 7;
   ASSERT_EQ(RecordListAppend(list_, &record), HOST_ERR_NONE);
   const void* first = RecordListPeek(list_, 0);
-  for (int64_t i = 1; i < kCount; ++i) ASSERT_EQ(RecordListAppend(list_, &record), HOST_ERR_NONE);
+  for (std::int64_t i = 1; i < kCount; ++i) ASSERT_EQ(RecordListAppend(list_, &record), HOST_ERR_NONE);
   EXPECT_EQ(RecordListPeek(list_, 0), first);
 }
 
 TEST_F(RecordListRunTest, RoomThatCannotBeMadeIsNoFailure) {
-  for (const int64_t count :
-       {INT64_MAX, INT64_MAX / 8, int64_t{1} << 58, int64_t{0}, int64_t{-1}, INT64_MIN}) {
+  for (const std::int64_t count :
+       {INT64_MAX, INT64_MAX / 8, std::int64_t{1} << 58, std::int64_t{0}, std::int64_t{-1}, INT64_MIN}) {
     RecordListReserve(list_, count);
   }
   RecordListReserve(nullptr, 5);
-  const int64_t record = 7;
+  const std::int64_t record = 7;
   EXPECT_EQ(RecordListAppend(list_, &record), HOST_ERR_NONE);
-  EXPECT_EQ(Records(), (std::vector<int64_t>{7}));
+  EXPECT_EQ(Records(), (std::vector<std::int64_t>{7}));
 }
 
 TEST_F(RecordListRunTest, ARunCountsAsOneAppendHoweverLongItIs) {
-  const std::array<int64_t, 3> run = {1, 2, 3};
+  const std::array<std::int64_t, 3> run = {1, 2, 3};
   HostBeginRehearsal();
   EXPECT_EQ(RecordListAppendRun(list_, run.data(), 3), HOST_ERR_NONE);
   EXPECT_EQ(RecordListAppend(list_, run.data()), HOST_ERR_NONE);
@@ -107,18 +107,18 @@ TEST_F(RecordListRunTest, ARunCountsAsOneAppendHoweverLongItIs) {
 }
 
 TEST_F(RecordListRunTest, ARunThatFailsIsAppendedNotEvenInPart) {
-  const std::array<int64_t, 3> run = {1, 2, 3};
+  const std::array<std::int64_t, 3> run = {1, 2, 3};
   WithFailure({HOST_UTILITY_ListAppend, 2, 4711, HOST_THROW_NOTHING}, [&] {
     EXPECT_EQ(RecordListAppendRun(list_, run.data(), 2), HOST_ERR_NONE);
     EXPECT_EQ(RecordListAppendRun(list_, run.data(), 3), 4711);
     EXPECT_EQ(RecordListAppendRun(list_, run.data(), 1), HOST_ERR_NONE);
     EXPECT_EQ(HostUtilityCallCount(HOST_UTILITY_ListAppend), 3);
   });
-  EXPECT_EQ(Records(), (std::vector<int64_t>{1, 2, 1}));
+  EXPECT_EQ(Records(), (std::vector<std::int64_t>{1, 2, 1}));
 }
 
 TEST_F(RecordListRunTest, ARunIsReadWhereItLiesAndCountsAsOneGet) {
-  const std::array<int64_t, 4> records = {3, 5, 7, 9};
+  const std::array<std::int64_t, 4> records = {3, 5, 7, 9};
   ASSERT_EQ(RecordListAppendRun(list_, records.data(), 4), HOST_ERR_NONE);
   HostBeginRehearsal();
   const void* run = nullptr;
@@ -130,9 +130,9 @@ TEST_F(RecordListRunTest, ARunIsReadWhereItLiesAndCountsAsOneGet) {
 }
 
 TEST_F(RecordListRunTest, RecordsThatAreMissingAreNoRun) {
-  const std::array<int64_t, 4> records = {3, 5, 7, 9};
+  const std::array<std::int64_t, 4> records = {3, 5, 7, 9};
   ASSERT_EQ(RecordListAppendRun(list_, records.data(), 4), HOST_ERR_NONE);
-  constexpr std::pair<int64_t, int64_t> kRuns[] = {
+  constexpr std::pair<std::int64_t, std::int64_t> kRuns[] = {
       {-1, 2}, {0, 5},         {4, 1},         {2, 3},         {0, 0},        {4, 0},
       {0, -1}, {INT64_MIN, 1}, {1, INT64_MIN}, {INT64_MAX, 1}, {0, INT64_MAX}};
   for (const auto& [index, count] : kRuns) {

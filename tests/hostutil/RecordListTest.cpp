@@ -30,8 +30,8 @@ class RecordListTest : public UtilityTest {
     }
   }
 
-  int64_t Count() const {
-    int64_t count = -1;
+  std::int64_t Count() const {
+    std::int64_t count = -1;
     EXPECT_EQ(RecordListCount(list_, &count), HOST_ERR_NONE);
     return count;
   }
@@ -78,7 +78,8 @@ TEST_F(RecordListTest, GetCopiesTheRecordOut) {
 
 TEST_F(RecordListTest, AnIndexOutsideTheListIsRefusedAndTheRecordStaysAsItIs) {
   Fill(3);
-  for (const int64_t index : {int64_t{3}, int64_t{-1}, INT64_MAX, INT64_MIN, int64_t{1} << 32}) {
+  for (const std::int64_t index :
+       {std::int64_t{3}, std::int64_t{-1}, INT64_MAX, INT64_MIN, std::int64_t{1} << 32}) {
     Record record{5, 6};
     EXPECT_EQ(RecordListGet(list_, index, &record), HOST_ERR_LIST_INDEX) << index;
     EXPECT_EQ(record.time, 5);
@@ -149,17 +150,17 @@ TEST_F(RecordListTest, LocksNestAndTheAddressStays) {
 TEST_F(RecordListTest, SeveralRecordsCanBeLockedAndAreUnlockedInAnyOrder) {
   Fill(6);
   std::array<void*, 6> addresses{};
-  for (const int64_t index : {4, 1, 4, 2, 2, 0}) {
+  for (const std::int64_t index : {4, 1, 4, 2, 2, 0}) {
     ASSERT_EQ(RecordListLock(list_, index, &addresses[static_cast<std::size_t>(index)]), HOST_ERR_NONE);
   }
   EXPECT_EQ(static_cast<Record*>(addresses[4]) - static_cast<Record*>(addresses[1]), 3);
   EXPECT_EQ(RecordListUnlock(list_, 3), HOST_ERR_LIST_INDEX) << "not locked";
   const Record record{8, 9};
-  for (const int64_t index : {4, 2, 0, 4, 1, 2}) {
+  for (const std::int64_t index : {4, 2, 0, 4, 1, 2}) {
     EXPECT_EQ(RecordListAppend(list_, &record), HOST_ERR_LIST_LOCKED);
     EXPECT_EQ(RecordListUnlock(list_, index), HOST_ERR_NONE) << index;
   }
-  for (const int64_t index : {0, 1, 2, 3, 4, 5}) {
+  for (const std::int64_t index : {0, 1, 2, 3, 4, 5}) {
     EXPECT_EQ(RecordListUnlock(list_, index), HOST_ERR_LIST_INDEX);
   }
   EXPECT_EQ(RecordListAppend(list_, &record), HOST_ERR_NONE);
@@ -203,7 +204,7 @@ TEST_F(RecordListTest, NullPointersAreRefused) {
   Fill(1);
   Record record{};
   void* address = &record;
-  int64_t count = 9;
+  std::int64_t count = 9;
   EXPECT_EQ(RecordListCreate(8, 10, 0, nullptr), HOST_ERR_UTILITY_NULL);
   EXPECT_EQ(RecordListAppend(nullptr, &record), HOST_ERR_UTILITY_NULL);
   EXPECT_EQ(RecordListAppend(list_, nullptr), HOST_ERR_UTILITY_NULL);
@@ -226,7 +227,7 @@ TEST_F(RecordListTest, AnObjectThatIsNoListIsRefused) {
   auto* const other = reinterpret_cast<RecordList*>(memory.data());
   Record record{};
   void* address = nullptr;
-  int64_t count = 0;
+  std::int64_t count = 0;
   EXPECT_EQ(RecordListAppend(other, &record), HOST_ERR_UTILITY_NULL);
   EXPECT_EQ(RecordListGet(other, 0, &record), HOST_ERR_UTILITY_NULL);
   EXPECT_EQ(RecordListLock(other, 0, &address), HOST_ERR_UTILITY_NULL);

@@ -1,6 +1,7 @@
 // Every service made to fail in every way.
 #include <gtest/gtest.h>
 
+#include <cstdint>
 #include <cstring>
 #include <functional>
 #include <memory>
@@ -25,10 +26,10 @@ struct Scene {
     openFile = MakeFile(folder.Path("scene.ma"));
     EXPECT_EQ(HostFileOpen(openFile, HOST_FILE_READ), HOST_ERR_NONE);
     text = MakeText("shot.ma");
-    EXPECT_EQ(RecordListCreate(sizeof(int64_t), 4, 3, &list), HOST_ERR_NONE);
+    EXPECT_EQ(RecordListCreate(sizeof(std::int64_t), 4, 3, &list), HOST_ERR_NONE);
     void* locked = nullptr;
     EXPECT_EQ(RecordListLock(list, 1, &locked), HOST_ERR_NONE);
-    EXPECT_EQ(RecordListCreate(sizeof(int64_t), 4, 3, &openList), HOST_ERR_NONE);
+    EXPECT_EQ(RecordListCreate(sizeof(std::int64_t), 4, 3, &openList), HOST_ERR_NONE);
     EXPECT_EQ(MatrixSetIdentity(&matrix), HOST_ERR_NONE);
     EXPECT_EQ(MatrixTranslate(&matrix, 1, 2, 3), HOST_ERR_NONE);
     before = matrix;
@@ -52,10 +53,10 @@ struct Scene {
   HostStringTable* madeTable = reinterpret_cast<HostStringTable*>(1);
   void* address = reinterpret_cast<void*>(1);
   const void* run = reinterpret_cast<void*>(1);
-  int64_t number = 99;
-  int32_t order = 99;
+  std::int64_t number = 99;
+  std::int32_t order = 99;
   double value = 99;
-  int64_t record = 99;
+  std::int64_t record = 99;
   char buffer[8] = "???????";
   MatrixComponents components{{9, 9, 9}, {9, 9, 9}, {9, 9, 9}, {9, 9, 9}};
 };
@@ -63,7 +64,7 @@ struct Scene {
 // A function of the library as a fault point: how to call it on a scene, and how to see that it did nothing.
 struct FaultPoint {
   const char* function;
-  int32_t service;
+  std::int32_t service;
   std::function<HostError(Scene*)> call;
   std::function<bool(Scene*)> didNothing;  // and handed out null or zero
 };
@@ -76,14 +77,14 @@ bool AllZero(const Record& record) {
 
 bool MatrixUntouched(Scene* s) { return std::memcmp(&s->matrix, &s->before, sizeof s->before) == 0; }
 
-int64_t CountOf(const RecordList* list) {
-  int64_t count = -1;
+std::int64_t CountOf(const RecordList* list) {
+  std::int64_t count = -1;
   EXPECT_EQ(RecordListCount(list, &count), HOST_ERR_NONE);
   return count;
 }
 
-const int64_t kSeven = 7;
-const int64_t kRun[] = {7, 8};
+const std::int64_t kSeven = 7;
+const std::int64_t kRun[] = {7, 8};
 
 const PivotedTransform kPivoted = {{1, 2, 3}, {4, 5, 6}, {7, 8, 9}, {0.1, 0.2, 0.3}, {10, 11, 12}};
 
@@ -211,7 +212,7 @@ void Rehearse(const FaultPoint& point, const HostUtilityFailure& failure) {
   std::vector<std::unique_ptr<Scene>> scenes;
   for (std::size_t i = 0; i < kCalls; ++i) scenes.push_back(std::make_unique<Scene>());
   const auto fails = [&](std::size_t i) {
-    return failure.nth == 0 || failure.nth == static_cast<int64_t>(i) + 1;
+    return failure.nth == 0 || failure.nth == static_cast<std::int64_t>(i) + 1;
   };
   WithFailure(failure, [&] {
     for (std::size_t i = 0; i < kCalls; ++i) {
@@ -228,7 +229,7 @@ void Rehearse(const FaultPoint& point, const HostUtilityFailure& failure) {
         EXPECT_EQ(point.call(scene), failure.code) << "call " << i + 1;
       }
     }
-    EXPECT_EQ(HostUtilityCallCount(point.service), static_cast<int64_t>(kCalls));
+    EXPECT_EQ(HostUtilityCallCount(point.service), static_cast<std::int64_t>(kCalls));
   });
   for (std::size_t i = 0; i < kCalls; ++i) {
     if (fails(i) && failure.thrown != HOST_THROW_NOTHING) continue;
@@ -239,7 +240,7 @@ void Rehearse(const FaultPoint& point, const HostUtilityFailure& failure) {
 
 TEST_F(RehearsalSweepTest, TheNthCallOfEveryServiceReturnsTheCodeAndDoesNothing) {
   for (const FaultPoint& point : FaultPoints()) {
-    for (int64_t nth = 1; nth <= static_cast<int64_t>(kCalls); ++nth) {
+    for (std::int64_t nth = 1; nth <= static_cast<std::int64_t>(kCalls); ++nth) {
       Rehearse(point, {point.service, nth, 4711, HOST_THROW_NOTHING});
     }
   }
@@ -258,7 +259,7 @@ TEST_F(RehearsalSweepTest, WithCodeZeroEveryServiceDoesNothingAndHandsOutNothing
 
 TEST_F(RehearsalSweepTest, EveryServiceCanThrowEveryException) {
   for (const FaultPoint& point : FaultPoints()) {
-    for (const int32_t thrown : {HOST_THROW_BAD_ALLOC, HOST_THROW_RUNTIME_ERROR, HOST_THROW_OTHER}) {
+    for (const std::int32_t thrown : {HOST_THROW_BAD_ALLOC, HOST_THROW_RUNTIME_ERROR, HOST_THROW_OTHER}) {
       Rehearse(point, {point.service, 3, 4711, thrown});
       Rehearse(point, {point.service, 0, 4711, thrown});
     }
@@ -266,7 +267,7 @@ TEST_F(RehearsalSweepTest, EveryServiceCanThrowEveryException) {
 }
 
 TEST_F(RehearsalSweepTest, EveryServiceOfTheTableHasAFaultPoint) {
-  std::set<int32_t> covered;
+  std::set<std::int32_t> covered;
   for (const FaultPoint& point : FaultPoints()) covered.insert(point.service);
   EXPECT_EQ(covered.size(), static_cast<std::size_t>(HOST_UTILITY_COUNT));
 }
@@ -277,7 +278,7 @@ TEST_F(RehearsalSweepTest, AServiceCountsAsItselfOnly) {
     HostBeginRehearsal();
     EXPECT_EQ(point.call(&scene), HOST_ERR_NONE);
     HostEndRehearsal();
-    for (int32_t service = 0; service < HOST_UTILITY_COUNT; ++service) {
+    for (std::int32_t service = 0; service < HOST_UTILITY_COUNT; ++service) {
       EXPECT_EQ(HostUtilityCallCount(service), service == point.service ? 1 : 0) << point.function;
     }
     HostReleaseLeftovers();
@@ -293,7 +294,7 @@ TEST_F(RehearsalSweepTest, ACallWithNullPointersIsAFaultPointToo) {
 }
 
 TEST_F(RehearsalSweepTest, ARehearsedFailureTakesNullPlacesToHandOutTo) {
-  for (int32_t service = 0; service < HOST_UTILITY_COUNT; ++service) {
+  for (std::int32_t service = 0; service < HOST_UTILITY_COUNT; ++service) {
     const HostUtilityFailure failure{service, 0, 4711, HOST_THROW_NOTHING};
     ASSERT_EQ(HostAddUtilityFailure(&failure), HOST_ERR_NONE);
   }
@@ -338,7 +339,7 @@ TEST_F(RehearsalSweepTest, WhatIsNoFaultPointGoesOnUnderEveryFailure) {
   HostStringTable* table = nullptr;
   const char* const entries[] = {"key=text"};
   ASSERT_EQ(HostRegisterStringTable("Sweep", entries, 1, &table), HOST_ERR_NONE);
-  for (int32_t service = 0; service < HOST_UTILITY_COUNT; ++service) {
+  for (std::int32_t service = 0; service < HOST_UTILITY_COUNT; ++service) {
     const HostUtilityFailure failure{service, 0, 0, HOST_THROW_BAD_ALLOC};
     ASSERT_EQ(HostAddUtilityFailure(&failure), HOST_ERR_NONE);
   }
@@ -353,7 +354,7 @@ TEST_F(RehearsalSweepTest, WhatIsNoFaultPointGoesOnUnderEveryFailure) {
   EXPECT_EQ(UTF16StringUnits(scene.text)[0], 's');
   UTF16StringRetain(scene.text);
   UTF16StringRelease(scene.text);
-  for (int32_t service = 0; service < HOST_UTILITY_COUNT; ++service) {
+  for (std::int32_t service = 0; service < HOST_UTILITY_COUNT; ++service) {
     EXPECT_EQ(HostUtilityCallCount(service), 0);
   }
   HostEndRehearsal();

@@ -22,7 +22,7 @@ class TemporaryFolder : public testsupport::TemporaryFolder {
   }
 
   // A file of that size without contents; it takes no room on the disk.
-  std::string WriteSparse(const std::string& name, int64_t size) const {
+  std::string WriteSparse(const std::string& name, std::int64_t size) const {
     Write(name, "");
     EXPECT_EQ(truncate(Path(name).c_str(), size), 0);
     return Path(name);

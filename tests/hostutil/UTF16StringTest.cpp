@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include <cstdint>
 #include <string>
 #include <vector>
 
@@ -14,7 +15,7 @@ using Units = std::vector<HostUTF16Unit>;
 
 class UTF16StringTest : public UtilityTest {};
 
-std::string Stripped(const std::string& name, int32_t flag) {
+std::string Stripped(const std::string& name, std::int32_t flag) {
   UTF16String* text = MakeText(name);
   UTF16String* stripped = nullptr;
   EXPECT_EQ(HostStripExtension(text, flag, &stripped), HOST_ERR_NONE);

@@ -3,6 +3,7 @@
 
 #include <gtest/gtest.h>
 
+#include <cstdint>
 #include <string>
 #include <vector>
 
@@ -14,15 +15,15 @@ namespace hostutil_tests {
 
 // One line of the ledger.
 struct LedgerLine {
-  int32_t kind;
+  std::int32_t kind;
   std::string description;
-  int32_t releaseFailed;
+  std::int32_t releaseFailed;
 };
 
 inline std::vector<LedgerLine> Ledger() {
   std::vector<LedgerLine> lines;
   HostVisitLedger(
-      [](void* context, int32_t kind, const char* description, int32_t releaseFailed) {
+      [](void* context, std::int32_t kind, const char* description, std::int32_t releaseFailed) {
         static_cast<std::vector<LedgerLine>*>(context)->push_back({kind, description, releaseFailed});
       },
       &lines);
@@ -55,7 +56,7 @@ inline std::vector<HostUTF16Unit> UnitsOf(const UTF16String* text) {
 
 // The text as a user is shown it.
 inline std::string Shown(const UTF16String* text) {
-  const int64_t length = HostUnitsToShownText(UTF16StringUnits(text), nullptr, 0);
+  const std::int64_t length = HostUnitsToShownText(UTF16StringUnits(text), nullptr, 0);
   std::string shown(static_cast<std::size_t>(length) + 1, '?');
   HostUnitsToShownText(UTF16StringUnits(text), shown.data(), length + 1);
   shown.pop_back();

@@ -164,6 +164,6 @@ FAULTS = (
     Fault("an output replaces the link that leads to it", "tools/mayascene/OutputFile.cpp",
           "place = placeOf(target).string();",
           "place = placeOf(target).empty() ? std::string() : target;"),
-    Fault("characters that turn the direction of text reach the terminal", "tools/mayascene/TerminalText.cpp",
+    Fault("characters that turn the direction of text reach the terminal", "diag/ShownText.cpp",
           "(point >= 0x2028 && point <= 0x202e)", "(point >= 0x2028 && point <= 0x2029)"),
 )

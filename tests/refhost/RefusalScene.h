@@ -93,7 +93,7 @@ struct Scene {
 };
 
 // Callbacks to register; never called.
-inline HostError someHook(intptr_t) { return 0; }
+inline HostError someHook(std::intptr_t) { return 0; }
 inline HostError someImport(const HostUTF16Unit*, void*, void*, VOR_Item*) { return 0; }
 inline HostError someVerify(const HostUTF16Unit*, void*, std::uint8_t*) { return 0; }
 inline void someNone() {}

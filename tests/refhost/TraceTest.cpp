@@ -1,5 +1,6 @@
 // The trace, compared as whole lines.
 #include <cmath>
+#include <cstdint>
 #include <limits>
 
 #include "refhost/Trace.h"
@@ -78,7 +79,7 @@ TEST(Trace, UtilityAndMemoryCalls) {
           R"({"call":"FreeMemHandle","suite":"QZGP Memory Suite","version":1,"handle":"mem:1","error":0})"));
 }
 
-HostError ignoredHook(intptr_t) { return 0; }
+HostError ignoredHook(std::intptr_t) { return 0; }
 HostError ignoredImport(const HostUTF16Unit*, void*, void*, VOR_Item*) { return 0; }
 HostError ignoredVerify(const HostUTF16Unit*, void*, std::uint8_t*) { return 0; }
 

@@ -61,7 +61,7 @@ std::string ExactDecimal(std::uint64_t significand, int exponent) {
   std::string digits = Digits(limbs);
   const auto fraction = static_cast<std::size_t>(-exponent);
   if (digits.size() <= fraction) digits.insert(0, fraction + 1 - digits.size(), '0');
-  return digits.insert(digits.size() - fraction, ".");
+  return digits.insert(digits.size() - fraction, 1, '.');
 }
 
 }  // namespace scan_tests

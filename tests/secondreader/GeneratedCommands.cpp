@@ -37,7 +37,7 @@ void SceneGenerator::resolution() {
       ":time1", "defaultResolution", ":defaultResolution \"x\"", "\"x\" :defaultResolution", ":", ":;"};
   word(anyCase("select"));
   if (dice_.chance(90)) word("-ne");
-  word(odd() ? dice_.oneOf(kSelects) : ":" + anyCase("defaultResolution"));
+  word(odd() ? dice_.oneOf(kSelects) : ':' + anyCase("defaultResolution"));
   end();
   static constexpr std::string_view kAspects[] = {"1", "1.005", "1.01", "0.9", "2", "0.9091", "1.009", "-1"};
   for (int count = dice_.between(1, 4); count > 0; --count) {

@@ -51,11 +51,11 @@ PlayedLine& PlayedLine::numbers(const char* key, const std::vector<double>& valu
 }
 
 PlayedLine& PlayedLine::pair(const char* key, std::int64_t first, std::int64_t second) {
-  return plain(key, "[" + std::to_string(first) + "," + std::to_string(second) + "]");
+  return plain(key, '[' + std::to_string(first) + ',' + std::to_string(second) + ']');
 }
 
 PlayedLine& PlayedLine::handle(const char* key, const char* kind, Handle number) {
-  return plain(key, number == 0 ? "null" : "\"" + std::string(kind) + ":" + std::to_string(number) + "\"");
+  return plain(key, number == 0 ? "null" : '"' + std::string(kind) + ':' + std::to_string(number) + '"');
 }
 
 PlayedCall::PlayedCall(PlayedHost& host, const char* operation, SuiteName suite)

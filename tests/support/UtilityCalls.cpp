@@ -2,6 +2,7 @@
 
 #include <dlfcn.h>
 
+#include <cstdint>
 #include <utility>
 
 #include "hostutil/UTF16String.h"
@@ -24,7 +25,8 @@ UtilityCalls TakeUtilityCalls() { return std::exchange(noted, {}); }
 
 }  // namespace testsupport
 
-HostError RecordListCreate(int64_t recordSize, int64_t growth, int64_t initial, RecordList** list) {
+HostError RecordListCreate(std::int64_t recordSize, std::int64_t growth, std::int64_t initial,
+                           RecordList** list) {
   noted.created.push_back({recordSize, growth, initial});
   static const auto original = Original<decltype(RecordListCreate)>("RecordListCreate");
   return original(recordSize, growth, initial, list);
@@ -36,7 +38,7 @@ HostError RecordListDispose(RecordList* list) {
   return original(list);
 }
 
-HostError HostStripExtension(const UTF16String* text, int32_t flag, UTF16String** stripped) {
+HostError HostStripExtension(const UTF16String* text, std::int32_t flag, UTF16String** stripped) {
   noted.stripFlags.push_back(flag);
   static const auto original = Original<decltype(HostStripExtension)>("HostStripExtension");
   return original(text, flag, stripped);

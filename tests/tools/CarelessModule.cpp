@@ -2,6 +2,7 @@
 //
 // Importing a file leaves a block of memory behind, shows a message and passes a null handle; its name says
 // the rest: one that ends in "throws" lets an exception out.
+#include <cstdint>
 #include <stdexcept>
 
 #include "hostapi/FileImportManagerSuite.h"
@@ -12,10 +13,10 @@
 namespace {
 
 const WNBasicSuite* basic = nullptr;
-int32_t ownId = 0;
+std::int32_t ownId = 0;
 
 template <typename Suite>
-const Suite* acquire(const char* name, int32_t version) {
+const Suite* acquire(const char* name, std::int32_t version) {
   const void* suite = nullptr;
   return basic->AcquireSuite(name, version, &suite) == 0 ? static_cast<const Suite*>(suite) : nullptr;
 }
@@ -39,7 +40,7 @@ HostError importFile(const HostUTF16Unit* path, void*, void*, VOR_Item*) {
   return 0;
 }
 
-HostError verifyFile(const HostUTF16Unit*, void*, uint8_t* canImport) {
+HostError verifyFile(const HostUTF16Unit*, void*, std::uint8_t* canImport) {
   *canImport = 1;
   return 0;
 }
@@ -47,8 +48,8 @@ HostError verifyFile(const HostUTF16Unit*, void*, uint8_t* canImport) {
 }  // namespace
 
 extern "C" __attribute__((visibility("default"))) HostError GPMain_MayaImport(const WNBasicSuite* basicSuite,
-                                                                              int32_t, int32_t,
-                                                                              int32_t pluginId, void*) {
+                                                                              std::int32_t, std::int32_t,
+                                                                              std::int32_t pluginId, void*) {
   basic = basicSuite;
   ownId = pluginId;
   const auto* manager =

@@ -114,7 +114,7 @@ bool isStill(const refhost::Stream& stream) { return stream.keyCount() < 2 || is
 
 std::string valueText(const refhost::Stream& stream) {
   std::string text;
-  for (int32_t axis = 0; axis < stream.dimension; ++axis) {
+  for (std::int32_t axis = 0; axis < stream.dimension; ++axis) {
     if (axis > 0) text += ", ";
     text += numberText(stream.value[axis]);
   }
