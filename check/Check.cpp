@@ -43,7 +43,7 @@ bool IsTheStopAgain(const diag::Diagnostic& diagnostic, std::uint32_t stopLine) 
 std::set<std::uint32_t> LostParentLines(const diag::Collector& collector) {
   std::set<std::uint32_t> lines;
   for (const diag::Diagnostic& one : collector.kept()) {
-    if (one.code == diag::Code::ParentNotImported) lines.insert(one.place.line);
+    if (one.code == diag::Code::ParentElsewhere) lines.insert(one.place.line);
   }
   return lines;
 }
@@ -57,7 +57,7 @@ bool IsTheLostParentAgain(const diag::Diagnostic& diagnostic, const std::set<std
 void Gather(std::string_view text, const Options& options, diag::Collector* collector, Report* report) {
   const std::uint32_t stopLine = StopLine(*collector);
   std::set<std::uint32_t> lostParents;
-  if (IsWanted(diag::Code::ParentNotImported, options)) lostParents = LostParentLines(*collector);
+  if (IsWanted(diag::Code::ParentElsewhere, options)) lostParents = LostParentLines(*collector);
   for (const diag::Diagnostic& diagnostic : collector->kept()) {
     if (!IsWanted(diagnostic.code, options) || IsTheStopAgain(diagnostic, stopLine) ||
         IsTheLostParentAgain(diagnostic, lostParents)) {
@@ -79,15 +79,27 @@ void Gather(std::string_view text, const Options& options, diag::Collector* coll
   }
 }
 
-void CheckScene(std::string_view text, const CameOver& cameOver, diag::Collector* collector, Head* head) {
-  const scene::Scene scene = scene::Read(text, *collector);
+void CheckScene(std::string_view text, const CameOver& cameOver, const Options& options,
+                diag::Collector* collector, Head* head) {
+  std::vector<scene::NodeNote> notes;
+  const scene::Scene scene = scene::Read(text, *collector, &notes);
   const scene::Settings settings = scene::ReadSettings(scene, *collector);
   const std::vector<Camera> cameras = FindCameras(scene, cameOver);
   *head = ReadHead(scene, settings, cameOver, cameras, collector->lines());
   const motion::Measures measures = motion::MeasuresOf(scene);
   const std::vector<Link> links = FindLinks(scene, cameras);
   Channels channels(scene);
-  const Subject subject{scene, settings, measures, cameOver, cameras, links, channels, *collector};
+  std::set<std::uint64_t> driversSaid;
+  const Subject subject{.scene = scene,
+                        .settings = settings,
+                        .measures = measures,
+                        .cameOver = cameOver,
+                        .cameras = cameras,
+                        .links = links,
+                        .channels = channels,
+                        .diagnostics = *collector,
+                        .driversSaid = options.only.empty() ? &driversSaid : nullptr};
+  ReportNodeNotes(subject, notes);
   if (cameOver.stop == Stop::UnequalKeys) ReportKeyCounts(subject);
   for (const auto rule :
        {ReportLostCameras, ReportLostParents, ReportLostChannels, ReportLostLookAts, ReportNames,
@@ -115,7 +127,7 @@ Report Check(std::string_view text, const CameOver& cameOver, const Options& opt
     default:
       ReportStopInText(text, cameOver, &collector);
   }
-  if (cameOver.stop != Stop::NotAScene) CheckScene(text, cameOver, &collector, &report.head);
+  if (cameOver.stop != Stop::NotAScene) CheckScene(text, cameOver, options, &collector, &report.head);
   Gather(text, options, &collector, &report);
   return report;
 }

@@ -34,6 +34,9 @@ class Lens {
     ReportFactor("lensSqueezeRatio", Code::LensSqueezeLost);
     ReportFactor("cameraScale", Code::CameraScaleLost);
     ReportFit();
+    ReportMotion({"horizontalFilmAperture", motion::Camera().horizontalAperture}, Code::ApertureMotionLost);
+    ReportMotion({"verticalFilmAperture", motion::Camera().verticalAperture}, Code::ApertureMotionLost);
+    ReportMotion({"filmFit", motion::filmfit::kHorizontal}, Code::FitMotionLost);
   }
 
  private:
@@ -61,6 +64,16 @@ class Lens {
     if (const auto factor = Differs({attribute, 1.0})) {
       subject_.diagnostics.Report(code, factor->place, {name(), factor->what});
     }
+  }
+
+  // The importer takes the stored value, whatever drives the attribute.
+  void ReportMotion(const Field& field, Code code) {
+    const auto driver = scene().SourceOf(scene().PlugOf(camera_, field.attribute));
+    if (!driver) return;
+    const auto difference = Differs({field.attribute, Number(field.attribute, field.neutral)});
+    if (!difference) return;
+    if (subject_.driversSaid != nullptr) subject_.driversSaid->insert(difference->place.offset);
+    subject_.diagnostics.Report(code, difference->place, {name(), difference->what});
   }
 
   void ReportFit() {

@@ -28,8 +28,6 @@ void ReportAttributes(const Subject& subject, NodeId camera) {
   const auto add = [&attributes](const char* what) {
     attributes += (attributes.empty() ? "" : ", ") + std::string(what);
   };
-  // The importer knows an orthographic camera by one word alone: with another one it comes over.
-  if (subject.scene.Number(camera, "orthographic").value_or(0.0) != 0.0) add("the orthographic view");
   if (IsOn(subject.scene, camera, "dof") || IsOn(subject.scene, camera, "depthOfField"))
     add("the depth of field");
   if (HasImagePlane(subject.scene, camera)) add("the image plane");
@@ -46,6 +44,9 @@ void ReportCameras(const Subject& subject) {
     const scene::Node& node = subject.scene.node(camera.shape);
     if (camera.layer != nullptr || (camera.taken && subject.cameOver.stop != Stop::None)) {
       ReportAttributes(subject, camera.shape);
+      // The importer knows an orthographic camera by one word alone: with another one it comes over.
+      if (subject.scene.Number(camera.shape, "orthographic").value_or(0.0) != 0.0)
+        subject.diagnostics.Report(Code::OrthographicAsPerspective, node.place, {node.name});
     } else if (scene::IsStartupCamera(node)) {
       if (startup++ == 0) firstStartup = &node;
     } else if (subject.scene.Number(camera.shape, "orthographic").value_or(0.0) != 0.0) {

@@ -57,6 +57,10 @@ void Add(std::string_view channel, std::string* channels) {
   *channels += channel;
 }
 
+void KeepAsSaid(const Subject& subject, const scene::Driver& driver) {
+  if (subject.driversSaid != nullptr) subject.driversSaid->insert(driver.connection->destinationPlace.offset);
+}
+
 // What else than curves drives the node, a diagnostic for each driver.
 void ReportDrivers(const Subject& subject, const Link& link) {
   const scene::Scene& scene = subject.scene;
@@ -71,6 +75,7 @@ void ReportDrivers(const Subject& subject, const Link& link) {
     }
     // Of a camera's look-at its own rule says what became of it.
     if (link.own && link.ofCamera && IsLookAt(type) && channel.starts_with("rotate")) continue;
+    KeepAsSaid(subject, driver);
     Driven& driven = drivers.try_emplace(driver.plug.node, Driven{{}, place}).first->second;
     Add(channel, &driven.channels);
   }
@@ -105,6 +110,7 @@ void ReportFocalLength(const Subject& subject, NodeId camera) {
   const scene::Node& source = scene.node(driver->plug.node);
   const diag::Range place = driver->connection->destinationPlace;
   if (!IsImportedCurve(source.type)) {
+    KeepAsSaid(subject, *driver);
     subject.diagnostics.Report(
         Code::FocalLengthElsewhere, place,
         {scene.node(camera).name, source.name, source.type.empty() ? "in another file" : source.type});

@@ -40,15 +40,18 @@ Range WrittenParent(std::string_view text, const scene::Node& node) {
   return {};
 }
 
+// Stands for a node of another file.
+bool IsFosterParent(const scene::Node& node) { return node.type == "fosterParent"; }
+
 std::string WhereItIs(const scene::Scene& scene, const scene::Node& parent) {
-  if (parent.origin == scene::Origin::Created) return ", a node of the type " + std::string(parent.type);
   for (const scene::Reference& reference : scene.references()) {
     const std::string prefix = std::string(reference.nameSpace) + ':';
-    if (prefix.size() > 1 && parent.name.starts_with(prefix)) {
-      return ", which stands in \"" + std::string(reference.file.substr(0, 200)) + '"';
+    const bool fostered = IsFosterParent(parent) && parent.name.starts_with(reference.node);
+    if (fostered || (prefix.size() > 1 && parent.name.starts_with(prefix))) {
+      return ", but in \"" + std::string(reference.file.substr(0, 200)) + '"';
     }
   }
-  return ", which stands in no file that is known";
+  return ", and in no file that is known";
 }
 
 void ReportParent(const Subject& subject, const scene::Node& node) {
@@ -61,9 +64,11 @@ void ReportParent(const Subject& subject, const scene::Node& node) {
   const Range place = written == Range{} ? node.place : written;
   if (path.find('|') != std::string_view::npos) {
     subject.diagnostics.Report(Code::ParentIsPath, place, {node.name, path});
-  } else if (parent.origin != scene::Origin::Created || !IsImportedTransform(parent.type)) {
-    subject.diagnostics.Report(Code::ParentNotImported, place,
+  } else if (parent.origin != scene::Origin::Created || IsFosterParent(parent)) {
+    subject.diagnostics.Report(Code::ParentElsewhere, place,
                                {node.name, parent.name, WhereItIs(scene, parent)});
+  } else if (!IsImportedTransform(parent.type)) {
+    subject.diagnostics.Report(Code::ParentNotImported, place, {node.name, parent.name, parent.type});
   }
 }
 

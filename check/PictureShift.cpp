@@ -2,6 +2,7 @@
 #include <algorithm>
 #include <cmath>
 #include <deque>
+#include <limits>
 #include <optional>
 #include <string>
 #include <vector>
@@ -23,7 +24,8 @@ class Shifts {
   explicit Shifts(const Subject& subject)
       : subject_(subject),
         unreported_(subject.scene.text()),
-        evaluator_(subject.scene, &subject.diagnostics),
+        evaluated_(subject.scene.text(), std::numeric_limits<std::size_t>::max()),
+        evaluator_(subject.scene, &evaluated_),
         interests_(subject.scene, &unreported_),
         unitsPerFrame_(motion::UnitsPerFrame(subject.scene)) {}
 
@@ -31,6 +33,8 @@ class Shifts {
     for (const Camera& camera : subject_.cameras) Ask(camera);
     FindFrames();
     Measure();
+    ReportEvaluation();
+    ReportInfinities(subject_, frames_);
     for (const CameraShift* const camera : measured_) camera->Report();
   }
 
@@ -38,6 +42,17 @@ class Shifts {
   void SayNotMeasured(const Camera& camera, std::string_view why) const {
     const scene::Node& node = subject_.scene.node(camera.shape);
     subject_.diagnostics.Report(diag::Code::ShiftNotMeasured, node.place, {node.name, why});
+  }
+
+  // What the evaluation found; of a driver that the import does not follow that has been said.
+  void ReportEvaluation() const {
+    using diag::Code;
+    for (const diag::Diagnostic& one : evaluated_.kept()) {
+      const bool ofDriver = one.code == Code::UnsupportedDriver || one.code == Code::DriverWithoutAnswer;
+      if (ofDriver && subject_.driversSaid != nullptr && subject_.driversSaid->contains(one.range.offset))
+        continue;
+      subject_.diagnostics.Take(one);
+    }
   }
 
   // Whether all layers of the camera were made: a stop leaves the last ones in the middle.
@@ -120,6 +135,7 @@ class Shifts {
 
   const Subject& subject_;
   diag::Collector unreported_;
+  diag::Collector evaluated_;
   motion::Evaluator evaluator_;
   motion::Evaluator interests_;
   double unitsPerFrame_;

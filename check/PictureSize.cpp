@@ -17,11 +17,35 @@ diag::Range PlaceOr(const std::optional<diag::Range>& place, const scene::Scene&
   return node == scene::kNoNode ? diag::Range{} : scene.node(node).place;
 }
 
-void Compare(const Subject& subject, const char* what, double made, const scene::Said<double>& meant,
-             double tolerance) {
-  if (std::fabs(made - meant.value) <= tolerance) return;
-  subject.diagnostics.Report(Code::PictureSizeAssumed, PlaceOr(meant.place, subject.scene),
-                             {what, text::RoundedNumber(made), text::RoundedNumber(meant.value)});
+// What of the size differs, in words, and where the file says the first of it.
+struct SizeDifference {
+  std::string made;
+  std::string meant;
+  std::optional<diag::Range> place;
+
+  void Compare(const char* what, double madeValue, const scene::Said<double>& said, double tolerance) {
+    if (std::fabs(madeValue - said.value) <= tolerance) return;
+    if (!made.empty()) {
+      made += ", ";
+      meant += ", ";
+    }
+    made.append(what).append(" ").append(text::RoundedNumber(madeValue));
+    meant += text::RoundedNumber(said.value);
+    if (!place) place = said.place;
+  }
+};
+
+void CompareSize(const Subject& subject, const CameOverComposition& composition) {
+  const scene::Settings& settings = subject.settings;
+  SizeDifference difference;
+  // The importer takes whole pixels.
+  difference.Compare("width", composition.width, settings.width, 0.999);
+  difference.Compare("height", composition.height, settings.height, 0.999);
+  difference.Compare("pixel aspect", composition.pixelAspect,
+                     {settings.pixelAspect(), settings.deviceAspect.place}, 0.01);
+  if (difference.made.empty()) return;
+  subject.diagnostics.Report(Code::PictureSizeAssumed, PlaceOr(difference.place, subject.scene),
+                             {difference.made, difference.meant});
 }
 
 void CompareRate(const Subject& subject, double made) {
@@ -42,11 +66,7 @@ void ReportPicture(const Subject& subject) {
   }
   if (!subject.cameOver.composition) return;
   const CameOverComposition& composition = *subject.cameOver.composition;
-  // The importer takes whole pixels.
-  Compare(subject, "width", composition.width, settings.width, 0.999);
-  Compare(subject, "height", composition.height, settings.height, 0.999);
-  Compare(subject, "pixel aspect", composition.pixelAspect,
-          {settings.pixelAspect(), settings.deviceAspect.place}, 0.01);
+  CompareSize(subject, composition);
   CompareRate(subject, composition.framesPerSecond);
 }
 

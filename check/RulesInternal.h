@@ -1,7 +1,10 @@
 // What the rules look at, and where they report. One topic a file.
 #pragma once
 
+#include <cstdint>
 #include <initializer_list>
+#include <set>
+#include <span>
 #include <string_view>
 #include <vector>
 
@@ -10,6 +13,7 @@
 #include "check/Curves.h"
 #include "check/Links.h"
 #include "diag/Collector.h"
+#include "motion/FrameEnds.h"
 #include "motion/Measures.h"
 #include "scene/Scene.h"
 #include "scene/Settings.h"
@@ -25,6 +29,9 @@ struct Subject {
   const std::vector<Link>& links;
   Channels& channels;
   diag::Collector& diagnostics;
+  // Where the connections stand of which a rule has said that the import does not follow the driver. Null:
+  // what the evaluation says of the same connection is said, too.
+  std::set<std::uint64_t>* driversSaid;
 };
 
 // ---- why the import stopped, and where ----
@@ -43,6 +50,10 @@ void ReportOtherStop(std::string_view text, const CameOver& cameOver, diag::Coll
 
 // ---- what does not come over ----
 
+// What reading the scene found at single nodes, where something that comes over depends on the node:
+// Dependencies.cpp.
+void ReportNodeNotes(const Subject& subject, std::span<const scene::NodeNote> notes);
+
 void ReportLostCameras(const Subject& subject);   // LostCameras.cpp
 void ReportLostParents(const Subject& subject);   // LostParents.cpp
 void ReportLostChannels(const Subject& subject);  // LostChannels.cpp
@@ -56,5 +67,8 @@ void ReportTransforms(const Subject& subject);  // Transforms.cpp
 void ReportTimes(const Subject& subject);       // Times.cpp
 void ReportPicture(const Subject& subject);     // PictureSize.cpp
 void ReportShifts(const Subject& subject);      // PictureShift.cpp
+
+// Curves that go on outside their keys, within the frames: Infinities.cpp.
+void ReportInfinities(const Subject& subject, const motion::FrameEnds& frames);
 
 }  // namespace check

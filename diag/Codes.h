@@ -117,6 +117,8 @@ enum class Code : std::uint16_t {
   LookAtWeightLast = 812,
   LookAtNotTaken = 813,
   AttributesWithoutPlace = 814,
+  OrthographicAsPerspective = 815,
+  ParentElsewhere = 816,
   // Where the picture differs: diag/PictureCodes.cpp
   PictureShifts = 901,
   KeysAreNoBake = 902,
@@ -137,6 +139,9 @@ enum class Code : std::uint16_t {
   FractionalFrames = 917,
   RateDiffers = 918,
   ShiftNotMeasured = 919,
+  ApertureMotionLost = 920,
+  FitMotionLost = 921,
+  InfinityLost = 922,
   // What keeps a check from its end: diag/ProcessCodes.cpp
   CheckTimedOut = 1001,
   CheckBrokeOff = 1002,

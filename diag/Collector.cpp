@@ -20,6 +20,10 @@ void Collector::Report(Code code, Range range, std::initializer_list<std::string
   kept_.push_back(std::move(diagnostic));
 }
 
+void Collector::Take(const Diagnostic& diagnostic) {
+  if (++counts_[diagnostic.code] <= fullPerCode_) kept_.push_back(diagnostic);
+}
+
 std::uint64_t Collector::CountOf(Code code) const {
   const auto found = counts_.find(code);
   return found == counts_.end() ? 0 : found->second;

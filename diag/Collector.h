@@ -26,6 +26,9 @@ class Collector {
   // As many arguments as the row of the code has placeholders.
   void Report(Code code, Range range, std::initializer_list<std::string_view> arguments = {});
 
+  // One that another collector of the same text kept.
+  void Take(const Diagnostic& diagnostic);
+
   // Those kept in full, in the order in which they were reported.
   std::span<const Diagnostic> kept() const { return kept_; }
 

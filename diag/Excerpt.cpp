@@ -42,9 +42,12 @@ std::string Excerpt(std::string_view text, const Range& range) {
   const auto offset = static_cast<std::size_t>(range.offset);
   // Only as much of the line is looked for as can be shown.
   const std::size_t earliest = offset > kMost ? offset - kMost : 0;
-  const std::size_t feed = text.substr(earliest, offset - earliest).rfind('\n');
-  std::size_t start = feed == std::string_view::npos ? earliest : earliest + feed + 1;
-  const bool wholeStart = start == 0 || text[start - 1] == '\n';
+  // The line feed of a line end of two bytes belongs to the line that it ends.
+  const bool insideLineEnd = offset > 0 && text[offset - 1] == '\r' && text.substr(offset, 1) == "\n";
+  const std::size_t before = offset - earliest - (insideLineEnd ? 1 : 0);
+  const std::size_t lineEndBefore = text.substr(earliest, before).find_last_of("\r\n");
+  std::size_t start = lineEndBefore == std::string_view::npos ? earliest : earliest + lineEndBefore + 1;
+  const bool wholeStart = start == 0 || text[start - 1] == '\n' || text[start - 1] == '\r';
   const std::string_view rest = text.substr(start, offset - start + kMost);
   const std::string_view line =
       rest.substr(0, std::min(rest.find_first_of("\r\n", offset - start), rest.size()));

@@ -10,24 +10,35 @@ namespace {
 
 constexpr std::size_t kBlock = 4096;
 
+bool IsLineEnd(char c, char next) { return c == '\n' || (c == '\r' && next != '\n'); }
+
+// The line ends of a part of the text. The byte after the part is looked at, too; a text ends like a line.
 // Counts in bytes, side by side: a compiler makes vector instructions of it, which it does not of one wide
 // counter. A block is short enough for the bytes to hold.
-std::uint32_t CountLineFeeds(std::string_view text) {
+std::uint32_t CountLineEnds(std::string_view text, std::size_t begin, std::size_t end) {
   constexpr std::size_t kLanes = 64;
   static_assert(kBlock / kLanes < 256);
   std::array<std::uint8_t, kLanes> lanes{};
-  std::size_t at = 0;
-  for (; at + kLanes <= text.size(); at += kLanes) {
-    for (std::size_t lane = 0; lane < kLanes; ++lane) lanes[lane] += text[at + lane] == '\n';
+  std::size_t at = begin;
+  for (; at + kLanes <= end && at + kLanes < text.size(); at += kLanes) {
+    const char* const bytes = text.data() + at;
+    for (std::size_t lane = 0; lane < kLanes; ++lane) {
+      const int feed = bytes[lane] == '\n';
+      const int lone = static_cast<int>(bytes[lane] == '\r') & static_cast<int>(bytes[lane + 1] != '\n');
+      lanes[lane] = static_cast<std::uint8_t>(lanes[lane] + feed + lone);
+    }
   }
-  const auto rest = std::count(text.begin() + static_cast<std::ptrdiff_t>(at), text.end(), '\n');
-  return std::accumulate(lanes.begin(), lanes.end(), static_cast<std::uint32_t>(rest));
+  std::uint32_t rest = 0;
+  for (; at < end; ++at) rest += IsLineEnd(text[at], at + 1 < text.size() ? text[at + 1] : '\0') ? 1 : 0;
+  return std::accumulate(lanes.begin(), lanes.end(), rest);
 }
 
-// Where the line starts that goes on after the text, counted from the text's first byte.
-std::uint64_t LastLineStart(std::string_view text, std::uint64_t before, std::uint64_t none) {
-  const std::size_t feed = text.rfind('\n');
-  return feed == std::string_view::npos ? none : before + feed + 1;
+// Where the line starts that goes on after the part of the text.
+std::uint64_t LastLineStart(std::string_view text, std::size_t begin, std::size_t end, std::uint64_t none) {
+  for (std::size_t at = end; at-- > begin;) {
+    if (IsLineEnd(text[at], at + 1 < text.size() ? text[at + 1] : '\0')) return at + 1;
+  }
+  return none;
 }
 
 }  // namespace
@@ -38,9 +49,10 @@ void Lines::CountTo(std::size_t at) {
   while (blocks_.size() <= at / kBlock) {
     Block block = blocks_.back();
     const std::size_t start = (blocks_.size() - 1) * kBlock;
-    const std::string_view text = text_.substr(start, kBlock);
-    block.lineFeeds += CountLineFeeds(text);
-    block.lineStart = LastLineStart(text, start, block.lineStart);
+    const std::size_t end = std::min(start + kBlock, text_.size());
+    const std::uint32_t lineEnds = CountLineEnds(text_, start, end);
+    block.lineEnds += lineEnds;
+    if (lineEnds != 0) block.lineStart = LastLineStart(text_, start, end, block.lineStart);
     blocks_.push_back(block);
   }
 }
@@ -50,9 +62,9 @@ LineAndColumn Lines::At(std::uint64_t offset) {
   CountTo(at);
   const Block& block = blocks_[at / kBlock];
   const std::size_t blockStart = at / kBlock * kBlock;
-  const std::string_view before = text_.substr(blockStart, at - blockStart);
-  const std::uint64_t start = LastLineStart(before, blockStart, block.lineStart);
-  return {block.lineFeeds + CountLineFeeds(before) + 1, static_cast<std::uint32_t>(at - start + 1)};
+  const std::uint64_t start = LastLineStart(text_, blockStart, at, block.lineStart);
+  return {block.lineEnds + CountLineEnds(text_, blockStart, at) + 1,
+          static_cast<std::uint32_t>(at - start + 1)};
 }
 
 }  // namespace diag

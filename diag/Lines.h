@@ -8,7 +8,8 @@
 
 namespace diag {
 
-// Both count from 1. A column counts bytes. A line ends after its line feed.
+// Both count from 1. A column counts bytes. A line ends as editors see it, and as the import counts: after a
+// line feed, or after a carriage return that no line feed follows.
 struct LineAndColumn {
   std::uint32_t line = 1;
   std::uint32_t column = 1;
@@ -27,7 +28,7 @@ class Lines {
 
  private:
   struct Block {
-    std::uint32_t lineFeeds;  // before the block
+    std::uint32_t lineEnds;   // before the block
     std::uint64_t lineStart;  // of the line that its first byte stands in
   };
 

@@ -45,14 +45,14 @@ constexpr Entry kLossCodes[] = {
     {.code = Code::ParentNotImported,
      .severity = Severity::Warning,
      .symbol = "ParentNotImported",
-     .sentence = "\"{0}\" loses its place: the import does not have its parent \"{1}\"{2}",
-     .meaning = "A node above the camera is in a referenced file, or nowhere, or is of a type that the "
-                "importer does "
-                "not know, as a joint. The camera comes over as if that node stood at the origin.",
-     .example = "file -r -ns \"rig\" -rfn \"rigRN\" \"rig.ma\";\ncreateNode transform -n \"shotCam\" -p "
-                "\"rig:root\";",
-     .help = "Where the parent is a node of this scene: mayascene bake SCENE -o OUT. Where it is in another "
-             "file: import the reference into the scene before the export."},
+     .sentence =
+         "\"{0}\" loses its place: the import does not take its parent \"{1}\", a node of the type {2}",
+     .meaning =
+         "A node above the camera is of a type that the importer does not know, as a joint. The camera "
+         "comes over as if that node stood at the origin.",
+     .example = "createNode joint -n \"arm\";\ncreateNode transform -n \"shotCam\" -p \"arm\";\n"
+                "createNode camera -n \"shotCamShape\" -p \"shotCam\";",
+     .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
     {.code = Code::ChannelsOfOneKey,
      .severity = Severity::Warning,
      .symbol = "ChannelsOfOneKey",
@@ -61,7 +61,9 @@ constexpr Entry kLossCodes[] = {
                 "curves of "
                 "one key alone. It comes over with the values that the scene stores beside them, which are "
                 "others; often it lands at the origin.",
-     .example = "setAttr \".ktv[0]\" 1 12.5;\nconnectAttr \"shotCam_translateX.o\" \"shotCam.tx\";",
+     .example = "createNode animCurveTL -n \"moveX\";\n"
+                "  setAttr \".ktv[0]\" 1 12.5;\n"
+                "connectAttr \"moveX.o\" \"shotCam.tx\";",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
     {.code = Code::DrivenByNoCurve,
      .severity = Severity::Warning,
@@ -69,7 +71,8 @@ constexpr Entry kLossCodes[] = {
      .sentence = "\"{0}\" stands still in {1}: \"{2}\" ({3}) drives it, which is no curve",
      .meaning = "A constraint, an expression or another node computes the channels. The importer follows "
                 "animation curves alone, and takes the values that the scene stores.",
-     .example = "connectAttr \"shotCam_pointConstraint1.ctx\" \"shotCam.tx\";",
+     .example = "createNode pointConstraint -n \"hold\" -p \"shotCam\";\n"
+                "connectAttr \"hold.ctx\" \"shotCam.tx\";",
      .help =
          "Write the scene anew, with a key at every frame: mayascene bake SCENE -o OUT, or mayascene import "
          "--bake. What a bake cannot compute, bake in Maya (Edit, Keys, Bake Simulation)."},
@@ -79,8 +82,11 @@ constexpr Entry kLossCodes[] = {
      .sentence = "\"{0}\" stands still in {1}: its curves go through \"{2}\" ({3})",
      .meaning = "Between the curve and the channel stands another node: a blend, a conversion of units, an "
                 "animation layer. The importer follows curves that drive a channel directly.",
-     .example =
-         "connectAttr \"curve1.o\" \"pairBlend1.itx2\";\nconnectAttr \"pairBlend1.otx\" \"shotCam.tx\";",
+     .example = "createNode pairBlend -n \"blend\";\n"
+                "createNode animCurveTL -n \"moveX\";\n"
+                "  setAttr -s 2 \".ktv[0:1]\" 1 0 24 5;\n"
+                "connectAttr \"moveX.o\" \"blend.itx2\";\n"
+                "connectAttr \"blend.otx\" \"shotCam.tx\";",
      .help =
          "Write the scene anew, with a key at every frame: mayascene bake SCENE -o OUT, or mayascene import "
          "--bake."},
@@ -89,7 +95,9 @@ constexpr Entry kLossCodes[] = {
      .symbol = "ConnectionToPath",
      .sentence = "the curve of \"{0}\" is lost: the connection names the node by a path",
      .meaning = "The importer looks for the node of a connection by its name. It finds none under a path.",
-     .example = "connectAttr \"shotCam_translateX.o\" \"|rig|shotCam.tx\";",
+     .example = "createNode animCurveTL -n \"moveX\";\n"
+                "  setAttr -s 2 \".ktv[0:1]\" 1 0 24 5;\n"
+                "connectAttr \"moveX.o\" \"|shotCam.tx\";",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake. Or give the "
              "node a name "
              "that no other node has, and export again."},
@@ -100,7 +108,9 @@ constexpr Entry kLossCodes[] = {
      .meaning =
          "The focal length comes from another node, as a control of a rig. The importer follows a curve that "
          "drives the focal length directly, and takes the value that the scene stores otherwise.",
-     .example = "connectAttr \"control.zoom\" \"shotCamShape.fl\";",
+     .example = "createNode transform -n \"control\";\n"
+                "  addAttr -ln \"zoom\" -at double;\n"
+                "connectAttr \"control.zoom\" \"shotCamShape.fl\";",
      .help =
          "Write the scene anew, with a key at every frame: mayascene bake SCENE -o OUT, or mayascene import "
          "--bake."},
@@ -111,7 +121,11 @@ constexpr Entry kLossCodes[] = {
      .meaning = "The importer knows the target of a look-at by the word \"target\" in the connection. A "
                 "scene that is "
                 "saved with short names says \"tg[0].tt\". The camera \"{1}\" is not aimed.",
-     .example = "connectAttr \"aim_point.t\" \"shotCam_aim.tg[0].tt\";",
+     .example = "createNode transform -n \"point\";\n"
+                "createNode aimConstraint -n \"aim\" -p \"shotCam\";\n"
+                "connectAttr \"aim.constraintRotate\" \"shotCam.rotate\";\n"
+                "connectAttr \"shotCam.translate\" \"aim.constraintTranslate\";\n"
+                "connectAttr \"point.t\" \"aim.tg[0].tt\";",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake. The camera then "
              "turns by "
              "keys. Or save the scene with full attribute names."},
@@ -122,8 +136,12 @@ constexpr Entry kLossCodes[] = {
      .meaning =
          "The last connection with the word \"target\" counts. Here it is the one of the weight, which comes "
          "from the look-at itself.",
-     .example = "connectAttr \"aim_point.translate\" \"aim.target[0].targetTranslate\";\n"
-                "connectAttr \"aim.aim_pointW0\" \"aim.target[0].targetWeight\";",
+     .example = "createNode transform -n \"point\";\n"
+                "createNode aimConstraint -n \"aim\" -p \"shotCam\";\n"
+                "connectAttr \"aim.constraintRotate\" \"shotCam.rotate\";\n"
+                "connectAttr \"shotCam.translate\" \"aim.constraintTranslate\";\n"
+                "connectAttr \"point.translate\" \"aim.target[0].targetTranslate\";\n"
+                "connectAttr \"aim.pointW0\" \"aim.target[0].targetWeight\";",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
     {.code = Code::LookAtNotTaken,
      .severity = Severity::Warning,
@@ -132,7 +150,10 @@ constexpr Entry kLossCodes[] = {
      .meaning = "The importer needs three connections of a look-at: the place of what is turned, the target, "
                 "and the "
                 "rotation, each between two nodes that it knows. One is missing, or goes by a path.",
-     .example = "createNode lookAt -n \"shotCam_group\";\nconnectAttr \"shotCam_group.cr\" \"shotCam.r\";",
+     .example = "createNode transform -n \"point\";\n"
+                "createNode aimConstraint -n \"aim\";\n"
+                "connectAttr \"aim.constraintRotate\" \"shotCam.rotate\";\n"
+                "connectAttr \"point.translate\" \"aim.target[0].targetTranslate\";",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake. The camera then "
              "turns by "
              "keys."},
@@ -140,12 +161,32 @@ constexpr Entry kLossCodes[] = {
      .severity = Severity::Note,
      .symbol = "AttributesWithoutPlace",
      .sentence = "a composition has no place for {1} of \"{0}\"",
-     .meaning =
-         "The camera has settings that the importer does not take: depth of field, an image plane, "
-         "visibility. An orthographic camera that is written with another word than \"yes\" comes over "
-         "as one with a perspective.",
-     .example = "setAttr \".dof\" yes;",
+     .meaning = "The camera has settings that the importer does not take: depth of field, an image plane, "
+                "visibility.",
+     .example = "createNode camera -n \"shotCamShape\" -p \"shotCam\";\n  setAttr \".dof\" yes;",
      .help = "Set the same in the composition, where it is wanted."},
+    {.code = Code::OrthographicAsPerspective,
+     .severity = Severity::Warning,
+     .symbol = "OrthographicAsPerspective",
+     .sentence = "the orthographic camera \"{0}\" comes over with a perspective",
+     .meaning =
+         "The importer knows an orthographic camera by the word \"yes\" alone. This one is written with "
+         "another word, so the import makes a layer of it, as of any other camera. A camera of a "
+         "composition has a perspective.",
+     .example = "createNode camera -n \"planShape\" -p \"plan\";\n  setAttr \".o\" on;",
+     .help =
+         "Delete the layer, unless the shot is seen through it: then give the camera a very long lens and "
+         "move it far away."},
+    {.code = Code::ParentElsewhere,
+     .severity = Severity::Warning,
+     .symbol = "ParentElsewhere",
+     .sentence = "\"{0}\" loses its place: its parent \"{1}\" is not in this file{2}",
+     .meaning = "A node above the camera stands in a referenced file, or in none that is known. The camera "
+                "comes over as if that node stood at the origin. A bake cannot read the other file either.",
+     .example = "file -r -ns \"rig\" -rfn \"rigRN\" \"rig.ma\";\ncreateNode transform -n \"shotCam\" -p "
+                "\"rig:root\";\ncreateNode camera -n \"shotCamShape\" -p \"shotCam\";",
+     .help = "Import the reference into the scene before the export, or export the camera together with "
+             "everything above it."},
 };
 
 }  // namespace

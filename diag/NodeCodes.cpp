@@ -96,8 +96,8 @@ constexpr Entry kNodeCodes[] = {
     {.code = Code::ReferenceNotRead,
      .severity = Severity::Note,
      .symbol = "ReferenceNotRead",
-     .sentence = "the referenced file \"{0}\" is not read",
-     .meaning = "The scene takes nodes from another file. Those nodes are not known.",
+     .sentence = "referenced files are not read: {0}, the first \"{1}\"",
+     .meaning = "The scene takes nodes from other files. Those nodes are not known.",
      .example = "file -r -ns \"hero\" -rfn \"heroRN\" \"hero.ma\";",
      .help = "Nothing has to be done, unless a camera or its parent stands in that file: then import the "
              "referenced file into "

@@ -18,7 +18,10 @@ constexpr Entry kPictureCodes[] = {
          "above it, or time 0 of a scene that does not count time in frames; between keys the import counts "
          "as straight. The other diagnostics of the camera name "
          "the reasons.",
-     .example = "setAttr -s 2 \".ktv[0:1]\" 1 0 48 100;",
+     .example = "createNode animCurveTL -n \"moveX\";\n"
+                "  setAttr \".tan\" 3;\n"
+                "  setAttr -s 2 \".ktv[0:1]\" 1 0 48 100;\n"
+                "connectAttr \"moveX.o\" \"shotCam.tx\";",
      .help =
          "Write the scene anew, with a key at every frame: mayascene bake SCENE -o OUT, or mayascene import "
          "--bake."},
@@ -29,7 +32,10 @@ constexpr Entry kPictureCodes[] = {
      .meaning = "The importer takes the keys and none of their tangents. Between keys the composition has a "
                 "way of its "
                 "own.",
-     .example = "setAttr -s 2 \".ktv[0:1]\" 1 0 48 100;",
+     .example = "createNode animCurveTL -n \"moveX\";\n"
+                "  setAttr \".tan\" 3;\n"
+                "  setAttr -s 2 \".ktv[0:1]\" 1 0 48 100;\n"
+                "connectAttr \"moveX.o\" \"shotCam.tx\";",
      .help =
          "Write the scene anew, with a key at every frame: mayascene bake SCENE -o OUT, or mayascene import "
          "--bake."},
@@ -38,21 +44,25 @@ constexpr Entry kPictureCodes[] = {
      .symbol = "RotateOrderLost",
      .sentence = "\"{0}\" is turned in another order: the import takes xyz, the scene has {1}",
      .meaning = "The three angles of a rotation mean another direction in another order.",
-     .example = "setAttr \".ro\" 2;",
+     .example = "createNode transform -n \"shotCam\";\n"
+                "  setAttr \".r\" -type \"double3\" 30 40 0 ;\n"
+                "  setAttr \".ro\" 4;",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
     {.code = Code::RotateAxisLost,
      .severity = Severity::Warning,
      .symbol = "RotateAxisLost",
      .sentence = "the rotate axis of \"{0}\" is lost",
      .meaning = "The node is turned once more, before its own rotation. The importer does not take that.",
-     .example = "setAttr \".ra\" -type \"double3\" 0 90 0 ;",
+     .example = "createNode transform -n \"shotCam\";\n"
+                "  setAttr \".ra\" -type \"double3\" 0 90 0 ;",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
     {.code = Code::ShearLost,
      .severity = Severity::Warning,
      .symbol = "ShearLost",
      .sentence = "the shear of \"{0}\" is lost",
      .meaning = "The axes of the node are not square to each other. A layer has square axes.",
-     .example = "setAttr \".sh\" -type \"double3\" 0.5 0 0 ;",
+     .example = "createNode transform -n \"shotCam\";\n"
+                "  setAttr \".sh\" -type \"double3\" 0.5 0 0 ;",
      .help = "Take the shear out of what stands above the camera."},
     {.code = Code::PivotTranslationLost,
      .severity = Severity::Warning,
@@ -61,7 +71,8 @@ constexpr Entry kPictureCodes[] = {
      .meaning = "Where a pivot was moved and the node was to stay in its place, the difference is kept in a "
                 "value of "
                 "its own. The importer takes the pivots alone.",
-     .example = "setAttr \".rpt\" -type \"double3\" 0 2 0 ;",
+     .example = "createNode transform -n \"shotCam\";\n"
+                "  setAttr \".rpt\" -type \"double3\" 0 2 0 ;",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
     {.code = Code::InheritanceOff,
      .severity = Severity::Warning,
@@ -70,7 +81,9 @@ constexpr Entry kPictureCodes[] = {
      .meaning = "The importer makes the layer of the node a child of the layers of what stands above it, "
                 "whatever the "
                 "scene says.",
-     .example = "setAttr \".it\" no;",
+     .example = "createNode transform -n \"rig\";\n"
+                "createNode transform -n \"shotCam\" -p \"rig\";\n"
+                "  setAttr \".it\" no;",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
     {.code = Code::FitDiffers,
      .severity = Severity::Warning,
@@ -79,7 +92,8 @@ constexpr Entry kPictureCodes[] = {
      .meaning =
          "With fill and overscan the shapes of the film and of the picture decide which side fits. Here it "
          "is the vertical one.",
-     .example = "setAttr \".ff\" 0;",
+     .example = "createNode camera -n \"shotCamShape\" -p \"shotCam\";\n"
+                "  setAttr \".ff\" 3;",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
     {.code = Code::LensSqueezeLost,
      .severity = Severity::Warning,
@@ -87,14 +101,16 @@ constexpr Entry kPictureCodes[] = {
      .sentence = "the lens squeeze of \"{0}\" is lost: {1}",
      .meaning =
          "The camera has an anamorphic lens, which takes in a wider picture. The importer does not read it.",
-     .example = "setAttr \".lsr\" 2;",
+     .example = "createNode camera -n \"shotCamShape\" -p \"shotCam\";\n"
+                "  setAttr \".lsr\" 2;",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
     {.code = Code::CameraScaleLost,
      .severity = Severity::Warning,
      .symbol = "CameraScaleLost",
      .sentence = "the camera scale of \"{0}\" is lost: {1}",
      .meaning = "The camera scale makes the lens longer or shorter. The importer does not read it.",
-     .example = "setAttr \".cs\" 2;",
+     .example = "createNode camera -n \"shotCamShape\" -p \"shotCam\";\n"
+                "  setAttr \".cs\" 2;",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
     {.code = Code::ChainScaled,
      .severity = Severity::Warning,
@@ -102,16 +118,17 @@ constexpr Entry kPictureCodes[] = {
      .sentence = "\"{0}\" scales the camera \"{1}\" below it",
      .meaning =
          "A scale above a camera moves it. An uneven one also bends its axes, which no layer can show.",
-     .example = "setAttr \".s\" -type \"double3\" 2 2 2 ;",
+     .example = "createNode transform -n \"rig\";\n"
+                "  setAttr \".s\" -type \"double3\" 2 2 2 ;\n"
+                "createNode transform -n \"shotCam\" -p \"rig\";",
      .help = "Take the scale out of the rig, or write the camera in world space: mayascene bake SCENE -o OUT "
              "--world."},
     {.code = Code::PictureSizeAssumed,
      .severity = Severity::Warning,
      .symbol = "PictureSizeAssumed",
-     .sentence = "the {0} of the composition is {1}, where the scene means {2}",
+     .sentence = "the composition has {0}, where the scene means {1}",
      .meaning = "The file leaves a value of the render settings out, or derives it. The importer has "
-                "defaults of its "
-                "own: 720 by 486 pixels, pixel aspect 0.9091.",
+                "defaults of its own: 720 by 486 pixels, pixel aspect 0.9091.",
      .example = "select -ne :defaultResolution;\n  setAttr \".w\" 1920;\n  setAttr \".h\" 1080;",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT. Or set the composition by hand."},
     {.code = Code::KeysStartApart,
@@ -121,7 +138,14 @@ constexpr Entry kPictureCodes[] = {
      .meaning = "The importer puts the first key of each node at time 0 of the composition. Nodes that are "
                 "keyed from "
                 "different frames move against each other.",
-     .example = "setAttr -s 2 \".ktv[0:1]\" 1 0 24 10;\nsetAttr -s 2 \".ktv[0:1]\" 12 0 24 10;",
+     .example = "createNode transform -n \"rig\";\n"
+                "createNode transform -n \"shotCam\" -p \"rig\";\n"
+                "createNode animCurveTL -n \"rigX\";\n"
+                "  setAttr -s 2 \".ktv[0:1]\" 1 0 24 10;\n"
+                "connectAttr \"rigX.o\" \"rig.tx\";\n"
+                "createNode animCurveTL -n \"moveX\";\n"
+                "  setAttr -s 2 \".ktv[0:1]\" 12 0 24 10;\n"
+                "connectAttr \"moveX.o\" \"shotCam.tx\";",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
     {.code = Code::OtherLengthUnit,
      .severity = Severity::Warning,
@@ -142,7 +166,9 @@ constexpr Entry kPictureCodes[] = {
      .meaning =
          "A time of the composition is a whole number of thousandths of a frame, and has 31 bits. Later keys "
          "land at the largest time.",
-     .example = "setAttr -s 2 \".ktv[0:1]\" 1 0 3000000 10;",
+     .example = "createNode animCurveTL -n \"moveX\";\n"
+                "  setAttr -s 2 \".ktv[0:1]\" 1 0 3000000 10;\n"
+                "connectAttr \"moveX.o\" \"shotCam.tx\";",
      .help = "Take out the keys that are far away from the shot."},
     {.code = Code::NegativeFrames,
      .severity = Severity::Note,
@@ -151,7 +177,9 @@ constexpr Entry kPictureCodes[] = {
      .meaning =
          "The first key lands at time 0 of the composition, so that all frames come over; their numbers are "
          "others.",
-     .example = "setAttr -s 2 \".ktv[0:1]\" -10 0 24 10;",
+     .example = "createNode animCurveTL -n \"moveX\";\n"
+                "  setAttr -s 2 \".ktv[0:1]\" -10 0 24 10;\n"
+                "connectAttr \"moveX.o\" \"shotCam.tx\";",
      .help = "Shift the layers in the composition to where the footage needs them."},
     {.code = Code::FractionalFrames,
      .severity = Severity::Note,
@@ -160,7 +188,9 @@ constexpr Entry kPictureCodes[] = {
      .meaning = "Keys lie at fractions of a frame. They come over to a thousandth of a frame; a composition "
                 "shows whole "
                 "frames.",
-     .example = "setAttr -s 2 \".ktv[0:1]\" 1.5 0 24.5 10;",
+     .example = "createNode animCurveTL -n \"moveX\";\n"
+                "  setAttr -s 2 \".ktv[0:1]\" 1.5 0 24.5 10;\n"
+                "connectAttr \"moveX.o\" \"shotCam.tx\";",
      .help = "Nothing has to be done where the motion is smooth."},
     {.code = Code::RateDiffers,
      .severity = Severity::Warning,
@@ -178,8 +208,46 @@ constexpr Entry kPictureCodes[] = {
          "At most 100000 frames of a scene are measured, and at most 4000000 frames of layers: each frame "
          "counts once for the camera and once for each layer above it. A camera that the import "
          "made before it stopped is measured; the one at which it stopped, and those after it, are not.",
-     .example = "setAttr -s 2 \".ktv[0:1]\" 1 0 3000000 10;",
+     .example = "createNode animCurveTL -n \"moveX\";\n"
+                "  setAttr -s 2 \".ktv[0:1]\" 1 0 3000000 10;\n"
+                "connectAttr \"moveX.o\" \"shotCam.tx\";",
      .help = "Write the shot alone: mayascene bake SCENE -o OUT --frames A:B."},
+    {.code = Code::ApertureMotionLost,
+     .severity = Severity::Warning,
+     .symbol = "ApertureMotionLost",
+     .sentence = "the film aperture of \"{0}\" stands still: {1}",
+     .meaning = "The angle of view changes with the aperture. The importer takes the aperture that the scene "
+                "stores, and no keys of it. The diagnostic of the picture's shift says how far that goes.",
+     .example = "createNode animCurveTU -n \"wide\";\n  setAttr -s 2 \".ktv[0:1]\" 1 1 24 2;\n"
+                "connectAttr \"wide.o\" \"shotCamShape.hfa\";",
+     .help = "Write the scene anew, with a key at every frame: mayascene bake SCENE -o OUT, or mayascene "
+             "import --bake."},
+    {.code = Code::FitMotionLost,
+     .severity = Severity::Warning,
+     .symbol = "FitMotionLost",
+     .sentence = "the film fit of \"{0}\" stands still: {1}",
+     .meaning =
+         "The fit decides which side of the film the picture shows whole. The importer takes the fit "
+         "that the scene stores, and no keys of it. The diagnostic of the picture's shift says how far "
+         "that goes.",
+     .example = "createNode animCurveTU -n \"fit\";\n  setAttr -s 2 \".ktv[0:1]\" 1 1 24 2;\n"
+                "connectAttr \"fit.o\" \"shotCamShape.ff\";",
+     .help = "Write the scene anew, with a key at every frame: mayascene bake SCENE -o OUT, or mayascene "
+             "import --bake."},
+    {.code = Code::InfinityLost,
+     .severity = Severity::Warning,
+     .symbol = "InfinityLost",
+     .sentence = "\"{0}\" stands still in {1} {2} its keys, where the scene goes on: {3}",
+     .meaning = "A curve can go on outside its keys: it repeats them, or goes on along a straight line. A "
+                "composition holds the first and the last key. The shot has frames there.",
+     .example = "createNode script -n \"sceneConfigurationScriptNode\";\n"
+                "  setAttr \".b\" -type \"string\" \"playbackOptions -min 1 -max 48\";\n"
+                "createNode animCurveTL -n \"moveX\";\n"
+                "  setAttr -s 2 \".ktv[0:1]\" 1 0 24 10;\n"
+                "  setAttr \".pst\" 3;\n"
+                "connectAttr \"moveX.o\" \"shotCam.tx\";",
+     .help = "Write the scene anew, with a key at every frame: mayascene bake SCENE -o OUT, or mayascene "
+             "import --bake."},
 };
 
 }  // namespace

@@ -150,7 +150,12 @@ constexpr Entry kStopCodes[] = {
          "The importer takes the first keys of all channels of a node together, then the second ones, and so "
          "on. All curves of a node with two keys or more need as many keys. What was made before stays; "
          "the node and what follows it do not come over.",
-     .example = "setAttr -s 3 \".ktv[0:2]\" 1 0 2 5.5 3 10;\nsetAttr -s 2 \".ktv[0:1]\" 1 0 3 10;",
+     .example = "createNode animCurveTL -n \"moveX\";\n"
+                "  setAttr -s 3 \".ktv[0:2]\" 1 0 2 5.5 3 10;\n"
+                "createNode animCurveTA -n \"turnY\";\n"
+                "  setAttr -s 2 \".ktv[0:1]\" 1 0 3 90;\n"
+                "connectAttr \"moveX.o\" \"shotCam.tx\";\n"
+                "connectAttr \"turnY.o\" \"shotCam.ry\";",
      .help =
          "Write the scene anew, with a key at every frame: mayascene bake SCENE -o OUT, or mayascene import "
          "--bake."},
@@ -159,7 +164,8 @@ constexpr Entry kStopCodes[] = {
      .symbol = "NumberTooLarge",
      .sentence = "the import stops here: the number \"{0}\" is too large",
      .meaning = "No number may be larger than about 1.8e308. Nothing comes over.",
-     .example = "setAttr \".t\" -type \"double3\" 1e999 0 0 ;",
+     .example = "createNode transform -n \"shotCam\";\n"
+                "  setAttr \".t\" -type \"double3\" 1e999 0 0 ;",
      .help = "Look in the scene for the node that has such a value, set it to a smaller one, and export the "
              "scene again."},
     {.code = Code::NumberUnreadable,
@@ -169,7 +175,8 @@ constexpr Entry kStopCodes[] = {
      .meaning = "Where the importer needs a number, it takes decimal digits, with a sign, a fraction and an "
                 "exponent "
                 "at most. Nothing comes over.",
-     .example = "setAttr \".t\" -type \"double3\" 1.#QNAN 0 0 ;",
+     .example = "createNode transform -n \"shotCam\";\n"
+                "  setAttr \".t\" -type \"double3\" 1.#QNAN 0 0 ;",
      .help = "Look in the scene for what has no valid value, and export the scene again."},
 };
 

@@ -76,8 +76,8 @@ const Reader::CommandReader* Reader::FindReader(std::string_view name) {
   return found == std::end(kReaders) ? nullptr : found;
 }
 
-Reader::Reader(std::string_view text, diag::Collector* diagnostics)
-    : diagnostics_(diagnostics), cursor_(text), builder_(text, diagnostics) {}
+Reader::Reader(std::string_view text, diag::Collector* diagnostics, std::vector<NodeNote>* notes)
+    : diagnostics_(diagnostics), cursor_(text), builder_(text, diagnostics, notes) {}
 
 Scene Reader::Read() {
   constexpr std::string_view kByteOrderMark = "\xef\xbb\xbf";
@@ -245,12 +245,14 @@ Reader::Named Reader::NameOf(const Token& token) {
   return {token.text, {token.offset, token.end - token.offset}};
 }
 
-Scene Read(std::string_view text, diag::Collector& diagnostics) {
+Scene Read(std::string_view text, diag::Collector& diagnostics) { return Read(text, diagnostics, nullptr); }
+
+Scene Read(std::string_view text, diag::Collector& diagnostics, std::vector<NodeNote>* notes) {
   if (text.size() >= std::numeric_limits<std::uint32_t>::max()) {
     diagnostics.Report(Code::TextTooLong, {}, {std::to_string(text.size())});
     text = {};
   }
-  return Reader(text, &diagnostics).Read();
+  return Reader(text, &diagnostics, notes).Read();
 }
 
 }  // namespace scene

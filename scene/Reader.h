@@ -13,8 +13,8 @@ namespace scene {
 
 class Reader {
  public:
-  // Both must outlive the reader and the scene.
-  Reader(std::string_view text, diag::Collector* diagnostics);
+  // All must outlive the reader, the text the scene too. `notes` may be null: they are reported then.
+  Reader(std::string_view text, diag::Collector* diagnostics, std::vector<NodeNote>* notes);
 
   Scene Read();
 

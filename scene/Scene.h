@@ -6,6 +6,7 @@
 // from several threads.
 #pragma once
 
+#include <array>
 #include <cstdint>
 #include <deque>
 #include <optional>
@@ -241,5 +242,18 @@ class Scene {
 // and reported; it costs nothing else. Time and memory grow in proportion to the text. A text of 4 GiB or
 // more is not read: the scene is then empty.
 Scene Read(std::string_view text, diag::Collector& diagnostics);
+
+// What is to be said of one node, where it may be that nobody asks for the node.
+struct NodeNote {
+  diag::Code code;
+  NodeId node;
+  diag::Range place;
+  std::array<std::string_view, 3> arguments;  // as many as the code has; they last as long as the scene
+};
+
+// The same, but ParentInReference and AlreadyConnected are put into `notes`, and not reported.
+Scene Read(std::string_view text, diag::Collector& diagnostics, std::vector<NodeNote>* notes);
+
+void Report(const NodeNote& note, diag::Collector* diagnostics);
 
 }  // namespace scene

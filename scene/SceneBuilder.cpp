@@ -82,10 +82,13 @@ void SceneBuilder::Connect(Named source, Named destination, ConnectHow how) {
   if (const Connection* const there = scene_.ConnectionTo(to)) {
     if (there->source == connection.source) return;
     if (how != ConnectHow::Force) {
-      const std::string_view driver =
-          scene_.text_.substr(there->sourcePlace.offset, there->sourcePlace.length);
-      diagnostics_->Report(diag::Code::AlreadyConnected, destination.place, {destination.text, driver});
-      return;
+      const auto written = [this](const diag::Range& place) {
+        return scene_.text_.substr(place.offset, place.length);
+      };
+      return Note({diag::Code::AlreadyConnected,
+                   to.node,
+                   destination.place,
+                   {written(destination.place), written(there->sourcePlace)}});
     }
     Cut(static_cast<std::uint32_t>(there - scene_.connections_.data()));
   }
@@ -123,7 +126,19 @@ void SceneBuilder::AddReference(const Reference& reference, bool read) {
     known.plusOne = static_cast<std::uint32_t>(scene_.references_.size());
     referenceBySpace_.At(0, reference.nameSpace).plusOne = known.plusOne;
   }
-  if (read) diagnostics_->Report(diag::Code::ReferenceNotRead, reference.place, {reference.file});
+  if (read && referencesRead_++ == 0) firstRead_ = reference;
+}
+
+void SceneBuilder::Note(const NodeNote& note) {
+  if (notes_ != nullptr) return notes_->push_back(note);
+  Report(note, diagnostics_);
+}
+
+void Report(const NodeNote& note, diag::Collector* diagnostics) {
+  const auto& [a, b, c] = note.arguments;
+  if (note.code == diag::Code::ParentInReference)
+    return diagnostics->Report(note.code, note.place, {a, b, c});
+  diagnostics->Report(note.code, note.place, {a, b});
 }
 
 }  // namespace scene

@@ -2,6 +2,7 @@
 // yet is looked up once more at the end.
 #pragma once
 
+#include <cstdint>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -13,8 +14,8 @@ namespace scene {
 
 class SceneBuilder {
  public:
-  // Both must outlive the builder.
-  SceneBuilder(std::string_view text, diag::Collector* diagnostics);
+  // All must outlive the builder. `notes` may be null: they are reported then.
+  SceneBuilder(std::string_view text, diag::Collector* diagnostics, std::vector<NodeNote>* notes);
 
   // A name as a command gives it, and where.
   struct Named {
@@ -81,6 +82,7 @@ class SceneBuilder {
   void Index(std::uint32_t connection);
   Scene::IndexOfOne& Appended(const Plug& source, const Plug& destination);
   void Cut(std::uint32_t connection);
+  void Note(const NodeNote& note);
 
   // ---- the end: SceneBuilderFinish.cpp ----
 
@@ -91,10 +93,14 @@ class SceneBuilder {
   void LinkSettings();
   void LinkConnections();
   void ReportParents();
+  void ReportReferences();
   std::string_view ReferencedFileOf(NodeId parent) const;
 
   diag::Collector* diagnostics_;
+  std::vector<NodeNote>* notes_;  // may be null
   Scene scene_;
+  std::uint64_t referencesRead_ = 0;
+  Reference firstRead_;
   std::string_view nameSpace_;
   FlatMap<Scene::IndexOfOne> fromElsewhere_;  // nodes by the name they are called
   FlatMap<Counter> counters_;                 // by parent and name without its number

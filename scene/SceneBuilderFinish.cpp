@@ -1,6 +1,7 @@
 // The end of a scene: what was named before it was created is found, circles of parents are cut, lists are
 // linked. Each step is one pass.
 #include <cstddef>
+#include <string>
 #include <utility>
 
 #include "scene/SceneBuilder.h"
@@ -14,6 +15,7 @@ Scene SceneBuilder::Finish() {
   LinkChildren();
   LinkSettings();
   LinkConnections();
+  ReportReferences();
   ReportParents();
   return std::move(scene_);
 }
@@ -39,6 +41,9 @@ std::vector<NodeId> SceneBuilder::FindForward() {
 }
 
 void SceneBuilder::ReplaceForward(const std::vector<NodeId>& replacement) {
+  if (notes_ != nullptr) {
+    for (NodeNote& note : *notes_) note.node = replacement[note.node];
+  }
   for (NodeId id = 0; id < replacement.size(); ++id) {
     Node& node = scene_.nodes_[id];
     if (node.parent == kNoNode || replacement[node.parent] == node.parent) continue;
@@ -142,6 +147,12 @@ std::string_view SceneBuilder::ReferencedFileOf(NodeId parent) const {
   return scene_.references_[found->plusOne - 1].file;
 }
 
+void SceneBuilder::ReportReferences() {
+  if (referencesRead_ == 0) return;
+  diagnostics_->Report(diag::Code::ReferenceNotRead, firstRead_.place,
+                       {std::to_string(referencesRead_), firstRead_.file});
+}
+
 void SceneBuilder::ReportParents() {
   for (const Node& node : scene_.nodes_) {
     if (node.parent == kNoNode || node.origin != Origin::Created) continue;
@@ -150,7 +161,8 @@ void SceneBuilder::ReportParents() {
     if (!foster && parent.origin == Origin::Created) continue;
     const std::string_view file = ReferencedFileOf(node.parent);
     if (foster || !file.empty()) {
-      diagnostics_->Report(diag::Code::ParentInReference, node.place, {parent.name, node.name, file});
+      const auto id = static_cast<NodeId>(&node - scene_.nodes_.data());
+      Note({diag::Code::ParentInReference, id, node.place, {parent.name, node.name, file}});
     } else {
       diagnostics_->Report(diag::Code::ParentMissing, node.place, {parent.name, node.name});
     }

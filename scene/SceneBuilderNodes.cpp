@@ -28,7 +28,8 @@ std::string_view Stem(std::string_view name) {
 
 }  // namespace
 
-SceneBuilder::SceneBuilder(std::string_view text, diag::Collector* diagnostics) : diagnostics_(diagnostics) {
+SceneBuilder::SceneBuilder(std::string_view text, diag::Collector* diagnostics, std::vector<NodeNote>* notes)
+    : diagnostics_(diagnostics), notes_(notes) {
   scene_.text_ = text;
 }
 

@@ -94,9 +94,10 @@ std::size_t KeysOf(const check::ChainLink& link) {
 std::string CameraContradiction(const check::CameraHead& camera, const check::Report& report) {
   if (!camera.cameOver) return "";
   const std::size_t keys = camera.chain.empty() ? 0 : KeysOf(camera.chain.front());
-  const bool lost = HasOneOf(report, {Code::ConnectionToPath, Code::ParentIsPath, Code::ParentNotImported,
-                                      Code::SameNames, Code::NamesDifferInCase, Code::NameTooLong,
-                                      Code::NodeWithoutName, Code::AlreadyConnected, Code::NameTaken});
+  const bool lost =
+      HasOneOf(report, {Code::ConnectionToPath, Code::ParentIsPath, Code::ParentNotImported,
+                        Code::ParentElsewhere, Code::SameNames, Code::NamesDifferInCase, Code::NameTooLong,
+                        Code::NodeWithoutName, Code::AlreadyConnected, Code::NameTaken});
   if (camera.keys != keys && !lost) {
     return camera.path + " has " + std::to_string(keys) + " keys, " + std::to_string(camera.keys) +
            " came over";

@@ -46,8 +46,19 @@ TEST(LossTest, AParentInAReferenceIsSaidWithItsFile) {
                         "createNode transform -n \"shotCam\" -p \"rig:root\";\n"
                         "createNode camera -n \"shotCamShape\" -p \"shotCam\";\n" +
                         kResolution);
-  EXPECT_THAT(checked.SentenceOf(Code::ParentNotImported),
-              HasSubstr("\"rig:root\", which stands in \"set/rig.ma\""));
+  EXPECT_THAT(checked.SentenceOf(Code::ParentElsewhere),
+              HasSubstr("\"rig:root\" is not in this file, but in \"set/rig.ma\""));
+}
+
+TEST(LossTest, AFosterParentStandsForANodeOfItsFile) {
+  const Checked checked(kHead +
+                        "file -r -ns \"rig\" -rfn \"rigRN\" \"set/rig.ma\";\n"
+                        "createNode fosterParent -n \"rigRNfosterParent1\";\n"
+                        "createNode transform -n \"shotCam\" -p \"rigRNfosterParent1\";\n"
+                        "createNode camera -n \"shotCamShape\" -p \"shotCam\";\n" +
+                        kResolution);
+  EXPECT_THAT(checked.SentenceOf(Code::ParentElsewhere), HasSubstr("but in \"set/rig.ma\""));
+  EXPECT_EQ(checked.CountOf(Code::ParentInReference), 0u);
 }
 
 TEST(LossTest, AParentThatDoesNotComeOverIsSaidOnce) {
@@ -59,7 +70,7 @@ TEST(LossTest, AParentThatDoesNotComeOverIsSaidOnce) {
   const std::string referenced = kHead + "file -r -ns \"rig\" -rfn \"rigRN\" \"set/rig.ma\";\n" + child;
   for (const std::string& text : {missing, referenced}) {
     const Checked checked(text);
-    EXPECT_EQ(checked.CountOf(Code::ParentNotImported), 1u) << checked.All();
+    EXPECT_EQ(checked.CountOf(Code::ParentElsewhere), 1u) << checked.All();
     EXPECT_EQ(checked.CountOf(Code::ParentMissing) + checked.CountOf(Code::ParentInReference), 0u)
         << checked.All();
   }
@@ -107,6 +118,38 @@ TEST(LossTest, ChannelsThatAConstraintDrivesAreNamedTogether) {
       checked.SentenceOf(Code::DrivenByNoCurve),
       "\"shotCam\" stands still in translateX, translateY: \"hold\" (pointConstraint) drives it, which is no "
       "curve");
+}
+
+// The import holds the value, and the evaluation cannot compute it: the first is said, once for each driver.
+TEST(LossTest, ADriverThatCannotBeComputedIsSaidOnce) {
+  const std::string text = CameraScene("", "",
+                                       "createNode expression -n \"shake\";\n"
+                                       "connectAttr \"shake.out[0]\" \"shotCam.tx\";\n"
+                                       "connectAttr \"shake.out[1]\" \"shotCam.ty\";\n"
+                                       "connectAttr \"shake.out[2]\" \"shotCamShape.fl\";\n");
+  const Checked checked(text);
+  EXPECT_EQ(checked.CountOf(Code::DrivenByNoCurve), 1u);
+  EXPECT_EQ(checked.CountOf(Code::FocalLengthElsewhere), 1u);
+  EXPECT_EQ(checked.CountOf(Code::UnsupportedDriver), 0u) << checked.All();
+  check::Options wanted;
+  wanted.only = {Code::UnsupportedDriver};
+  EXPECT_EQ(Checked(text, wanted).CountOf(Code::UnsupportedDriver), 3u);
+}
+
+// A scene has thousands of nodes of which nothing comes over.
+TEST(LossTest, NotesOfNodesAreGivenWhereALayerDependsOnThem) {
+  const std::string text = CameraScene(
+      "", "",
+      "file -r -ns \"set\" -rfn \"setRN\" \"set.ma\";\nfile -r -ns \"sky\" -rfn \"skyRN\" \"sky.ma\";\n"
+      "createNode transform -n \"prop\" -p \"set:root\";\n"
+      "createNode transform -n \"guide\" -p \"set:root\";\n"
+      "connectAttr \"guide.tx\" \"shotCam.tx\";\nconnectAttr \"guide.ty\" \"shotCam.tx\";\n"
+      "connectAttr \"guide.tx\" \"prop.tx\";\nconnectAttr \"guide.ty\" \"prop.tx\";\n");
+  const Checked checked(text);
+  EXPECT_EQ(checked.MarkedBy(Code::ParentInReference), "guide");
+  EXPECT_EQ(checked.MarkedBy(Code::AlreadyConnected), "shotCam.tx");
+  EXPECT_EQ(checked.SentenceOf(Code::ReferenceNotRead),
+            "referenced files are not read: 2, the first \"set.ma\"");
 }
 
 TEST(LossTest, ACurveThatGoesThroughAnotherNode) {
@@ -180,9 +223,10 @@ TEST(LossTest, SettingsThatACompositionHasNoPlaceFor) {
 TEST(LossTest, AnOrthographicCameraThatComesOverWithAPerspective) {
   const Checked checked(CameraScene("", "\tsetAttr \".o\" on;\n"));
   ASSERT_EQ(checked.cameOver().layers.size(), 1u);
-  EXPECT_EQ(checked.SentenceOf(Code::AttributesWithoutPlace),
-            "a composition has no place for the orthographic view of \"shotCamShape\"");
-  EXPECT_EQ(Checked(CameraScene("", "\tsetAttr \".o\" off;\n")).CountOf(Code::AttributesWithoutPlace), 0u);
+  EXPECT_EQ(checked.SentenceOf(Code::OrthographicAsPerspective),
+            "the orthographic camera \"shotCamShape\" comes over with a perspective");
+  EXPECT_EQ(checked.CountOf(Code::AttributesWithoutPlace), 0u);
+  EXPECT_EQ(Checked(CameraScene("", "\tsetAttr \".o\" off;\n")).All(), "");
 }
 
 }  // namespace

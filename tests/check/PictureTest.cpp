@@ -185,8 +185,9 @@ TEST(PictureTest, AResolutionThatTheFileLeavesOut) {
   const Checked checked(
       kHead +
       "createNode transform -n \"shotCam\";\ncreateNode camera -n \"shotCamShape\" -p \"shotCam\";\n");
-  EXPECT_EQ(checked.CountOf(Code::PictureSizeAssumed), 3u);
-  EXPECT_THAT(checked.All(), HasSubstr("the width of the composition is 720, where the scene means 960"));
+  EXPECT_EQ(checked.SentenceOf(Code::PictureSizeAssumed),
+            "the composition has width 720, height 486, pixel aspect 0.909, where the scene means 960, 540, "
+            "1");
 }
 
 TEST(PictureTest, TheUnitAndTheRate) {

@@ -2,6 +2,7 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <cmath>
 #include <string>
 
 #include "tests/check/CheckedText.h"
@@ -30,7 +31,10 @@ TEST(ShiftTest, WhatDrivesManyCamerasIsReportedOnce) {
                      "createNode transform -n \"rig\";\ncreateNode expression -n \"drive\";\n"
                      "connectAttr \"drive.out[0]\" \"rig.tx\";\n";
   for (int i = 0; i < 3; ++i) text += CameraOf("shot" + std::to_string(i), "", "rig");
-  EXPECT_EQ(Checked(text + kResolution).CountOf(Code::UnsupportedDriver), 1u);
+  check::Options evaluation;
+  evaluation.only = {Code::UnsupportedDriver};
+  EXPECT_EQ(Checked(text + kResolution, evaluation).CountOf(Code::UnsupportedDriver), 1u);
+  EXPECT_EQ(Checked(text + kResolution).CountOf(Code::DrivenByNoCurve), 1u);
 }
 
 TEST(ShiftTest, NothingIsReportedOfWhatDrivesTheCentreOfInterest) {
@@ -140,6 +144,66 @@ TEST(ShiftTest, KeysOfEachSecondAreNoBakeAndThoseOfEachFrameAre) {
 TEST(ShiftTest, ASceneInSecondsKeepsItsTimes) {
   const Checked checked(InSeconds(CameraScene("", "", CurveOf("moveX", "1 0 3 100", "shotCam.tx"))));
   EXPECT_EQ(checked.CountOf(Code::PictureShifts), 0u) << checked.All();
+}
+
+// The scene shows twice as much at the last key: its edges land twice as far from the middle.
+TEST(ShiftTest, AnApertureThatIsKeyedOrDriven) {
+  const Checked keyed(
+      CameraScene("", "", CurveOf("wide", "1 1.41732 5 2.83464", "shotCamShape.hfa", "animCurveTU")));
+  EXPECT_EQ(keyed.SentenceOf(Code::ApertureMotionLost),
+            "the film aperture of \"shotCamShape\" stands still: it has keys, one at 2.835");
+  EXPECT_EQ(keyed.MarkedBy(Code::ApertureMotionLost), "shotCamShape.hfa");
+  const auto& shift = keyed.Only(Code::PictureShifts).diagnostic.arguments;
+  EXPECT_NEAR(std::stod(shift.at(1)), std::hypot(480.0, 270.0), 0.01);
+  EXPECT_EQ(shift.at(2), "5");
+  const Checked driven(CameraScene("", "",
+                                   "createNode expression -n \"film\";\n"
+                                   "connectAttr \"film.out[0]\" \"shotCamShape.vfa\";\n"));
+  EXPECT_EQ(driven.SentenceOf(Code::ApertureMotionLost),
+            "the film aperture of \"shotCamShape\" stands still: \"film\" drives it");
+  EXPECT_EQ(driven.CountOf(Code::UnsupportedDriver), 0u);
+  EXPECT_EQ(
+      Checked(CameraScene("", "", CurveOf("wide", "1 1.41732 5 1.41732", "shotCamShape.hfa", "animCurveTU")))
+          .All(),
+      "");
+}
+
+TEST(ShiftTest, AFilmFitThatIsKeyed) {
+  const Checked checked(CameraScene("", "", CurveOf("fit", "1 1 5 2", "shotCamShape.ff", "animCurveTU")));
+  EXPECT_EQ(checked.SentenceOf(Code::FitMotionLost),
+            "the film fit of \"shotCamShape\" stands still: it has keys, one at 2");
+  EXPECT_EQ(checked.MarkedBy(Code::FitMotionLost), "shotCamShape.ff");
+  EXPECT_EQ(checked.CountOf(Code::PictureShifts), 1u);
+}
+
+std::string CurveThatGoesOn(const std::string& infinity, const std::string& frames) {
+  return CameraScene("", "",
+                     frames + "createNode animCurveTL -n \"moveX\";\n\tsetAttr \".tan\" 9;\n" +
+                         "\tsetAttr \".wgt\" no;\n\tsetAttr -s 2 \".ktv[0:1]\" 10 0 20 10;\n" + infinity +
+                         "connectAttr \"moveX.o\" \"shotCam.tx\";\n");
+}
+
+TEST(ShiftTest, ACurveThatGoesOnOutsideItsKeys) {
+  const auto sentence = [](const char* infinity) {
+    return Checked(CurveThatGoesOn(infinity, Playback(1, 30))).SentenceOf(Code::InfinityLost);
+  };
+  const std::string held = "\"shotCam\" stands still in translateX ";
+  EXPECT_EQ(sentence("\tsetAttr \".pre\" 1;\n"), held + "before its keys, where the scene goes on: linear");
+  EXPECT_EQ(sentence("\tsetAttr \".pst\" 3;\n"), held + "after its keys, where the scene goes on: cycle");
+  EXPECT_EQ(sentence("\tsetAttr \".pst\" 4;\n"),
+            held + "after its keys, where the scene goes on: cycle with offset");
+  EXPECT_EQ(sentence("\tsetAttr \".pst\" 5;\n"), held + "after its keys, where the scene goes on: oscillate");
+  const Checked linear(CurveThatGoesOn("\tsetAttr \".pst\" 1;\n", Playback(10, 30)));
+  EXPECT_EQ(linear.MarkedBy(Code::InfinityLost), "1");
+  // Ten frames on, a unit a frame, ten units away.
+  const auto& shift = linear.Only(Code::PictureShifts).diagnostic.arguments;
+  EXPECT_NEAR(std::stod(shift.at(1)), 960.0 * 35.0 / 25.4 / 1.41732, 0.01);
+  EXPECT_EQ(shift.at(2), "30");
+}
+
+TEST(ShiftTest, ACurveThatGoesOnOutsideTheFramesLosesNothing) {
+  EXPECT_EQ(Checked(CurveThatGoesOn("\tsetAttr \".pre\" 1;\n\tsetAttr \".pst\" 4;\n", "")).All(), "");
+  EXPECT_EQ(Checked(CurveThatGoesOn("\tsetAttr \".pst\" 0;\n", Playback(10, 30))).All(), "");
 }
 
 }  // namespace

@@ -118,6 +118,31 @@ TEST(StopsTest, AFileThatIsNoSceneIsSaidByItsKind) {
   EXPECT_FALSE(Checked("#usda 1.0\n").report().head.isScene);
 }
 
+// The import says the line, too: both count it as an editor does.
+TEST(StopsTest, TheLineOfAStopIsTheImportsWhateverEndsLines) {
+  const std::string head = CameraScene("");
+  const std::string stops[] = {"createNode transform -n _root;\n",
+                               "setAttr \".t\" -type \"double3\" 1e999 0 0 ;\n",
+                               "createNode transform\n -n \"open\n"};
+  const Code codes[] = {Code::RefusedByte, Code::NumberTooLarge, Code::CutOffInString};
+  const std::vector<std::vector<std::string>> allEnds = {
+      {"\n"}, {"\r\n"}, {"\r"}, {"\r", "\r\n", "\n"}, {"\n", "\r", "\r"}};
+  for (std::size_t stop = 0; stop < std::size(stops); ++stop) {
+    const std::string text = head + "createNode transform -n \"last\";\n" + stops[stop];
+    std::string line;
+    for (const std::vector<std::string>& ends : allEnds) {
+      std::string changed;
+      std::size_t count = 0;
+      for (const char c : text) changed += c == '\n' ? ends[count++ % ends.size()] : std::string(1, c);
+      const Checked checked(changed);
+      const check::Finding& finding = checked.Only(codes[stop]);
+      EXPECT_EQ(finding.diagnostic.place.line, checked.cameOver().line) << stop;
+      if (line.empty()) line = std::to_string(finding.diagnostic.place.line) + finding.excerpt;
+      EXPECT_EQ(std::to_string(finding.diagnostic.place.line) + finding.excerpt, line) << stop;
+    }
+  }
+}
+
 TEST(StopsTest, TheSameStopIsNotSaidTwice) {
   const Checked checked(kHead + "createNode transform -n \"a\n");
   EXPECT_EQ(checked.CountOf(Code::OpenString), 0u);

@@ -43,15 +43,17 @@ TEST_F(HeadTest, AReferenceIsNamedOnceAndNotFollowed) {
   Read(
       "file -rdi 1 -ns \"hero\" -rfn \"heroRN\" -op \"v=0;\" -typ \"mayaAscii\"\n\t\t\"hero.ma\";\n"
       "file -rdi 2 -ns \"x\" -rfn \"xRN\" \"x.ma\";\n"
-      "file -r -ns \"hero\" -dr 1 -rfn \"heroRN\" \"hero.ma\";\nfile -r;file -import \"y.ma\";");
+      "file -r -ns \"hero\" -dr 1 -rfn \"heroRN\" \"hero.ma\";\nfile -r;file -import \"y.ma\";"
+      "file -r -ns \"x\" -dr 1 -rfn \"xRN\" \"x.ma\";");
   ASSERT_EQ(scene_.references().size(), 2u);
   EXPECT_EQ(scene_.references()[0].node, "heroRN");
   EXPECT_EQ(scene_.references()[0].nameSpace, "hero");
   EXPECT_EQ(scene_.references()[0].file, "hero.ma");
   EXPECT_EQ(PlaceOf(scene_.references()[0].place), "2:4");
   EXPECT_EQ(scene_.references()[1].file, "x.ma");
-  EXPECT_THAT(Diagnostics(), ElementsAre("4:41: the referenced file \"hero.ma\" is not read [MA0211]",
-                                         "5:1: the command \"file\" lacks a file [MA0108]"));
+  EXPECT_THAT(Diagnostics(), ElementsAre("5:1: the command \"file\" lacks a file [MA0108]",
+                                         "4:41: referenced files are not read: 2, the first \"hero.ma\" "
+                                         "[MA0211]"));
 }
 
 TEST_F(HeadTest, UnitsAreSaidOrTheDefault) {

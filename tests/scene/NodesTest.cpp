@@ -212,8 +212,7 @@ TEST_F(NodesTest, AParentInAReferencedFileIsReportedWithTheFile) {
   EXPECT_THAT(
       Diagnostics(),
       ElementsAre(
-          "1:41: the referenced file \"hero.ma\" is not read [MA0211]",
-          "5:35: the referenced file \"prop.ma\" is not read [MA0211]",
+          "1:41: referenced files are not read: 2, the first \"hero.ma\" [MA0211]",
           "2:26: \"faceCam\" stands under \"hero:head\", which belongs to the referenced file \"hero.ma\" "
           "[MA0205]",
           "4:23: \"c\" stands under \"heroRNfosterParent1\", which belongs to the referenced file "
