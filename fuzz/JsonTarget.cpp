@@ -197,8 +197,10 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   std::ostringstream written;
   mayascene::writeCompositionJson(written, scene.run);
   CheckJson(written.str(), scene);
-  std::ostringstream outline;
-  mayascene::printOutline(outline, scene.run.scenes.front(), mayascene::Style(false));
-  CheckOutline(outline.str());
+  for (const auto detail : {mayascene::Detail::Layers, mayascene::Detail::Properties}) {
+    std::ostringstream outline;
+    mayascene::printOutline(outline, scene.run.scenes.front(), detail, mayascene::Style(false));
+    CheckOutline(outline.str());
+  }
   return 0;
 }
