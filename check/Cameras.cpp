@@ -1,10 +1,15 @@
 #include "check/Cameras.h"
 
 #include <algorithm>
+#include <array>
 #include <cstddef>
 
 namespace check {
 namespace {
+
+// The types that the importer keeps as transforms.
+constexpr std::array<std::string_view, 4> kTransformTypes = {"transform", "stereoRigTransform", "lookAt",
+                                                             "aimConstraint"};
 
 // With its quotes a name has fewer bytes than this.
 constexpr std::size_t kQuotedName = 255;
@@ -28,6 +33,11 @@ bool IsSkipped(const scene::Scene& scene, scene::NodeId id) {
 bool SameName(std::string_view a, std::string_view b) {
   return a.size() == b.size() &&
          std::equal(a.begin(), a.end(), b.begin(), [](char x, char y) { return Lower(x) == Lower(y); });
+}
+
+bool IsImportedTransform(std::string_view type) {
+  return std::any_of(kTransformTypes.begin(), kTransformTypes.end(),
+                     [type](std::string_view one) { return SameName(one, type); });
 }
 
 std::string_view ImportName(const scene::Scene& scene, const scene::Node& node) {

@@ -24,6 +24,9 @@ std::vector<Camera> FindCameras(const scene::Scene& scene, const CameOver& cameO
 // for one whose name is too long for the importer.
 std::string_view ImportName(const scene::Scene& scene, const scene::Node& node);
 
+// Whether the importer keeps nodes of the type as transforms.
+bool IsImportedTransform(std::string_view type);
+
 // Whether two names are one for the importer: it does not look at case.
 bool SameName(std::string_view a, std::string_view b);
 

@@ -85,8 +85,8 @@ void CheckScene(std::string_view text, const CameOver& cameOver, const Options& 
   const scene::Scene scene = scene::Read(text, *collector, &notes);
   const scene::Settings settings = scene::ReadSettings(scene, *collector);
   const std::vector<Camera> cameras = FindCameras(scene, cameOver);
-  *head = ReadHead(scene, settings, cameOver, cameras, collector->lines());
   const motion::Measures measures = motion::MeasuresOf(scene);
+  *head = ReadHead({scene, settings, measures, cameOver, cameras, collector->lines(), options.all});
   const std::vector<Link> links = FindLinks(scene, cameras);
   Channels channels(scene);
   std::set<std::uint64_t> driversSaid;

@@ -18,7 +18,7 @@
 namespace check {
 
 struct Options {
-  bool all = false;              // every diagnostic in full, however many there are of one code
+  bool all = false;              // every diagnostic in full, and the whole head, however much there is
   std::vector<diag::Code> only;  // no others are reported, or counted; empty: all of them
 };
 

@@ -32,12 +32,26 @@ std::size_t CountOf(LayerKind kind, const CameOver& cameOver) {
                     [kind](const CameOverLayer& layer) { return layer.kind == kind; }));
 }
 
+void DescribeCameras(const HeadSource& source, Head* head) {
+  std::vector<scene::NodeId> shapes;
+  for (const Camera& camera : source.cameras) {
+    if (scene::IsStartupCamera(source.scene.node(camera.shape)) && camera.layer == nullptr) continue;
+    AddOrCount(source, &head->cameras, &head->camerasNotShown, [&] {
+      shapes.push_back(camera.shape);
+      return DescribeCamera(source, camera);
+    });
+  }
+  DescribeLensesOverFrames(source, shapes, &head->cameras);
+}
+
 }  // namespace
 
 Where WhereIs(const diag::Range& range, diag::Lines& lines) { return {range, lines.At(range.offset)}; }
 
-Head ReadHead(const scene::Scene& scene, const scene::Settings& settings, const CameOver& cameOver,
-              const std::vector<Camera>& cameras, diag::Lines& lines) {
+Head ReadHead(const HeadSource& source) {
+  const scene::Scene& scene = source.scene;
+  const scene::Settings& settings = source.settings;
+  diag::Lines& lines = source.lines;
   Head head;
   head.isScene = true;
   head.product = settings.product;
@@ -52,16 +66,11 @@ Head ReadHead(const scene::Scene& scene, const scene::Settings& settings, const 
   head.height = GivenBy(settings.height, lines);
   head.pixelAspect = GivenBy(settings.deviceAspect, lines);
   head.pixelAspect.value = settings.pixelAspect();
-  for (const Camera& camera : cameras) {
-    if (scene::IsStartupCamera(scene.node(camera.shape)) && camera.layer == nullptr) continue;
-    if (head.cameras.size() == Head::kMostCameras) {
-      ++head.camerasNotShown;
-    } else {
-      head.cameras.push_back(DescribeCamera(scene, settings, cameOver, camera, lines));
-    }
-  }
-  head.camerasThatCame = CountOf(LayerKind::Camera, cameOver);
-  head.nullsThatCame = CountOf(LayerKind::Null, cameOver);
+  DescribeCameras(source, &head);
+  DescribeLocators(source, &head);
+  DescribeLookAts(source, &head);
+  head.camerasThatCame = CountOf(LayerKind::Camera, source.cameOver);
+  head.nullsThatCame = CountOf(LayerKind::Null, source.cameOver);
   return head;
 }
 

@@ -1,4 +1,5 @@
-// The first lines of a report: what holds for the scene as a whole, and its cameras.
+// The first lines of a report: what holds for the scene as a whole, its cameras, its marked
+// locators and its look-ats.
 #pragma once
 
 #include <cstddef>
@@ -40,21 +41,53 @@ struct ChainLink {
   std::vector<Drive> drives;
 };
 
-struct CameraHead {
+// A camera or a marked locator: where it hangs, and the layer that the import made of it.
+struct ShapeHead {
   std::string path;
   Where where;
-  Given<double> focalLength;         // millimetres, where nothing drives it
-  Given<double> horizontalAperture;  // inches
-  Given<double> verticalAperture;
-  Given<std::string> fit;        // "fill", "horizontal", "vertical", "overscan"
-  double angleOfView = 0.0;      // degrees, across the picture
-  std::vector<Drive> drives;     // of the lens
-  std::vector<ChainLink> chain;  // from the camera's own transform upwards
+  std::vector<ChainLink> chain;  // from the shape's own transform upwards
   bool chainGoesOn = false;      // it has more than kMostLinks
   bool cameOver = false;         // the import made a layer of it
   std::size_t keys = 0;          // that the layer has on its place
-  std::size_t zoomKeys = 0;
-  std::size_t parents = 0;  // null layers above it, at most kMostLinks
+  std::size_t parents = 0;       // null layers above it, at most kMostLinks
+};
+
+// From the smallest value to the largest one.
+struct Span {
+  double least = 0.0;
+  double largest = 0.0;
+};
+
+// The values that a driven lens takes. None: nothing drives it, or its values cannot be computed.
+struct LensOverFrames {
+  double first = 0.0;  // frames: what is played, and all keys of such cameras
+  double last = 0.0;
+  std::optional<Span> focalLength;  // units as in CameraHead
+  std::optional<Span> horizontalAperture;
+  std::optional<Span> verticalAperture;
+  std::optional<Span> orthographicWidth;
+  std::optional<Span> angleOfView;  // none where any of the lens cannot be computed
+};
+
+struct CameraHead : ShapeHead {
+  Given<double> focalLength;         // millimetres; as it is stored, whether or not something drives it
+  Given<double> horizontalAperture;  // inches, stored
+  Given<double> verticalAperture;
+  Given<std::string> fit;                          // "fill", "horizontal", "vertical", "overscan"
+  double angleOfView = 0.0;                        // degrees, across the picture, of the stored lens
+  std::optional<Given<double>> orthographicWidth;  // the scene's unit; of an orthographic camera alone
+  std::vector<Drive> drives;                       // of the lens
+  std::optional<LensOverFrames> overFrames;        // of a lens that is driven
+  std::size_t zoomKeys = 0;                        // of the layer
+};
+
+// A look-at, whatever it turns.
+struct LookAtHead {
+  std::string name;
+  Where where;
+  std::string turns;   // the node that it turns; empty: none
+  std::string camera;  // the camera that the import aims by it; empty: none
+  std::string target;  // the node that this camera is aimed at
 };
 
 struct Range {
@@ -76,11 +109,15 @@ struct Head {
   Given<double> height;
   Given<double> pixelAspect;
   std::vector<CameraHead> cameras;  // those that the file creates, in its order
-  std::size_t camerasNotShown = 0;  // beyond the first kMostCameras
+  std::size_t camerasNotShown = 0;  // beyond the first kMostOfAKind, as with the next two
+  std::vector<ShapeHead> locators;  // those that are marked
+  std::size_t locatorsNotShown = 0;
+  std::vector<LookAtHead> lookAts;  // those that turn a camera, then the others
+  std::size_t lookAtsNotShown = 0;
   std::size_t nullsThatCame = 0;
   std::size_t camerasThatCame = 0;
 
-  static constexpr std::size_t kMostCameras = 100;
+  static constexpr std::size_t kMostOfAKind = 100;  // where not all are asked for
   static constexpr std::size_t kMostLinks = 32;
 };
 

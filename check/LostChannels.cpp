@@ -7,6 +7,7 @@
 #include <vector>
 
 #include "check/Curves.h"
+#include "check/LookAts.h"
 #include "check/RulesInternal.h"
 #include "scene/Attributes.h"
 
@@ -44,8 +45,6 @@ bool ComesFromCurve(const scene::Scene& scene, NodeId from) {
   }
   return false;
 }
-
-bool IsLookAt(std::string_view type) { return SameName(type, "lookAt") || SameName(type, "aimConstraint"); }
 
 struct Driven {
   std::string channels;

@@ -3,6 +3,7 @@
 #include <string_view>
 #include <vector>
 
+#include "check/LookAts.h"
 #include "check/RulesInternal.h"
 
 namespace check {
@@ -11,26 +12,10 @@ namespace {
 using diag::Code;
 using scene::NodeId;
 
-constexpr std::string_view kTarget = "target";
-
-// The attribute of a plug as the file has it.
-std::string_view WrittenAttribute(const scene::Scene& scene, const diag::Range& plug) {
-  const std::string_view text =
-      scene.text().substr(static_cast<std::size_t>(plug.offset), static_cast<std::size_t>(plug.length));
-  const std::size_t dot = text.find('.');
-  return dot == std::string_view::npos ? std::string_view() : text.substr(dot + 1);
-}
-
 // The last connection into the look-at that the importer takes for its target; null where there is none.
 const scene::Connection* LastTarget(const scene::Scene& scene, NodeId lookAt) {
-  const scene::Connection* last = nullptr;
-  for (const scene::Connection* const connection : scene.ConnectionsInto(lookAt)) {
-    const std::string_view attribute = WrittenAttribute(scene, connection->destinationPlace);
-    if (attribute.find(kTarget) == std::string_view::npos) continue;
-    if (last == nullptr || last->destinationPlace.offset < connection->destinationPlace.offset)
-      last = connection;
-  }
-  return last;
+  const std::vector<const scene::Connection*> targets = TargetsOf(scene, lookAt);
+  return targets.empty() ? nullptr : targets.back();
 }
 
 void ReportLookAt(const Subject& subject, NodeId lookAt, const Camera& camera) {
@@ -56,8 +41,7 @@ std::vector<NodeId> LookAtsOf(const scene::Scene& scene, NodeId transform) {
     const NodeId source = connection->source.node;
     const std::string_view type = scene.node(source).type;
     const bool turns = connection->destination.attribute.starts_with("rotate");
-    const bool lookAt = SameName(type, "lookAt") || SameName(type, "aimConstraint");
-    if (turns && lookAt && std::find(found.begin(), found.end(), source) == found.end())
+    if (turns && IsLookAt(type) && std::find(found.begin(), found.end(), source) == found.end())
       found.push_back(source);
   }
   return found;

@@ -1,6 +1,5 @@
 // Nodes above a camera that the importer does not find.
 #include <algorithm>
-#include <array>
 #include <string>
 
 #include "check/RulesInternal.h"
@@ -10,15 +9,6 @@ namespace {
 
 using diag::Code;
 using diag::Range;
-
-// The types that the importer keeps as transforms.
-constexpr std::array<std::string_view, 4> kTransformTypes = {"transform", "stereoRigTransform", "lookAt",
-                                                             "aimConstraint"};
-
-bool IsImportedTransform(std::string_view type) {
-  return std::any_of(kTransformTypes.begin(), kTransformTypes.end(),
-                     [type](std::string_view one) { return SameName(one, type); });
-}
 
 // What stands in quotes after "-p" in the command that created the node; empty where it is not found.
 Range WrittenParent(std::string_view text, const scene::Node& node) {

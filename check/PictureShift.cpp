@@ -3,12 +3,12 @@
 #include <cmath>
 #include <deque>
 #include <limits>
-#include <optional>
 #include <string>
 #include <vector>
 
 #include "check/CameraShift.h"
 #include "check/RulesInternal.h"
+#include "check/Times.h"
 #include "motion/Evaluator.h"
 #include "motion/FrameEnds.h"
 
@@ -80,12 +80,8 @@ class Shifts {
 
   // Those of the bake: what is played, and all keys of what the cameras depend on.
   void FindFrames() {
-    std::optional<motion::FrameEnds> played;
-    if (const auto& playback = subject_.settings.playback) {
-      played =
-          motion::FrameEnds{playback->value.first / unitsPerFrame_, playback->value.last / unitsPerFrame_};
-    }
-    frames_ = motion::FindFrameEnds(subject_.scene, played, evaluator_.computingNodes(), subject_.measures)
+    frames_ = motion::FindFrameEnds(subject_.scene, PlayedFrames(subject_.scene, subject_.settings),
+                                    evaluator_.computingNodes(), subject_.measures)
                   .value_or(motion::FrameEnds{});
     const double count = frames_.last - frames_.first + 1.0;
     double steps = kMostSteps;

@@ -136,6 +136,13 @@ void ReportStarts(const Subject& subject, const Camera& camera) {
 
 }  // namespace
 
+std::optional<motion::FrameEnds> PlayedFrames(const scene::Scene& scene, const scene::Settings& settings) {
+  if (!settings.playback) return std::nullopt;
+  const double unitsPerFrame = motion::UnitsPerFrame(scene);
+  const auto& played = settings.playback->value;
+  return motion::FrameEnds{played.first / unitsPerFrame, played.last / unitsPerFrame};
+}
+
 bool CountsFrames(const scene::Scene& scene) {
   const std::string_view unit = scene.timeUnit().word;
   if (!unit.empty() && unit.front() >= '0' && unit.front() <= '9') return true;

@@ -5,6 +5,7 @@
 #include <optional>
 
 #include "check/RulesInternal.h"
+#include "motion/FrameEnds.h"
 
 namespace check {
 
@@ -18,5 +19,8 @@ bool CountsFrames(const scene::Scene& scene);
 // The smallest first key of the camera and what stands above it, in the scene's unit. None where nothing is
 // keyed.
 std::optional<double> FirstKey(const Subject& subject, const Camera& camera);
+
+// What the scene plays, in frames. None where it does not say.
+std::optional<motion::FrameEnds> PlayedFrames(const scene::Scene& scene, const scene::Settings& settings);
 
 }  // namespace check

@@ -66,7 +66,7 @@ void CheckBounds(const check::Report& report) {
 
 void CheckOutputs(const mayascene::CheckedScene& scene, std::size_t size) {
   std::ostringstream text;
-  mayascene::printCheck(text, scene, false, mayascene::Style(false));
+  mayascene::printCheck(text, scene, {}, mayascene::Style(false));
   for (const char c : text.str()) {
     const auto byte = static_cast<unsigned char>(c);
     Require(byte == '\n' || (byte >= 0x20 && byte != 0x7f), "no control reaches a terminal");

@@ -37,6 +37,47 @@ TEST_F(CheckCommand, SaysWhereEachSettingStandsOrThatItIsTheDefault) {
   EXPECT_THAT(out, HasSubstr("  range          the file does not say\n"));
 }
 
+// Every row of a driven lens, a locator and a look-at.
+TEST_F(CheckCommand, TheHeadShowsLensesLocatorsAndLookAts) {
+  write("shot.ma",
+        sceneText("createNode transform -n \"cam\";\ncreateNode camera -n \"camShape\" -p \"cam\";\n"
+                  "createNode locator -n \"nullShape\" -p \"cam\";\ncreateNode lookAt -n \"look\";\n"
+                  "createNode animCurveTU -n \"zoom\";\n\tsetAttr \".tan\" 2;\n"
+                  "\tsetAttr \".ktv[0:1]\" 1 40 5 80;\n"
+                  "connectAttr \"zoom.o\" \"camShape.fl\";\n"
+                  "connectAttr \"look.cr\" \"cam.r\";\n"
+                  "createNode transform -n \"flat\";\n"
+                  "createNode camera -n \"flatShape\" -p \"flat\";\n\tsetAttr \".o\" yes;\n"));
+  const std::string out = run({"check", "shot.ma"}).out;
+  EXPECT_THAT(out, HasSubstr("    focal length 40 to 80 mm, frames 1 to 5\n"
+                             "      driven by  animCurveTU zoom, 2 keys (line "));
+  EXPECT_THAT(out,
+              HasSubstr("    angle        25.361 to 48.455 degrees across the picture, frames 1 to 5\n"));
+  EXPECT_THAT(out,
+              HasSubstr("    orthographic 10 centimeter across the picture (default: the file does not say)\n"
+                        "    under        flat\n"));
+  EXPECT_THAT(out, HasSubstr("    came over    a null layer with 0 keys for its place, under 0 nulls\n"));
+  EXPECT_THAT(out, HasSubstr("    turns        cam\n    came over    nothing: it aims no camera\n"));
+}
+
+TEST_F(CheckCommand, LongListsOfTheHeadAreCutUnlessAllIsAskedFor) {
+  std::string nodes = "createNode transform -n \"t0\";\n";
+  std::string wires;
+  for (int i = 1; i < 12; ++i) {
+    const std::string n = std::to_string(i);
+    nodes += "createNode transform -n \"t" + n + "\" -p \"t" + std::to_string(i - 1) + "\";\n";
+    nodes += "createNode camera -n \"c" + n + "\" -p \"t" + n + "\";\n";
+    wires += "connectAttr \"t0.tx\" \"t" + n + ".tx\";\nconnectAttr \"t0.ty\" \"t" + n + ".ty\";\n";
+  }
+  write("deep.ma", sceneText(nodes + wires));
+  const std::string out = run({"check", "deep.ma"}).out;
+  EXPECT_THAT(out, HasSubstr("  cameras        3 more (--all shows them)\n"));
+  // The eighth camera: nine transforms, of which the topmost is not driven.
+  EXPECT_THAT(out, HasSubstr("    under        1 more (--all shows them)\n"
+                             "    channels     7 more (--all shows them)\n"));
+  EXPECT_THAT(run({"check", "--all", "deep.ma"}).out, Not(HasSubstr("--all shows them")));
+}
+
 TEST_F(CheckCommand, AnErrorIsShownWithItsLineAndEndsWithOne) {
   write("refused.ma", sceneText("select -ne |shotcam;\n"));
   const ToolResult check = run({"check", "refused.ma"});

@@ -44,5 +44,11 @@ TEST_F(DocumentedOutput, ThePageOnCheckingShowsAReportAsItIsPrinted) {
   EXPECT_THAT(document("docs/checking.md"), HasSubstr("```\n" + check.out + "```\n"));
 }
 
+TEST_F(DocumentedOutput, ThePageOnCheckingShowsAHeadAsItIsPrinted) {
+  const std::string report = run({"check", "examples/look_at_dancer.ma"}).out;
+  EXPECT_THAT(document("docs/checking.md"),
+              HasSubstr("```\n" + report.substr(0, report.find("\n\n") + 1) + "```\n"));
+}
+
 }  // namespace
 }  // namespace mayascene_test

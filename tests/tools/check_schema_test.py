@@ -21,6 +21,8 @@ connectAttr "moveX.o" "shotCam.tx";
 createNode animCurveTU -n "zoom";
 \tsetAttr ".ktv[0]" 1 35;
 connectAttr "zoom.o" "shotCamShape.fl";
+createNode locator -n "nullShape" -p "rig\x1b";
+createNode lookAt -n "look";
 createNode script -n "sceneConfigurationScriptNode";
 \tsetAttr ".b" -type "string" "playbackOptions -min 1 -max 24 -ast 1 -aet 48 ";
 """
@@ -42,6 +44,10 @@ BROKEN = {
     "a layer without keys": lambda d: camera(d)["layer"].pop("keys"),
     "a driver without a type": lambda d: camera(d)["drivenBy"][0].pop("type"),
     "a link without a name": lambda d: camera(d)["chain"][0].pop("name"),
+    "a span without an end": lambda d: camera(d)["overFrames"]["focalLength"].pop("largest"),
+    "frames without a first one": lambda d: camera(d)["overFrames"].pop("first"),
+    "a locator without a layer": lambda d: scene(d)["head"]["locators"][0].pop("layer"),
+    "a look-at without a target": lambda d: scene(d)["head"]["lookAts"][0].pop("target"),
     "line 0": lambda d: camera(d)["where"].update(line=0),
     "another severity": lambda d: diagnostic(d).update(severity="fatal"),
     "another code": lambda d: diagnostic(d).update(code="E12"),
@@ -72,12 +78,14 @@ def main():
     test.write("notes.txt", "just some notes\n")
     test.write("broken.ma", HEADER + "createNode transform -n \"open;\n")
     test.write("infinite.ma", CAMERA + "createNode camera -n \"c\";\n\tsetAttr \".fl\" 0;\n")
+    test.write("flat.ma", CAMERA + "createNode camera -n \"flat\";\n\tsetAttr \".o\" yes;\n")
     good = test.document_of("check", "camera.ma")
     every = test.document_of("check", "many.ma", "notes.txt", "broken.ma", "missing.ma", "infinite.ma")
     test.expect(every["scenes"][0]["notInFull"], "nothing was counted alone")
     test.expect(every["scenes"][3]["failure"] is not None, "no file could not be read")
     documents = {
         "a camera": good,
+        "an orthographic camera": test.document_of("check", "flat.ma"),
         "every kind of file": every,
         "own scenes": test.document_of("check", "--all", *test.scenes(least=8)),
     }

@@ -55,43 +55,108 @@ void writeDrives(text::JsonWriter& json, const std::vector<check::Drive>& drives
   json.endArray();
 }
 
-void writeChain(text::JsonWriter& json, const check::CameraHead& camera) {
+void writeChain(text::JsonWriter& json, const check::ShapeHead& shape) {
   json.key("chain");
   json.beginArray();
-  for (const check::ChainLink& link : camera.chain) {
+  for (const check::ChainLink& link : shape.chain) {
     json.beginObject();
     writeText(json, "name", link.name);
     writeDrives(json, link.drives);
     json.endObject();
   }
   json.endArray();
-  writeTruth(json, "chainGoesOn", camera.chainGoesOn);
+  writeTruth(json, "chainGoesOn", shape.chainGoesOn);
 }
 
-void writeLayer(text::JsonWriter& json, const check::CameraHead& camera) {
+// The keys of the zoom are null of a locator.
+void writeLayer(text::JsonWriter& json, const check::ShapeHead& shape, const std::size_t* zoomKeys) {
   json.key("layer");
-  if (!camera.cameOver) return json.null();
+  if (!shape.cameOver) return json.null();
   json.beginObject();
-  writeCount(json, "keys", camera.keys);
-  writeCount(json, "zoomKeys", camera.zoomKeys);
-  writeCount(json, "parents", camera.parents);
+  writeCount(json, "keys", shape.keys);
+  if (zoomKeys != nullptr) writeCount(json, "zoomKeys", *zoomKeys);
+  writeCount(json, "parents", shape.parents);
   json.endObject();
 }
 
-void writeCamera(text::JsonWriter& json, const check::CameraHead& camera) {
+void writeSpan(text::JsonWriter& json, std::string_view key, const std::optional<check::Span>& span) {
+  if (!span) return;
+  json.key(key);
   json.beginObject();
-  writeText(json, "path", camera.path);
+  writeNumber(json, "least", span->least);
+  writeNumber(json, "largest", span->largest);
+  json.endObject();
+}
+
+// Without what is not driven, and without what cannot be computed.
+void writeOverFrames(text::JsonWriter& json, const std::optional<check::LensOverFrames>& over) {
+  if (!over) return;
+  json.key("overFrames");
+  json.beginObject();
+  writeNumber(json, "first", over->first);
+  writeNumber(json, "last", over->last);
+  writeSpan(json, "focalLength", over->focalLength);
+  writeSpan(json, "horizontalAperture", over->horizontalAperture);
+  writeSpan(json, "verticalAperture", over->verticalAperture);
+  writeSpan(json, "orthographicWidth", over->orthographicWidth);
+  writeSpan(json, "angleOfView", over->angleOfView);
+  json.endObject();
+}
+
+void beginShape(text::JsonWriter& json, const check::ShapeHead& shape) {
+  json.beginObject();
+  writeText(json, "path", shape.path);
   json.key("where");
-  writeWhere(json, camera.where);
+  writeWhere(json, shape.where);
+}
+
+void writeCamera(text::JsonWriter& json, const check::CameraHead& camera) {
+  beginShape(json, camera);
   writeGiven(json, "focalLength", camera.focalLength);
   writeGiven(json, "horizontalAperture", camera.horizontalAperture);
   writeGiven(json, "verticalAperture", camera.verticalAperture);
   writeGiven(json, "fit", camera.fit);
   writeNumber(json, "angleOfView", camera.angleOfView);
+  if (camera.orthographicWidth) writeGiven(json, "orthographicWidth", *camera.orthographicWidth);
   writeDrives(json, camera.drives);
+  writeOverFrames(json, camera.overFrames);
   writeChain(json, camera);
-  writeLayer(json, camera);
+  writeLayer(json, camera, &camera.zoomKeys);
   json.endObject();
+}
+
+void writeLocator(text::JsonWriter& json, const check::ShapeHead& locator) {
+  beginShape(json, locator);
+  writeChain(json, locator);
+  writeLayer(json, locator, nullptr);
+  json.endObject();
+}
+
+void writeNameOrNull(text::JsonWriter& json, std::string_view key, const std::string& name) {
+  json.key(key);
+  name.empty() ? json.null() : json.text(name);
+}
+
+void writeLookAt(text::JsonWriter& json, const check::LookAtHead& lookAt) {
+  json.beginObject();
+  writeText(json, "name", lookAt.name);
+  json.key("where");
+  writeWhere(json, lookAt.where);
+  writeNameOrNull(json, "turns", lookAt.turns);
+  writeNameOrNull(json, "camera", lookAt.camera);
+  writeNameOrNull(json, "target", lookAt.target);
+  json.endObject();
+}
+
+// An array, and how many more there are.
+template <typename T>
+void writeList(text::JsonWriter& json, std::string_view key, const std::vector<T>& things,
+               void (*write)(text::JsonWriter&, const T&), std::size_t notShown) {
+  json.key(key);
+  json.beginArray();
+  for (const T& thing : things) write(json, thing);
+  json.endArray();
+  writeCount(json, std::string(key) + "NotShown", notShown);
 }
 
 void writeRanges(text::JsonWriter& json, const check::Head& head) {
@@ -137,11 +202,9 @@ void writeHead(text::JsonWriter& json, const check::Head& head) {
   writeGiven(json, "pixelAspect", head.pixelAspect);
   writeCount(json, "camerasThatCame", head.camerasThatCame);
   writeCount(json, "nullsThatCame", head.nullsThatCame);
-  json.key("cameras");
-  json.beginArray();
-  for (const check::CameraHead& camera : head.cameras) writeCamera(json, camera);
-  json.endArray();
-  writeCount(json, "camerasNotShown", head.camerasNotShown);
+  writeList(json, "cameras", head.cameras, writeCamera, head.camerasNotShown);
+  writeList(json, "locators", head.locators, writeLocator, head.locatorsNotShown);
+  writeList(json, "lookAts", head.lookAts, writeLookAt, head.lookAtsNotShown);
   json.endObject();
 }
 

@@ -1,7 +1,10 @@
 #include "tools/mayascene/CheckHeadText.h"
 
+#include <algorithm>
+#include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 #include "diag/ShownText.h"
 #include "tools/mayascene/Quantities.h"
@@ -11,8 +14,14 @@ namespace {
 
 constexpr std::size_t kNameColumn = 16;
 
-// Of many cameras these are shown; the document has more of them.
-constexpr std::size_t kShownCameras = 20;
+// Of longer lists these are shown; the document has more of them.
+constexpr std::size_t kShownOfAKind = 8;
+constexpr std::size_t kShownLinks = 8;     // above one camera
+constexpr std::size_t kShownChannels = 9;  // of one camera and what is above it
+
+constexpr std::size_t kUnderScene = 2;  // spaces before a row
+constexpr std::size_t kUnderShape = 4;
+constexpr std::size_t kUnderLink = 6;
 
 std::string lineOf(const check::Where& where) { return " (line " + std::to_string(where.place.line) + ')'; }
 
@@ -20,23 +29,59 @@ std::string said(const std::optional<check::Where>& where) {
   return where ? lineOf(*where) : " (default: the file does not say)";
 }
 
+std::string driverText(const check::Drive& drive) {
+  std::string text = diag::ShownText(drive.type) + ' ' + diag::ShownText(drive.node);
+  if (drive.keys) text += ", " + countText(*drive.keys, "key");
+  return text + lineOf(drive.where);
+}
+
+std::string moreText(std::size_t count) { return std::to_string(count) + " more (--all shows them)"; }
+
+// "35 to 50 mm, frames 1 to 24"
+std::string spanText(const check::Span& span, std::string_view unit, const check::LensOverFrames& over) {
+  std::string text = numberText(span.least);
+  if (span.largest > span.least) text += " to " + numberText(span.largest);
+  text += unit;
+  if (over.first == over.last) return text + ", frame " + numberText(over.first);
+  return text + ", frames " + numberText(over.first) + " to " + numberText(over.last);
+}
+
 class HeadPrinter {
  public:
-  HeadPrinter(std::ostream& out, const Style& style) : out_(out), style_(style) {}
+  HeadPrinter(std::ostream& out, bool all, const Style& style) : out_(out), all_(all), style_(style) {}
 
-  void row(std::string_view name, std::string_view value, std::size_t indent = 2) {
+  void row(std::string_view name, std::string_view value, std::size_t indent = kUnderScene) {
     std::string start = std::string(indent, ' ') + std::string(name);
     if (start.size() < kNameColumn) start.resize(kNameColumn, ' ');
     out_ << style_.faint(start) << ' ' << value << '\n';
   }
 
   void scene(const check::Head& head);
-  void camera(const check::CameraHead& camera);
+  void camera(const check::CameraHead& camera, const std::string& unit);
+  void locator(const check::ShapeHead& locator);
+  void lookAt(const check::LookAtHead& lookAt);
+
+  // The first ones, then how many more there are. `notInList` are counted with them.
+  template <typename T, typename Show>
+  void list(const std::vector<T>& things, std::size_t notInList, std::string_view name, Show show) {
+    const std::size_t shown = all_ ? things.size() : std::min(things.size(), kShownOfAKind);
+    for (std::size_t i = 0; i < shown; ++i) show(things[i]);
+    const std::size_t more = things.size() - shown + notInList;
+    if (more != 0) row(name, moreText(more));
+  }
 
  private:
-  void drives(const std::vector<check::Drive>& drives);
+  void stored(std::string_view name, const check::Given<double>& given, std::string_view unit);
+  void number(const check::CameraHead& camera, std::string_view channel, std::string_view name,
+              const check::Given<double>& given, std::string_view unit,
+              std::optional<check::Span> check::LensOverFrames::*span);
+  void lens(const check::CameraHead& camera);
+  void angle(const check::CameraHead& camera);
+  void drivenBy(const check::Drive& drive) { row("driven by", driverText(drive), kUnderLink); }
+  void chain(const check::CameraHead& camera);
 
   std::ostream& out_;
+  bool all_;
   const Style& style_;
 };
 
@@ -56,56 +101,141 @@ void HeadPrinter::scene(const check::Head& head) {
   row("came over", countText(head.camerasThatCame, "camera") + ", " + countText(head.nullsThatCame, "null"));
 }
 
-void HeadPrinter::drives(const std::vector<check::Drive>& drives) {
-  for (const check::Drive& drive : drives) {
-    std::string text = diag::ShownText(drive.type) + ' ' + diag::ShownText(drive.node);
-    if (drive.keys) text += ", " + countText(*drive.keys, "key");
-    row(drive.channel, text + lineOf(drive.where), 6);
+const check::Drive* driveOf(const check::CameraHead& camera, std::string_view channel) {
+  const auto found = std::find_if(camera.drives.begin(), camera.drives.end(),
+                                  [channel](const check::Drive& drive) { return drive.channel == channel; });
+  return found == camera.drives.end() ? nullptr : &*found;
+}
+
+void HeadPrinter::stored(std::string_view name, const check::Given<double>& given, std::string_view unit) {
+  row(name, numberText(given.value) + std::string(unit) + said(given.where), kUnderShape);
+}
+
+// The stored value, or of one that is driven the values that it takes.
+void HeadPrinter::number(const check::CameraHead& camera, std::string_view channel, std::string_view name,
+                         const check::Given<double>& given, std::string_view unit,
+                         std::optional<check::Span> check::LensOverFrames::*span) {
+  const check::Drive* const drive = driveOf(camera, channel);
+  if (drive == nullptr) return stored(name, given, unit);
+  if (camera.overFrames && (*camera.overFrames).*span) {
+    row(name, spanText(*((*camera.overFrames).*span), unit, *camera.overFrames), kUnderShape);
+  } else {
+    row(name, "driven, values not known; stored: " + numberText(given.value) + std::string(unit),
+        kUnderShape);
+  }
+  drivenBy(*drive);
+}
+
+void HeadPrinter::lens(const check::CameraHead& camera) {
+  using Over = check::LensOverFrames;
+  number(camera, "focalLength", "focal length", camera.focalLength, " mm", &Over::focalLength);
+  if (driveOf(camera, "horizontalFilmAperture") == nullptr &&
+      driveOf(camera, "verticalFilmAperture") == nullptr) {
+    row("aperture",
+        numberText(camera.horizontalAperture.value) + " x " + numberText(camera.verticalAperture.value) +
+            " in" + said(camera.horizontalAperture.where),
+        kUnderShape);
+  } else {
+    number(camera, "horizontalFilmAperture", "film width", camera.horizontalAperture, " in",
+           &Over::horizontalAperture);
+    number(camera, "verticalFilmAperture", "film height", camera.verticalAperture, " in",
+           &Over::verticalAperture);
+  }
+  if (!camera.orthographicWidth) angle(camera);
+  row("film fit", camera.fit.value + said(camera.fit.where), kUnderShape);
+  if (const check::Drive* const drive = driveOf(camera, "filmFit")) drivenBy(*drive);
+}
+
+void HeadPrinter::angle(const check::CameraHead& camera) {
+  constexpr std::string_view kUnit = " degrees across the picture";
+  if (camera.drives.empty()) {
+    row("angle", numberText(camera.angleOfView) + std::string(kUnit), kUnderShape);
+  } else if (camera.overFrames && camera.overFrames->angleOfView) {
+    row("angle", spanText(*camera.overFrames->angleOfView, kUnit, *camera.overFrames), kUnderShape);
+  } else {
+    row("angle", "not known", kUnderShape);
   }
 }
 
-void HeadPrinter::camera(const check::CameraHead& camera) {
-  row("camera", style_.strong(diag::ShownText(camera.path)) + lineOf(camera.where));
-  row("focal length", numberText(camera.focalLength.value) + " mm" + said(camera.focalLength.where), 4);
-  row("aperture",
-      numberText(camera.horizontalAperture.value) + " x " + numberText(camera.verticalAperture.value) +
-          " in" + said(camera.horizontalAperture.where),
-      4);
-  row("angle", numberText(camera.angleOfView) + " degrees across the picture", 4);
-  row("film fit", camera.fit.value + said(camera.fit.where), 4);
-  drives(camera.drives);
+// Of a long chain, and of many driven channels, the lowest ones and a count.
+void HeadPrinter::chain(const check::CameraHead& camera) {
+  std::size_t links = 0;
+  std::size_t channels = 0;
+  std::size_t channelsLeft = 0;
   for (const check::ChainLink& link : camera.chain) {
-    row("under", diag::ShownText(link.name), 4);
-    drives(link.drives);
+    const bool shown = all_ || links < kShownLinks;
+    if (shown) row("under", diag::ShownText(link.name), kUnderShape);
+    if (shown) ++links;
+    for (const check::Drive& drive : link.drives) {
+      if (!all_ && (!shown || channels == kShownChannels)) {
+        ++channelsLeft;
+        continue;
+      }
+      row(drive.channel, driverText(drive), kUnderLink);
+      ++channels;
+    }
   }
-  if (camera.chainGoesOn) row("under", "and more", 4);
+  const std::size_t linksLeft = camera.chain.size() - links;
+  if (linksLeft != 0) row("under", moreText(linksLeft), kUnderShape);
+  if (camera.chainGoesOn) row("under", "further ones, which are not looked at", kUnderShape);
+  if (channelsLeft != 0) row("channels", moreText(channelsLeft), kUnderShape);
+}
+
+void HeadPrinter::camera(const check::CameraHead& camera, const std::string& unit) {
+  row("camera", style_.strong(diag::ShownText(camera.path)) + lineOf(camera.where));
+  if (camera.orthographicWidth) {
+    number(camera, "orthographicWidth", "orthographic", *camera.orthographicWidth,
+           ' ' + unit + " across the picture", &check::LensOverFrames::orthographicWidth);
+  }
+  // The import takes some orthographic cameras for others, with their lens.
+  if (!camera.orthographicWidth || camera.cameOver) lens(camera);
+  chain(camera);
   std::string came = "no layer";
   if (camera.cameOver) {
     came = "a camera layer with " + countText(camera.keys, "key") + " for its place and " +
            countText(camera.zoomKeys, "key") + " for its zoom, under " + countText(camera.parents, "null");
   }
-  row("came over", came, 4);
+  row("came over", came, kUnderShape);
+}
+
+void HeadPrinter::locator(const check::ShapeHead& locator) {
+  row("locator", style_.strong(diag::ShownText(locator.path)) + lineOf(locator.where));
+  std::string came = "no layer";
+  if (locator.cameOver) {
+    came = "a null layer with " + countText(locator.keys, "key") + " for its place, under " +
+           countText(locator.parents, "null");
+  }
+  row("came over", came, kUnderShape);
+}
+
+void HeadPrinter::lookAt(const check::LookAtHead& lookAt) {
+  row("look-at", style_.strong(diag::ShownText(lookAt.name)) + lineOf(lookAt.where));
+  row("turns", lookAt.turns.empty() ? "nothing" : diag::ShownText(lookAt.turns), kUnderShape);
+  std::string came = "nothing: it aims no camera";
+  if (!lookAt.camera.empty())
+    came = diag::ShownText(lookAt.camera) + " is aimed at " + diag::ShownText(lookAt.target);
+  row("came over", came, kUnderShape);
 }
 
 }  // namespace
 
-void printHead(std::ostream& out, const CheckedScene& scene, const Style& style) {
+void printHead(std::ostream& out, const CheckedScene& scene, bool all, const Style& style) {
   const check::Head& head = scene.report.head;
   out << style.strong(diag::ShownText(scene.path)) << '\n';
-  HeadPrinter printer(out, style);
+  HeadPrinter printer(out, all, style);
   if (!head.isScene) {
     printer.row("came over", "nothing");
     out << '\n';
     return;
   }
   printer.scene(head);
-  std::size_t shown = 0;
-  for (const check::CameraHead& camera : head.cameras) {
-    if (++shown > kShownCameras) break;
-    printer.camera(camera);
-  }
-  const std::size_t all = head.cameras.size() + head.camerasNotShown;
-  if (all > kShownCameras) printer.row("cameras", std::to_string(all - kShownCameras) + " more");
+  const std::string unit = diag::ShownText(head.linearUnit.value);
+  printer.list(head.cameras, head.camerasNotShown, "cameras",
+               [&](const check::CameraHead& camera) { printer.camera(camera, unit); });
+  printer.list(head.locators, head.locatorsNotShown, "locators",
+               [&](const check::ShapeHead& locator) { printer.locator(locator); });
+  printer.list(head.lookAts, head.lookAtsNotShown, "look-ats",
+               [&](const check::LookAtHead& lookAt) { printer.lookAt(lookAt); });
   out << '\n';
 }
 

@@ -8,7 +8,8 @@
 
 namespace mayascene {
 
-// A few lines, and an empty one. What comes out of the scene is made harmless.
-void printHead(std::ostream& out, const CheckedScene& scene, const Style& style);
+// A few lines, and an empty one; long lists are cut and counted unless all is asked for. What comes out of
+// the scene is made harmless.
+void printHead(std::ostream& out, const CheckedScene& scene, bool all, const Style& style);
 
 }  // namespace mayascene

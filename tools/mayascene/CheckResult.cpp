@@ -71,7 +71,7 @@ CheckResult resultOf(const CheckedScene& scene, const CheckArguments& arguments)
   result.status = scene.status;
   if (scene.failure.empty()) {
     std::ostringstream report;
-    printCheck(report, scene, arguments.quiet, Style(arguments.colourReport));
+    printCheck(report, scene, {arguments.quiet, arguments.options.all}, Style(arguments.colourReport));
     result.report = std::move(report).str();
     result.totals = totalsText(scene.report);
   }

@@ -41,16 +41,16 @@ std::string totalsText(const check::Report& report) {
          countOf(report.notes, "note");
 }
 
-void printCheck(std::ostream& out, const CheckedScene& scene, bool quiet, const Style& style) {
+void printCheck(std::ostream& out, const CheckedScene& scene, const ReportShape& shape, const Style& style) {
   if (!scene.failure.empty()) return;
   const check::Report& report = scene.report;
-  if (!quiet && !scene.unfinished) printHead(out, scene, style);
+  if (!shape.quiet && !scene.unfinished) printHead(out, scene, shape.all, style);
   for (const check::Finding& finding : report.findings) {
     const bool error = diag::EntryOf(finding.diagnostic.code).severity == diag::Severity::Error;
-    if (error || !quiet) printFinding(out, scene.path, finding, style);
+    if (error || !shape.quiet) printFinding(out, scene.path, finding, style);
   }
-  printNotInFull(out, scene, quiet);
-  if (!quiet) out << style.strong(diag::ShownText(scene.path) + ": " + totalsText(report)) << '\n';
+  printNotInFull(out, scene, shape.quiet);
+  if (!shape.quiet) out << style.strong(diag::ShownText(scene.path) + ": " + totalsText(report)) << '\n';
 }
 
 }  // namespace mayascene

@@ -8,9 +8,14 @@
 
 namespace mayascene {
 
-// The head, the diagnostics in the form that compilers use, and a last line with totals. Of a quiet report
-// the errors alone. Nothing for a file that could not be read. What comes out of the scene is made harmless.
-void printCheck(std::ostream& out, const CheckedScene& scene, bool quiet, const Style& style);
+struct ReportShape {
+  bool quiet = false;  // errors alone
+  bool all = false;    // the head without a cut
+};
+
+// The head, the diagnostics in the form that compilers use, and a last line with totals. Nothing for a file
+// that could not be read. What comes out of the scene is made harmless.
+void printCheck(std::ostream& out, const CheckedScene& scene, const ReportShape& shape, const Style& style);
 
 // "2 errors, 1 warning, no notes"
 std::string totalsText(const check::Report& report);
