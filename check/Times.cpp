@@ -81,6 +81,35 @@ bool TurnsFar(const Subject& subject, const KeyedChannel& channel) {
   return false;
 }
 
+bool SameTimes(const Subject& subject, const KeyedChannel& a, const KeyedChannel& b) {
+  if (std::fabs(a.first - b.first) > 1e-3 || std::fabs(a.last - b.last) > 1e-3) return false;
+  if (a.whole && b.whole) return true;
+  const auto keysOf = [&](const KeyedChannel& channel) {
+    return motion::ReadCurve(subject.scene, channel.curve, subject.measures).keys;
+  };
+  const std::vector<motion::CurveKey> one = keysOf(a);
+  const std::vector<motion::CurveKey> other = keysOf(b);
+  return std::equal(
+      one.begin(), one.end(), other.begin(), other.end(),
+      [](const motion::CurveKey& x, const motion::CurveKey& y) { return std::fabs(x.time - y.time) < 1e-6; });
+}
+
+// The channel whose keys the import puts at the times of another one's: a node has one list of times, that of
+// its first channel of several keys, and its first key is that of the first channel with any. Null: none.
+const KeyedChannel* TakesOtherTimes(const Subject& subject, const NodeKeys& keys) {
+  const KeyedChannel* lead = nullptr;
+  for (const KeyedChannel& channel : keys.channels) {
+    if (channel.keys < 2) continue;
+    if (lead == nullptr) {
+      lead = &channel;
+      if (std::fabs(channel.first - keys.first) > 1e-3) return &channel;
+    } else if (channel.keys == lead->keys && !SameTimes(subject, *lead, channel)) {
+      return &channel;
+    }
+  }
+  return nullptr;
+}
+
 void ReportKeys(const Subject& subject, const NodeKeys& keys) {
   const std::string_view name = subject.scene.node(keys.node).name;
   const double unit = motion::UnitsPerFrame(subject.scene);
@@ -91,21 +120,21 @@ void ReportKeys(const Subject& subject, const NodeKeys& keys) {
     const auto found = std::find_if(keys.channels.begin(), keys.channels.end(), holds);
     return found == keys.channels.end() ? nullptr : &*found;
   };
-  if (const auto* const bad = first([&](const KeyedChannel& channel) {
-        return channel.keys > 1 && !channel.whole &&
-               (IsCurved(subject, channel) || TurnsFar(subject, channel));
-      })) {
+  const KeyedChannel* bad = first([&](const KeyedChannel& channel) {
+    return channel.keys > 1 && !channel.whole && (IsCurved(subject, channel) || TurnsFar(subject, channel));
+  });
+  if (bad == nullptr) bad = TakesOtherTimes(subject, keys);
+  if (bad != nullptr) {
     const double frames = std::ceil(bad->last / unit - 1e-6) - std::floor(bad->first / unit + 1e-6) + 1.0;
     subject.diagnostics.Report(Code::KeysAreNoBake, bad->place,
                                {name, std::to_string(bad->keys), text::RoundedNumber(frames)});
   }
-  if (const auto* const bad = first([](const KeyedChannel& one) { return one.keys != 0 && one.first < 0.0; }))
-    say(Code::NegativeFrames, *bad, bad->first / unit);
-  if (const auto* const bad = first([](const KeyedChannel& one) { return one.fractional; }))
-    say(Code::FractionalFrames, *bad, bad->fraction);
-  if (const auto* const bad =
-          first([](const KeyedChannel& one) { return one.keys != 0 && one.last - one.first > kLastFrame; }))
-    say(Code::BeyondCompositionTime, *bad, bad->last);
+  bad = first([](const KeyedChannel& one) { return one.keys != 0 && one.first < 0.0; });
+  if (bad != nullptr) say(Code::NegativeFrames, *bad, bad->first / unit);
+  bad = first([](const KeyedChannel& one) { return one.fractional; });
+  if (bad != nullptr) say(Code::FractionalFrames, *bad, bad->fraction);
+  bad = first([](const KeyedChannel& one) { return one.keys != 0 && one.last - one.first > kLastFrame; });
+  if (bad != nullptr) say(Code::BeyondCompositionTime, *bad, bad->last);
 }
 
 // Everything that is keyed above the shape, and its lens.

@@ -31,7 +31,8 @@ constexpr Entry kPictureCodes[] = {
      .sentence = "\"{0}\" loses its path between keys: {1} keys over {2} frames",
      .meaning = "The importer takes the keys and none of their tangents. Between keys the composition has a "
                 "way of its "
-                "own.",
+                "own. A node has one list of times: curves with as many keys at other times are put at those "
+                "of the first.",
      .example = "createNode animCurveTL -n \"moveX\";\n"
                 "  setAttr \".tan\" 3;\n"
                 "  setAttr -s 2 \".ktv[0:1]\" 1 0 48 100;\n"

@@ -15,7 +15,7 @@
 #include "fuzz/Target.h"
 #include "refhost/Host.h"
 #include "refhost/ModuleLoader.h"
-#include "tests/check/Contradictions.h"
+#include "tests/check/StopContradictions.h"
 #include "text/JsonWriter.h"
 #include "tools/mayascene/CheckJson.h"
 #include "tools/mayascene/CheckText.h"
@@ -93,7 +93,7 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   mayascene::CheckedScene scene;
   scene.path = "fuzz";
   scene.report = check::Check(text, cameOver);
-  const std::string wrong = check_test::ContradictionIn(text, cameOver, scene.report, false);
+  const std::string wrong = check_test::StopContradictionIn(cameOver, scene.report, false);
   Require(wrong.empty(), wrong.c_str());
   CheckBounds(scene.report);
   CheckOutputs(scene, size);

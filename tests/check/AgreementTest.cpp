@@ -6,13 +6,15 @@
 #include <cstdint>
 #include <filesystem>
 #include <fstream>
+#include <iostream>
 #include <iterator>
 #include <string>
 #include <vector>
 
 #include "refhost/Host.h"
-#include "tests/check/Contradictions.h"
 #include "tests/check/GeneratedScene.h"
+#include "tests/check/LayerContradictions.h"
+#include "tests/check/StopContradictions.h"
 #include "tests/support/LeftOut.h"
 #include "tests/support/SplitMix.h"
 #include "tests/support/TemporaryFolder.h"
@@ -33,13 +35,25 @@ class Agreement {
     EXPECT_TRUE(host_.load(&loaded, &failure)) << failure;
   }
 
+  ~Agreement() {
+    std::cout << compared_.scenes << " scenes, " << compared_.stops << " stops, " << compared_.layers
+              << " layers, " << compared_.channels << " channels, " << compared_.keys << " keys\n";
+  }
+  Agreement(const Agreement&) = delete;
+  Agreement& operator=(const Agreement&) = delete;
+
   // What is contradicted; empty where nothing is.
   std::string Of(const std::string& text, bool wellFormed) {
     const fs::path path = folder_.path() / "shot.ma";
     std::ofstream(path, std::ios::binary | std::ios::trunc) << text;
     const refhost::CallbackResult result = host_.importScene(path);
     const check::CameOver cameOver = mayascene::whatCameOver(mayascene::lookAtScene(path), result, false);
-    return ContradictionIn(text, cameOver, check::Check(text, cameOver), wellFormed);
+    const check::Report report = check::Check(text, cameOver, {.all = true, .only = {}});
+    ++compared_.scenes;
+    compared_.stops += cameOver.stop == check::Stop::None ? 0 : 1;
+    const std::string wrong = StopContradictionIn(cameOver, report, wellFormed);
+    if (!wrong.empty() || !wellFormed || cameOver.stop != check::Stop::None) return wrong;
+    return LayerContradictionIn(text, cameOver, report, &compared_);
   }
 
  private:
@@ -52,6 +66,7 @@ class Agreement {
 
   testsupport::TemporaryFolder folder_;
   refhost::Host host_;
+  Compared compared_;
 };
 
 std::string TextOf(const fs::path& path) {

@@ -97,6 +97,18 @@ TEST(PictureTest, StraightKeysAreAsGoodAsABake) {
   EXPECT_EQ(checked.All(), "");
 }
 
+TEST(PictureTest, ANodeHasOneListOfTimes) {
+  const auto says = [](std::string_view x, std::string_view y) {
+    const Checked checked(CameraScene("", "", CurveOf("x", x, "shotCam.tx") + CurveOf("y", y, "shotCam.ty")));
+    return checked.CountOf(Code::KeysAreNoBake);
+  };
+  EXPECT_EQ(says("1 0 5 8 9 16", "1 3 5 4 9 5"), 0u);
+  EXPECT_EQ(says("1 0 5 8 9 16", "1 3 6 4 9 5"), 1u);
+  EXPECT_EQ(says("1 0 2 8 3 16", "1 3 3 4 5 5"), 1u);
+  EXPECT_EQ(says("1 0 2 8 3 16", "2 3 3 4 4 5"), 1u);
+  EXPECT_EQ(says("5 7", "1 3 2 4 3 5"), 1u);  // the one key's time is time 0
+}
+
 TEST(PictureTest, NodesThatAreKeyedFromDifferentFrames) {
   const std::string text =
       kHead +

@@ -195,7 +195,8 @@ struct CommandLine {
         ->allow_extra_args(false)
         ->option_text("CODE ...")
         ->check(codeWord());
-    checkVerb->add_flag("--all", check.options.all, "show the whole head and all diagnostics, not 20 of each code");
+    checkVerb->add_flag("--all", check.options.all,
+                        "show the whole head and all diagnostics, not 20 of each code");
     checkVerb->add_flag("-v,--verbose", check.verbose, "a line for each scene on standard error");
     checkVerb->add_flag("-q,--quiet", check.quiet, "print nothing but errors");
     checkVerb->add_option("--jobs", check.jobs, "scenes that are checked at a time (the processors)")
