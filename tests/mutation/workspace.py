@@ -17,6 +17,7 @@ OWN_TESTS = {
     "hostutil": ("hostutil_tests",),
     "refhost": ("refhost_test",),
     "text": ("text_test",),
+    "diag": ("diag_test",),
     "tools": ("tool_tests", "tool_command_tests"),
     "scan": ("scan_tests",),
 }
