@@ -35,8 +35,8 @@ std::uint32_t CountLineEnds(std::string_view text, std::size_t begin, std::size_
 
 // Where the line starts that goes on after the part of the text.
 std::uint64_t LastLineStart(std::string_view text, std::size_t begin, std::size_t end, std::uint64_t none) {
-  for (std::size_t at = end; at-- > begin;) {
-    if (IsLineEnd(text[at], at + 1 < text.size() ? text[at + 1] : '\0')) return at + 1;
+  for (std::size_t after = end; after > begin; --after) {
+    if (IsLineEnd(text[after - 1], after < text.size() ? text[after] : '\0')) return after;
   }
   return none;
 }
