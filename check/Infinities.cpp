@@ -19,11 +19,13 @@ constexpr double kMostFrames = 100'000;
 
 enum class Side { Before, After };
 
+// By the number that a scene writes.
+constexpr std::array<std::string_view, 6> kWords = {"constant",          "linear",   "", "cycle",
+                                                    "cycle with offset", "oscillate"};
+
 std::string_view WordOf(int code) {
-  constexpr std::array<std::string_view, 6> kWords = {"constant",          "linear",   "", "cycle",
-                                                      "cycle with offset", "oscillate"};
-  return code >= 0 && static_cast<std::size_t>(code) < kWords.size() ? kWords[static_cast<std::size_t>(code)]
-                                                                     : "";
+  const auto index = static_cast<std::size_t>(code);  // of a negative one, beyond the words
+  return index < kWords.size() ? kWords[index] : std::string_view();
 }
 
 class Infinities {

@@ -164,8 +164,10 @@ void HeadPrinter::chain(const check::CameraHead& camera) {
   std::size_t channelsLeft = 0;
   for (const check::ChainLink& link : camera.chain) {
     const bool shown = all_ || links < kShownLinks;
-    if (shown) row("under", diag::ShownText(link.name), kUnderShape);
-    if (shown) ++links;
+    if (shown) {
+      row("under", diag::ShownText(link.name), kUnderShape);
+      ++links;
+    }
     for (const check::Drive& drive : link.drives) {
       if (!all_ && (!shown || channels == kShownChannels)) {
         ++channelsLeft;
