@@ -1,5 +1,9 @@
 #include "diag/Diagnostic.h"
 
+#include <fmt/args.h>
+#include <fmt/format.h>
+
+#include <algorithm>
 #include <cstddef>
 
 #include "diag/ShownText.h"
@@ -8,42 +12,31 @@ namespace diag {
 namespace {
 
 // Puts the arguments in the places of {0}, {1} …; one that is not there shows as nothing.
-std::string Fill(std::string_view text, const std::vector<std::string>& arguments) {
-  std::string filled;
-  for (std::size_t at = 0; at < text.size(); ++at) {
-    const bool placeholder = text[at] == '{' && at + 2 < text.size() && text[at + 2] == '}' &&
-                             text[at + 1] >= '0' && text[at + 1] <= '9';
-    if (!placeholder) {
-      filled += text[at];
-      continue;
-    }
-    const auto index = static_cast<std::size_t>(text[at + 1] - '0');
-    if (index < arguments.size()) filled += ShownText(arguments[index]);
-    at += 2;
-  }
-  return filled;
+std::string Fill(std::string_view text, const Diagnostic& diagnostic) {
+  const std::vector<std::string>& arguments = diagnostic.arguments;
+  fmt::dynamic_format_arg_store<fmt::format_context> shown;
+  const std::size_t count = std::max(arguments.size(), ArgumentCount(EntryOf(diagnostic.code)));
+  for (std::size_t i = 0; i < count; ++i)
+    shown.push_back(i < arguments.size() ? ShownText(arguments[i]) : "");
+  return fmt::vformat(text, shown);
 }
 
 }  // namespace
 
 std::string SentenceOf(const Diagnostic& diagnostic) {
-  return Fill(EntryOf(diagnostic.code).sentence, diagnostic.arguments);
+  return Fill(EntryOf(diagnostic.code).sentence, diagnostic);
 }
 
-std::string HelpOf(const Diagnostic& diagnostic) {
-  return Fill(EntryOf(diagnostic.code).help, diagnostic.arguments);
-}
+std::string HelpOf(const Diagnostic& diagnostic) { return Fill(EntryOf(diagnostic.code).help, diagnostic); }
 
 bool IsOfWholeFile(const Diagnostic& diagnostic) { return diagnostic.range == Range{}; }
 
 std::string HeadLineOf(std::string_view file, const Diagnostic& diagnostic) {
-  std::string text = ShownText(file) + ": ";
-  if (!IsOfWholeFile(diagnostic)) {
-    text.pop_back();
-    text += std::to_string(diagnostic.place.line) + ':' + std::to_string(diagnostic.place.column) + ": ";
-  }
-  text += NameOf(EntryOf(diagnostic.code).severity);
-  return text + ": " + SentenceOf(diagnostic) + " [" + NameOf(diagnostic.code) + ']';
+  const auto& place = diagnostic.place;
+  const std::string where =
+      IsOfWholeFile(diagnostic) ? " " : fmt::format("{}:{}: ", place.line, place.column);
+  return fmt::format("{}:{}{}: {} [{}]", ShownText(file), where, NameOf(EntryOf(diagnostic.code).severity),
+                     SentenceOf(diagnostic), NameOf(diagnostic.code));
 }
 
 std::string HelpLineOf(const Diagnostic& diagnostic) { return "help: " + HelpOf(diagnostic); }

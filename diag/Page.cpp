@@ -1,5 +1,7 @@
 #include "diag/Page.h"
 
+#include <fmt/format.h>
+
 #include <array>
 #include <cstddef>
 #include <string_view>
@@ -74,11 +76,10 @@ std::string Wrapped(std::string_view text) {
 }
 
 std::string Section(const Entry& entry) {
-  std::string text = "\n### " + NameOf(entry.code) + "\n\n";
-  text += Wrapped(std::string(NameOf(entry.severity)) + ": " + std::string(entry.sentence)) + '\n';
-  text += Wrapped(entry.meaning);
-  if (!entry.example.empty()) text += "\n```\n" + std::string(entry.example) + "\n```\n";
-  return text + '\n' + Wrapped("What to do: " + std::string(entry.help));
+  const std::string example = entry.example.empty() ? "" : fmt::format("\n```\n{}\n```\n", entry.example);
+  return fmt::format("\n### {}\n\n{}\n{}{}\n{}", NameOf(entry.code),
+                     Wrapped(fmt::format("{}: {}", NameOf(entry.severity), entry.sentence)),
+                     Wrapped(entry.meaning), example, Wrapped(fmt::format("What to do: {}", entry.help)));
 }
 
 }  // namespace
@@ -91,7 +92,7 @@ std::string Page() {
       const bool holds = static_cast<unsigned>(entry.code) / 100 * 100 == candidate.first;
       if (!holds || topic == &candidate) continue;
       topic = &candidate;
-      page += "\n## " + std::string(topic->title) + '\n';
+      page += fmt::format("\n## {}\n", topic->title);
     }
     page += Section(entry);
   }

@@ -1,8 +1,8 @@
 // The table as a whole: its parts in order, and how a row is found.
+#include <fmt/format.h>
+
 #include <algorithm>
-#include <array>
 #include <cstddef>
-#include <cstdio>
 #include <initializer_list>
 #include <vector>
 
@@ -49,11 +49,7 @@ std::size_t ArgumentCount(const Entry& entry) {
   return std::max(LargestPlaceholder(entry.sentence), LargestPlaceholder(entry.help));
 }
 
-std::string NameOf(Code code) {
-  std::array<char, 16> name{};
-  (void)std::snprintf(name.data(), name.size(), "MA%04u", static_cast<unsigned>(code));
-  return name.data();
-}
+std::string NameOf(Code code) { return fmt::format("MA{:04}", static_cast<unsigned>(code)); }
 
 std::string_view NameOf(Severity severity) {
   switch (severity) {

@@ -7,8 +7,10 @@
 #include <iterator>
 #include <set>
 #include <string>
+#include <vector>
 
 #include "diag/Codes.h"
+#include "diag/Diagnostic.h"
 #include "diag/Page.h"
 
 namespace diag {
@@ -71,6 +73,21 @@ TEST(TableTest, TheArgumentsAreCountedByTheirPlaceholders) {
           << entry.symbol;
     }
   }
+}
+
+// The texts are formats: a brace that is none would end the tool when the diagnostic shows.
+TEST(TableTest, EveryTextTakesItsArgumentsAndShowsAMissingOneAsNothing) {
+  const auto of = [](Code code, const std::vector<std::string>& arguments) {
+    return Diagnostic{.code = code, .range = {}, .place = {}, .arguments = arguments};
+  };
+  for (const Entry& entry : Table()) {
+    for (const auto& arguments : {std::vector<std::string>(), {"{0}", "{}", "}", "{", "%s"}}) {
+      EXPECT_NO_THROW(SentenceOf(of(entry.code, arguments))) << entry.symbol;
+      EXPECT_NO_THROW(HelpOf(of(entry.code, arguments))) << entry.symbol;
+    }
+  }
+  EXPECT_EQ(SentenceOf(of(Code::CommandCutOff, {})), SentenceOf(of(Code::CommandCutOff, {""})));
+  EXPECT_THAT(SentenceOf(of(Code::CommandCutOff, {"{1}"})), HasSubstr("{1}"));
 }
 
 TEST(TableTest, ANameHasFourDigits) {

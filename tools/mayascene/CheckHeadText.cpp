@@ -1,5 +1,7 @@
 #include "tools/mayascene/CheckHeadText.h"
 
+#include <fmt/format.h>
+
 #include <algorithm>
 #include <optional>
 #include <string>
@@ -23,27 +25,27 @@ constexpr std::size_t kUnderScene = 2;  // spaces before a row
 constexpr std::size_t kUnderShape = 4;
 constexpr std::size_t kUnderLink = 6;
 
-std::string lineOf(const check::Where& where) { return " (line " + std::to_string(where.place.line) + ')'; }
+std::string lineOf(const check::Where& where) { return fmt::format(" (line {})", where.place.line); }
 
 std::string said(const std::optional<check::Where>& where) {
   return where ? lineOf(*where) : " (default: the file does not say)";
 }
 
 std::string driverText(const check::Drive& drive) {
-  std::string text = diag::ShownText(drive.type) + ' ' + diag::ShownText(drive.node);
-  if (drive.keys) text += ", " + countText(*drive.keys, "key");
-  return text + lineOf(drive.where);
+  const std::string keys = drive.keys ? ", " + countText(*drive.keys, "key") : "";
+  return fmt::format("{} {}{}{}", diag::ShownText(drive.type), diag::ShownText(drive.node), keys,
+                     lineOf(drive.where));
 }
 
-std::string moreText(std::size_t count) { return std::to_string(count) + " more (--all shows them)"; }
+std::string moreText(std::size_t count) { return fmt::format("{} more (--all shows them)", count); }
 
 // "35 to 50 mm, frames 1 to 24"
 std::string spanText(const check::Span& span, std::string_view unit, const check::LensOverFrames& over) {
-  std::string text = numberText(span.least);
-  if (span.largest > span.least) text += " to " + numberText(span.largest);
-  text += unit;
-  if (over.first == over.last) return text + ", frame " + numberText(over.first);
-  return text + ", frames " + numberText(over.first) + " to " + numberText(over.last);
+  const std::string largest = span.largest > span.least ? " to " + numberText(span.largest) : "";
+  const std::string frames =
+      over.first == over.last ? fmt::format("frame {}", numberText(over.first))
+                              : fmt::format("frames {} to {}", numberText(over.first), numberText(over.last));
+  return fmt::format("{}{}{}, {}", numberText(span.least), largest, unit, frames);
 }
 
 class HeadPrinter {
@@ -89,16 +91,18 @@ void HeadPrinter::scene(const check::Head& head) {
   if (!head.product.empty()) row("written by", diag::ShownText(head.product));
   row("lengths", diag::ShownText(head.linearUnit.value) + said(head.linearUnit.where));
   row("angles", diag::ShownText(head.angularUnit.value) + said(head.angularUnit.where));
-  row("frame rate", numberText(head.framesPerSecond) + ", " + diag::ShownText(head.timeUnit.value) +
-                        said(head.timeUnit.where));
+  row("frame rate", fmt::format("{}, {}{}", numberText(head.framesPerSecond),
+                                diag::ShownText(head.timeUnit.value), said(head.timeUnit.where)));
   for (const check::Range& range : head.ranges) {
-    row(range.what, numberText(range.first) + " to " + numberText(range.last) + lineOf(range.where));
+    row(range.what,
+        fmt::format("{} to {}{}", numberText(range.first), numberText(range.last), lineOf(range.where)));
   }
   if (head.ranges.empty()) row("range", "the file does not say");
   row("width", numberText(head.width.value) + said(head.width.where));
   row("height", numberText(head.height.value) + said(head.height.where));
   row("pixel aspect", numberText(head.pixelAspect.value) + said(head.pixelAspect.where));
-  row("came over", countText(head.camerasThatCame, "camera") + ", " + countText(head.nullsThatCame, "null"));
+  row("came over", fmt::format("{}, {}", countText(head.camerasThatCame, "camera"),
+                               countText(head.nullsThatCame, "null")));
 }
 
 const check::Drive* driveOf(const check::CameraHead& camera, std::string_view channel) {
@@ -108,7 +112,7 @@ const check::Drive* driveOf(const check::CameraHead& camera, std::string_view ch
 }
 
 void HeadPrinter::stored(std::string_view name, const check::Given<double>& given, std::string_view unit) {
-  row(name, numberText(given.value) + std::string(unit) + said(given.where), kUnderShape);
+  row(name, fmt::format("{}{}{}", numberText(given.value), unit, said(given.where)), kUnderShape);
 }
 
 // The stored value, or of one that is driven the values that it takes.
@@ -120,7 +124,7 @@ void HeadPrinter::number(const check::CameraHead& camera, std::string_view chann
   if (camera.overFrames && (*camera.overFrames).*span) {
     row(name, spanText(*((*camera.overFrames).*span), unit, *camera.overFrames), kUnderShape);
   } else {
-    row(name, "driven, values not known; stored: " + numberText(given.value) + std::string(unit),
+    row(name, fmt::format("driven, values not known; stored: {}{}", numberText(given.value), unit),
         kUnderShape);
   }
   drivenBy(*drive);
@@ -132,8 +136,8 @@ void HeadPrinter::lens(const check::CameraHead& camera) {
   if (driveOf(camera, "horizontalFilmAperture") == nullptr &&
       driveOf(camera, "verticalFilmAperture") == nullptr) {
     row("aperture",
-        numberText(camera.horizontalAperture.value) + " x " + numberText(camera.verticalAperture.value) +
-            " in" + said(camera.horizontalAperture.where),
+        fmt::format("{} x {} in{}", numberText(camera.horizontalAperture.value),
+                    numberText(camera.verticalAperture.value), said(camera.horizontalAperture.where)),
         kUnderShape);
   } else {
     number(camera, "horizontalFilmAperture", "film width", camera.horizontalAperture, " in",
@@ -149,7 +153,7 @@ void HeadPrinter::lens(const check::CameraHead& camera) {
 void HeadPrinter::angle(const check::CameraHead& camera) {
   constexpr std::string_view kUnit = " degrees across the picture";
   if (camera.drives.empty()) {
-    row("angle", numberText(camera.angleOfView) + std::string(kUnit), kUnderShape);
+    row("angle", fmt::format("{}{}", numberText(camera.angleOfView), kUnit), kUnderShape);
   } else if (camera.overFrames && camera.overFrames->angleOfView) {
     row("angle", spanText(*camera.overFrames->angleOfView, kUnit, *camera.overFrames), kUnderShape);
   } else {
@@ -187,15 +191,16 @@ void HeadPrinter::camera(const check::CameraHead& camera, const std::string& uni
   row("camera", style_.strong(diag::ShownText(camera.path)) + lineOf(camera.where));
   if (camera.orthographicWidth) {
     number(camera, "orthographicWidth", "orthographic", *camera.orthographicWidth,
-           ' ' + unit + " across the picture", &check::LensOverFrames::orthographicWidth);
+           fmt::format(" {} across the picture", unit), &check::LensOverFrames::orthographicWidth);
   }
   // The import takes some orthographic cameras for others, with their lens.
   if (!camera.orthographicWidth || camera.cameOver) lens(camera);
   chain(camera);
   std::string came = "no layer";
   if (camera.cameOver) {
-    came = "a camera layer with " + countText(camera.keys, "key") + " for its place and " +
-           countText(camera.zoomKeys, "key") + " for its zoom, under " + countText(camera.parents, "null");
+    came = fmt::format("a camera layer with {} for its place and {} for its zoom, under {}",
+                       countText(camera.keys, "key"), countText(camera.zoomKeys, "key"),
+                       countText(camera.parents, "null"));
   }
   row("came over", came, kUnderShape);
 }
@@ -204,8 +209,8 @@ void HeadPrinter::locator(const check::ShapeHead& locator) {
   row("locator", style_.strong(diag::ShownText(locator.path)) + lineOf(locator.where));
   std::string came = "no layer";
   if (locator.cameOver) {
-    came = "a null layer with " + countText(locator.keys, "key") + " for its place, under " +
-           countText(locator.parents, "null");
+    came = fmt::format("a null layer with {} for its place, under {}", countText(locator.keys, "key"),
+                       countText(locator.parents, "null"));
   }
   row("came over", came, kUnderShape);
 }
@@ -215,7 +220,7 @@ void HeadPrinter::lookAt(const check::LookAtHead& lookAt) {
   row("turns", lookAt.turns.empty() ? "nothing" : diag::ShownText(lookAt.turns), kUnderShape);
   std::string came = "nothing: it aims no camera";
   if (!lookAt.camera.empty())
-    came = diag::ShownText(lookAt.camera) + " is aimed at " + diag::ShownText(lookAt.target);
+    came = fmt::format("{} is aimed at {}", diag::ShownText(lookAt.camera), diag::ShownText(lookAt.target));
   row("came over", came, kUnderShape);
 }
 

@@ -1,5 +1,7 @@
 #include "tools/mayascene/CheckResult.h"
 
+#include <fmt/format.h>
+
 #include <charconv>
 #include <chrono>
 #include <cstring>
@@ -28,22 +30,20 @@ bool takeNumber(std::string_view* line, std::size_t* number) {
 }
 
 std::string sizeText(std::size_t bytes) {
-  return bytes % kMiB == 0 ? std::to_string(bytes / kMiB) + " MiB" : std::to_string(bytes) + " bytes";
+  return bytes % kMiB == 0 ? fmt::format("{} MiB", bytes / kMiB) : fmt::format("{} bytes", bytes);
 }
 
 std::string secondsText(std::chrono::duration<double> duration) {
-  std::ostringstream text;
-  text << duration.count() << " s";
-  return text.str();
+  return fmt::format("{:g} s", duration.count());
 }
 
 std::string breakText(const ChildEnd& end) {
   if (end.kind != ChildEnd::Kind::Signalled) {
-    return "its process ended with status " + std::to_string(end.number) + " and without a whole report";
+    return fmt::format("its process ended with status {} and without a whole report", end.number);
   }
   const char* const name = ::strsignal(end.number);
-  return "its process was ended by signal " + std::to_string(end.number) +
-         (name == nullptr ? "" : " (" + std::string(name) + ')');
+  const std::string named = name == nullptr ? "" : fmt::format(" ({})", name);
+  return fmt::format("its process was ended by signal {}{}", end.number, named);
 }
 
 diag::Diagnostic diagnosticOf(const ChildEnd& end, const PoolLimits& limits) {

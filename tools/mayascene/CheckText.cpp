@@ -1,5 +1,7 @@
 #include "tools/mayascene/CheckText.h"
 
+#include <fmt/format.h>
+
 #include <string>
 #include <string_view>
 
@@ -30,15 +32,15 @@ void printNotInFull(std::ostream& out, const CheckedScene& scene, bool quiet) {
 }
 
 std::string countOf(std::uint64_t count, const std::string& thing) {
-  if (count == 0) return "no " + thing + 's';
-  return std::to_string(count) + ' ' + thing + (count == 1 ? "" : "s");
+  if (count == 0) return fmt::format("no {}s", thing);
+  return fmt::format("{} {}{}", count, thing, count == 1 ? "" : "s");
 }
 
 }  // namespace
 
 std::string totalsText(const check::Report& report) {
-  return countOf(report.errors, "error") + ", " + countOf(report.warnings, "warning") + ", " +
-         countOf(report.notes, "note");
+  return fmt::format("{}, {}, {}", countOf(report.errors, "error"), countOf(report.warnings, "warning"),
+                     countOf(report.notes, "note"));
 }
 
 void printCheck(std::ostream& out, const CheckedScene& scene, const ReportShape& shape, const Style& style) {
@@ -50,7 +52,8 @@ void printCheck(std::ostream& out, const CheckedScene& scene, const ReportShape&
     if (error || !shape.quiet) printFinding(out, scene.path, finding, style);
   }
   printNotInFull(out, scene, shape.quiet);
-  if (!shape.quiet) out << style.strong(diag::ShownText(scene.path) + ": " + totalsText(report)) << '\n';
+  if (!shape.quiet)
+    out << style.strong(fmt::format("{}: {}", diag::ShownText(scene.path), totalsText(report))) << '\n';
 }
 
 }  // namespace mayascene

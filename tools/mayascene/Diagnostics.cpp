@@ -1,20 +1,17 @@
 #include "tools/mayascene/Diagnostics.h"
 
+#include <fmt/format.h>
+
 namespace mayascene {
 namespace {
 
 // "error 2021 (FILE_OPEN): the file cannot be opened, or is no regular file"; after it ", line 7" where the
 // line of the scene is known.
 std::string describeFailure(const refhost::CallbackResult& result) {
-  std::string text = "error " + std::to_string(result.code);
   const std::string_view name = refhost::errorName(result.code);
-  if (name.empty()) {
-    text += ": a code of no known meaning";
-  } else {
-    text += " (" + std::string(name) + "): " + std::string(refhost::errorSentence(result.code));
-  }
-  if (result.line != 0) text += ", line " + std::to_string(result.line);
-  return text;
+  const std::string line = result.line == 0 ? "" : fmt::format(", line {}", result.line);
+  if (name.empty()) return fmt::format("error {}: a code of no known meaning{}", result.code, line);
+  return fmt::format("error {} ({}): {}{}", result.code, name, refhost::errorSentence(result.code), line);
 }
 
 }  // namespace

@@ -1,5 +1,7 @@
 #include "tools/mayascene/LayerSummary.h"
 
+#include <fmt/format.h>
+
 #include <algorithm>
 #include <cmath>
 #include <string_view>
@@ -33,7 +35,7 @@ std::string millimetresText(double value) { return numberText(std::round(value *
 
 std::string rangeText(double least, double most, std::string (*text)(double)) {
   const std::string first = text(least), last = text(most);
-  return first == last ? first : first + " to " + last;
+  return first == last ? first : fmt::format("{} to {}", first, last);
 }
 
 // Where keys stand over the value, it is not seen.
@@ -47,8 +49,8 @@ std::string lensText(const Layer& camera) {
     most = *ends.second;
   }
   const double factor = focalLengthPerZoom(camera);
-  if (factor == 0.0) return "zoom " + rangeText(least, most, numberText) + " px";
-  return "lens " + rangeText(least * factor, most * factor, millimetresText) + " mm";
+  if (factor == 0.0) return fmt::format("zoom {} px", rangeText(least, most, numberText));
+  return fmt::format("lens {} mm", rangeText(least * factor, most * factor, millimetresText));
 }
 
 // The three rotations are one word.
@@ -72,9 +74,8 @@ std::string motionText(const Layer& layer) {
     if (moving.empty() || moving.back() != word) moving.push_back(word);
   }
   if (moving.empty()) return "still";
-  std::string text;
-  for (const std::string_view word : moving) text.append(text.empty() ? "" : ", ").append(word);
-  return text + " animated, " + spanText(*first, *last, layer.composition->frameRate);
+  return fmt::format("{} animated, {}", fmt::join(moving, ", "),
+                     spanText(*first, *last, layer.composition->frameRate));
 }
 
 }  // namespace

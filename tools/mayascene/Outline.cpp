@@ -1,5 +1,7 @@
 #include "tools/mayascene/Outline.h"
 
+#include <fmt/format.h>
+
 #include <algorithm>
 #include <cstddef>
 #include <string>
@@ -42,8 +44,8 @@ std::string padded(std::string_view text, std::size_t width) {
 
 std::string filmText(const Layer& camera) {
   const double millimetres = camera.filmSize / kPointsPerInch * kMillimetresPerInch;
-  return numberText(camera.filmSize) + " pt (" + numberText(millimetres) + " mm) " +
-         (camera.filmDirection == HOST_FILM_VERTICAL ? "vertically" : "horizontally");
+  return fmt::format("{} pt ({} mm) {}", numberText(camera.filmSize), numberText(millimetres),
+                     camera.filmDirection == HOST_FILM_VERTICAL ? "vertically" : "horizontally");
 }
 
 std::vector<Row> rowsOf(const Layer& layer) {
@@ -69,7 +71,7 @@ std::string layerTitle(const Layer& layer, const Style& style) {
   const std::string name = style.strong(quotedTerminalText(layer.name));
   switch (layer.kind) {
     case LayerKind::Camera:
-      return "camera " + name + (layer.aimed ? ", aimed at its point of interest" : "");
+      return fmt::format("camera {}{}", name, layer.aimed ? ", aimed at its point of interest" : "");
     case LayerKind::Composition:
       return "composition " + name;
     case LayerKind::Null:
@@ -97,7 +99,7 @@ void printProperties(std::ostream& out, const Layer& layer, const std::string& i
 void printLayer(std::ostream& out, const Layer& layer, std::size_t depth, Detail detail, const Style& style) {
   const std::string indent(kStep * (1 + std::min(depth, kDeepest)), ' ');
   out << indent;
-  if (depth > kDeepest) out << style.faint("[depth " + std::to_string(depth) + "] ");
+  if (depth > kDeepest) out << style.faint(fmt::format("[depth {}] ", depth));
   out << layerTitle(layer, style);
   if (detail == Detail::Layers && layer.kind != LayerKind::Composition) out << "   " << layerSummary(layer);
   out << '\n';
@@ -150,8 +152,8 @@ std::string summary(const refhost::Folder& folder) {
       for (const Stream& stream : layer->streams) keys += stream.keyCount();
     }
   }
-  return countText(folder.compositions.size(), "composition") + ", " + countText(cameras, "camera") + ", " +
-         countText(nulls, "null") + ", " + countText(keys, "key");
+  return fmt::format("{}, {}, {}, {}", countText(folder.compositions.size(), "composition"),
+                     countText(cameras, "camera"), countText(nulls, "null"), countText(keys, "key"));
 }
 
 bool madeSomething(const SceneReport& scene) {

@@ -1,12 +1,12 @@
 #include "tools/mayascene/Progress.h"
 
+#include <fmt/format.h>
+
 #include <sys/ioctl.h>
 #include <unistd.h>
 
 #include <algorithm>
-#include <array>
 #include <cstdint>
-#include <cstdio>
 #include <cstdlib>
 #include <string_view>
 #include <utility>
@@ -27,20 +27,19 @@ std::string barText(const ProgressState& state) {
   std::string bar(kBar, ' ');
   bar.replace(0, filled, filled, '=');
   if (filled < kBar) bar[filled] = '>';
-  return '[' + bar + "]  ";
+  return fmt::format("[{}]  ", bar);
 }
 
 std::string rateText(double rate) {
-  std::array<char, 32> text{};
-  (void)std::snprintf(text.data(), text.size(), rate < 10.0 ? "%.1f/s" : "%.0f/s", rate);
-  return text.data();
+  return rate < 10.0 ? fmt::format("{:.1f}/s", rate) : fmt::format("{:.0f}/s", rate);
 }
 
 std::string timeText(const ProgressState& state) {
   if (state.done == 0 || state.seconds.count() <= 0.0) return "";
   const double rate = static_cast<double>(state.done) / state.seconds.count();
   const auto left = static_cast<double>(state.all - state.done);
-  return ", " + rateText(rate) + ", " + durationText(std::chrono::duration<double>(left / rate)) + " left";
+  return fmt::format(", {}, {} left", rateText(rate),
+                     durationText(std::chrono::duration<double>(left / rate)));
 }
 
 }  // namespace
@@ -48,15 +47,14 @@ std::string timeText(const ProgressState& state) {
 std::string durationText(std::chrono::duration<double> duration) {
   const double clamped = duration.count() < kMostSeconds ? duration.count() : kMostSeconds;
   const auto seconds = static_cast<std::int64_t>(clamped + 0.5);
-  if (seconds < kMinute) return std::to_string(seconds) + " s";
-  if (seconds < kHour)
-    return std::to_string(seconds / kMinute) + " min " + std::to_string(seconds % kMinute) + " s";
-  return std::to_string(seconds / kHour) + " h " + std::to_string(seconds % kHour / kMinute) + " min";
+  if (seconds < kMinute) return fmt::format("{} s", seconds);
+  if (seconds < kHour) return fmt::format("{} min {} s", seconds / kMinute, seconds % kMinute);
+  return fmt::format("{} h {} min", seconds / kHour, seconds % kHour / kMinute);
 }
 
 std::string progressText(const ProgressState& state, std::size_t width) {
-  std::string text = std::to_string(state.done) + " of " + std::to_string(state.all) + " done, " +
-                     std::to_string(state.failed) + " failed" + timeText(state);
+  std::string text =
+      fmt::format("{} of {} done, {} failed{}", state.done, state.all, state.failed, timeText(state));
   const std::string bar = barText(state);
   if (bar.size() + text.size() <= width) return bar + text;
   text.resize(std::min(text.size(), width));

@@ -1,5 +1,7 @@
 #include "tools/mayascene/Quantities.h"
 
+#include <fmt/format.h>
+
 #include <array>
 #include <charconv>
 #include <cmath>
@@ -42,14 +44,15 @@ std::string frameText(const T_Time& time, const HostRatio& rate) {
 }
 
 std::string secondsText(const T_Time& time) {
-  if (!hasSeconds(time)) return std::to_string(time.value) + "/0 s";
-  return numberText(seconds(time)) + " s";
+  if (!hasSeconds(time)) return fmt::format("{}/0 s", time.value);
+  return fmt::format("{} s", numberText(seconds(time)));
 }
 
 bool isSameTime(const T_Time& a, const T_Time& b) { return a.value == b.value && a.scale == b.scale; }
 
 std::string secondsSpan(const T_Time& first, const T_Time& last) {
-  return isSameTime(first, last) ? secondsText(first) : secondsText(first) + " to " + secondsText(last);
+  if (isSameTime(first, last)) return secondsText(first);
+  return fmt::format("{} to {}", secondsText(first), secondsText(last));
 }
 
 // Whether the keys, of which there are several, hold one value but for rounding noise.
@@ -75,18 +78,18 @@ std::string numberText(double value) {
 }
 
 std::string countText(std::size_t count, const std::string& thing) {
-  return std::to_string(count) + ' ' + thing + (count == 1 ? "" : "s");
+  return fmt::format("{} {}{}", count, thing, count == 1 ? "" : "s");
 }
 
 std::string ratioText(const HostRatio& ratio) {
-  if (ratio.denominator == 0) return std::to_string(ratio.numerator) + "/0";
+  if (ratio.denominator == 0) return fmt::format("{}/0", ratio.numerator);
   return numberText(static_cast<double>(ratio.numerator) / ratio.denominator);
 }
 
 std::string durationText(const T_Time& duration, const HostRatio& rate) {
   if (!hasFrames(duration, rate)) return secondsText(duration);
   const std::string frames = frameText(duration, rate);
-  return secondsText(duration) + " (" + frames + (frames == "1" ? " frame)" : " frames)");
+  return fmt::format("{} ({} {})", secondsText(duration), frames, frames == "1" ? "frame" : "frames");
 }
 
 std::string keysText(const refhost::Stream& stream, const HostRatio& rate) {
@@ -94,16 +97,16 @@ std::string keysText(const refhost::Stream& stream, const HostRatio& rate) {
   const T_Time& first = keys.times.front();
   const T_Time& last = keys.times.back();
   const std::string span = secondsSpan(first, last);
-  const std::string text = countText(keys.times.size(), "key") + ", ";
-  const std::string ending = isConstant(stream) ? ", constant" : "";
-  if (!hasFrames(first, rate) || !hasFrames(last, rate)) return text + span + ending;
-  return text + spanText(first, last, rate) + " (" + span + ')' + ending;
+  const std::string count = countText(keys.times.size(), "key");
+  const char* const ending = isConstant(stream) ? ", constant" : "";
+  if (!hasFrames(first, rate) || !hasFrames(last, rate)) return fmt::format("{}, {}{}", count, span, ending);
+  return fmt::format("{}, {} ({}){}", count, spanText(first, last, rate), span, ending);
 }
 
 std::string spanText(const T_Time& first, const T_Time& last, const HostRatio& rate) {
   if (!hasFrames(first, rate) || !hasFrames(last, rate)) return secondsSpan(first, last);
-  if (isSameTime(first, last)) return "frame " + frameText(first, rate);
-  return "frames " + frameText(first, rate) + " to " + frameText(last, rate);
+  if (isSameTime(first, last)) return fmt::format("frame {}", frameText(first, rate));
+  return fmt::format("frames {} to {}", frameText(first, rate), frameText(last, rate));
 }
 
 bool isEarlier(const T_Time& one, const T_Time& other) {
