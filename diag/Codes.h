@@ -165,9 +165,12 @@ enum class Code : std::uint16_t {
   ExportZoomByExtension = 1114,
   ExportFileTooLarge = 1115,
   ExportDownAxisLost = 1116,
+  ExportNoKeysInFrames = 1117,
+  ExportNothingKeyed = 1118,
   ExportRotationOrder = 1121,
   ExportPartLost = 1122,
   ExportFramesRounded = 1123,
+  ExportFramesHeld = 1124,
 };
 
 // Ordered: a later one is worse.

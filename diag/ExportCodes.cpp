@@ -132,6 +132,21 @@ constexpr Entry kExportCodes[] = {
                 "the same picture.",
      .example = "",
      .help = "Export in the axes of the scene."},
+    {.code = Code::ExportNoKeysInFrames,
+     .severity = Severity::Warning,
+     .symbol = "ExportNoKeysInFrames",
+     .sentence = "{0}: none of its keys lies in the frames {1} to {2}, so the list has none",
+     .meaning = "A list of keys holds only those of the frames that were asked for. The layer moves, and the "
+                "list does not show it.",
+     .example = "",
+     .help = "Choose frames that have keys, or leave --keys out: then each frame has a row."},
+    {.code = Code::ExportNothingKeyed,
+     .severity = Severity::Warning,
+     .symbol = "ExportNothingKeyed",
+     .sentence = "no layer has keys: the list is empty",
+     .meaning = "Nothing of the composition moves, and a list of keys holds nothing else.",
+     .example = "",
+     .help = "Leave --keys out: then each layer has a row with its place and its lens."},
     {.code = Code::ExportRotationOrder,
      .severity = Severity::Note,
      .symbol = "ExportRotationOrder",
@@ -155,6 +170,14 @@ constexpr Entry kExportCodes[] = {
      .meaning = "Each line has the whole number below its frame. The values are those of the frame itself.",
      .example = "",
      .help = "Say a whole first frame with --frames."},
+    {.code = Code::ExportFramesHeld,
+     .severity = Severity::Note,
+     .symbol = "ExportFramesHeld",
+     .sentence = "{0} the values of the {1} key, which is on frame {2}",
+     .meaning = "Nothing came over for these frames. Each layer stays as it is at its own first or last key.",
+     .example = "",
+     .help =
+         "Nothing has to be done where that is wanted. With --bake the scene itself says what they show."},
 };
 
 }  // namespace

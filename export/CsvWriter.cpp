@@ -12,6 +12,7 @@
 #include "export/ReportedLosses.h"
 #include "export/TextWriter.h"
 #include "export/Writers.h"
+#include "text/Utf8.h"
 
 namespace interchange {
 namespace {
@@ -20,11 +21,25 @@ constexpr std::string_view kFrameHead =
     "layer,frame,seconds,tx,ty,tz,rx,ry,rz,sx,sy,sz,wx,wy,wz,zoom,focal,fov,number,parent\r\n";
 constexpr std::string_view kKeyHead = "layer,stream,frame,seconds,x,y,z,number\r\n";
 
+// Without the spaces in front. Those that show no width, and controls, are escaped in a name.
+std::string_view WithoutSpaces(std::string_view cell) {
+  while (!cell.empty()) {
+    const text::Character character = text::CharacterAt(cell, 0);
+    const char32_t point = character.point;
+    const bool space = point == ' ' || point == 0xa0 || point == 0x1680 ||
+                       (point >= 0x2000 && point <= 0x200a) || point == 0x202f || point == 0x205f ||
+                       point == 0x3000;
+    if (!space) break;
+    cell.remove_prefix(character.length);
+  }
+  return cell;
+}
+
 // Whether a spreadsheet takes the text for a formula: by its first sign, in full width too.
 bool IsFormula(std::string_view text) {
   constexpr std::array<std::string_view, 8> kSigns = {
       "=", "+", "-", "@", "\xef\xbc\x9d", "\xef\xbc\x8b", "\xef\xbc\x8d", "\xef\xbc\xa0"};
-  text.remove_prefix(std::min(text.find_first_not_of(' '), text.size()));
+  text = WithoutSpaces(text);
   return std::any_of(kSigns.begin(), kSigns.end(),
                      [&](std::string_view sign) { return text.starts_with(sign); });
 }
@@ -79,8 +94,8 @@ class Frames {
  private:
   void WriteRow(std::size_t index, std::size_t frame) {
     const Layer& layer = composition_.layers[index];
-    out_ << names_[index] << ',' << composition_.FrameNumber(frame) << ','
-         << static_cast<double>(frame) / composition_.framesPerSecond;
+    const double number = composition_.FrameNumber(frame);
+    out_ << names_[index] << ',' << number << ',' << number / composition_.framesPerSecond;
     WriteVector(out_, At(layer.position, frame));
     WriteVector(out_, AnglesAt(index, frame));
     WriteVector(out_, At(layer.scale, frame));
@@ -116,8 +131,7 @@ void WriteKeys(TextWriter& out, const Composition& composition, std::size_t inde
   for (const StreamKeys& stream : layer.keys) {
     for (std::size_t key = 0; key < stream.frames.size(); ++key) {
       const double frame = stream.frames[key];
-      out << name << ',' << stream.stream << ',' << frame << ','
-          << (frame - composition.firstFrame) / composition.framesPerSecond;
+      out << name << ',' << stream.stream << ',' << frame << ',' << frame / composition.framesPerSecond;
       for (std::size_t i = 0; i < 3; ++i) {
         out << ',';
         if (i < stream.components) out << stream.values[key * stream.components + i];

@@ -37,6 +37,7 @@ struct Format {
   std::string_view suffix;    // ".chan"
   std::string_view sentence;  // for help
   bool ownAxes = false;       // the axes are the format's own, whatever the user says
+  bool severalFiles = false;  // a composition that moves is never one file
   bool listsKeys = false;     // takes WriteOptions::keys
 
   // Writes a composition that IsWritable() takes. What the format cannot say is reported. False after an

@@ -14,6 +14,7 @@ constexpr std::array kFormats = {
            .suffix = ".gltf",
            .sentence = "glTF 2.0, with a .bin beside it: always metres, y up",
            .ownAxes = true,
+           .severalFiles = true,
            .write = WriteGltf},
     Format{.name = "glb",
            .suffix = ".glb",

@@ -5,6 +5,7 @@
 #include <cmath>
 #include <ctime>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "diag/Collector.h"
@@ -107,11 +108,11 @@ TEST(CsvWriter, ARowForEachFrameOfEachLayer) {
   ASSERT_EQ(rows.size(), 5u);
   EXPECT_THAT(rows[0], ElementsAre("layer", "frame", "seconds", "tx", "ty", "tz", "rx", "ry", "rz", "sx",
                                    "sy", "sz", "wx", "wy", "wz", "zoom", "focal", "fov", "number", "parent"));
-  EXPECT_THAT(rows[1], ElementsAre("arm", "101", "0", "0", "7", "0", "0", "0", "90", "1", "1", "1", "0", "7",
-                                   "0", "", "", "", "1", ""));
+  EXPECT_THAT(rows[1], ElementsAre("arm", "101", "4.04", "0", "7", "0", "0", "0", "90", "1", "1", "1", "0",
+                                   "7", "0", "", "", "", "1", ""));
   EXPECT_EQ(rows[2][0], "cam");
   EXPECT_EQ(rows[3][0], "arm");
-  EXPECT_THAT(rows[4], ElementsAre("cam", "102", "0.04", "2.5", "0", "0", "370", "0", "0", "1", "1", "3", "0",
+  EXPECT_THAT(rows[4], ElementsAre("cam", "102", "4.08", "2.5", "0", "0", "370", "0", "0", "1", "1", "3", "0",
                                    "9.5", "0", "540", "9", "90", "2", "1"));
 }
 
@@ -143,8 +144,8 @@ TEST(CsvWriter, ARowForEachKeyOfEachStream) {
   const std::vector<Row> rows = Written(composition, true);
   ASSERT_EQ(rows.size(), 4u);
   EXPECT_THAT(rows[0], ElementsAre("layer", "stream", "frame", "seconds", "x", "y", "z", "number"));
-  EXPECT_THAT(rows[2], ElementsAre("cam", "position", "103.5", "0.1", "4", "5", "6", "2"));
-  EXPECT_THAT(rows[3], ElementsAre("cam", "zoom", "102", "0.04", "540", "", "", "2"));
+  EXPECT_THAT(rows[2], ElementsAre("cam", "position", "103.5", "4.14", "4", "5", "6", "2"));
+  EXPECT_THAT(rows[3], ElementsAre("cam", "zoom", "102", "4.08", "540", "", "", "2"));
 }
 
 TEST(CsvWriter, NamesAreNoFormulas) {
@@ -159,6 +160,29 @@ TEST(CsvWriter, NamesAreNoFormulas) {
     Composition composition = OneCamera();
     composition.layers[0].name = name;
     EXPECT_EQ(Written(composition)[1][0], '\'' + name);
+  }
+}
+
+TEST(CsvWriter, NamesAreNoFormulasAfterSpacesOfAnyKind) {
+  for (const std::string space : {"\xc2\xa0", "\xe1\x9a\x80", "\xe2\x80\x80", "\xe2\x80\x8a", "\xe2\x80\xaf",
+                                  "\xe2\x81\x9f", "\xe3\x80\x80", " \xc2\xa0 \xe3\x80\x80"}) {
+    Composition composition = OneCamera();
+    composition.layers[0].name = space + "=1";
+    composition.layers[1].name = space + "x";
+    const std::vector<Row> rows = Written(composition);
+    EXPECT_EQ(rows[1][0], '\'' + space + "=1");
+    EXPECT_EQ(rows[2][0], space + "x");
+  }
+  // Spaces that end a line or show no width never reach the file as they are.
+  for (const auto& [space, shown] : {std::pair("\t", "\\t"),
+                                     {"\r", "\\r"},
+                                     {"\xc2\x85", "\\u0085"},
+                                     {"\xe2\x80\x8b", "\\u200b"},
+                                     {"\xe2\x80\xa8", "\\u2028"},
+                                     {"\xef\xbb\xbf", "\\ufeff"}}) {
+    Composition composition = OneCamera();
+    composition.layers[0].name = space + std::string("=1");
+    EXPECT_EQ(Written(composition)[1][0], shown + std::string("=1"));
   }
 }
 
@@ -187,7 +211,7 @@ TEST(CsvWriter, WholeNumbersHaveNoExponent) {
   composition.layers[0].position[2] = 1e300;
   const std::vector<Row> rows = Written(composition);
   EXPECT_THAT((Row(rows[1].begin() + 1, rows[1].begin() + 6)),
-              ElementsAre("100000", "0", "0", "-9007199254740991", "1e+300"));
+              ElementsAre("100000", "4000", "0", "-9007199254740991", "1e+300"));
 }
 
 TEST(CsvWriter, WhatItHasNoPlaceForIsNamed) {
@@ -219,7 +243,8 @@ TEST(CsvWriter, DeepParentsTakeNoLongerThanFlatOnes) {
   EXPECT_TRUE(Write(*FindFormat("csv"), composition, {}, files, &diagnostics));
   // Worked out link by link for each of them it takes half a minute.
   EXPECT_LT(std::clock() - begin, 3 * CLOCKS_PER_SEC);
-  EXPECT_THAT(files.main(), HasSubstr("\nlink,1,0,1,0,0,0,0,0,1,1,1," + std::to_string(kDepth) + ",0,0,"));
+  EXPECT_THAT(files.main(), HasSubstr("\nlink,1,0.041666666666666664,1,0,0,0,0,0,1,1,1," +
+                                      std::to_string(kDepth) + ",0,0,"));
 }
 
 TEST(CsvWriter, HostileCompositionsGiveATableOrAnError) {

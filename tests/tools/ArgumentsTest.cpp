@@ -163,6 +163,29 @@ TEST(Arguments, WhatMakesNoSenseIsWrongUsage) {
   expectWrongUsage({"prefs", "set", "linear-units"}, "VALUE is required");
 }
 
+TEST(Arguments, WrongUsageNamesTheHelpOfItsVerb) {
+  for (const std::string verb : {"import", "bake", "export", "check", "verify"}) {
+    expectWrongUsage({verb.c_str(), "--nothing"},
+                     "\nRun mayascene " + verb + " --help for how it is used.\n");
+  }
+  expectWrongUsage({"export", "a.ma", "-o", "a"}, "\nRun mayascene export --help ");
+  expectWrongUsage({"prefs", "x"}, "\nRun mayascene prefs --help ");
+  expectWrongUsage({"prefs", "set", "x", "1"}, "\nRun mayascene prefs set --help ");
+  expectWrongUsage({"nothing"}, "\nRun mayascene --help ");
+}
+
+TEST(Arguments, AnOptionThatIsGivenTwiceIsNamedAndOneThatMayBeIsNot) {
+  expectWrongUsage({"export", "a.ma", "b.ma", "--camera", "c", "--camera", "d", "--frames", "1:2", "--frames",
+                    "3:4", "-o", "x"},
+                   "mayascene: --frames is given twice\n");
+  expectWrongUsage({"bake", "a.ma", "-o", "x", "-o", "y", "--output", "z"},
+                   "mayascene: --output is given 3 times\n");
+  expectWrongUsage({"check", "a.ma", "--only", "MA0101", "--only", "MA0102", "--jobs", "1", "--jobs", "1"},
+                   "mayascene: --jobs is given twice\n");
+  expectWrongUsage({"prefs", "--preferences", "a", "--preferences", "b", "set", "linear-units", "1"},
+                   "mayascene: --preferences is given twice\n");
+}
+
 TEST(Arguments, ARehearsalThatNamesNothingIsWrongUsage) {
   expectWrongUsage({"import", "--fail", "NoSuchCall:1=2", "a.ma"}, "--fail: ");
   expectWrongUsage({"import", "--fail", "FileRead", "a.ma"}, "--fail: ");

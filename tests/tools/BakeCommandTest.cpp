@@ -343,7 +343,9 @@ TEST_F(BakeCommand, ManyWarningsOfOneKindAreCounted) {
   write("shot.ma", unbakedScene() + commands);
   const ToolResult result = run({"bake", "shot.ma", "-o", "baked.ma"});
   EXPECT_EQ(result.status, 0);
-  EXPECT_THAT(result.err, HasSubstr("6 more of these, see --report"));
+  EXPECT_THAT(result.err, HasSubstr("6 more of these: add --report FILE to see all\n"));
+  EXPECT_THAT(run({"bake", "shot.ma", "-o", "baked.ma", "--report", "all.json"}).err,
+              HasSubstr("6 more of these: all are in all.json\n"));
 }
 
 }  // namespace

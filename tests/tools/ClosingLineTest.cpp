@@ -5,6 +5,7 @@
 #include <cstdlib>
 #include <filesystem>
 #include <string>
+#include <utility>
 
 #include "tests/tools/ToolRun.h"
 
@@ -78,6 +79,45 @@ TEST_F(ClosingLine, TheCommandBringsItOverAndThenNothingIsSaid) {
     EXPECT_EQ(again.status, 0) << scene;
     EXPECT_EQ(lines(again), 0u) << again.err;
   }
+}
+
+// Pasted as it stands, the command writes what the export did not.
+TEST_F(ClosingLine, AnExportNamesItselfAndTheShellRunsIt) {
+  const std::string folder = std::filesystem::path(MAYASCENE_TOOL).parent_path();
+  for (const auto& [file, word] :
+       {std::pair<std::string, std::string>("out.x", "out.x"), {"a b.x", "'a b.x'"}}) {
+    const ToolResult result =
+        run({"export", "curved.ma", "-f", "csv", "--frames", "-2:9", "--scale", "2", "-o", file});
+    EXPECT_EQ(result.status, 0);
+    ASSERT_EQ(lines(result), 1u) << result.err;
+    const std::string command = result.err.substr(result.err.rfind(kBring) + std::string(kBring).size());
+    EXPECT_EQ(command, "mayascene export --bake -f csv --frames=-2:9 --scale 2 curved.ma -o " + word + '\n');
+    const std::string plain = read(file);
+    write("script", command);
+    const std::string shell =
+        "cd '" + path("").string() + "' && PATH='" + folder + "':\"$PATH\" bash script 2>said";
+    EXPECT_EQ(std::system(shell.c_str()), 0) << read("said");
+    EXPECT_NE(read(file), plain);
+    EXPECT_EQ(read("said").find(kBring), std::string::npos);
+  }
+  EXPECT_THAT(run({"export", "curved.ma", "path.ma", "-f", "glb", "-o", "all"}).err,
+              EndsWith("mayascene export --bake -f glb path.ma -o all/path.glb\n"));
+  EXPECT_THAT(run({"export", "curved.ma", "-f", "csv", "-o", "-"}).err,
+              EndsWith("mayascene export --bake -f csv curved.ma -o -\n"));
+  EXPECT_THAT(run({"export", "-q", "path.ma", "-o", "x.glb"}).err, EndsWith(" path.ma -o x.glb\n"));
+  EXPECT_EQ(lines(run({"export", "-q", "curved.ma", "-o", "x.glb"})), 0u);
+}
+
+TEST_F(ClosingLine, AStrictExportEndsWithOneWhereItIsSaid) {
+  EXPECT_EQ(run({"export", "--strict", "whole.ma", "-o", "x.csv"}).status, 0);
+  for (const bool quiet : {false, true}) {
+    const ToolResult result =
+        run({"export", "--strict", "curved.ma", "-o", "x.csv", quiet ? "-q" : "--keys"});
+    EXPECT_EQ(result.status, 1);
+    EXPECT_EQ(lines(result), 1u);  // the reason of the status is no news that --quiet hides
+  }
+  EXPECT_EQ(run({"export", "--strict", "--bake", "curved.ma", "-o", "x.csv"}).status, 0);
+  EXPECT_EQ(run({"export", "curved.ma", "-o", "x.csv"}).status, 0);
 }
 
 TEST_F(ClosingLine, EachSceneHasItsOwnAfterAllOfThem) {

@@ -60,7 +60,7 @@ TEST_F(ExitStatusTest, WrongUsageIsTwoAndPrintsNoData) {
   const ToolResult result = run({"import"});
   EXPECT_EQ(result.status, 2);
   EXPECT_EQ(result.out, "");
-  EXPECT_EQ(result.err, "mayascene: SCENE is required\nRun mayascene --help for how it is used.\n");
+  EXPECT_EQ(result.err, "mayascene: SCENE is required\nRun mayascene import --help for how it is used.\n");
 }
 
 TEST_F(ExitStatusTest, AFileThatIsMissingIsThreeAndTheOthersAreImported) {

@@ -10,6 +10,7 @@
 namespace {
 
 using mayascene_test::ToolTest;
+using testing::AllOf;
 using testing::ElementsAre;
 using testing::HasSubstr;
 using testing::Not;
@@ -18,11 +19,15 @@ using testing::StartsWith;
 // A camera under a boom in the unit, keyed from frame 11 on.
 std::string rig(const std::string& unit) {
   return "//Maya ASCII 2023 scene\ncurrentUnit -l " + unit +
-         " -a degree -t film;\ncreateNode transform -n \"boom\";\n\tsetAttr \".t\" -type \"double3\" 0 2 0;\n"
+         " -a degree -t film;\nselect -ne :defaultResolution;\n\tsetAttr \".w\" 640;\n\tsetAttr \".h\" 360;\n"
+         "\tsetAttr \".pa\" 1;\ncreateNode transform -n \"boom\";\n\tsetAttr \".t\" -type \"double3\" 0 2 "
+         "0;\n"
          "createNode transform -n \"cam\" -p \"boom\";\ncreateNode camera -n \"camShape\" -p \"cam\";\n"
-         "createNode animCurveTL -n \"c1\";\n\tsetAttr -s 3 \".ktv[0:2]\" 11 0 12 1 13 4;\n"
+         "createNode animCurveTL -n \"c1\";\n\tsetAttr \".tan\" 2;\n\tsetAttr -s 3 \".ktv[0:2]\" 11 0 12 1 "
+         "13 4;\n"
          "connectAttr \"c1.o\" \"cam.tz\";\n"
-         "createNode animCurveTA -n \"c2\";\n\tsetAttr -s 3 \".ktv[0:2]\" 11 0 12 -10 13 -20;\n"
+         "createNode animCurveTA -n \"c2\";\n\tsetAttr \".tan\" 2;\n\tsetAttr -s 3 \".ktv[0:2]\" 11 0 12 -10 "
+         "13 -20;\n"
          "connectAttr \"c2.o\" \"cam.rx\";\n";
 }
 
@@ -47,10 +52,10 @@ TEST_F(ExportCommandTest, FramesAndLengthsAreTheScenesOwn) {
           run({"export", "shot.ma", "-o", "shot.csv", "--linear-units", converted, "--quiet"});
       EXPECT_EQ(result.status, 0) << result.err;
       EXPECT_EQ(result.err, "");
-      EXPECT_EQ(rowOf("shot.csv", "11"), "11,0,0,0,0,0,0,0");
+      EXPECT_EQ(rowOf("shot.csv", "11"), "11,0.4583333333333333,0,0,0,0,0,0");
       const std::string row = rowOf("shot.csv", "13");
-      ASSERT_THAT(row, StartsWith("13,0.08333333333333333,0,0,")) << unit << converted;
-      EXPECT_NEAR(std::stod(row.substr(27)), 4.0, 1e-14) << unit << converted;
+      ASSERT_THAT(row, StartsWith("13,0.5416666666666666,0,0,")) << unit << converted;
+      EXPECT_NEAR(std::stod(row.substr(26)), 4.0, 1e-14) << unit << converted;
     }
   }
 }
@@ -58,22 +63,22 @@ TEST_F(ExportCommandTest, FramesAndLengthsAreTheScenesOwn) {
 TEST_F(ExportCommandTest, RotationsAreTheScenesOwn) {
   write("shot.ma", rig("cm"));
   EXPECT_EQ(run({"export", "shot.ma", "-o", "shot.csv", "--quiet"}).status, 0);
-  EXPECT_EQ(rowOf("shot.csv", "12"), "12,0.041666666666666664,0,0,1,-10,0,0");
+  EXPECT_EQ(rowOf("shot.csv", "12"), "12,0.5,0,0,1,-10,0,0");
 }
 
 TEST_F(ExportCommandTest, HostAxesAndScaleTurnAndStretchPlaces) {
   write("shot.ma", rig("cm"));
   EXPECT_EQ(run({"export", "shot.ma", "-o", "shot.csv", "--axes", "host", "--scale", "10", "--quiet"}).status,
             0);
-  EXPECT_EQ(rowOf("shot.csv", "13"), "13,0.08333333333333333,0,0,-40,-20,0,0");
+  EXPECT_EQ(rowOf("shot.csv", "13"), "13,0.5416666666666666,0,0,-40,-20,0,0");
 }
 
 TEST_F(ExportCommandTest, FramesAreChosenInTheScenesNumbers) {
   write("shot.ma", rig("cm"));
   EXPECT_EQ(run({"export", "shot.ma", "-o", "shot.csv", "--frames", "12:14", "--quiet"}).status, 0);
   EXPECT_THAT(rowOf("shot.csv", "11"), HasSubstr("none"));
-  EXPECT_EQ(rowOf("shot.csv", "12"), "12,0,0,0,1,-10,0,0");
-  EXPECT_EQ(rowOf("shot.csv", "14"), "14,0.08333333333333333,0,0,4,-20,0,0");
+  EXPECT_EQ(rowOf("shot.csv", "12"), "12,0.5,0,0,1,-10,0,0");
+  EXPECT_EQ(rowOf("shot.csv", "14"), "14,0.5833333333333334,0,0,4,-20,0,0");
 }
 
 TEST_F(ExportCommandTest, ABakeIsExportedFromItsFirstToItsLastFrame) {
@@ -81,15 +86,86 @@ TEST_F(ExportCommandTest, ABakeIsExportedFromItsFirstToItsLastFrame) {
   const auto result = run({"export", "--bake", "--frames", "10:15", "shot.ma", "-o", "shot.csv"});
   EXPECT_EQ(result.status, 0) << result.err;
   EXPECT_THAT(result.err, HasSubstr("shot.ma: written to shot.csv"));
-  EXPECT_THAT(rowOf("shot.csv", "10"), StartsWith("10,0,0,0,0,"));
+  EXPECT_THAT(rowOf("shot.csv", "10"), StartsWith("10,0.4166666666666667,0,0,0,"));
   EXPECT_THAT(rowOf("shot.csv", "15"), HasSubstr(",0,0,4,-20,0,0"));
+}
+
+TEST_F(ExportCommandTest, FramesWithoutKeysAreNamed) {
+  write("shot.ma", rig("cm"));
+  const auto said = [this](const char* frames, const char* option) {
+    return run({"export", "shot.ma", "-o", "shot.csv", "--frames", frames, option}).err;
+  };
+  const auto before =
+      HasSubstr("note: frames 5 to 10 hold the values of the first key, which is on frame 11");
+  const auto after = HasSubstr("note: frame 14 holds the values of the last key, which is on frame 13");
+  EXPECT_THAT(said("5:14", "--strict"), AllOf(before, after));
+  EXPECT_THAT(said("11:13", "--strict"), Not(HasSubstr("MA1124")));
+  EXPECT_THAT(said("11:13.5", "--strict"), Not(HasSubstr("MA1124")));
+  EXPECT_THAT(said("5:14", "--bake"), Not(HasSubstr("MA1124")));
+  EXPECT_THAT(said("5:14", "--keys"), Not(HasSubstr("MA1124")));
+  EXPECT_THAT(said("20:22.5", "--strict"), HasSubstr("frames 20 to 22 hold the values of the last key"));
+  EXPECT_THAT(said("2:4", "--strict"),
+              AllOf(HasSubstr("frames 2 to 4 hold the values of the first key"), Not(HasSubstr("last key"))));
+}
+
+TEST_F(ExportCommandTest, AListWithoutKeysIsAWarning) {
+  write("shot.ma", rig("cm"));
+  const auto none = run({"export", "shot.ma", "-o", "k.csv", "--keys", "--frames", "14:20"});
+  EXPECT_EQ(none.status, 0);
+  EXPECT_THAT(none.err, HasSubstr("warning: camShape: none of its keys lies in the frames 14 to 20, so the "
+                                  "list has none [MA1117]"));
+  EXPECT_EQ(run({"export", "shot.ma", "-o", "k.csv", "--keys", "--frames", "14:20", "--strict"}).status, 1);
+  const auto one = run({"export", "shot.ma", "-o", "k.csv", "--keys", "--frames", "13:20", "--strict"});
+  EXPECT_EQ(one.status, 0) << one.err;
+  write("still.ma", mayascene_test::sceneText(mayascene_test::stillCamera()));
+  const auto still = run({"export", "still.ma", "-o", "k.csv", "--keys", "--strict"});
+  EXPECT_EQ(still.status, 1);
+  EXPECT_THAT(still.err, HasSubstr("warning: no layer has keys: the list is empty [MA1118]"));
+}
+
+TEST_F(ExportCommandTest, SecondsAreTheSameInEveryFormat) {
+  write("shot.ma", rig("cm"));
+  for (const char* format : {"x.csv", "x.gltf", "x.usda"}) {
+    EXPECT_EQ(run({"export", "shot.ma", "-o", format, "--quiet"}).status, 0);
+  }
+  EXPECT_THAT(rowOf("x.csv", "11"), StartsWith("11,0.4583333333333333,"));
+  EXPECT_THAT(rowOf("x.csv", "13"), StartsWith("13,0.5416666666666666,"));
+  EXPECT_THAT(read("x.gltf"), HasSubstr("\"firstSeconds\": 0.4583333333333333"));
+  EXPECT_THAT(read("x.gltf"), HasSubstr("\"max\": [0.5416666"));
+  EXPECT_THAT(read("x.usda"),
+              AllOf(HasSubstr("startTimeCode = 11\n"), HasSubstr("timeCodesPerSecond = 24\n")));
+}
+
+TEST_F(ExportCommandTest, StandardOutputTakesOneFileWhole) {
+  write("shot.ma", rig("cm"));
+  for (const std::string format : {"glb", "usda", "csv", "chan"}) {
+    EXPECT_EQ(run({"export", "shot.ma", "-o", "file." + format, "--quiet"}).status, 0);
+    const auto result = run({"export", "shot.ma", "-f", format, "-o", "-"});
+    EXPECT_EQ(result.status, 0) << result.err;
+    EXPECT_EQ(result.out, read("file." + format)) << format;
+    EXPECT_THAT(result.err, HasSubstr("shot.ma: written to standard output\n"));
+  }
+  const auto two = run({"export", "shot.ma", "-f", "gltf", "-o", "-"});
+  EXPECT_EQ(two.status, 2);
+  EXPECT_THAT(two.err, HasSubstr("gltf is several files, and standard output takes one: take glb"));
+  std::string pair = rig("cm");
+  pair += "createNode transform -n \"eye\";\ncreateNode camera -n \"eyeShape\" -p \"eye\";\n";
+  write("pair.ma", pair);
+  const auto cameras = run({"export", "pair.ma", "-f", "chan", "-o", "-"});
+  EXPECT_EQ(cameras.status, 5);
+  EXPECT_EQ(cameras.out, "");
+  EXPECT_THAT(cameras.err, HasSubstr("standard output cannot take the several files"));
+  const auto scenes = run({"export", "shot.ma", "pair.ma", "-f", "csv", "-o", "-"});
+  EXPECT_EQ(scenes.status, 2);
+  EXPECT_THAT(scenes.err,
+              HasSubstr("standard output cannot take the outputs of several scenes: name a folder"));
 }
 
 TEST_F(ExportCommandTest, KeysAreListedAsTheyAre) {
   write("shot.ma", rig("cm"));
   EXPECT_EQ(run({"export", "shot.ma", "-o", "shot.csv", "--keys", "--quiet"}).status, 0);
-  EXPECT_THAT(read("shot.csv"), HasSubstr("\ncamShape,position,13,0.08333333333333333,0,0,4,"));
-  EXPECT_THAT(read("shot.csv"), HasSubstr("\ncamShape,xRotation,12,0.041666666666666664,-10,,,"));
+  EXPECT_THAT(read("shot.csv"), HasSubstr("\ncamShape,position,13,0.5416666666666666,0,0,4,"));
+  EXPECT_THAT(read("shot.csv"), HasSubstr("\ncamShape,xRotation,12,0.5,-10,,,"));
 }
 
 TEST_F(ExportCommandTest, AChanFileHasTheCamerasPlaceInTheWorld) {
@@ -228,6 +304,7 @@ TEST_F(ExportCommandTest, ManyFramesAreWrittenOnlyWhereTheyAreAskedFor) {
   EXPECT_EQ(result.status, 1);
   EXPECT_THAT(result.err, HasSubstr("MA1106"));
   EXPECT_EQ(run({"export", "long.ma", "-o", "long.csv", "--frames", "11:12", "--quiet"}).status, 0);
+  EXPECT_EQ(run({"export", "long.ma", "-o", "long.csv", "--keys", "--quiet"}).status, 0);
 }
 
 TEST_F(ExportCommandTest, KeysBetweenFramesAreAWarning) {

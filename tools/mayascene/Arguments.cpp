@@ -24,6 +24,9 @@ namespace {
 constexpr double kLeastTimeout = 0.001;
 constexpr double kMostTimeout = 1e6;
 
+constexpr const char* kImportedScene =
+    "a Maya ASCII scene with baked animation; with --bake\nanimated in any way";
+
 // The library's own range takes "nan" for a number in it.
 CLI::Validator timeoutWord() {
   const auto check = [](const std::string& word) -> std::string {
@@ -144,15 +147,13 @@ struct CommandLine {
     addPrefs();
   }
 
-  void addScenes(CLI::App* verb, std::vector<std::string>* scenes) {
-    verb->add_option("SCENE", *scenes, "a Maya ASCII scene with baked animation")
-        ->required()
-        ->option_text(" ");
+  static void addScenes(CLI::App* verb, std::vector<std::string>* scenes, const char* text) {
+    verb->add_option("SCENE", *scenes, text)->required()->option_text(" ");
   }
 
   void addImport() {
     importVerb = app.add_subcommand("import", "import scenes and print an outline of what was made");
-    addScenes(importVerb, &import.scenes);
+    addScenes(importVerb, &import.scenes, kImportedScene);
     importVerb->add_option("--json", import.json, "write all of it, keys included; - is standard output")
         ->option_text("FILE");
     importVerb->add_flag("-v,--verbose", import.verbose, "show every property in the outline");
@@ -165,9 +166,7 @@ struct CommandLine {
 
   void addBake() {
     bakeVerb = app.add_subcommand("bake", "write scenes anew, with a value at every frame");
-    bakeVerb->add_option("SCENE", bake.scenes, "a Maya ASCII scene, animated in any way")
-        ->required()
-        ->option_text(" ");
+    addScenes(bakeVerb, &bake.scenes, "a Maya ASCII scene, animated in any way");
     bakeVerb->add_option("-o,--output", bake.output, "the bake; with several scenes a folder for them")
         ->required()
         ->option_text("OUT");
@@ -177,17 +176,14 @@ struct CommandLine {
 
   void addExport() {
     exportVerb = app.add_subcommand("export", "write cameras and nulls of scenes for other programs");
-    addScenes(exportVerb, &exported.scenes);
+    addScenes(exportVerb, &exported.scenes, kImportedScene);
     addExportOptions(exportVerb, &exportWords, &exported);
   }
 
   void addCheck() {
     checkVerb = app.add_subcommand("check", "say what an import makes of scenes, what it does not, and why");
-    checkVerb
-        ->add_option("SCENE", check.scenes,
-                     "a Maya ASCII scene, in whatever state, or a folder\nthat is searched for *.ma")
-        ->required()
-        ->option_text(" ");
+    addScenes(checkVerb, &check.scenes,
+              "a Maya ASCII scene, in whatever state, or a folder\nthat is searched for *.ma");
     checkVerb->add_option("--json", check.json, "write the reports; - is standard output")
         ->option_text("FILE");
     checkVerb->add_flag("--strict", check.strict, "warnings make the exit status 1");
@@ -218,7 +214,7 @@ struct CommandLine {
 
   void addVerify() {
     verifyVerb = app.add_subcommand("verify", "answer for each file whether the importer takes it");
-    addScenes(verifyVerb, &verify.scenes);
+    addScenes(verifyVerb, &verify.scenes, "a file, such as a Maya ASCII scene");
     verifyVerb->add_flag("-q,--quiet", verify.quiet, "print nothing but errors");
     addHostOptions(verifyVerb, &verify.host, &verifyHostWords);
   }
@@ -257,6 +253,21 @@ struct CommandLine {
       command += ' ' + verb->get_name();
     }
     return tableOf(*verb, command);
+  }
+
+  // What is wrong with the words, in plain ones.
+  std::string complaint(const CLI::ParseError& wrong) const {
+    const bool mismatch = dynamic_cast<const CLI::ArgumentMismatch*>(&wrong) != nullptr;
+    for (const CLI::App* verb = &app; mismatch; verb = verb->get_subcommands().back()) {
+      for (const CLI::Option* option : verb->get_options()) {
+        if (option->get_items_expected_max() != 1 || option->results().size() < 2) continue;
+        const std::size_t times = option->results().size();
+        return option->get_name() + " is given " +
+               (times == 2 ? std::string("twice") : std::to_string(times) + " times");
+      }
+      if (verb->get_subcommands().empty()) break;
+    }
+    return wrong.what();
   }
 
   Arguments parse(std::vector<std::string> words) {
@@ -318,7 +329,8 @@ Arguments parseArguments(int argc, const char* const* argv, std::ostream& out, s
     line.app.exit(shown, out, err);
     return {};
   } catch (const CLI::ParseError& wrong) {
-    err << "mayascene: " << terminalText(wrong.what()) << "\nRun mayascene --help for how it is used.\n";
+    err << "mayascene: " << terminalText(line.complaint(wrong)) << "\nRun " << line.named().command
+        << " --help for how it is used.\n";
     Arguments arguments;
     arguments.over = ExitStatus::WrongUsage;
     return arguments;

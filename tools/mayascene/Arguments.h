@@ -77,6 +77,7 @@ struct ExportArguments {
   bool keys = false;
   bool strict = false;
   bool quiet = false;
+  std::string words;  // what was asked for, but the output and what goes with a bake: " -f csv --scale 2"
 };
 
 struct PrefsArguments {

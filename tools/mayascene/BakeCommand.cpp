@@ -64,7 +64,7 @@ ExitStatus runBake(const BakeArguments& arguments, Diagnostics& diagnostics) {
   std::vector<BakedScene> scenes;
   for (std::size_t i = 0; i < places.size(); ++i) {
     BakedScene scene = bakeTo(arguments.scenes[i], places[i], arguments, diagnostics);
-    showBake(scene, diagnostics);
+    showBake(scene, arguments.report, diagnostics);
     status = worse(status, scene.status);
     scenes.push_back(std::move(scene));
   }

@@ -31,7 +31,11 @@ std::string freeName(const fs::path& scene, const std::string& suffix, std::set<
 // The folder `output`, made where it is not there.
 ExitStatus makeFolder(const std::string& output, std::string* failure) {
   std::error_code error;
-  if (fs::exists(output, error) || output == kStandardOutput) {
+  if (output == kStandardOutput) {
+    *failure = "standard output cannot take the outputs of several scenes: name a folder";
+    return ExitStatus::WrongUsage;
+  }
+  if (fs::exists(output, error)) {
     *failure = output + " is no folder: the outputs of several scenes need one";
     return ExitStatus::WrongUsage;
   }

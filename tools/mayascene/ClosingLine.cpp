@@ -95,36 +95,40 @@ std::optional<bake::Loss> lossOf(const SceneReport& report, const scene::Scene& 
   return bake::FindLoss(scene, result.folder == nullptr ? bake::CameOver() : cameOver(*result.folder));
 }
 
-std::string commandOf(const bake::Loss& loss, const std::string& path) {
-  const char* verb = loss.comesWithAllLocators ? "import --bake --locators all " : "import --bake ";
-  return std::string("mayascene ") + verb + shellWord(path);
+std::string commandOf(const bake::Loss& loss, const std::string& path, const BakingCommand& command) {
+  const char* locators = loss.comesWithAllLocators ? " --locators all " : " ";
+  return command.before + locators + shellWord(path) + command.after;
 }
 
-void say(const SceneReport& report, Diagnostics& diagnostics) {
+// Whether there was nothing to say.
+bool say(const SceneReport& report, const BakingCommand& command, Diagnostics& diagnostics) {
   std::string failure;
   const auto text = SceneText::open(report.path, &failure);
-  if (text == nullptr) return;
+  if (text == nullptr) return true;
   diag::Collector collector(text->text());
   const scene::Scene scene = scene::Read(text->text(), collector);
   const auto loss = lossOf(report, scene, &collector);
-  if (!loss) return;
+  if (!loss) return true;
   std::string line = loss->sentence;
   if (loss->place)
     line.insert(0, "line " + std::to_string(collector.lines().At(loss->place->offset).line) + ": ");
-  if (loss->comesWithBake) line += ". To bring it over: " + commandOf(*loss, report.path);
+  if (loss->comesWithBake) line += ". To bring it over: " + commandOf(*loss, report.path, command);
   diagnostics.close(report.path, line);
+  return false;
 }
 
 }  // namespace
 
-void closeWithLoss(const SceneReport& report, bool quiet, Diagnostics& diagnostics) {
+bool closeWithLoss(const SceneReport& report, bool quiet, const BakingCommand& command,
+                   Diagnostics& diagnostics) {
   const bool stopped = report.outcome == Outcome::Failed && stopOf(report.result).has_value();
   const bool ended = report.outcome == Outcome::Imported || report.outcome == Outcome::Nothing;
-  if (!stopped && (quiet || !ended)) return;
+  if (!stopped && (quiet || !ended)) return true;
   try {
-    say(report, diagnostics);
+    return say(report, command, diagnostics);
   } catch (const std::bad_alloc&) {
     // The import is over and keeps its status: the line alone is missing.
+    return false;
   }
 }
 

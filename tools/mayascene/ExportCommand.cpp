@@ -76,13 +76,21 @@ class ExportRun {
       status = worse(status, ExitStatus::Refused);
     }
     status = worse(status, session.finish());
-    if (baked == nullptr && !arguments_.quiet) closeWithLoss(report, false, diagnostics_);
-    return status;
+    if (baked != nullptr) return status;
+    // What did not come over counts as a warning does.
+    const bool whole =
+        closeWithLoss(report, arguments_.quiet && !arguments_.strict, bakingCommand(place), diagnostics_);
+    return arguments_.strict && !whole ? worse(status, ExitStatus::Refused) : status;
   }
 
   const std::vector<BakedScene>& bakes() const { return bakes_; }
 
  private:
+  BakingCommand bakingCommand(const std::string& place) const {
+    const std::string output = place == kStandardOutput ? place : shellWord(place);
+    return {"mayascene export --bake" + arguments_.words, " -o " + output};
+  }
+
   ExitStatus writeImported(const SceneReport& report, const BakedScene* baked, const std::string& place,
                            std::int32_t linearUnits) {
     const refhost::Folder& folder = *report.result.folder;
@@ -107,7 +115,9 @@ class ExportRun {
       return ExitStatus::CannotWrite;
     }
     if (!written) return ExitStatus::Refused;
-    for (const std::string& file : files.written()) diagnostics_.remark(report.path, "written to " + file);
+    for (const std::string& file : files.written()) {
+      diagnostics_.remark(report.path, "written to " + (file == kStandardOutput ? "standard output" : file));
+    }
     const bool warned = arguments_.strict && collector.CountOf(diag::Severity::Warning) != 0;
     return warned ? ExitStatus::Refused : ExitStatus::Done;
   }

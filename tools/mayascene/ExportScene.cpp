@@ -51,11 +51,13 @@ class Describer {
       places.emplace(layer, made_.layers.size());
       betweenFrames_ = 0;
       made_.layers.push_back(layerOf(*layer));
+      if (options_.keys) reportKeys(made_.layers.back(), diagnostics);
       if (betweenFrames_ != 0) {
         diagnostics->Report(diag::Code::ExportKeysBetweenFrames, {},
                             {layer->name, std::to_string(betweenFrames_)});
       }
     }
+    if (options_.keys && !keyed_) diagnostics->Report(diag::Code::ExportNothingKeyed, {});
     for (const auto& [layer, place] : places) {
       const auto parent = places.find(layer->parent);
       if (parent != places.end()) made_.layers[place].parent = parent->second;
@@ -206,6 +208,17 @@ class Describer {
     }
   }
 
+  // Whether the list has any of the layer's keys.
+  void reportKeys(const interchange::Layer& layer, diag::Collector* diagnostics) {
+    if (layer.keys.empty()) return;
+    keyed_ = true;
+    const bool listed = std::any_of(layer.keys.begin(), layer.keys.end(),
+                                    [](const interchange::StreamKeys& list) { return !list.frames.empty(); });
+    if (listed) return;
+    diagnostics->Report(diag::Code::ExportNoKeysInFrames, {},
+                        {layer.name, numberText(options_.frames->first), numberText(options_.frames->last)});
+  }
+
   const refhost::Composition& inner_;
   const LensExtrasByCamera& extras_;
   const DescriptionOptions& options_;
@@ -214,8 +227,32 @@ class Describer {
   double offset_ = 0.0;
   double span_ = 0.0;
   std::size_t betweenFrames_ = 0;
+  bool keyed_ = false;  // a layer has keys, in the list or not
   std::map<const std::vector<T_Time>*, Channel::Places> places_;
 };
+
+// "frame 3 holds", "frames 1 to 10 hold"
+std::string holdText(double first, double last) {
+  if (first == last) return "frame " + numberText(first) + " holds";
+  return "frames " + numberText(first) + " to " + numberText(last) + " hold";
+}
+
+// Frames before the first key of all layers and after the last one.
+void reportHeldFrames(const interchange::Composition& made, const SceneNumbers& numbers,
+                      diag::Collector* diagnostics) {
+  if (!numbers.firstFrame || !numbers.lastFrame) return;
+  const auto report = [&](double first, double last, const char* which, double key) {
+    diagnostics->Report(diag::Code::ExportFramesHeld, {}, {holdText(first, last), which, numberText(key)});
+  };
+  const double end = made.FrameNumber(made.frames - 1);
+  // How many of the frames lie before the first key, and how many up to the last one.
+  const double before = std::ceil(*numbers.firstFrame - made.firstFrame - kFrameTolerance);
+  const double kept = std::floor(*numbers.lastFrame - made.firstFrame + kFrameTolerance) + 1.0;
+  if (before > 0.0)
+    report(made.firstFrame, std::min(made.firstFrame + before - 1.0, end), "first", *numbers.firstFrame);
+  if (kept < static_cast<double>(made.frames))
+    report(made.firstFrame + std::max(kept, 0.0), end, "last", *numbers.lastFrame);
+}
 
 }  // namespace
 
@@ -237,11 +274,13 @@ std::optional<interchange::Composition> describe(const refhost::Folder& folder, 
   made.firstFrame = options.frames ? options.frames->first : start;
   const double last = options.frames ? options.frames->last : numbers.lastFrame.value_or(start);
   const double frames = std::floor(last - made.firstFrame + kFrameTolerance) + 1.0;
-  if (!(frames <= (options.frames ? kMostFrames : kMostFramesUnasked))) {
+  if (!options.keys && !(frames <= (options.frames ? kMostFrames : kMostFramesUnasked))) {
     diagnostics->Report(diag::Code::ExportTooManyFrames, {}, {numberText(made.firstFrame), numberText(last)});
     return std::nullopt;
   }
   made.frames = options.keys ? 1 : std::max<std::size_t>(1, static_cast<std::size_t>(std::max(frames, 1.0)));
+
+  if (options.frames && !options.keys) reportHeldFrames(made, numbers, diagnostics);
 
   const double unitsPerPoint = linearUnits == 0 ? 1.0 : 1.0 / check::PointsPerUnit(numbers.linearUnit);
   Describer(inner, numbers.lenses, options, unitsPerPoint, &made)

@@ -10,6 +10,7 @@
 #include "export/Format.h"
 #include "export/SafeNames.h"
 #include "tools/mayascene/HostWords.h"
+#include "tools/mayascene/OutputFile.h"
 
 namespace mayascene {
 namespace {
@@ -58,6 +59,23 @@ void checkEnding(const ExportArguments& arguments) {
                                              " does, and -f says " + std::string(arguments.format->name));
 }
 
+// The options of the command, as they are typed again; their values are words or numbers.
+std::string wordsOf(const ExportWords& words, const ExportArguments& arguments) {
+  std::string all;
+  const auto say = [&all](const char* option, const std::string& value) {
+    if (value.empty()) return;
+    // A value that begins with a minus would be taken for an option.
+    all += option + std::string(value.front() == '-' ? "=" : " ") + value;
+  };
+  say(" -f", words.format);
+  say(" --frames", words.bake.frames);
+  say(" --scale", words.scale);
+  say(" --axes", words.axes);
+  if (arguments.keys) all += " --keys";
+  if (arguments.strict) all += " --strict";
+  return all;
+}
+
 // What a format does not take. Of no format: the output has no suffix that names one.
 void checkFormat(const ExportArguments& arguments) {
   const interchange::Format* format = arguments.format;
@@ -67,6 +85,10 @@ void checkFormat(const ExportArguments& arguments) {
                                arguments.output + " ends as none of the formats does; name one with -f");
   }
   const std::string name(format->name);
+  if (arguments.output == kStandardOutput && format->severalFiles) {
+    throw CLI::ValidationError("--output",
+                               name + " is several files, and standard output takes one: take glb");
+  }
   if (format->ownAxes && arguments.axes == interchange::Axes::Host) {
     throw CLI::ValidationError("--axes", name + " has axes of its own, which are those of the scene");
   }
@@ -116,6 +138,7 @@ void translateExportWords(const CLI::App& verb, const ExportWords& words, Export
   if (!words.bake.frames.empty()) arguments->frames = framesOf(words.bake.frames);
   if (words.bakes) translateBakeWords(words.bake, &arguments->bake.emplace());
   arguments->strict = words.bake.strict;
+  arguments->words = wordsOf(words, *arguments);
   checkEnding(*arguments);
   checkFormat(*arguments);
 }

@@ -115,7 +115,7 @@ ExitStatus runImport(const ImportArguments& arguments, Diagnostics& diagnostics)
   status = worse(status, outputs.commit(diagnostics));
   // Last, when what was asked for is there.
   if (arguments.bake) return status;
-  for (const SceneReport& scene : run.scenes) closeWithLoss(scene, arguments.quiet, diagnostics);
+  for (const SceneReport& scene : run.scenes) (void)closeWithLoss(scene, arguments.quiet, {}, diagnostics);
   return status;
 }
 

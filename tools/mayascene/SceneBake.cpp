@@ -7,6 +7,7 @@
 #include "diag/Codes.h"
 #include "scene/Scene.h"
 #include "text/Numbers.h"
+#include "tools/mayascene/Quantities.h"
 #include "tools/mayascene/SceneFile.h"
 #include "tools/mayascene/SceneNumbers.h"
 #include "tools/mayascene/SceneText.h"
@@ -85,7 +86,7 @@ bool isWorthKeeping(const BakedScene& scene, const bake::Options& options) {
                      [](const bake::CameraReport& camera) { return camera.written; });
 }
 
-void showBake(const BakedScene& scene, Diagnostics& diagnostics) {
+void showBake(const BakedScene& scene, const std::string& report, Diagnostics& diagnostics) {
   std::map<diag::Code, int> shown;
   std::uint64_t left = scene.errors + scene.warnings;
   for (const diag::Diagnostic& one : scene.diagnostics) {
@@ -94,8 +95,9 @@ void showBake(const BakedScene& scene, Diagnostics& diagnostics) {
     diagnostics.show(scene.path, one);
     --left;
   }
-  if (left != 0) diagnostics.remark(scene.path, std::to_string(left) + " more of these, see --report");
-  if (scene.notes != 0) diagnostics.remark(scene.path, std::to_string(scene.notes) + " notes, see --report");
+  const std::string where = report.empty() ? ": add --report FILE to see all" : ": all are in " + report;
+  if (left != 0) diagnostics.remark(scene.path, std::to_string(left) + " more of these" + where);
+  if (scene.notes != 0) diagnostics.remark(scene.path, countText(scene.notes, "note") + where);
   if (!scene.report.frames) return;
   for (const bake::CameraReport& camera : scene.report.cameras) {
     diagnostics.remark(scene.path, describe(camera, *scene.report.frames));

@@ -38,7 +38,8 @@ BakedScene bakeScene(const std::string& path, const BakeArguments& arguments, Di
 // Whether the bake holds what was asked for: it has frames, and one of the cameras where some are named.
 bool isWorthKeeping(const BakedScene& scene, const bake::Options& options);
 
-// On standard error: a line a camera, errors and warnings, and how many notes there are.
-void showBake(const BakedScene& scene, Diagnostics& diagnostics);
+// On standard error: a line a camera, errors and warnings, and how many notes there are. `report` is the file
+// that holds them all, empty where there is none.
+void showBake(const BakedScene& scene, const std::string& report, Diagnostics& diagnostics);
 
 }  // namespace mayascene

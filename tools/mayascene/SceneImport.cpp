@@ -62,7 +62,7 @@ SceneReport importBaked(const std::string& path, const BakeArguments& arguments,
   const auto bake = TemporaryBake::make(std::filesystem::path(path).filename().string(), &failure);
   if (bake != nullptr) {
     *baked = bakeScene(path, arguments, diagnostics, bake->stream());
-    showBake(*baked, diagnostics);
+    showBake(*baked, arguments.report, diagnostics);
   }
   if (bake == nullptr || !bake->finish(&failure)) {
     diagnostics.complain(path, failure);
