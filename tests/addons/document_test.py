@@ -45,6 +45,14 @@ class Documents(unittest.TestCase):
         self.assertEqual(document.read(failed)[0].complaints,
                          ["Error reading Maya file.", "error 7, line 12"])
 
+    def test_a_reason_that_is_said_twice_is_given_once(self):
+        remarks = [("error", "mayascene: a.ma: message: no keys"),
+                   ("error", "mayascene: a.ma: left behind: a file"),
+                   ("warning", "the film offset is lost")]
+        self.assertEqual(
+            document.reasons(["no keys"], remarks),
+            ["no keys", "mayascene: a.ma: left behind: a file"])
+
     def test_a_parent_may_stand_after_its_child(self):
         camera, null = picture_of(compositions.composition(1, [
             compositions.layer(5, "camera", "eye", parent=7),

@@ -58,7 +58,31 @@ class Runs(unittest.TestCase):
         tool = self.tool_that_says(5, "no space is left")
         done = runner.run(tool, "a.ma", True)
         self.assertEqual((done.remarks, done.status),
-                         ([("warning", "no space is left")], 5))
+                         ([("error", "no space is left")], 5))
+
+    def test_a_bake_whose_report_is_cut_short_has_its_lines(self):
+        tool = self.tool_that_says(0, "a remark",
+                                   "echo '{\"scenes\": [' > \"$8\"")
+        self.assertEqual(runner.run(tool, "a.ma", True).remarks,
+                         [("warning", "a remark")])
+
+    def test_a_failure_with_a_report_has_each_of_both_once(self):
+        report = json.dumps({"scenes": [{"diagnostics": [
+            {"code": "MA0502", "severity": "warning", "line": 130,
+             "sentence": "the film offset is lost"}]}]})
+        tool = self.tool_that_says(
+            1, "a.ma:130:2: warning: the film offset is lost [MA0502]\n"
+            "help: set it by hand\n"
+            "mayascene: a.ma: left behind: a file\n"
+            "a.ma:7:1: error: the film is lost [MA0501]\n"
+            "help: find it",
+            f"echo '{report}' > \"$8\"")
+        self.assertEqual(
+            runner.run(tool, "a.ma", True).remarks,
+            [("error", "mayascene: a.ma: left behind: a file"),
+             ("error", "a.ma:7:1: error: the film is lost [MA0501]"),
+             ("error", "help: find it"),
+             ("warning", "line 130: the film offset is lost [MA0502]")])
 
     def test_no_document_is_a_failure_with_its_words(self):
         with self.assertRaisesRegex(runner.ToolFailed, "no such module"):
@@ -66,6 +90,10 @@ class Runs(unittest.TestCase):
                        "a.ma", True)
         with self.assertRaisesRegex(runner.ToolFailed, "status 7"):
             runner.run(self.tool("exit 7\n"), "a.ma", True)
+
+    def test_a_tool_that_is_stopped_is_a_failure_that_says_so(self):
+        with self.assertRaisesRegex(runner.ToolFailed, "ended by signal 15"):
+            runner.run(self.tool("kill -TERM $$\n"), "a.ma", True)
 
     def test_a_tool_that_cannot_be_started_is_named(self):
         with self.assertRaisesRegex(runner.ToolFailed, "nowhere/mayascene"):

@@ -76,10 +76,11 @@ class ImportMayaScene(bpy.types.Operator, ImportHelper):
             raise CannotImport(f"{tool} gave {len(scenes)} scenes")
         scene = scenes[0]
         if scene.outcome != "imported":
-            said = [text for kind, text in run.remarks if kind == "error"]
-            why = scene.complaints + said
+            why = document.reasons(scene.complaints, run.remarks)
+            more = [f"and {len(why) - _SHOWN} more"] * (len(why) > _SHOWN)
             raise CannotImport("\n".join(
-                [_OUTCOMES.get(scene.outcome, scene.outcome)] + why[:_SHOWN]))
+                [_OUTCOMES.get(scene.outcome, scene.outcome)]
+                + why[:_SHOWN] + more))
         self._say(run.remarks
                   + [("warning", text) for text in scene.complaints])
         return scene

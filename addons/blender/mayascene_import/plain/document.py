@@ -182,6 +182,14 @@ def _scene(scene):
                  scene.get("linearUnit"), pictures)
 
 
+def reasons(complaints, remarks):
+    """Why a scene does not come over: what the document says, and errors
+    that say something else."""
+    said = [text for kind, text in remarks if kind == "error"
+            and not any(complaint in text for complaint in complaints)]
+    return complaints + said
+
+
 def read(document):
     """The scenes of a document that json.loads() gave."""
     if not isinstance(document, dict) or document.get("format") != FORMAT:

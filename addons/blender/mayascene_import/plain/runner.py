@@ -49,22 +49,38 @@ def command(tool, scene, bake, report):
     return words + [os.path.abspath(scene)]
 
 
-def _report_remarks(path):
+def _diagnostics(path):
+    """Those of the report; None where it cannot be read."""
     try:
         with open(path, encoding="utf-8") as file:
             report = json.load(file)
-        scenes = report["scenes"]
+        return [item for scene in report["scenes"]
+                for item in scene.get("diagnostics", [])]
     except (OSError, ValueError, KeyError, TypeError):
-        return []
-    return [(item["severity"],
-             f"line {item['line']}: {item['sentence']} [{item['code']}]")
-            for scene in scenes for item in scene.get("diagnostics", [])]
+        return None
 
 
-def _said(text):
-    """The tool's own lines."""
-    lines = [line.strip() for line in text.splitlines()]
-    return [("warning", line) for line in lines if line]
+def _remark(item):
+    return (item["severity"],
+            f"line {item['line']}: {item['sentence']} [{item['code']}]")
+
+
+def _said(text, diagnostics, kind):
+    """The tool's own lines, without those that the diagnostics repeat and
+    the help below each of these."""
+    known = [f": {item['sentence']} [{item['code']}]" for item in diagnostics]
+    lines, repeated = [], False
+    for line in map(str.strip, text.splitlines()):
+        if repeated and line.startswith("help: "):
+            continue
+        repeated = any(line.endswith(end) for end in known)
+        if line and not repeated:
+            lines.append((kind, line))
+    return lines
+
+
+def _ending(status):
+    return f"status {status}" if status >= 0 else f"ended by signal {-status}"
 
 
 def run(tool, scene, bake):
@@ -78,13 +94,16 @@ def run(tool, scene, bake):
         except OSError as problem:
             raise ToolFailed(f"{tool} cannot be started: "
                              f"{problem.strerror or problem}") from problem
-        remarks = _report_remarks(report)
+        diagnostics = _diagnostics(report)
     said = done.stderr.decode("utf-8", "replace")
     try:
         document = json.loads(done.stdout.decode("utf-8"))
     except ValueError as problem:
         raise ToolFailed(said.strip() or f"{tool} gave no composition, "
-                         f"status {done.returncode}") from problem
-    if not bake or (done.returncode != 0 and not remarks):
-        remarks = remarks + _said(said)
+                         + _ending(done.returncode)) from problem
+    remarks = [_remark(item) for item in diagnostics or []]
+    # After a bake that ended well the lines say what was baked.
+    if not bake or done.returncode != 0 or diagnostics is None:
+        kind = "warning" if done.returncode == 0 else "error"
+        remarks = _said(said, diagnostics or [], kind) + remarks
     return Run(document, remarks, done.returncode)
