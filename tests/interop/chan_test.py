@@ -23,7 +23,7 @@ def _film(composition, camera):
     return [size, size * composition.height / composition.width]
 
 
-def _file_of(composition, camera, path):
+def file_of(composition, camera, path):
     """Several cameras have a file each."""
     if len(composition.cameras()) == 1:
         return path
@@ -43,7 +43,7 @@ def _job(scene, path, folder):
     return {"size": [composition.width, composition.height],
             "frames": _frames(composition),
             "cameras": [{"name": names[camera.number],
-                         "file": _file_of(composition, camera, path),
+                         "file": file_of(composition, camera, path),
                          "film": _film(composition, camera)}
                         for camera in composition.cameras()],
             "output": os.path.join(folder, scene.name + ".chan.json")}

@@ -19,7 +19,7 @@ def moved(matrix, point):
             for row in matrix[:3]]
 
 
-def _about(axis, degrees):
+def about(axis, degrees):
     """The rotation about one axis of three."""
     c, s = math.cos(math.radians(degrees)), math.sin(math.radians(degrees))
     one, other = (axis + 1) % 3, (axis + 2) % 3
@@ -29,11 +29,11 @@ def _about(axis, degrees):
     return made
 
 
-def _diagonal(a, b, c):
+def diagonal(a, b, c):
     return [[a, 0, 0, 0], [0, b, 0, 0], [0, 0, c, 0], [0, 0, 0, 1]]
 
 
-def _shifted(x, y, z):
+def shifted(x, y, z):
     return [[1, 0, 0, x], [0, 1, 0, y], [0, 0, 1, z], [0, 0, 0, 1]]
 
 
@@ -54,7 +54,7 @@ def _look_at(place, interest):
     """A level camera, looking along -Z, that sees the interest ahead."""
     back = [a - b for a, b in zip(place, interest)]
     if _length(back) == 0.0:
-        return _diagonal(1, 1, 1)
+        return diagonal(1, 1, 1)
     back = _divided(back, _length(back))
     right = _cross([0, 1, 0], back)
     right = _divided(right, _length(right))
@@ -101,14 +101,14 @@ class Layer:
             return self.streams[name].at(seconds)
         x, y, z = at("position")
         turned = multiplied(multiplied(
-            _about(2, -at("zRotation")[0]), _about(1, -at("yRotation")[0])),
-            _about(0, at("xRotation")[0]))
+            about(2, -at("zRotation")[0]), about(1, -at("yRotation")[0])),
+            about(0, at("xRotation")[0]))
         if self.aimed:
             a, b, c = at("pointOfInterest")
             turned = multiplied(_look_at([x, -y, -z], [a, -b, -c]), turned)
-        sized = multiplied(turned, _diagonal(*(part / 100.0
-                                               for part in at("scale"))))
-        return multiplied(_shifted(x, -y, -z), sized)
+        sized = multiplied(turned, diagonal(*(part / 100.0
+                                              for part in at("scale"))))
+        return multiplied(shifted(x, -y, -z), sized)
 
 
 class Composition:
@@ -175,7 +175,7 @@ class Composition:
         return found
 
     def world(self, layer, frame):
-        made = _diagonal(1, 1, 1)
+        made = diagonal(1, 1, 1)
         for link in self.chain(layer):
             made = multiplied(link.local(frame / self.rate), made)
         return made

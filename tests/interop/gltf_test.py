@@ -9,7 +9,7 @@ import blender
 import browser
 import exports
 import gltf
-from comparison import compare
+from comparison import LIMIT_SINGLE, compare
 from scenes import ROOT
 
 
@@ -82,7 +82,7 @@ def lens_problems(scenes, files):
         off, count = gltf.worst_lens(scene.composition, files[scene.name])
         worst, moving = max(worst, off), moving + count
     problems = []
-    if worst > 0.05:
+    if worst > LIMIT_SINGLE:
         problems.append(f"glTF: a lens is {worst:.3g} px off at the edge")
     if moving == 0:
         problems.append("glTF: no lens moves in these scenes")

@@ -15,6 +15,7 @@ import assimp
 import blender
 import browser
 import chan_test
+import doubles_test
 import exports
 import gltf_test
 import scenes
@@ -117,6 +118,8 @@ def _usd(run):
     for scene, result in usd_test.through_three(run.exported, files,
                                                 run.folder):
         run.take(scene, through, result)
+    for scene, result in doubles_test.through_usd(run.exported, files):
+        run.take(scene, ".usda, the tests' own reader", result)
 
 
 def _chan(run):
@@ -125,12 +128,22 @@ def _chan(run):
     for scene, result in chan_test.through_blender(run.exported, files,
                                                    run.folder):
         run.take(scene, through, result)
+    for scene, result in doubles_test.through_chan(run.exported, files):
+        run.take(scene, ".chan, the tests' own reader", result)
+
+
+def _csv(run):
+    files = _exported(run, ".csv")
+    run.problems += doubles_test.csv_problems(run.exported, files)
+    for scene, result in doubles_test.through_csv(run.exported, files):
+        run.take(scene, ".csv, the tests' own reader", result)
 
 
 _FAILURES = (assimp.AssimpFailed, blender.BlenderFailed,
              exports.ExportFailed, browser.BrowserFailed, usda.NoUsda)
 
-_PARTS = {"addon": _addon, "gltf": _gltf, "usd": _usd, "chan": _chan}
+_PARTS = {"addon": _addon, "gltf": _gltf, "usd": _usd, "chan": _chan,
+          "csv": _csv}
 
 
 def main():

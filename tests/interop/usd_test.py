@@ -7,11 +7,11 @@ import blender
 import browser
 import exports
 import usda
-from comparison import compare
+from comparison import LIMIT_DOUBLE, compare
 from gltf_test import in_metres
 
 
-class _Stage:
+class Stage:
     """A file, and the prim of each layer."""
 
     def __init__(self, scene, path):
@@ -63,22 +63,26 @@ class _Stage:
                 f"{value}" for name, value in wanted.items()
                 if self.root.values.get(name) != value]
 
+    def zooms(self, camera, time):
+        """In pixels, across the picture and up."""
+        lens = self.lens(camera)
+        focal = lens.number_at("focalLength", time)
+        return [focal * size / lens.number_at(side + "Aperture", time)
+                for side, size in (("horizontal", self.composition.width),
+                                   ("vertical", self.composition.height))]
+
     def worst_lens(self):
         """By how many pixels the edge of the picture is off, at any frame.
         """
         worst = 0.0
         composition = self.composition
         for camera in composition.cameras():
-            lens = self.lens(camera)
             for frame in composition.frames():
-                time = composition.number_of(frame)
-                focal = lens.number_at("focalLength", time)
                 wanted = composition.zoom(camera, frame)
-                for side, size in (("horizontal", composition.width),
-                                   ("vertical", composition.height)):
-                    found = focal * size / lens.number_at(
-                        side + "Aperture", time)
-                    worst = max(worst, abs(found / wanted - 1) * size / 2)
+                found = self.zooms(camera, composition.number_of(frame))
+                for zoom, size in zip(found, (composition.width,
+                                              composition.height)):
+                    worst = max(worst, abs(zoom / wanted - 1) * size / 2)
         return worst
 
 
@@ -86,12 +90,12 @@ def lens_problems(scenes, files):
     """The largest difference, how many lenses move, and what is wrong."""
     worst, moving, problems = 0.0, 0, []
     for scene in scenes:
-        stage = _Stage(scene, files[scene.name])
+        stage = Stage(scene, files[scene.name])
         problems += stage.head_problems(scene)
         worst = max(worst, stage.worst_lens())
         moving += sum(scene.composition.lens_moves(camera)
                       for camera in scene.composition.cameras())
-    if worst > 0.05:
+    if worst > LIMIT_DOUBLE:
         problems.append(f"USD: a lens is {worst:.3g} px off at the edge")
     if moving == 0:
         problems.append("USD: no lens moves in these scenes")
@@ -101,7 +105,7 @@ def lens_problems(scenes, files):
 def through_three(scenes, files, folder):
     """A lens that moves is held by the reader of these tests; three shows
     one of its frames."""
-    stages = [_Stage(scene, files[scene.name]) for scene in scenes]
+    stages = [Stage(scene, files[scene.name]) for scene in scenes]
     jobs = []
     for scene, stage in zip(scenes, stages):
         composition = scene.composition

@@ -25,17 +25,28 @@ class Prim:
 
     def number_at(self, attribute, time):
         """A number of 32 bits; between two samples it moves evenly."""
+        (before, one), (after, other) = self._around(attribute, time)
+        one, other = _single(one), _single(other)
+        if before == after:
+            return one
+        return one + (other - one) * (time - before) / (after - before)
+
+    def vector_at(self, attribute, time):
+        """Doubles, at a sample."""
+        (before, one), (after, _) = self._around(attribute, time)
+        if before != after:
+            raise ValueError(f"{attribute} has no sample at {time}")
+        return one
+
+    def _around(self, attribute, time):
         samples = self.samples.get(attribute)
         if not samples:
-            return _single(self.values[attribute])
+            return [(time, self.values[attribute])] * 2
         before = max((key for key in samples if key <= time),
                      default=min(samples))
         after = min((key for key in samples if key >= time),
                     default=max(samples))
-        one, other = _single(samples[before]), _single(samples[after])
-        if before == after:
-            return one
-        return one + (other - one) * (time - before) / (after - before)
+        return (before, samples[before]), (after, samples[after])
 
 
 def _single(number):
