@@ -42,6 +42,7 @@ class VerbLimits:
     verb: str
     workload: str
     output: str | None = None  # the name of the file that it writes
+    options: tuple[str, ...] = ()
     by_import: float | None = None  # as a multiple of the plain import
     by_result: float | None = None  # as a multiple of the import of the output
     extra: float | None = None  # MB of memory beyond the file ...
@@ -64,9 +65,11 @@ VERBS = [
     VerbLimits("check", "composition", by_import=2.5),
     VerbLimits("check", "shot", by_import=2.5),
     VerbLimits("export", "composition", "exported.glb", by_import=2.5, compositions=2.0),
+    VerbLimits("export", "composition", "exported.gltf", compositions=2.0),
     VerbLimits("export", "composition", "exported.usda", compositions=2.0),
+    VerbLimits("export", "composition", "exported.chan", compositions=2.0),
     VerbLimits("export", "composition", "exported.csv", compositions=2.0),
-    VerbLimits("export", "shot", "exported.chan", compositions=2.0),
+    VerbLimits("export", "composition", "keys.csv", options=("--keys",), compositions=2.0),
 ]
 
 

@@ -23,7 +23,7 @@ def add_verb(table, limits, arguments, folder):
     commands = {"import": (measured.importing(scene),)}
     output = None
     try:
-        verb = [arguments.programs / "mayascene", limits.verb, "--quiet", scene]
+        verb = [arguments.programs / "mayascene", limits.verb, "--quiet", *limits.options, scene]
         if limits.verb != "bake":  # which asks no preference
             verb += ["--preferences", folder / "preferences"]
         if limits.output:
@@ -40,6 +40,7 @@ def add_verb(table, limits, arguments, folder):
         scene.unlink()
         if output:
             output.unlink(missing_ok=True)
+            output.with_suffix(".bin").unlink(missing_ok=True)  # the data of a .gltf
     seconds = {name: values[2] for name, values in medians.items()}
     ratio = {name: seconds["verb"] / seconds[name] for name in seconds}
     times = [f"{seconds[name]:.3f}" if name in seconds else "-" for name in ("verb", "import", "result")]

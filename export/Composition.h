@@ -69,8 +69,8 @@ struct Lens {
 struct StreamKeys {
   std::string_view stream;     // "position", …; a literal
   std::size_t components = 1;  // 1 or 3 values a key
-  std::vector<double> frames;  // the scene's own numbers, rising
-  std::vector<double> values;  // components of the first key, of the second, …
+  Channel::Places frames;      // not null: the scene's own numbers, rising; streams may share them
+  Channel values[3];           // a component each, with a value for each key
 };
 
 struct Layer {

@@ -129,12 +129,12 @@ void WriteKeys(TextWriter& out, const Composition& composition, std::size_t inde
   const Layer& layer = composition.layers[index];
   const std::string name = Cell(layer.name);
   for (const StreamKeys& stream : layer.keys) {
-    for (std::size_t key = 0; key < stream.frames.size(); ++key) {
-      const double frame = stream.frames[key];
+    for (std::size_t key = 0; key < stream.frames->size(); ++key) {
+      const double frame = (*stream.frames)[key];
       out << name << ',' << stream.stream << ',' << frame << ',' << frame / composition.framesPerSecond;
       for (std::size_t i = 0; i < 3; ++i) {
         out << ',';
-        if (i < stream.components) out << stream.values[key * stream.components + i];
+        if (i < stream.components) out << stream.values[i].at(key);
       }
       out << ',' << index + 1 << "\r\n";
     }

@@ -22,10 +22,9 @@ bool AreSound(const Channel (&channels)[3], std::size_t frames) {
 
 bool AreSound(const std::vector<StreamKeys>& keys) {
   return std::all_of(keys.begin(), keys.end(), [](const StreamKeys& stream) {
-    const auto finite = [](double value) { return std::isfinite(value); };
-    return stream.values.size() == stream.frames.size() * stream.components &&
-           std::all_of(stream.frames.begin(), stream.frames.end(), finite) &&
-           std::all_of(stream.values.begin(), stream.values.end(), finite);
+    const std::vector<double>& frames = *stream.frames;
+    return AreSound(stream.values, frames.size()) &&
+           std::all_of(frames.begin(), frames.end(), [](double frame) { return std::isfinite(frame); });
   });
 }
 

@@ -4,6 +4,7 @@
 #include <charconv>
 #include <cmath>
 #include <ctime>
+#include <memory>
 #include <string>
 #include <utility>
 #include <vector>
@@ -140,7 +141,12 @@ TEST(CsvWriter, ACameraThatIsAimedAtWhatIsAsGoodAsNowhereHasItsAngles) {
 
 TEST(CsvWriter, ARowForEachKeyOfEachStream) {
   Composition composition = OneCamera();
-  composition.layers[1].keys = {{"position", 3, {101, 103.5}, {1, 2, 3, 4, 5, 6}}, {"zoom", 1, {102}, {540}}};
+  const auto at = [](std::vector<double> frames) {
+    return std::make_shared<const std::vector<double>>(std::move(frames));
+  };
+  const auto moving = [](double first, double second) { return Channel(std::vector{first, second}); };
+  composition.layers[1].keys = {{"position", 3, at({101, 103.5}), {moving(1, 4), 5, moving(3, 6)}},
+                                {"zoom", 1, at({102}), {540}}};
   const std::vector<Row> rows = Written(composition, true);
   ASSERT_EQ(rows.size(), 4u);
   EXPECT_THAT(rows[0], ElementsAre("layer", "stream", "frame", "seconds", "x", "y", "z", "number"));

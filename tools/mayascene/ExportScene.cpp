@@ -30,6 +30,22 @@ double quotientOf(const HostRatio& ratio) {
   return static_cast<double>(ratio.numerator) / static_cast<double>(ratio.denominator);
 }
 
+// Whether all of so many values, of which there is one at least, are the same.
+bool isOne(std::size_t count, const auto& value) {
+  const double first = value(0);
+  for (std::size_t i = 1; i < count; ++i) {
+    if (value(i) != first) return false;
+  }
+  return true;
+}
+
+std::vector<double> listOf(std::size_t count, const auto& value) {
+  std::vector<double> list;
+  list.reserve(count);
+  for (std::size_t i = 0; i < count; ++i) list.push_back(value(i));
+  return list;
+}
+
 // One composition on its way into a description.
 class Describer {
  public:
@@ -123,13 +139,8 @@ class Describer {
     const auto value = [&](std::size_t key) {
       return converted(stream.id, component, from[key * dimension + component]);
     };
-    const double first = value(0);
-    std::size_t same = 1;
-    while (same < stream.keyCount() && value(same) == first) ++same;
-    if (same == stream.keyCount()) return first;
-    std::vector<double> values;
-    values.reserve(stream.keyCount());
-    for (std::size_t key = 0; key < stream.keyCount(); ++key) values.push_back(value(key));
+    if (isOne(stream.keyCount(), value)) return value(0);
+    std::vector<double> values = listOf(stream.keyCount(), value);
     const Channel::Places places = placesOf(stream.keys->times);
     if (areAllFrames(*places)) return Channel(std::move(values));
     countBetween(*places);
@@ -195,25 +206,48 @@ class Describer {
       interchange::StreamKeys list;
       list.stream = layer.kind == refhost::LayerKind::Camera ? words.cameraName : words.name;
       list.components = static_cast<std::size_t>(stream->dimension);
-      const Channel::Places places = placesOf(stream->keys->times);
-      for (std::size_t key = 0; key < places->size(); ++key) {
-        const double place = (*places)[key];
-        if (options_.frames && (place < 0.0 || made_.firstFrame + place > options_.frames->last)) continue;
-        list.frames.push_back(made_.firstFrame + place);
-        for (std::size_t i = 0; i < list.components; ++i) {
-          list.values.push_back(converted(stream->id, i, stream->keys->values[key * list.components + i]));
-        }
-      }
+      std::size_t first = 0;
+      list.frames = listedFrames(stream->keys->times, &first);
+      for (std::size_t i = 0; i < list.components; ++i)
+        list.values[i] = listedValues(*stream, i, first, list.frames->size());
       lists->push_back(std::move(list));
     }
+  }
+
+  // The frames of the keys that are asked for, in the scene's own numbers, and which key is the first.
+  Channel::Places listedFrames(const refhost::KeyTimes& times, std::size_t* first) {
+    const Channel::Places places = placesOf(times);
+    auto begin = places->begin(), end = places->end();
+    if (options_.frames) {
+      begin = std::lower_bound(begin, end, 0.0);
+      end = std::upper_bound(begin, end, options_.frames->last - made_.firstFrame);
+    }
+    *first = static_cast<std::size_t>(begin - places->begin());
+    const std::vector<T_Time>& row = times;
+    Channel::Places& listed = listed_[&row];
+    if (listed) return listed;
+    std::vector<double> frames(begin, end);
+    for (double& frame : frames) frame += made_.firstFrame;
+    return listed = std::make_shared<const std::vector<double>>(std::move(frames));
+  }
+
+  Channel listedValues(const refhost::Stream& stream, std::size_t component, std::size_t first,
+                       std::size_t count) const {
+    const auto dimension = static_cast<std::size_t>(stream.dimension);
+    const auto value = [&](std::size_t key) {
+      return converted(stream.id, component, stream.keys->values[(first + key) * dimension + component]);
+    };
+    if (count == 0) return {};
+    return isOne(count, value) ? Channel(value(0)) : Channel(listOf(count, value));
   }
 
   // Whether the list has any of the layer's keys.
   void reportKeys(const interchange::Layer& layer, diag::Collector* diagnostics) {
     if (layer.keys.empty()) return;
     keyed_ = true;
-    const bool listed = std::any_of(layer.keys.begin(), layer.keys.end(),
-                                    [](const interchange::StreamKeys& list) { return !list.frames.empty(); });
+    const bool listed =
+        std::any_of(layer.keys.begin(), layer.keys.end(),
+                    [](const interchange::StreamKeys& list) { return !list.frames->empty(); });
     if (listed) return;
     diagnostics->Report(diag::Code::ExportNoKeysInFrames, {},
                         {layer.name, numberText(options_.frames->first), numberText(options_.frames->last)});
@@ -229,6 +263,7 @@ class Describer {
   std::size_t betweenFrames_ = 0;
   bool keyed_ = false;  // a layer has keys, in the list or not
   std::map<const std::vector<T_Time>*, Channel::Places> places_;
+  std::map<const std::vector<T_Time>*, Channel::Places> listed_;
 };
 
 // "frame 3 holds", "frames 1 to 10 hold"
