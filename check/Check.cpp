@@ -79,11 +79,51 @@ void Gather(std::string_view text, const Options& options, diag::Collector* coll
   }
 }
 
-void CheckScene(std::string_view text, const CameOver& cameOver, const Options& options,
-                diag::Collector* collector, Head* head) {
+void ReportStop(std::string_view text, const CameOver& cameOver, diag::Collector* collector) {
+  switch (cameOver.stop) {
+    case Stop::None:
+    case Stop::UnequalKeys:
+    case Stop::NotAScene:  // nothing is read then
+      return;
+    case Stop::Other:
+      return ReportOtherStop(text, cameOver, collector);
+    default:
+      return ReportStopInText(text, cameOver, collector);
+  }
+}
+
+std::size_t FullPerCode(const Options& options) {
+  return options.all ? std::numeric_limits<std::size_t>::max() : diag::Collector::kFullPerCode;
+}
+
+}  // namespace
+
+struct Reading::Parts {
+  Parts(std::string_view sceneText, Options given)
+      : text(sceneText),
+        options(std::move(given)),
+        collector(text, FullPerCode(options)),
+        scene(scene::Read(text, collector, &notes)),
+        settings(scene::ReadSettings(scene, collector)) {}
+
+  std::string_view text;
+  Options options;
+  diag::Collector collector;
   std::vector<scene::NodeNote> notes;
-  const scene::Scene scene = scene::Read(text, *collector, &notes);
-  const scene::Settings settings = scene::ReadSettings(scene, *collector);
+  scene::Scene scene;
+  scene::Settings settings;
+};
+
+Reading::Reading(std::string_view text, Options options)
+    : parts_(std::make_unique<Parts>(text, std::move(options))) {}
+Reading::Reading(Reading&&) noexcept = default;
+Reading::~Reading() = default;
+
+namespace {
+
+void RunRules(const CameOver& cameOver, const Options& options, const scene::Scene& scene,
+              const scene::Settings& settings, const std::vector<scene::NodeNote>& notes,
+              diag::Collector* collector, Head* head) {
   const std::vector<Camera> cameras = FindCameras(scene, cameOver);
   const motion::Measures measures = motion::MeasuresOf(scene);
   *head = ReadHead({scene, settings, measures, cameOver, cameras, collector->lines(), options.all});
@@ -110,24 +150,21 @@ void CheckScene(std::string_view text, const CameOver& cameOver, const Options& 
 
 }  // namespace
 
-Report Check(std::string_view text, const CameOver& cameOver, const Options& options) {
-  constexpr std::size_t kAll = std::numeric_limits<std::size_t>::max();
-  diag::Collector collector(text, options.all ? kAll : diag::Collector::kFullPerCode);
+Report Check(Reading reading, const CameOver& cameOver) {
+  Reading::Parts& parts = *reading.parts_;
+  if (cameOver.stop == Stop::NotAScene) return Check(parts.text, cameOver, parts.options);
   Report report;
-  switch (cameOver.stop) {
-    case Stop::NotAScene:
-      ReportFileKind(text, &collector);
-      break;
-    case Stop::None:
-    case Stop::UnequalKeys:
-      break;
-    case Stop::Other:
-      ReportOtherStop(text, cameOver, &collector);
-      break;
-    default:
-      ReportStopInText(text, cameOver, &collector);
-  }
-  if (cameOver.stop != Stop::NotAScene) CheckScene(text, cameOver, options, &collector, &report.head);
+  ReportStop(parts.text, cameOver, &parts.collector);
+  RunRules(cameOver, parts.options, parts.scene, parts.settings, parts.notes, &parts.collector, &report.head);
+  Gather(parts.text, parts.options, &parts.collector, &report);
+  return report;
+}
+
+Report Check(std::string_view text, const CameOver& cameOver, const Options& options) {
+  if (cameOver.stop != Stop::NotAScene) return Check(Reading(text, options), cameOver);
+  diag::Collector collector(text, FullPerCode(options));
+  Report report;
+  ReportFileKind(text, &collector);
   Gather(text, options, &collector, &report);
   return report;
 }

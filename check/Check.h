@@ -7,6 +7,7 @@
 
 #include <cstdint>
 #include <map>
+#include <memory>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -38,7 +39,25 @@ struct Report {
   std::uint64_t notes = 0;
 };
 
+// A scene that is read without knowing what came over: while the import runs, in a thread of its own, or
+// after it. The text must outlive it.
+class Reading {
+ public:
+  explicit Reading(std::string_view text, Options options = {});
+  Reading(Reading&&) noexcept;
+  ~Reading();
+
+ private:
+  friend Report Check(Reading reading, const CameOver& cameOver);
+  struct Parts;
+  std::unique_ptr<Parts> parts_;
+};
+
 // Takes any bytes. Time and memory grow with the text, what came over, and the frames that are looked at.
+// With an import that saw no scene the reading is of no use, and is not looked at.
+Report Check(Reading reading, const CameOver& cameOver);
+
+// The same in one step.
 Report Check(std::string_view text, const CameOver& cameOver, const Options& options = {});
 
 }  // namespace check

@@ -29,6 +29,22 @@ TEST_F(CheckCommand, ReportsWhatCameOver) {
   EXPECT_THAT(check.err, IsEmpty());
 }
 
+// With a processor free for it the scene is read while it is imported; what is no scene is not read at all.
+TEST_F(CheckCommand, TheReportIsTheSameWithOneProcessorAndWithMore) {
+  write("crane.ma", sceneText(craneCamera()));
+  write("cut.ma", sceneText(std::string(craneCamera()) + "setAttr \".t"));
+  write("other.ma", "//Maya is not all of a header\n");
+  write("packed.ma", "\x1f\x8b");
+  for (const char* const scene : {"crane.ma", "cut.ma", "other.ma", "packed.ma"}) {
+    const ToolResult one = run({"check", "--jobs", "1", scene});
+    const ToolResult more = run({"check", "--jobs", "2", scene});
+    EXPECT_EQ(one.status, more.status) << scene;
+    EXPECT_EQ(one.out, more.out);
+    EXPECT_EQ(one.err, more.err);
+    EXPECT_THAT(one.out, StartsWith(scene));
+  }
+}
+
 TEST_F(CheckCommand, SaysWhereEachSettingStandsOrThatItIsTheDefault) {
   write("still.ma", "//Maya ASCII 2018 scene\ncurrentUnit -l centimeter -a degree -t pal;\n");
   const std::string out = run({"check", "still.ma"}).out;

@@ -130,6 +130,7 @@ TEST_F(UnfinishedCheck, IsShownWithoutAHead) {
 // What the tool says to itself means what was said to it.
 TEST(ChildWords, GiveTheChildTheArgumentsOfTheRun) {
   CheckArguments asked;
+  asked.twoThreads = true;
   asked.options.all = true;
   asked.options.only = {diag::Code::OpenString, diag::Code::CheckTimedOut};
   asked.strict = true;
@@ -147,6 +148,7 @@ TEST(ChildWords, GiveTheChildTheArgumentsOfTheRun) {
   ASSERT_TRUE(arguments.check) << err.str();
   const CheckArguments& child = *arguments.check;
   EXPECT_TRUE(child.child);
+  EXPECT_TRUE(child.twoThreads);
   EXPECT_THAT(child.scenes, ElementsAre("-q"));
   EXPECT_TRUE(child.options.all);
   EXPECT_THAT(child.options.only, ElementsAre(diag::Code::OpenString, diag::Code::CheckTimedOut));

@@ -208,6 +208,7 @@ struct CommandLine {
   // What the tool says to itself: no help shows it.
   void addChildOptions() {
     checkVerb->add_flag("--child", check.child)->group("");
+    checkVerb->add_flag("--two-threads", check.twoThreads)->group("");
     checkVerb->add_flag("--colour-report", check.colourReport)->group("");
     checkVerb->add_flag("--colour-complaints", check.colourComplaints)->group("");
   }

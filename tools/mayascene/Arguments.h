@@ -61,6 +61,7 @@ struct CheckArguments {
   double timeout = 60.0;            // seconds for each scene
   // Of a run that is the child of another one, and checks a single scene for it.
   bool child = false;
+  bool twoThreads = false;    // a processor is free: the scene is read while it is imported
   bool colourReport = false;  // the parent shows them on a terminal
   bool colourComplaints = false;
 };

@@ -43,7 +43,7 @@ ExitStatus runCheckChild(const CheckArguments& arguments, Diagnostics& diagnosti
   HostSession session(arguments.host, refhost::Callback::Import, nullptr, diagnostics);
   const ExitStatus started = session.start();
   if (started > ExitStatus::Refused) return started;
-  CheckedScene scene = checkScene(arguments.scenes.front(), arguments.options, session, diagnostics);
+  CheckedScene scene = checkScene(arguments.scenes.front(), arguments, session, diagnostics);
   if (arguments.strict && scene.report.warnings != 0) scene.status = worse(scene.status, ExitStatus::Refused);
   scene.status = worse(worse(scene.status, started), session.finish());
   handOver(std::cout, resultOf(scene, arguments));
@@ -55,6 +55,7 @@ std::vector<std::string> childWords(const CheckArguments& arguments, const std::
   const auto flag = [&words](bool wanted, const char* name) {
     if (wanted) words.emplace_back(name);
   };
+  flag(arguments.twoThreads, "--two-threads");
   flag(arguments.options.all, "--all");
   flag(arguments.strict, "--strict");
   flag(arguments.quiet, "--quiet");
@@ -100,7 +101,9 @@ ExitStatus checkInChildren(const CheckArguments& arguments, const std::vector<st
     show(scene, end.err, result);
     return !noModule;
   };
-  const auto command = [&](std::size_t number) { return childWords(arguments, scenes.at(number)); };
+  CheckArguments each = arguments;
+  each.twoThreads = limits.jobs > scenes.size();
+  const auto command = [&](std::size_t number) { return childWords(each, scenes.at(number)); };
   ProcessPool(limits).run(scenes.size(), command, take, watch);
   return noModule ? ExitStatus::NoModule : status;
 }

@@ -4,6 +4,7 @@
 #include <string>
 
 #include "check/Check.h"
+#include "tools/mayascene/Arguments.h"
 #include "tools/mayascene/Diagnostics.h"
 #include "tools/mayascene/ExitStatus.h"
 #include "tools/mayascene/HostSession.h"
@@ -20,7 +21,7 @@ struct CheckedScene {
 
 // Imports the scene and reports what became of it. Complains of a file that cannot be read, and of what the
 // import left behind.
-CheckedScene checkScene(const std::string& path, const check::Options& options, HostSession& session,
+CheckedScene checkScene(const std::string& path, const CheckArguments& arguments, HostSession& session,
                         Diagnostics& diagnostics);
 
 }  // namespace mayascene
