@@ -289,7 +289,7 @@ TEST_F(ExportCommandTest, WhatCannotBeExportedLeavesNoFile) {
   EXPECT_EQ(run({"export", "notes.ma", "-o", "x.csv"}).status, 1);
   const auto still = run({"export", "persp.ma", "-o", "x.csv"});
   EXPECT_EQ(still.status, 1);
-  EXPECT_THAT(still.err, HasSubstr("persp.ma: nothing is written: it has no camera"));
+  EXPECT_THAT(still.err, HasSubstr("persp.ma: nothing is written: it has no camera and no null\n"));
   EXPECT_EQ(run({"export", "missing.ma", "-o", "x.csv"}).status, 3);
   EXPECT_EQ(run({"export", "empty.ma", "-o", "no/such/x.csv"}).status, 1);
   EXPECT_THAT(files(), ElementsAre("empty.ma", "notes.ma", "persp.ma"));

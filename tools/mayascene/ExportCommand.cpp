@@ -72,7 +72,7 @@ class ExportRun {
     if (imported && !report.result.folder->compositions.front()->layers.empty()) {
       status = worse(status, writeImported(report, baked, place, session.host().linearUnits()));
     } else if (imported || report.outcome == Outcome::Nothing) {
-      diagnostics_.complain(path, "nothing is written: it has no camera");
+      diagnostics_.complain(path, "nothing is written: it has no camera and no null");
       status = worse(status, ExitStatus::Refused);
     }
     status = worse(status, session.finish());
