@@ -9,14 +9,15 @@
  * the callbacks and the death hook one after the other. A plug-in calls operations only while one of these
  * runs, and no operation calls back into a plug-in.
  *
- * Failures. An operation that returns a code other than 0 did nothing. Whatever the caller held it holds as
- * before, also what the call was to end: that can be ended again, or is still held when the callback returns.
- * What the call was to hand out is as it was, or null or 0, unless the operation says otherwise, and the
- * caller owns nothing of it. Any operation may be called afterwards, the same one too. A handle that is null
- * although the code is 0 is no object.
+ * Failures. An operation that returns a code other than 0 did nothing. The caller still holds all that it
+ * held before, also what the call should have ended: it can end that again, or still hold it when the
+ * callback returns. What the call should have handed out is unchanged, or null or 0, unless the operation
+ * says otherwise; the caller owns nothing of it. Any operation may be called next, the same one too. A handle
+ * that is null although the code is 0 is no object.
  *
- * "Codes" at an operation are those that the embedded host gives it of its own accord. One that is permissive
- * gives none for sizes, ratios, times and values. A rehearsal can give any other, and so can another host.
+ * "Codes" at an operation are those that the embedded host returns by itself. A permissive one returns none
+ * for sizes, ratios, times and values. A rehearsal can make it return any other code, and so can another
+ * host.
  *
  * Exceptions. Operations are plain function pointers: an exception may come in through one, but none leaves
  * the entry, a callback or the death hook. What a call that threw has done is unknown; its caller treats it

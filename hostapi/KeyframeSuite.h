@@ -16,7 +16,7 @@ extern "C" {
 #define QZGP_KEYFRAME_SUITE_3 3
 #define QZGP_KEYFRAME_SUITE_4 4
 
-/* The one time mode in use: key times are times of the composition. */
+/* The only time mode: key times are times of the composition. */
 #define HOST_TIME_MODE_COMP 0
 
 typedef struct QZGP_KeyframeSuite3 {

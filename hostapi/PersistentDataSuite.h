@@ -14,8 +14,8 @@ extern "C" {
 #define QZGP_PERSISTENT_DATA_SUITE "QZGP Persistent Data Suite"
 #define QZGP_PERSISTENT_DATA_SUITE_3 3
 
-/* The importer's one preference: where it stands in the store. 0 takes distances as they stand in the scene,
- * anything else converts them from the scene's linear unit. */
+/* The section and the key of the importer's one preference. 0 takes distances as they stand in the scene, any
+ * other value converts them from the scene's linear unit. */
 #define HOST_PREF_SECTION "Maya Camera"
 #define HOST_PREF_LINEAR_UNITS "Use Linear Units"
 

@@ -20,7 +20,7 @@ typedef HostError (*HostDeathHook)(intptr_t refcon);
 typedef struct QZGP_RegisterSuite6 {
   void (*reserved0[2])(void);
 
-  /* Slot 2. Registers the hook. The reference value is handed to it unread.
+  /* Slot 2. Registers the hook. The host passes the reference value to it unchanged.
    * Codes: HOST_ERR_BAD_POINTER, HOST_ERR_BAD_PLUGIN_ID. */
   HostError (*RegisterDeathHook)(int32_t pluginId, HostDeathHook hook, intptr_t refcon);
 } QZGP_RegisterSuite6;

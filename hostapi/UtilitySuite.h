@@ -31,8 +31,8 @@ typedef struct QZGP_UtilitySuite7 {
    * Codes: HOST_ERR_BAD_POINTER. */
   HostError (*BeginSilentErrors)(HostSilentErrorState* state);
 
-  /* Slot 4. Ends the span that began with this state record. With report not 0 the errors kept back are
-   * shown now, with 0 they are dropped.
+  /* Slot 4. Ends the span that began with this state record. With report 0 the errors of the span are
+   * dropped, with any other value they are shown now.
    * Codes: HOST_ERR_BAD_POINTER, HOST_ERR_SILENT_ERRORS. */
   HostError (*EndSilentErrors)(int32_t report, HostSilentErrorState* state);
 } QZGP_UtilitySuite7;

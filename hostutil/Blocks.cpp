@@ -1,7 +1,7 @@
-// Blocks of memory that grow. Small ones are the allocator's. Large ones are made of whole large pages,
-// because most of the time that a fresh block takes goes into its page faults; and they grow by taking their
-// pages along, so that nothing is copied. A block that is moved to where its large pages would not lie on
-// their boundaries would fall apart into small ones.
+// Blocks of memory that grow. Small ones come from the allocator. Large ones are made of whole large pages,
+// because page faults take most of the time that a fresh block needs. They grow by moving their pages to a
+// larger range of addresses, so that nothing is copied. The range begins on the boundary of a large page:
+// elsewhere the system would split the large pages into small ones.
 #include "hostutil/BlocksInternal.h"
 
 #include <sys/mman.h>
@@ -16,26 +16,24 @@ namespace hostutil {
 namespace {
 
 constexpr std::int64_t kLargeBlock = std::int64_t{4} << 20;
-constexpr std::int64_t kLargePage = std::int64_t{2} << 20;
+constexpr std::size_t kLargePage = std::size_t{2} << 20;
 
 bool IsLarge(std::int64_t size) { return size >= kLargeBlock; }
 
 std::size_t WholePages(std::int64_t size) {
-  constexpr auto page = static_cast<std::size_t>(kLargePage);
-  return (static_cast<std::size_t>(size) + page - 1) / page * page;
+  return (static_cast<std::size_t>(size) + kLargePage - 1) / kLargePage * kLargePage;
 }
 
 // Addresses for `size` bytes from the boundary of a large page on; null when there are none.
 char* ReservePages(std::size_t size) {
-  constexpr auto page = static_cast<std::size_t>(kLargePage);
-  if (size > PTRDIFF_MAX - page) return nullptr;
+  if (size > PTRDIFF_MAX - kLargePage) return nullptr;
   void* const reserved =
-      mmap(nullptr, size + page, PROT_READ | PROT_WRITE, MAP_PRIVATE | MAP_ANONYMOUS, -1, 0);
+      mmap(nullptr, size + kLargePage, PROT_READ | PROT_WRITE, MAP_PRIVATE | MAP_ANONYMOUS, -1, 0);
   if (reserved == MAP_FAILED) return nullptr;
   auto* const first = static_cast<char*>(reserved);
-  const std::size_t before = (page - reinterpret_cast<std::uintptr_t>(first) % page) % page;
+  const std::size_t before = (kLargePage - reinterpret_cast<std::uintptr_t>(first) % kLargePage) % kLargePage;
   if (before != 0) munmap(first, before);
-  munmap(first + before + size, page - before);
+  munmap(first + before + size, kLargePage - before);
   return first + before;
 }
 

@@ -5,8 +5,9 @@
 
 namespace hostutil {
 
-// The block with room for newSize bytes, more than it had; may lie elsewhere. Null when there is no memory:
-// the block then stays. A null block of size 0 makes a new one. What was in it is kept, the rest is not set.
+// Gives the block room for newSize bytes, more than it had, and returns its address, which may be another.
+// Null when there is no memory: the block then stays as it is. A null block of size 0 makes a new one. The
+// contents are kept; what is added is not set.
 void* GrowBlock(void* block, std::int64_t size, std::int64_t newSize);
 
 // Ends a block of that size; null is accepted.

@@ -6,8 +6,8 @@
 
 namespace hostutil {
 
-// Takes pieces and writes those that fit whole, with room for a NUL; the first that does not fit ends the
-// writing. What all of them would have needed is counted on.
+// Appends pieces, as long as they fit whole with a NUL after them. From the first piece on that does not fit,
+// nothing more is written; the size that all of them need is still counted.
 template <typename Unit>
 class BoundedText {
  public:

@@ -1,4 +1,4 @@
-/* Which symbols the utility library shows. */
+/* Marks the functions that the utility library exports. */
 #ifndef HOSTUTIL_EXPORT_H
 #define HOSTUTIL_EXPORT_H
 

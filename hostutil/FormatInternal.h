@@ -3,9 +3,9 @@
 
 namespace hostutil {
 
-// Walks the pattern once, from left to right: calls argument(0) or argument(1) for a marker and literal(text)
-// for each other place, where text points at what is left of the pattern; it returns how many bytes it took.
-// What an argument holds is never looked at.
+// Walks the pattern once, from left to right. Calls argument(0) or argument(1) for a marker. For anything
+// else it calls literal(text) with what is left of the pattern; that returns how many bytes it took, 1 or
+// more. Markers inside an argument are not replaced.
 template <typename Literal, typename Argument>
 void WalkPattern(const char* pattern, Literal literal, Argument argument) {
   constexpr int kMarkerLength = 3;

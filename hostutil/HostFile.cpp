@@ -26,7 +26,7 @@ constexpr int kClosed = -1;
 constexpr std::int64_t kLargestSize = INT32_MAX;
 constexpr HostUTF16Unit kSlash = '/';
 
-// By which a handle is known to be a file of this library.
+// All files that this library made and that are not disposed of: any other handle is refused.
 std::unordered_set<const HostFile*> liveFiles;
 
 }  // namespace
@@ -170,8 +170,8 @@ HostError HostFileName(HostFile* file, UTF16String** name) {
 }
 
 HostError HostFileDispose(HostFile* file) {
-  // The mark stands until the release has gone through, so that a rehearsed failure, returned or thrown,
-  // leaves it behind. Outside a rehearsal nobody sees it.
+  // Set first, so that it remains when a rehearsal makes the release fail, by a code or an exception.
+  // Otherwise the object is gone with its mark.
   if (IsFile(file)) file->MarkReleaseFailed();
   if (HostError code; hostutil::Rehearsed(HOST_UTILITY_FileDispose, &code)) return code;
   if (!IsFile(file)) return HOST_ERR_UTILITY_NULL;

@@ -63,7 +63,7 @@ inline double Normalise(Vector* v) {
 // An angle or coordinate of -0 becomes 0, so that it cannot choose between half a turn and minus half a turn.
 double WithoutNegativeZero(double value) { return value + 0.0; }
 
-// 0 times what is not finite is not a number, and so is every sum with it.
+// 0 times a value that is not finite is NaN, and so is every sum with it.
 bool IsFinite(const TransformMatrix& matrix) {
   Row zero{};
   for (const auto& row : matrix.m) {
@@ -72,9 +72,9 @@ bool IsFinite(const TransformMatrix& matrix) {
   return zero.left[0] + zero.left[1] + zero.right[0] + zero.right[1] == 0.0;
 }
 
-// A direction at right angles to the only axis that is there, chosen so that the angles which that axis
-// leaves open come out as 0: X where x is known, Y where y is, Z where z is.
-void SeatOn(int known, Basis* basis) {
+// Adds an axis at right angles to the only one that is known. It is chosen so that the angles which the known
+// axis leaves open become 0: X where x is known, Y where y is, Z where z is.
+void AddPerpendicular(int known, Basis* basis) {
   const Vector& axis = (*basis)[static_cast<std::size_t>(known)];
   Vector other{};
   switch (known) {
@@ -88,15 +88,15 @@ void SeatOn(int known, Basis* basis) {
       other = {std::abs(axis[2]), 0.0, axis[2] < 0.0 ? axis[0] : -axis[0]};
       break;
   }
-  const std::size_t seat = known == 0 ? 1 : 0;
+  const std::size_t added = known == 0 ? 1 : 0;
   if (Normalise(&other) < kPoleCosine) {
     other = Vector{};
-    other[seat] = 1.0;
+    other[added] = 1.0;
   }
-  (*basis)[seat] = other;
+  (*basis)[added] = other;
 }
 
-// The axis number that a cyclic step leads to.
+// The next axis, in the cycle x, y, z.
 std::size_t Next(std::size_t axis) { return (axis + 1) % kAxes; }
 
 // Gives the axis that is missing the direction at right angles to the two others. False when these lie on one
@@ -122,20 +122,20 @@ void Complete(Basis* basis) {
   const auto missing = static_cast<std::size_t>(std::find(has.begin(), has.end(), false) - has.begin());
   if (known == 2 && CompleteThird(missing, basis)) return;
   const auto first = static_cast<std::size_t>(std::find(has.begin(), has.end(), true) - has.begin());
-  SeatOn(static_cast<int>(first), basis);
+  AddPerpendicular(static_cast<int>(first), basis);
   CompleteThird(first == 2 ? 1 : 2, basis);
 }
 
-// The angle of a direction from x towards y. One without a y, as nodes that turn about one axis have two,
-// needs no arc tangent.
+// The angle of a direction from x towards y. Without a y it needs no arc tangent; of a node that turns about
+// one axis only, two of the three angles are so.
 double AngleOf(double y, double x) {
   const double up = WithoutNegativeZero(y);
   if (up == 0.0) return x < 0.0 ? kHalfTurn : 0.0;
   return std::atan2(up, x);
 }
 
-// X, Y and Z so that Rz·Ry·Rx turns the coordinate axes into the basis. X is what is left when Y and Z are
-// taken back: near the pole that keeps the sum of the two right, where each alone is uncertain.
+// X, Y and Z so that Rz·Ry·Rx turns the coordinate axes into the basis. X is measured after Y and Z are
+// undone: near the pole X and Z are uncertain each alone, and this keeps their sum right.
 void AnglesOf(const Basis& basis, double rotation[kAxes]) {
   const auto& [x, y, z] = basis;
   // An axis without a y needs no root: its length is that of the x.
@@ -160,7 +160,7 @@ HostError hostutil::matrix::Decompose(const TransformMatrix& matrix, MatrixCompo
     *components = MatrixComponents{};
     return HOST_ERR_MATRIX_NOT_FINITE;
   }
-  // By rows, in the pairs that they were stored in: a load across two stores is waited for.
+  // Loaded by rows, in the pairs that they were stored in: a load across two stores stalls the processor.
   const Row rows[] = {Load(matrix.m[0]), Load(matrix.m[1]), Load(matrix.m[2])};
   Basis basis;
   for (std::size_t row = 0; row < kAxes; ++row) {

@@ -1,4 +1,4 @@
-// The work of the matrix services, apart from their fault points.
+// What the matrix services compute, without their fault points.
 #pragma once
 
 #include <cmath>
@@ -34,7 +34,7 @@ struct Triple {
 };
 
 inline void SetIdentity(TransformMatrix* matrix) {
-  // By pairs, as the operations that follow load them: a pair that was stored in parts is waited for.
+  // Stored in pairs, as the next operations load them: a load across two stores stalls the processor.
   Store({Pair{1.0, 0.0}, Pair{0.0, 0.0}}, matrix->m[0]);
   Store({Pair{0.0, 1.0}, Pair{0.0, 0.0}}, matrix->m[1]);
   Store({Pair{0.0, 0.0}, Pair{1.0, 0.0}}, matrix->m[2]);
@@ -42,7 +42,7 @@ inline void SetIdentity(TransformMatrix* matrix) {
 }
 
 inline void Translate(TransformMatrix* matrix, const Triple& by) {
-  if (by.x == 0.0 && by.y == 0.0 && by.z == 0.0) return;  // as nearly every pivot is
+  if (by.x == 0.0 && by.y == 0.0 && by.z == 0.0) return;  // so for nearly every pivot
   const Row last = Load(matrix->m[kAxes]);
   Store(Sum(Load(matrix->m[0]), Product(by.x, last)), matrix->m[0]);
   Store(Sum(Load(matrix->m[1]), Product(by.y, last)), matrix->m[1]);
@@ -55,8 +55,8 @@ inline void Scale(TransformMatrix* matrix, const Triple& by) {
   Store(Product(by.z, Load(matrix->m[2])), matrix->m[2]);
 }
 
-// Mixes the rows of the two other axes by the cosine and the sine, without another rounding. Nothing is 0
-// times a number here, so that an angle of 0 leaves the matrix as it is.
+// Mixes the rows of the two other axes by the cosine and the sine. No product by 0 is added, so there is no
+// further rounding. An angle of 0 leaves the matrix as it is.
 inline void TurnAboutCoordinateAxis(TransformMatrix* matrix, int axis, double angle) {
   if (angle == 0.0) return;
   const double c = std::cos(angle);

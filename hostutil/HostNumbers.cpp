@@ -1,5 +1,4 @@
-// Numbers as the host's services: the conversion itself is the scanner's (scan/Decimal.h). And the comparison
-// of ratios.
+// The services for numbers, on top of the conversion in scan/Decimal.h, and the comparison of ratios.
 #include "hostutil/HostNumbers.h"
 
 #include <cstdint>

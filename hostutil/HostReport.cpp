@@ -1,5 +1,4 @@
-// Translate-and-report: a standard exception becomes a message to the user and a code. And the note of a
-// line.
+// Translate-and-report: a standard exception becomes a message to the user and a code. Also the noted line.
 #include "hostutil/HostReport.h"
 
 #include <cstdint>

@@ -1,5 +1,5 @@
 /* How a plug-in reports its failures to the host: a standard exception that reaches a callback, which the
- * host shows and names a code for; and the line of a scene where a failure was found. */
+ * host shows and turns into a code, and the line of a scene where a failure was found. */
 #ifndef HOSTUTIL_HOSTREPORT_H
 #define HOSTUTIL_HOSTREPORT_H
 
@@ -19,9 +19,9 @@ enum { HOST_EXCEPTION_MEMORY = 1, HOST_EXCEPTION_OTHER = 2 };
  * no UTF-8 are U+FFFD. Nothing is allocated. */
 HOSTUTIL_API HostError HostTranslateAndReport(int32_t kind, const char* what);
 
-/* Notes at which line of the scene, from 1, the failure was found that the callback is about to return with
- * that code. The host may show it beside the code; nothing else comes of it. The last note counts. Cannot
- * fail, also not in a rehearsal. */
+/* Notes the line of the scene, from 1, of the failure that the callback is about to return with that code.
+ * The host may show it beside the code; it has no other effect. The last note counts. Cannot fail, not even
+ * in a rehearsal. */
 HOSTUTIL_API void HostNoteLine(HostError code, int64_t line);
 
 #ifdef __cplusplus

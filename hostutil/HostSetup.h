@@ -1,5 +1,5 @@
-/* The host's own side of the utility services: what it sets up before a plug-in is called, and what it
- * draws up afterwards. Plug-ins do not use it. The services have one state, for the host and all its modules;
+/* The host's own side of the utility services: what it sets up before it calls a plug-in, and the ledger that
+ * it reads afterwards. Plug-ins do not use it. The services have one state, for the host and all its modules;
  * they are for one thread at a time.
  */
 #ifndef HOSTUTIL_HOSTSETUP_H
@@ -22,7 +22,7 @@ HOSTUTIL_API void HostClearTranslations(void);
 /* --- Reporter ----------------------------------------------------------------------------------- */
 
 /* Called by HostTranslateAndReport with the text to show (UTF-8, never null, valid during the call) and the
- * code. It lets no exception out. */
+ * code. It must not throw. */
 typedef void (*HostReporter)(void* context, HostError code, const char* text);
 
 /* Null as the reporter: nothing is shown. */
@@ -37,8 +37,8 @@ enum { HOST_LEDGER_FILE = 1, HOST_LEDGER_LIST = 2 };
 
 /* Called once for each object that is still held, in the order in which they were made. `description` is
  * one line of UTF-8, valid during the call: control characters in a path are written as \uXXXX.
- * releaseFailed is 1 when a rehearsal made the object's own release fail, also with code 0. The visitor makes
- * and ends no object. */
+ * releaseFailed is 1 when a rehearsal made the object's own release fail, also with code 0. The visitor must
+ * not make or end an object. */
 typedef void (*HostLedgerVisitor)(void* context, int32_t kind, const char* description,
                                   int32_t releaseFailed);
 
@@ -72,7 +72,7 @@ enum {
   HOST_THROW_NOTHING = 0,
   HOST_THROW_BAD_ALLOC = 1,
   HOST_THROW_RUNTIME_ERROR = 2,
-  HOST_THROW_OTHER = 3 /* an exception of a type that nobody else knows */
+  HOST_THROW_OTHER = 3 /* an exception that only catch (...) catches */
 };
 
 /* One failure to rehearse. The nth call (from 1; 0 is every call) of the service does nothing, hands out
@@ -89,7 +89,8 @@ typedef struct HostUtilityFailure {
 } HostUtilityFailure;
 
 /* Adds a failure. It works only while the rehearsal runs. Where several fit a call, the first that was added
- * counts. HOST_ERR_UTILITY_NULL for a null pointer, or a field out of its range. */
+ * counts. HOST_ERR_UTILITY_NULL for a null pointer, or a field out of its range; HOST_ERR_EXCEPTION_MEMORY
+ * when there is no memory for it. */
 HOSTUTIL_API HostError HostAddUtilityFailure(const HostUtilityFailure* failure);
 HOSTUTIL_API void HostClearUtilityFailures(void);
 
@@ -105,8 +106,8 @@ HOSTUTIL_API int64_t HostUtilityCallCount(int32_t service);
 
 /* --- Memory -------------------------------------------------------------------------------------- */
 
-/* Asks the system for large pages for a block that is about to be filled, which makes that several times as
- * fast. A hint: a small block, or a system without large pages, is left as it is. */
+/* Asks the system for large pages for a block that is about to be filled, which then fills several times as
+ * fast. A hint: it does nothing for a small block, for null, and on a system without large pages. */
 HOSTUTIL_API void HostAdviseLargePages(void* memory, int64_t size);
 
 /* --- Paths -------------------------------------------------------------------------------------- */

@@ -1,4 +1,4 @@
-// Large pages for large blocks: most of the time that a fresh block takes goes into its page faults.
+// Large pages for large blocks: page faults take most of the time that a fresh block needs.
 #include <sys/mman.h>
 #include <unistd.h>
 

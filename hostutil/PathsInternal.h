@@ -23,18 +23,18 @@ struct DecodedCharacter {
 DecodedCharacter DecodeBytes(const char* bytes);
 DecodedCharacter DecodeUnits(const HostUTF16Unit* units);
 
-// Writes a character and returns its length. A lone surrogate takes one unit, or three bytes in the manner
-// of UTF-8.
+// Writes a character and returns its length in units or bytes. A lone surrogate takes one unit, or the three
+// bytes that UTF-8 would have for it.
 int EncodeUnits(char32_t codePoint, HostUTF16Unit* units);
 int EncodeBytes(char32_t codePoint, char* bytes);
 
-// What a user is shown of a character: U+FFFD for a lone surrogate.
+// The character as a user sees it: U+FFFD for a lone surrogate.
 char32_t Shown(char32_t codePoint);
 
 // The bytes by which the system knows a path.
 std::string PathBytes(const HostUTF16Unit* units);
 
-// A text for one line: as it is shown, with control characters and line separators as \uXXXX.
+// The text as a user sees it, on one line: control characters and line separators become \uXXXX.
 std::string ShownLine(const HostUTF16Unit* units);
 
 }  // namespace hostutil

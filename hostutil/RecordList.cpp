@@ -16,10 +16,10 @@
 
 namespace {
 
-// What distinguishes a list from other memory.
+// Distinguishes a list from other memory.
 constexpr std::uint64_t kListMark = 0x5265634C69737431;
 
-// The size of a time and a value, the records that are copied most: by a copy of known size.
+// The size of a key, a time and a value. Keys are copied most; a copy of constant size is faster.
 constexpr std::int64_t kKeySize = 2 * sizeof(double);
 
 }  // namespace
@@ -54,7 +54,7 @@ struct RecordList final : hostutil::LiveObject {
 
 namespace {
 
-// Asked of memory that may be no list, which a sanitizer would otherwise report.
+// Reads memory that may be no list, which a sanitizer would otherwise report.
 __attribute__((no_sanitize("vptr"))) bool IsList(const RecordList* list) {
   return list != nullptr && list->mark == kListMark;
 }

@@ -6,9 +6,9 @@
  *
  * Ownership: the caller of RecordListCreate owns the list until RecordListDispose; the library frees what
  * is left when the host releases its leftovers. A null list or pointer is HOST_ERR_UTILITY_NULL, and so is
- * an object that is no list: every list carries a mark, which is looked at. A list that was disposed of is
- * not recognised; the caller must not use it. What an operation hands out is null or 0 when it fails, but
- * RecordListGet then leaves the record as it was.
+ * an object that is no list: every list carries a mark, which each operation checks. A list that was disposed
+ * of is not detected; the caller must not use it. What an operation hands out is null or 0 when it fails,
+ * except that RecordListGet then leaves the record as it was.
  */
 #ifndef HOSTUTIL_RECORDLIST_H
 #define HOSTUTIL_RECORDLIST_H
@@ -37,15 +37,15 @@ HOSTUTIL_API HostError RecordListAppend(RecordList* list, const void* record);
  * of it. */
 HOSTUTIL_API HostError RecordListAppendRun(RecordList* list, const void* records, int64_t count);
 
-/* Makes room for `count` more records, so that they will be appended without growing. A hint: where there is
- * no room to be had, nothing happens. */
+/* Makes room for `count` more records, so that appending them does not grow the list. A hint: it does nothing
+ * where there is no memory, or while a record is locked. */
 HOSTUTIL_API void RecordListReserve(RecordList* list, int64_t count);
 
 /* Copies record `index` (from 0) out. HOST_ERR_LIST_INDEX when there is none. */
 HOSTUTIL_API HostError RecordListGet(const RecordList* list, int64_t index, void* record);
 
 /* Hands out the address of `count` records (1 or more) from `index` on, which lie one after the other, for
- * reading. It is valid until the list grows or ends. HOST_ERR_LIST_INDEX when there are not so many. A
+ * reading. It is valid until the list grows or ends. HOST_ERR_LIST_INDEX when there are fewer. A
  * rehearsal takes the whole run for one call of RecordListGet. */
 HOSTUTIL_API HostError RecordListGetRun(const RecordList* list, int64_t index, int64_t count,
                                         const void** records);

@@ -1,4 +1,4 @@
-// The registry of live objects, and the ledger that the host draws up from it.
+// The registry of live objects, and the ledger that the host reads from it.
 #include <cstdint>
 #include <new>
 #include <string>
@@ -15,8 +15,7 @@ struct Chain {
   LiveObject* last = nullptr;
 };
 
-// Texts are no part of the ledger. They lie apart so that drawing it up costs nothing for them, and are freed
-// last, because files hold references to them.
+// Texts are not part of the ledger. They have a chain of their own, so that a ledger need not pass over them.
 constinit Chain held;
 constinit Chain texts;
 

@@ -1,4 +1,4 @@
-// Every object that the library has made and that is not ended yet.
+// The registry of all objects that the library has made and that are not ended yet.
 #pragma once
 
 #include <string>

@@ -28,7 +28,7 @@ bool IsSound(const HostUtilityFailure& failure) {
          failure.thrown <= HOST_THROW_OTHER;
 }
 
-// What nobody else can catch by its type.
+// No code outside this file can name it in a catch.
 struct OtherException {};
 
 }  // namespace

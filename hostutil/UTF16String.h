@@ -34,13 +34,14 @@ HOSTUTIL_API HostError UTF16StringFormat(const char* pattern, const UTF16String*
  * counts as the empty one. */
 HOSTUTIL_API HostError HostStripExtension(const UTF16String* text, int32_t flag, UTF16String** stripped);
 
-/* The units, NUL-terminated. Never null; they live as long as the text. A null text has no units: "". */
+/* The units, NUL-terminated. Never null; they live as long as the text. A null text counts as the empty one.
+ */
 HOSTUTIL_API const HostUTF16Unit* UTF16StringUnits(const UTF16String* text);
 
-/* The number of units before the NUL. */
+/* The number of units before the NUL; 0 for a null text. */
 HOSTUTIL_API int64_t UTF16StringLength(const UTF16String* text);
 
-/* One more reference, one less. Null is accepted and does nothing. */
+/* Adds a reference; gives one back, the last of which frees the text. Null is accepted and does nothing. */
 HOSTUTIL_API void UTF16StringRetain(UTF16String* text);
 HOSTUTIL_API void UTF16StringRelease(UTF16String* text);
 

@@ -1,4 +1,4 @@
-// What a text consists of.
+// The contents of a text.
 #pragma once
 
 #include <cstdint>
@@ -14,7 +14,7 @@ struct UTF16String final : hostutil::LiveObject {
   explicit UTF16String(std::vector<HostUTF16Unit> terminated)
       : LiveObject(Kind::Text), units(std::move(terminated)) {}
 
-  // Nobody asks: texts are no part of the ledger.
+  // Never called: texts are not part of the ledger.
   std::string Describe() const override { return "text"; }  // GCOVR_EXCL_LINE
 
   const std::vector<HostUTF16Unit> units;
