@@ -18,9 +18,9 @@ constexpr Entry kBakeCodes[] = {
      .symbol = "TooManyFrames",
      .sentence = "the frames {0} to {1} are too many for a bake",
      .meaning = "Without --frames a bake has at most 100,000 frames, and never more than the time of a "
-                "composition can hold. A single key far away from the others makes the range as long.",
+                "composition can hold. A single key far away from the others can make the range that long.",
      .example = "setAttr \".ktv[0:1]\" 1 0 1000000000 1;",
-     .help = "Say which frames are wanted: --frames A:B."},
+     .help = "Choose the frames: --frames A:B."},
     {.code = Code::ClockTimeUnit,
      .severity = Severity::Warning,
      .symbol = "ClockTimeUnit",
@@ -33,7 +33,7 @@ constexpr Entry kBakeCodes[] = {
      .severity = Severity::Warning,
      .symbol = "CameraInWorldSpace",
      .sentence = "\"{0}\" comes without the transforms above it",
-     .meaning = "What stands above the camera cannot be said exactly by null layers: it is scaled or "
+     .meaning = "Null layers cannot show exactly what stands above the camera: it is scaled or "
                 "sheared, or it is in another file. The camera has its place in the world at every frame.",
      .example = "createNode transform -n \"rig\";\nsetAttr \".s\" -type \"double3\" 2 2 2 ;",
      .help = "Nothing has to be done for the picture. Take the scale out of the rig where the null layers "

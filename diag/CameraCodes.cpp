@@ -13,7 +13,7 @@ constexpr Entry kCameraCodes[] = {
                 "and lower case count. Orthographic cameras and the four cameras that every scene begins "
                 "with are never meant.",
      .example = "mayascene bake --camera shotCam shot.ma -o baked.ma",
-     .help = "Look at the names of the cameras in the scene: mayascene bake without --camera lists those "
+     .help = "Check the names of the cameras in the scene: mayascene bake without --camera lists those "
              "that it writes."},
     {.code = Code::FilmOffsetLost,
      .severity = Severity::Warning,

@@ -5,9 +5,9 @@
 //   100  reading the text            400  what drives a channel
 //   200  nodes, names, units         500  cameras and locators
 //   300  curves                      600  what a bake writes
-//   700  what stops an import          800  what does not come over
-//   900  where the picture differs   1000  what keeps a check from its end
-//   1100  what an export cannot say
+//   700  what stops an import        800  what does not come over
+//   900  where the picture differs   1000 what keeps a check from its end
+//   1100 what an export cannot say
 #pragma once
 
 #include <cstdint>
@@ -183,7 +183,7 @@ struct Entry {
   std::string_view symbol;    // the code's name as it is written above
   std::string_view sentence;  // what is so; {0}, {1} … stand for the arguments
   std::string_view meaning;   // what it means, for the page
-  std::string_view example;   // lines of a scene that give it
+  std::string_view example;   // lines of a scene, or a command, that cause it; may be empty
   std::string_view help;      // what to do, in a compositor's words; may have the sentence's placeholders
 };
 

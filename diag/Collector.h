@@ -17,7 +17,7 @@ namespace diag {
 class Collector {
  public:
   static constexpr std::size_t kFullPerCode = 20;
-  // An argument is kept up to so many bytes; "..." stands for the rest.
+  // The bytes of an argument that are kept; "..." stands for the rest.
   static constexpr std::size_t kLongestArgument = 200;
 
   explicit Collector(std::string_view text, std::size_t fullPerCode = kFullPerCode)
@@ -26,10 +26,10 @@ class Collector {
   // As many arguments as the row of the code has placeholders.
   void Report(Code code, Range range, std::initializer_list<std::string_view> arguments = {});
 
-  // One that another collector of the same text kept.
+  // Adds a diagnostic that another collector of the same text kept.
   void Take(const Diagnostic& diagnostic);
 
-  // Those kept in full, in the order in which they were reported.
+  // The diagnostics that are kept in full, in the order in which they were reported.
   std::span<const Diagnostic> kept() const { return kept_; }
 
   // How many were reported: of one code, of one severity, of all.

@@ -10,7 +10,7 @@ constexpr Entry kCurveCodes[] = {
      .symbol = "UnknownTangentType",
      .sentence = "\"{0}\" has tangents of a type that is not known",
      .meaning = "A key has a slow or a fast tangent, or no legal type, and the file does not write the "
-                "tangent itself. How steep such a tangent is, is not known. It is taken as a spline. Only "
+                "tangent itself. The slope of such a tangent is not known. It is taken as a spline. Only "
                 "the way between keys can differ.",
      .example = "createNode animCurveTL -n \"shotCam_translateX\";\n  setAttr \".tan\" 6;\n  setAttr -s 2 "
                 "\".ktv[0:1]\"  1 0 24 10;",
@@ -28,7 +28,7 @@ constexpr Entry kCurveCodes[] = {
      .severity = Severity::Note,
      .symbol = "AutoMixTangent",
      .sentence = "\"{0}\" has tangents of type 27, which is taken as auto mix",
-     .meaning = "The rule of auto mix is known, that its code is 27 is likely.",
+     .meaning = "The rule of auto mix is known. That its code is 27 is only likely.",
      .example = "createNode animCurveTL -n \"shotCam_translateX\";\n  setAttr \".tan\" 27;\n  setAttr -s 3 "
                 "\".ktv[0:2]\"  1 0 12 3 24 10;",
      .help = "Look at the way between the keys of \"{0}\" in the result."},
@@ -54,7 +54,7 @@ constexpr Entry kCurveCodes[] = {
      .severity = Severity::Warning,
      .symbol = "UnknownInfinity",
      .sentence = "what \"{0}\" does outside its keys is not known",
-     .meaning = "The code for what a curve does before its first key or after its last one is none that is "
+     .meaning = "A code says what a curve does before its first key or after its last one. This code is not "
                 "known. The curve is taken as constant there.",
      .example = "createNode animCurveTL -n \"shotCam_translateX\";\n  setAttr \".tan\" 9;\n  setAttr -s 2 "
                 "\".ktv[0:1]\"  1 0 24 10;\n  setAttr \".pst\" 2;",
@@ -91,8 +91,8 @@ constexpr Entry kCurveCodes[] = {
      .severity = Severity::Warning,
      .symbol = "QuaternionCurve",
      .sentence = "\"{0}\" is one of three curves that turn together, and is taken by itself",
-     .meaning = "The three curves of a rotation are to be interpolated as one rotation. Each is interpolated "
-                "by itself. On the keys nothing differs; between them the turn can take another way.",
+     .meaning = "The three curves of a rotation should be interpolated as one rotation. Each is interpolated "
+                "by itself. On the keys nothing differs; between them the rotation can take another path.",
      .example = "createNode animCurveTA -n \"shotCam_rotateX\";\n  setAttr \".tan\" 9;\n  setAttr -s 2 "
                 "\".ktv[0:1]\"  1 0 24 90;\n  setAttr \".roti\" 3;",
      .help =

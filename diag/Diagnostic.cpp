@@ -11,7 +11,7 @@
 namespace diag {
 namespace {
 
-// Puts the arguments in the places of {0}, {1} …; one that is not there shows as nothing.
+// Puts the arguments in the places of {0}, {1} …; a missing one shows as nothing.
 std::string Fill(std::string_view text, const Diagnostic& diagnostic) {
   const std::vector<std::string>& arguments = diagnostic.arguments;
   fmt::dynamic_format_arg_store<fmt::format_context> shown;

@@ -32,11 +32,11 @@ struct Diagnostic {
 std::string SentenceOf(const Diagnostic& diagnostic);
 std::string HelpOf(const Diagnostic& diagnostic);
 
-// Whether it is about the file as a whole: its range is that of no byte at all.
+// Whether it is about the file as a whole: offset and length of its range are 0.
 bool IsOfWholeFile(const Diagnostic& diagnostic);
 
-// "file:line:column: warning: sentence [MA0101]", and "help: …": a line each, without line ends. Of one about
-// the whole file, no line and no column. The file's name may hold any bytes.
+// "file:line:column: warning: sentence [MA0101]", and "help: …": a line each, without line ends. A diagnostic
+// about the whole file shows no line and no column. The file's name may hold any bytes.
 std::string HeadLineOf(std::string_view file, const Diagnostic& diagnostic);
 std::string HelpLineOf(const Diagnostic& diagnostic);
 

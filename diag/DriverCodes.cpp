@@ -20,7 +20,7 @@ constexpr Entry kDriverCodes[] = {
      .symbol = "DriverWithoutAnswer",
      .sentence = "\"{1}\" gives \"{0}\" no value, so its stored one is kept",
      .meaning = "What drives the channel depends on something that cannot be computed, or has no answer: a "
-                "constraint whose weights are all 0, or a node that is to look at its own place. At those "
+                "constraint whose weights are all 0, or a node that should look at its own place. At those "
                 "frames the channel keeps the value that the scene stores for it.",
      .example = "createNode transform -n \"shotCam\";\ncreateNode pointConstraint -n \"hold\" -p "
                 "\"shotCam\";\nconnectAttr \"hold.ctx\" \"shotCam.tx\";",
@@ -38,8 +38,9 @@ constexpr Entry kDriverCodes[] = {
      .severity = Severity::Note,
      .symbol = "SeveralTargets",
      .sentence = "\"{0}\" has several targets; how they are mixed is not certain",
-     .meaning = "Several targets of a constraint are averaged by their weights, and their turns are mixed "
-                "along the shorter way. The program that made the scene may mix the turns otherwise.",
+     .meaning =
+         "Several targets of a constraint are averaged by their weights, and their rotations are mixed "
+         "along the shorter way. The program that made the scene may mix the rotations differently.",
      .example = "createNode transform -n \"shotCam\";\ncreateNode transform -n \"left\";\ncreateNode "
                 "transform -n \"right\";\ncreateNode orientConstraint -n \"between\" -p "
                 "\"shotCam\";\nconnectAttr \"left.r\" \"between.tg[0].tr\";\nconnectAttr \"right.r\" "
@@ -59,10 +60,8 @@ constexpr Entry kDriverCodes[] = {
      .symbol = "StereoRig",
      .sentence = "the two eyes of \"{0}\" are computed by a rule that is not certain",
      .meaning = "Each eye of a stereo rig stands half of the separation beside the centre. Converged eyes "
-                "are turned to "
-                "the point of zero parallax; those off the axis have their film moved. Adjustments of the "
-                "rig are not "
-                "looked at.",
+                "are turned to the point of zero parallax; those off the axis have their film moved. "
+                "Adjustments of the rig are not read.",
      .example = "createNode stereoRigTransform -n \"rig\";\ncreateNode transform -n \"left\" -p \"rig\";\n"
                 "connectAttr \"rig.slo\" \"left.tx\";",
      .help = "Look at the distance of the two eyes in the result."},

@@ -8,7 +8,7 @@
 namespace diag {
 namespace {
 
-// Of a long line so many bytes are shown before the mark, and so many in all.
+// The bytes of a long line that are shown: before the mark, and in all.
 constexpr std::size_t kBefore = 40;
 constexpr std::size_t kMost = 100;
 
@@ -16,7 +16,7 @@ constexpr std::string_view kCut = "...";
 
 bool IsInsideCharacter(char c) { return (static_cast<unsigned char>(c) & 0xc0) == 0x80; }
 
-// How many columns a terminal gives to a text that is harmless: one for each character, nearly.
+// How many columns of a terminal a harmless text takes, nearly: one for each character.
 std::size_t ColumnsOf(std::string_view shown) {
   return static_cast<std::size_t>(
       std::count_if(shown.begin(), shown.end(), [](char c) { return !IsInsideCharacter(c); }));
@@ -40,7 +40,7 @@ std::size_t AtCharacter(std::string_view line, std::size_t at) {
 std::string Excerpt(std::string_view text, const Range& range) {
   if (range.offset > text.size()) return {};
   const auto offset = static_cast<std::size_t>(range.offset);
-  // Only as much of the line is looked for as can be shown.
+  // The line is searched only as far as it can be shown.
   const std::size_t earliest = offset > kMost ? offset - kMost : 0;
   // The line feed of a line end of two bytes belongs to the line that it ends.
   const bool insideLineEnd = offset > 0 && text[offset - 1] == '\r' && text.substr(offset, 1) == "\n";

@@ -45,11 +45,10 @@ constexpr Entry kExportCodes[] = {
      .severity = Severity::Error,
      .symbol = "ExportTooManyFrames",
      .sentence = "the keys go from frame {0} to frame {1}, more frames than are written unasked",
-     .meaning =
-         "Files hold a value for each frame. Unasked they get up to 100000 frames, asked up to 2000000. "
-         "Nothing is written of the scene.",
+     .meaning = "Files hold a value for each frame: up to 100000 frames, or up to 2000000 with --frames. "
+                "Nothing is written of the scene.",
      .example = "",
-     .help = "Say which frames to write with --frames."},
+     .help = "Choose the frames to write with --frames."},
     {.code = Code::ExportKeysBetweenFrames,
      .severity = Severity::Warning,
      .symbol = "ExportKeysBetweenFrames",
@@ -80,7 +79,7 @@ constexpr Entry kExportCodes[] = {
      .severity = Severity::Note,
      .symbol = "ExportNameReplaced",
      .sentence = "{0}: bytes of its name are no text, and stand as U+FFFD in the file",
-     .meaning = "The format holds names in UTF-8 alone. Two such names can look alike.",
+     .meaning = "The format holds names in UTF-8 only. Two such names can look alike.",
      .example = "",
      .help = "Rename {0} in the scene where another program has to find it by its name."},
     {.code = Code::ExportCameraScaled,
@@ -88,7 +87,7 @@ constexpr Entry kExportCodes[] = {
      .symbol = "ExportCameraScaled",
      .sentence = "{0}: programs that read {1} do not agree on a camera that is scaled unevenly",
      .meaning =
-         "The camera, or a layer above it, is scaled by other than the same on all axes, or mirrored. "
+         "The camera, or a layer above it, is mirrored, or is not scaled by the same factor on all axes. "
          "The file has the scale as the composition has it. Some programs leave it out of the picture.",
      .example = "",
      .help = "Export with --bake: the camera then comes without scale."},
@@ -96,8 +95,9 @@ constexpr Entry kExportCodes[] = {
      .severity = Severity::Note,
      .symbol = "ExportTimesShifted",
      .sentence = "the times of the file count from the first frame, not from frame 0",
-     .meaning = "glTF has no times below 0, and rounds those that are far from 0. What is as long as a frame "
-                "stays so; the number of the first frame is in the extras of the file's scene.",
+     .meaning =
+         "glTF has no times below 0, and rounds those that are far from 0. The length of a frame stays "
+         "the same; the number of the first frame is in the extras of the file's scene.",
      .example = "",
      .help =
          "Nothing has to be done for the picture. Add the first frame's number where frames are compared."},
@@ -106,8 +106,7 @@ constexpr Entry kExportCodes[] = {
      .symbol = "ExportTimesTooFine",
      .sentence = "the frames are too many, or their numbers too large, for the times of {0}",
      .meaning = "Two frames would have the same time: glTF has times of 32 bits. Frame numbers that are not "
-                "exact in "
-                "64 bits fit no format. Nothing is written of the scene.",
+                "exact in 64 bits fit no format. Nothing is written of the scene.",
      .example = "",
      .help = "Export fewer frames, or frames with smaller numbers: --frames A:B."},
     {.code = Code::ExportZoomByExtension,
@@ -116,7 +115,7 @@ constexpr Entry kExportCodes[] = {
      .sentence = "{0}: programs that do not know KHR_animation_pointer show its first zoom at all frames",
      .meaning = "glTF itself animates no lens. The changing field of view is in the file, by that extension.",
      .example = "",
-     .help = "Export to .chan or .usda for a program that passes the extension over."},
+     .help = "Export to .chan or .usda for a program that ignores the extension."},
     {.code = Code::ExportFileTooLarge,
      .severity = Severity::Error,
      .symbol = "ExportFileTooLarge",
@@ -169,7 +168,7 @@ constexpr Entry kExportCodes[] = {
      .sentence = "the first frame is a fraction, and the format holds whole frame numbers",
      .meaning = "Each line has the whole number below its frame. The values are those of the frame itself.",
      .example = "",
-     .help = "Say a whole first frame with --frames."},
+     .help = "Give a whole first frame with --frames."},
     {.code = Code::ExportFramesHeld,
      .severity = Severity::Note,
      .symbol = "ExportFramesHeld",

@@ -12,9 +12,9 @@ constexpr std::size_t kBlock = 4096;
 
 bool IsLineEnd(char c, char next) { return c == '\n' || (c == '\r' && next != '\n'); }
 
-// The line ends of a part of the text. The byte after the part is looked at, too; a text ends like a line.
-// Counts in bytes, side by side: a compiler makes vector instructions of it, which it does not of one wide
-// counter. A block is short enough for the bytes to hold.
+// The number of line ends in a part of the text. A carriage return at the end of the part is judged by the
+// byte after the part; at the end of the text it ends a line. Counts in an array of bytes, which compilers
+// turn into vector instructions, unlike one wide counter. A block is so short that no byte overflows.
 std::uint32_t CountLineEnds(std::string_view text, std::size_t begin, std::size_t end) {
   constexpr std::size_t kLanes = 64;
   static_assert(kBlock / kLanes < 256);
@@ -33,7 +33,7 @@ std::uint32_t CountLineEnds(std::string_view text, std::size_t begin, std::size_
   return std::accumulate(lanes.begin(), lanes.end(), rest);
 }
 
-// Where the line starts that goes on after the part of the text.
+// The start of the line that the end of the part stands in; `none` where the part has no line end.
 std::uint64_t LastLineStart(std::string_view text, std::size_t begin, std::size_t end, std::uint64_t none) {
   for (std::size_t after = end; after > begin; --after) {
     if (IsLineEnd(text[after - 1], after < text.size() ? text[after] : '\0')) return after;
@@ -43,7 +43,7 @@ std::uint64_t LastLineStart(std::string_view text, std::size_t begin, std::size_
 
 }  // namespace
 
-// Counts what lies before `at` and has not been counted.
+// Counts up to the block that holds `at`, from where the last call stopped.
 void Lines::CountTo(std::size_t at) {
   if (blocks_.empty()) blocks_.push_back({0, 0});
   while (blocks_.size() <= at / kBlock) {

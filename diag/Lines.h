@@ -17,8 +17,8 @@ struct LineAndColumn {
   bool operator==(const LineAndColumn&) const = default;
 };
 
-// Refers to the text, which must outlive it. A question costs one pass over what lies before its offset and
-// after those asked for before, and a look at a few thousand bytes.
+// Refers to the text, which must outlive it. All calls of At together pass over the text once at most; each
+// call reads a few thousand bytes more.
 class Lines {
  public:
   explicit Lines(std::string_view text) : text_(text) {}

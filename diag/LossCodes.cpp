@@ -12,8 +12,7 @@ constexpr Entry kLossCodes[] = {
      .meaning = "A camera of a composition has a perspective. The importer leaves orthographic cameras out.",
      .example = "createNode camera -n \"planShape\" -p \"plan\";\n  setAttr \".o\" yes;",
      .help = "Nothing has to be done, unless the shot is seen through it: then give the camera a very long "
-             "lens and move it "
-             "far away."},
+             "lens and move it far away."},
     {.code = Code::StartupCameras,
      .severity = Severity::Note,
      .symbol = "StartupCameras",
@@ -23,8 +22,7 @@ constexpr Entry kLossCodes[] = {
          "name, and the others because they are orthographic.",
      .example = "createNode camera -s -n \"perspShape\" -p \"persp\";",
      .help = "Nothing has to be done, unless one of them is the camera of the shot: then duplicate it in "
-             "Maya under another "
-             "name."},
+             "Maya under another name."},
     {.code = Code::CameraNotImported,
      .severity = Severity::Warning,
      .symbol = "CameraNotImported",
@@ -48,7 +46,7 @@ constexpr Entry kLossCodes[] = {
      .sentence =
          "\"{0}\" loses its place: the import does not take its parent \"{1}\", a node of the type {2}",
      .meaning =
-         "A node above the camera is of a type that the importer does not know, as a joint. The camera "
+         "A node above the camera is of a type that the importer does not know, such as a joint. The camera "
          "comes over as if that node stood at the origin.",
      .example = "createNode joint -n \"arm\";\ncreateNode transform -n \"shotCam\" -p \"arm\";\n"
                 "createNode camera -n \"shotCamShape\" -p \"shotCam\";",
@@ -58,9 +56,8 @@ constexpr Entry kLossCodes[] = {
      .symbol = "ChannelsOfOneKey",
      .sentence = "\"{0}\" does not get the values of its keys: one key alone in {1}",
      .meaning = "The importer takes a node for animated when one of its curves has two keys. This node has "
-                "curves of "
-                "one key alone. It comes over with the values that the scene stores beside them, which are "
-                "others; often it lands at the origin.",
+                "only curves of one key. It comes over with the values that the scene stores beside the "
+                "curves, which differ; often it lands at the origin.",
      .example = "createNode animCurveTL -n \"moveX\";\n"
                 "  setAttr \".ktv[0]\" 1 12.5;\n"
                 "connectAttr \"moveX.o\" \"shotCam.tx\";",
@@ -99,15 +96,14 @@ constexpr Entry kLossCodes[] = {
                 "  setAttr -s 2 \".ktv[0:1]\" 1 0 24 5;\n"
                 "connectAttr \"moveX.o\" \"|shotCam.tx\";",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake. Or give the "
-             "node a name "
-             "that no other node has, and export again."},
+             "node a name that no other node has, and export again."},
     {.code = Code::FocalLengthElsewhere,
      .severity = Severity::Warning,
      .symbol = "FocalLengthElsewhere",
      .sentence = "the focal length of \"{0}\" stands still: \"{1}\" ({2}) drives it",
      .meaning =
-         "The focal length comes from another node, as a control of a rig. The importer follows a curve that "
-         "drives the focal length directly, and takes the value that the scene stores otherwise.",
+         "The focal length comes from another node, such as a control of a rig. The importer follows only a "
+         "curve that drives the focal length directly; without one it takes the value that the scene stores.",
      .example = "createNode transform -n \"control\";\n"
                 "  addAttr -ln \"zoom\" -at double;\n"
                 "connectAttr \"control.zoom\" \"shotCamShape.fl\";",
@@ -119,16 +115,14 @@ constexpr Entry kLossCodes[] = {
      .symbol = "LookAtShortNames",
      .sentence = "the look-at \"{0}\" is not recognised: the scene has the short names of attributes",
      .meaning = "The importer knows the target of a look-at by the word \"target\" in the connection. A "
-                "scene that is "
-                "saved with short names says \"tg[0].tt\". The camera \"{1}\" is not aimed.",
+                "scene that is saved with short names says \"tg[0].tt\". The camera \"{1}\" is not aimed.",
      .example = "createNode transform -n \"point\";\n"
                 "createNode aimConstraint -n \"aim\" -p \"shotCam\";\n"
                 "connectAttr \"aim.constraintRotate\" \"shotCam.rotate\";\n"
                 "connectAttr \"shotCam.translate\" \"aim.constraintTranslate\";\n"
                 "connectAttr \"point.t\" \"aim.tg[0].tt\";",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake. The camera then "
-             "turns by "
-             "keys. Or save the scene with full attribute names."},
+             "turns by keys. Or save the scene with full attribute names."},
     {.code = Code::LookAtWeightLast,
      .severity = Severity::Warning,
      .symbol = "LookAtWeightLast",
@@ -148,15 +142,13 @@ constexpr Entry kLossCodes[] = {
      .symbol = "LookAtNotTaken",
      .sentence = "the look-at \"{0}\" is not recognised: the camera \"{1}\" is not aimed",
      .meaning = "The importer needs three connections of a look-at: the place of what is turned, the target, "
-                "and the "
-                "rotation, each between two nodes that it knows. One is missing, or goes by a path.",
+                "and the rotation, each between two nodes that it knows. One is missing, or names a path.",
      .example = "createNode transform -n \"point\";\n"
                 "createNode aimConstraint -n \"aim\";\n"
                 "connectAttr \"aim.constraintRotate\" \"shotCam.rotate\";\n"
                 "connectAttr \"point.translate\" \"aim.target[0].targetTranslate\";",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake. The camera then "
-             "turns by "
-             "keys."},
+             "turns by keys."},
     {.code = Code::AttributesWithoutPlace,
      .severity = Severity::Note,
      .symbol = "AttributesWithoutPlace",
@@ -181,7 +173,7 @@ constexpr Entry kLossCodes[] = {
      .severity = Severity::Warning,
      .symbol = "ParentElsewhere",
      .sentence = "\"{0}\" loses its place: its parent \"{1}\" is not in this file{2}",
-     .meaning = "A node above the camera stands in a referenced file, or in none that is known. The camera "
+     .meaning = "A node above the camera stands in a referenced file, or in no known file. The camera "
                 "comes over as if that node stood at the origin. A bake cannot read the other file either.",
      .example = "file -r -ns \"rig\" -rfn \"rigRN\" \"rig.ma\";\ncreateNode transform -n \"shotCam\" -p "
                 "\"rig:root\";\ncreateNode camera -n \"shotCamShape\" -p \"shotCam\";",

@@ -62,7 +62,7 @@ constexpr Entry kNodeCodes[] = {
      .sentence = "\"{0}\" would stand above itself",
      .meaning = "The parents of a node form a circle. The node is taken as if it had no parent.",
      .example = "createNode transform -n \"a\" -p \"b\";\ncreateNode transform -n \"b\" -p \"a\";",
-     .help = "Give the nodes a parent each that does not lead back to them."},
+     .help = "Give each node a parent that is not below it."},
     {.code = Code::UnknownNode,
      .severity = Severity::Note,
      .symbol = "UnknownNode",
@@ -74,8 +74,7 @@ constexpr Entry kNodeCodes[] = {
      .severity = Severity::Note,
      .symbol = "AlreadyConnected",
      .sentence = "\"{0}\" is already driven by \"{1}\"",
-     .meaning =
-         "A channel is driven by one other at most. The first connection stays, this one is passed over.",
+     .meaning = "A channel is driven by one other at most. The first connection stays, this one is ignored.",
      .example = "connectAttr \"a.o\" \"shotCam.tx\";\nconnectAttr \"b.o\" \"shotCam.tx\";",
      .help = "Take out one of the two connections."},
     {.code = Code::UnknownUnit,
@@ -83,14 +82,14 @@ constexpr Entry kNodeCodes[] = {
      .symbol = "UnknownUnit",
      .sentence = "\"{0}\" is no unit of {1}",
      .meaning = "The word of currentUnit is not known. The unit stays as it was: centimetres, degrees and 24 "
-                "frames a second, where nothing else was said.",
+                "frames a second, unless the file set another one before.",
      .example = "currentUnit -l league -a degree -t film;",
      .help = "Write a unit that is known: for example centimeter, degree, film or 25fps."},
     {.code = Code::SecondUnit,
      .severity = Severity::Warning,
      .symbol = "SecondUnit",
      .sentence = "the unit of {0} changes here from \"{1}\" to \"{2}\"",
-     .meaning = "The file says the unit twice, and differently. The last one holds for the whole file.",
+     .meaning = "The file sets the unit twice, to different values. The last one holds for the whole file.",
      .example = "currentUnit -l centimeter -a degree -t film;\ncurrentUnit -t pal;",
      .help = "Keep the command that is right, and take out the other."},
     {.code = Code::ReferenceNotRead,
@@ -100,15 +99,14 @@ constexpr Entry kNodeCodes[] = {
      .meaning = "The scene takes nodes from other files. Those nodes are not known.",
      .example = "file -r -ns \"hero\" -rfn \"heroRN\" \"hero.ma\";",
      .help = "Nothing has to be done, unless a camera or its parent stands in that file: then import the "
-             "referenced file into "
-             "the scene before the export."},
+             "referenced file into the scene before the export."},
     {.code = Code::SameNames,
      .severity = Severity::Warning,
      .symbol = "SameNames",
      .sentence = "this is a second node called \"{0}\" for the importer",
      .meaning = "The importer knows nodes by their names alone, wherever they stand. Of several transforms, "
-                "cameras, "
-                "curves or locators of one name, the first gets the values and the curves of all of them.",
+                "cameras, curves or locators of one name, the first gets the values and the curves of all of "
+                "them.",
      .example =
          "createNode transform -n \"shotCam\" -p \"rigA\";\ncreateNode transform -n \"shotCam\" -p \"rigB\";",
      .help = "Give the nodes different names, or write the scene anew: mayascene bake SCENE -o OUT."},
@@ -117,8 +115,8 @@ constexpr Entry kNodeCodes[] = {
      .symbol = "NamesDifferInCase",
      .sentence = "\"{0}\" and \"{1}\" are one name for the importer",
      .meaning =
-         "The importer does not look at upper and lower case. The first of the nodes gets the values and the "
-         "curves of both.",
+         "The importer does not distinguish upper and lower case. The first of the nodes gets the values and "
+         "the curves of both.",
      .example = "createNode transform -n \"shotCam\";\ncreateNode transform -n \"ShotCam\";",
      .help = "Give the nodes different names, or write the scene anew: mayascene bake SCENE -o OUT."},
     {.code = Code::NameTooLong,
@@ -133,7 +131,7 @@ constexpr Entry kNodeCodes[] = {
      .severity = Severity::Warning,
      .symbol = "NodeWithoutName",
      .sentence = "this {0} has no name that the importer takes",
-     .meaning = "The node has no name, or one without quotes. Of several such nodes the first gets the "
+     .meaning = "The node has no name, or a name without quotes. Of several such nodes the first gets the "
                 "values of all.",
      .example = "createNode transform -n shotCam;",
      .help = "Write the name in quotes, or write the scene anew: mayascene bake SCENE -o OUT."},

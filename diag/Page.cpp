@@ -33,7 +33,7 @@ constexpr std::array kTopics = {
 constexpr std::string_view kIntroduction =
     R"(# Diagnostics
 
-What is said about a scene, code by code. This page is made from the table of codes in `diag/`.
+All diagnostics about a scene, code by code. This page is made from the table of codes in `diag/`.
 
 A diagnostic has the form that compilers use. File, line and column say where; lines and columns count from 1, and a
 column counts bytes.

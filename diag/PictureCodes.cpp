@@ -11,13 +11,11 @@ constexpr Entry kPictureCodes[] = {
      .sentence = "the picture of \"{0}\" shifts by {1}, most at frame {2}",
      .meaning =
          "Nine points of the picture, in three rows of three at the distance of the centre of interest (100 "
-         "units where "
-         "the scene has none), are followed over the frames of the scene. The shift is the largest way, "
-         "in pixels of the scene's resolution, between where the scene shows a point and where the "
-         "import does. Time 0 of the composition is the first key of the camera and of what stands "
-         "above it, or time 0 of a scene that does not count time in frames; between keys the import counts "
-         "as straight. The other diagnostics of the camera name "
-         "the reasons.",
+         "units where the scene has none), are followed over the frames of the scene. The shift is the "
+         "largest distance, in pixels of the scene's resolution, between where the scene shows a point and "
+         "where the import does. Time 0 of the composition is the first key of the camera and of what "
+         "stands above it, or time 0 of a scene that does not count time in frames; between keys the import "
+         "is taken as linear. The other diagnostics of the camera name the reasons.",
      .example = "createNode animCurveTL -n \"moveX\";\n"
                 "  setAttr \".tan\" 3;\n"
                 "  setAttr -s 2 \".ktv[0:1]\" 1 0 48 100;\n"
@@ -29,10 +27,9 @@ constexpr Entry kPictureCodes[] = {
      .severity = Severity::Warning,
      .symbol = "KeysAreNoBake",
      .sentence = "\"{0}\" loses its path between keys: {1} keys over {2} frames",
-     .meaning = "The importer takes the keys and none of their tangents. Between keys the composition has a "
-                "way of its "
-                "own. A node has one list of times: curves with as many keys at other times are put at those "
-                "of the first.",
+     .meaning = "The importer takes the keys and none of their tangents. Between keys the composition "
+                "interpolates in its own way. A node has one list of times: curves with as many keys at "
+                "other times are put at those of the first.",
      .example = "createNode animCurveTL -n \"moveX\";\n"
                 "  setAttr \".tan\" 3;\n"
                 "  setAttr -s 2 \".ktv[0:1]\" 1 0 48 100;\n"
@@ -44,7 +41,7 @@ constexpr Entry kPictureCodes[] = {
      .severity = Severity::Warning,
      .symbol = "RotateOrderLost",
      .sentence = "\"{0}\" is turned in another order: the import takes xyz, the scene has {1}",
-     .meaning = "The three angles of a rotation mean another direction in another order.",
+     .meaning = "The same three angles give another direction when they are applied in another order.",
      .example = "createNode transform -n \"shotCam\";\n"
                 "  setAttr \".r\" -type \"double3\" 30 40 0 ;\n"
                 "  setAttr \".ro\" 4;",
@@ -69,9 +66,8 @@ constexpr Entry kPictureCodes[] = {
      .severity = Severity::Warning,
      .symbol = "PivotTranslationLost",
      .sentence = "the pivot translations of \"{0}\" are lost",
-     .meaning = "Where a pivot was moved and the node was to stay in its place, the difference is kept in a "
-                "value of "
-                "its own. The importer takes the pivots alone.",
+     .meaning = "When a pivot is moved and the node stays in its place, the scene keeps the difference in a "
+                "value of its own. The importer takes the pivots alone.",
      .example = "createNode transform -n \"shotCam\";\n"
                 "  setAttr \".rpt\" -type \"double3\" 0 2 0 ;",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
@@ -80,8 +76,7 @@ constexpr Entry kPictureCodes[] = {
      .symbol = "InheritanceOff",
      .sentence = "\"{0}\" does not inherit the transforms above it; the import lets it inherit",
      .meaning = "The importer makes the layer of the node a child of the layers of what stands above it, "
-                "whatever the "
-                "scene says.",
+                "whatever the scene says.",
      .example = "createNode transform -n \"rig\";\n"
                 "createNode transform -n \"shotCam\" -p \"rig\";\n"
                 "  setAttr \".it\" no;",
@@ -137,8 +132,7 @@ constexpr Entry kPictureCodes[] = {
      .symbol = "KeysStartApart",
      .sentence = "\"{0}\" begins at frame {1}, \"{2}\" at frame {3}: the import lets both begin at once",
      .meaning = "The importer puts the first key of each node at time 0 of the composition. Nodes that are "
-                "keyed from "
-                "different frames move against each other.",
+                "keyed from different frames move against each other.",
      .example = "createNode transform -n \"rig\";\n"
                 "createNode transform -n \"shotCam\" -p \"rig\";\n"
                 "createNode animCurveTL -n \"rigX\";\n"
@@ -153,13 +147,11 @@ constexpr Entry kPictureCodes[] = {
      .symbol = "OtherLengthUnit",
      .sentence = "the scene's unit of length is \"{0}\": one unit becomes a point of the composition",
      .meaning =
-         "The importer takes distances as they stand in the file. Scenes in other units come over in another "
-         "size than one in centimetres.",
+         "The importer takes distances as they stand in the file. A scene in another unit comes over in "
+         "another size than the same scene in centimetres.",
      .example = "currentUnit -l meter -a degree -t film;",
      .help = "Nothing has to be done, unless cameras from several scenes have to fit together: then set the "
-             "same unit in "
-             "all of them, "
-             "or import with --linear-units 1."},
+             "same unit in all of them, or import with --linear-units 1."},
     {.code = Code::BeyondCompositionTime,
      .severity = Severity::Warning,
      .symbol = "BeyondCompositionTime",
@@ -176,8 +168,8 @@ constexpr Entry kPictureCodes[] = {
      .symbol = "NegativeFrames",
      .sentence = "\"{0}\" has keys before frame 0, from frame {1} on",
      .meaning =
-         "The first key lands at time 0 of the composition, so that all frames come over; their numbers are "
-         "others.",
+         "The first key lands at time 0 of the composition, so that all frames come over; their numbers "
+         "change.",
      .example = "createNode animCurveTL -n \"moveX\";\n"
                 "  setAttr -s 2 \".ktv[0:1]\" -10 0 24 10;\n"
                 "connectAttr \"moveX.o\" \"shotCam.tx\";",
@@ -187,8 +179,7 @@ constexpr Entry kPictureCodes[] = {
      .symbol = "FractionalFrames",
      .sentence = "\"{0}\" has keys between frames, the first at {1}",
      .meaning = "Keys lie at fractions of a frame. They come over to a thousandth of a frame; a composition "
-                "shows whole "
-                "frames.",
+                "shows whole frames.",
      .example = "createNode animCurveTL -n \"moveX\";\n"
                 "  setAttr -s 2 \".ktv[0:1]\" 1.5 0 24.5 10;\n"
                 "connectAttr \"moveX.o\" \"shotCam.tx\";",
@@ -197,8 +188,7 @@ constexpr Entry kPictureCodes[] = {
      .severity = Severity::Warning,
      .symbol = "RateDiffers",
      .sentence = "the composition has {1} frames a second, the scene {0}",
-     .meaning =
-         "The scene does not say a frame rate, or says a unit of time that the importer takes otherwise.",
+     .meaning = "The scene sets no frame rate, or a unit of time that the importer takes for another one.",
      .example = "currentUnit -l centimeter -a degree -t sec;",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT. Or set the frame rate in the scene."},
     {.code = Code::ShiftNotMeasured,

@@ -10,7 +10,7 @@ constexpr Entry kProcessCodes[] = {
      .symbol = "CheckTimedOut",
      .sentence = "the check took longer than {0} and was ended",
      .meaning =
-         "Each scene is checked in a process of its own, which may take so long. Nothing is known of the "
+         "Each scene is checked in a process of its own, which has a time limit. Nothing is known of the "
          "scene. The other scenes are checked.",
      .example = "",
      .help = "Give it more time with --timeout. If it never ends, please report it with the scene."},
@@ -37,14 +37,15 @@ constexpr Entry kProcessCodes[] = {
      .severity = Severity::Error,
      .symbol = "ReportTooLarge",
      .sentence = "the report is larger than {0} and is not shown",
-     .meaning = "A report that is to show everything grows with the scene. Beyond this size it is dropped.",
+     .meaning = "A report that shows everything grows with the scene. Beyond this size it is dropped.",
      .example = "",
      .help = "Leave out --all, or choose codes with --only."},
     {.code = Code::CheckNotStarted,
      .severity = Severity::Error,
      .symbol = "CheckNotStarted",
      .sentence = "the check could not be started: {0}",
-     .meaning = "The system gave no process, or not what a process needs. Nothing is known of the scene.",
+     .meaning = "The system could not create a process, or could not give it what it needs. Nothing is known "
+                "of the scene.",
      .example = "",
      .help = "Try it again with fewer --jobs, or when the machine has less to do."},
 };

@@ -1,4 +1,4 @@
-// Names out of a scene, made harmless.
+// Text of a scene, made harmless for a terminal.
 #pragma once
 
 #include <string>

@@ -13,14 +13,13 @@ constexpr Entry kStopCodes[] = {
          "The importer, or its host, cannot go on here. What was made before stays, and nothing of what "
          "follows comes over.",
      .example = "select -ne :defaultResolution;\n  setAttr \".w\" 0;",
-     .help = "Correct what the sentence says in the scene, or write the scene anew: mayascene bake SCENE -o "
-             "OUT."},
+     .help = "Correct the scene where the sentence says so, or write it anew: mayascene bake SCENE -o OUT."},
     {.code = Code::NotMayaAscii,
      .severity = Severity::Error,
      .symbol = "NotMayaAscii",
      .sentence = "this is no Maya ASCII scene",
      .meaning =
-         "A Maya ASCII scene is a text that begins with \"//Maya\". This file begins otherwise, so the "
+         "A Maya ASCII scene is a text that begins with \"//Maya\". This file begins differently, so the "
          "importer does not read it.",
      .example = "#usda 1.0",
      .help = "Save the scene as Maya ASCII (.ma), and give that file."},
@@ -28,14 +27,14 @@ constexpr Entry kStopCodes[] = {
      .severity = Severity::Error,
      .symbol = "MayaBinary",
      .sentence = "this is a Maya Binary scene under another name",
-     .meaning = "The file has the form of a Maya Binary scene (.mb). The importer reads Maya ASCII alone.",
+     .meaning = "The file has the form of a Maya Binary scene (.mb). The importer reads only Maya ASCII.",
      .example = "",
      .help = "Open the scene in Maya and save it as Maya ASCII (.ma). To rename the file is not enough."},
     {.code = Code::CompressedFile,
      .severity = Severity::Error,
      .symbol = "CompressedFile",
      .sentence = "this file is compressed ({0})",
-     .meaning = "The file begins as a compressed one does. There may be a scene in it.",
+     .meaning = "The file begins like a compressed file. There may be a scene in it.",
      .example = "",
      .help = "Unpack the file, and give the scene that comes out of it."},
     {.code = Code::EmptyFile,
@@ -119,7 +118,7 @@ constexpr Entry kStopCodes[] = {
      .symbol = "CutOffInString",
      .sentence = "the import stops here: this string is not closed before the file ends",
      .meaning =
-         "The file was cut off inside a string, or a quote is missing or too many. Nothing comes over.",
+         "The file was cut off inside a string, or there is a quote too few or too many. Nothing comes over.",
      .example = "setAttr \".b\" -type \"string\" \"closing quote forgotten;",
      .help = "Copy or export the file again, and compare its size with the original's."},
     {.code = Code::CutOffInComment,
@@ -128,7 +127,7 @@ constexpr Entry kStopCodes[] = {
      .sentence = "the import stops here: this comment does not end before the file ends",
      .meaning =
          "\"/*\" opens a comment that nothing closes. The importer misses the end of a comment in \"/***/\" "
-         "too: it passes over a \"*\" after a \"*\". Nothing comes over.",
+         "too: it skips a \"*\" after a \"*\". Nothing comes over.",
      .example = "/* exported by hand\ncreateNode camera -n \"shotCamShape\";",
      .help = "End the comment with \"*/\", with no other \"*\" before it, or take it out."},
     {.code = Code::CutOffInCommand,
@@ -148,8 +147,8 @@ constexpr Entry kStopCodes[] = {
      .sentence = "the import stops at \"{0}\": {1} keys on {2} (\"{3}\"), but {4} on {5} (\"{6}\")",
      .meaning =
          "The importer takes the first keys of all channels of a node together, then the second ones, and so "
-         "on. All curves of a node with two keys or more need as many keys. What was made before stays; "
-         "the node and what follows it do not come over.",
+         "on. All curves of a node that have two keys or more need the same number of keys. What was made "
+         "before stays; the node and what follows it do not come over.",
      .example = "createNode animCurveTL -n \"moveX\";\n"
                 "  setAttr -s 3 \".ktv[0:2]\" 1 0 2 5.5 3 10;\n"
                 "createNode animCurveTA -n \"turnY\";\n"
@@ -172,9 +171,9 @@ constexpr Entry kStopCodes[] = {
      .severity = Severity::Error,
      .symbol = "NumberUnreadable",
      .sentence = "the import stops here: \"{0}\" is no number that it can read",
-     .meaning = "Where the importer needs a number, it takes decimal digits, with a sign, a fraction and an "
-                "exponent "
-                "at most. Nothing comes over.",
+     .meaning =
+         "Where the importer needs a number, it takes decimal digits, which can have a sign, a fraction "
+         "and an exponent. Nothing comes over.",
      .example = "createNode transform -n \"shotCam\";\n"
                 "  setAttr \".t\" -type \"double3\" 1.#QNAN 0 0 ;",
      .help = "Look in the scene for what has no valid value, and export the scene again."},

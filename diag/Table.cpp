@@ -21,7 +21,7 @@ std::vector<Entry> WholeTable() {
   return table;
 }
 
-// The number of the largest placeholder of a text, from 1; 0 where there is none.
+// One more than the number of the largest placeholder of a text; 0 where there is none.
 std::size_t LargestPlaceholder(std::string_view text) {
   std::size_t largest = 0;
   for (std::size_t at = text.find('{'); at != std::string_view::npos; at = text.find('{', at + 1)) {
@@ -35,8 +35,8 @@ std::size_t LargestPlaceholder(std::string_view text) {
 }  // namespace
 
 std::span<const Entry> Table() {
-  static const std::vector<Entry> table = WholeTable();
-  return table;
+  static const std::vector<Entry> kTable = WholeTable();
+  return kTable;
 }
 
 const Entry& EntryOf(Code code) {

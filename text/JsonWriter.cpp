@@ -10,13 +10,13 @@
 namespace text {
 namespace {
 
-void appendUnit(std::string* text, unsigned unit) {
+void AppendUnit(std::string* text, unsigned unit) {
   constexpr char kDigits[] = "0123456789abcdef";
   *text += "\\u";
   for (const unsigned shift : {12u, 8u, 4u, 0u}) *text += kDigits[(unit >> shift) & 0xfu];
 }
 
-void appendCharacter(std::string* text, char32_t point) {
+void AppendCharacter(std::string* text, char32_t point) {
   constexpr char32_t kFirstOfPairs = 0x10000;
   constexpr std::string_view kShort = "\b\t\n\f\r\"\\";
   constexpr std::string_view kLetters = "btnfr\"\\";
@@ -27,21 +27,21 @@ void appendCharacter(std::string* text, char32_t point) {
   } else if (point >= 0x20 && point < 0x7f) {
     *text += static_cast<char>(point);
   } else if (point < kFirstOfPairs) {
-    appendUnit(text, point);
+    AppendUnit(text, point);
   } else {
-    appendUnit(text, 0xd800u + ((point - kFirstOfPairs) >> 10));
-    appendUnit(text, 0xdc00u + ((point - kFirstOfPairs) & 0x3ffu));
+    AppendUnit(text, 0xd800u + ((point - kFirstOfPairs) >> 10));
+    AppendUnit(text, 0xdc00u + ((point - kFirstOfPairs) & 0x3ffu));
   }
 }
 
-// Only ASCII goes out, all else as \uXXXX: a name then cannot steer a terminal that the JSON is shown on.
-std::string quoted(std::string_view bytes) {
+// Writes ASCII only, all else as \uXXXX: a name then cannot control a terminal that shows the JSON.
+std::string Quoted(std::string_view bytes) {
   constexpr char32_t kReplacement = 0xfffd;
   std::string text = "\"";
   text.reserve(bytes.size() + 2);
   for (std::size_t at = 0; at < bytes.size();) {
     const Character character = CharacterAt(bytes, at);
-    appendCharacter(&text, character.length == 0 ? kReplacement : character.point);
+    AppendCharacter(&text, character.length == 0 ? kReplacement : character.point);
     at += character.length == 0 ? 1 : character.length;
   }
   return text += '"';
@@ -51,13 +51,13 @@ std::string quoted(std::string_view bytes) {
 
 void JsonWriter::key(std::string_view name) {
   separate();
-  out_ << quoted(name) << ": ";
+  out_ << Quoted(name) << ": ";
   afterKey_ = true;
 }
 
 void JsonWriter::text(std::string_view bytes) {
   separate();
-  out_ << quoted(bytes);
+  out_ << Quoted(bytes);
 }
 
 void JsonWriter::number(double value) {
@@ -79,7 +79,7 @@ void JsonWriter::boolean(bool value) { literal(value ? "true" : "false"); }
 
 void JsonWriter::null() { literal("null"); }
 
-// A line end is never part of a text: there it is escaped.
+// Every line feed in the value is layout: inside a text it is escaped.
 void JsonWriter::written(std::string_view value) {
   separate();
   while (value.ends_with('\n')) value.remove_suffix(1);

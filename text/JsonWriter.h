@@ -1,4 +1,4 @@
-// JSON, written as it comes, so that a million keys need no tree in memory.
+// Writes JSON value by value, so that a million keys need no tree in memory.
 #pragma once
 
 #include <cstdint>
@@ -23,12 +23,12 @@ class JsonWriter {
   void key(std::string_view name);
 
   void text(std::string_view bytes);  // what is no valid UTF-8 is replaced by U+FFFD
-  void number(double value);          // the shortest digits that give the same bits; "inf", "-inf", "nan"
+  void number(double value);  // the shortest digits that give the same bits; as texts "inf", "-inf", "nan"
   void integer(std::int64_t value);
   void boolean(bool value);
   void null();
 
-  // A value that a writer wrote at the level of a document: it is moved in to this level.
+  // A value that another writer wrote as a document of its own. Its lines are indented to this level.
   void written(std::string_view value);
 
  private:

@@ -1,4 +1,4 @@
-// UTF-8: its characters, and what stands in for bytes that are none.
+// UTF-8: its characters, and the replacement of bytes that are not valid.
 #pragma once
 
 #include <cstddef>
