@@ -20,18 +20,18 @@ namespace {
 constexpr std::int64_t kPlainDigits = 400;
 constexpr std::int64_t kPlainExponent = 4000;
 
-// The halfway point of two doubles has at most 767 significant digits: of what follows these, it matters
-// only whether it is zero.
+// The halfway point of two doubles has at most 767 significant digits. Of the digits after these it matters
+// only whether all are zero.
 constexpr std::int64_t kDecidingDigits = 770;
 
-// Far from where a double begins and ends, as the exponent of the first digit.
+// Beyond the range of a double on either side, as the power of ten of the first digit.
 constexpr std::int64_t kHugeExponent = 400;
 
-// An explicit exponent is held here: one more digit still fits the type, and no text is long enough for its
-// digits to make up for it.
+// An explicit exponent is held at this. One more digit still fits the type, and no text has enough digits to
+// make up for such an exponent.
 constexpr std::int64_t kExponentLimit = 100'000'000'000'000'000;
 
-// A longer number is left to the caller, who may have a limit of its own.
+// A longer number is left to the caller, which may have a limit of its own.
 constexpr std::int64_t kLongestPlainNumber = 64;
 
 // A position in the text; at the end it reads as a NUL.

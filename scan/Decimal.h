@@ -44,7 +44,7 @@ NumberStatus ReadNumber(const char* text, std::int64_t length, double* value);
   if (digits == 0 && *at != '.') return nullptr;
   if (*at == '.') {
     const char* const point = at++;
-    at = ReadOnDigits(at, end, &mantissa);
+    at = AppendDigits(at, end, &mantissa);
     fraction = at - point - 1;
     digits += fraction;
   }

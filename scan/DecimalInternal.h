@@ -13,7 +13,7 @@
 
 namespace scan::decimal {
 
-// How many digits always fit a 64-bit integer, and up to where such an integer is a double exactly.
+// How many digits always fit a 64-bit integer, and the largest such integer up to which all are doubles.
 inline constexpr std::int64_t kMantissaDigits = 19;
 inline constexpr std::uint64_t kExactMantissa = std::uint64_t{1} << std::numeric_limits<double>::digits;
 
@@ -94,8 +94,8 @@ inline constexpr std::uint64_t kWordPowers[kWordSize + 1] = {1,      10,      10
   return count;
 }
 
-// Reads digits on to the mantissa, which may overflow.
-[[gnu::always_inline]] inline const char* ReadOnDigits(const char* at, const char* end,
+// Appends the digits at `at` to the mantissa, which may overflow. Returns the first byte after them.
+[[gnu::always_inline]] inline const char* AppendDigits(const char* at, const char* end,
                                                        std::uint64_t* mantissa) {
   if constexpr (std::endian::native == std::endian::little) {
     while (end - at >= kWordSize) {

@@ -1,7 +1,7 @@
 // Looks for the bytes that end a word or a string, eight at a time.
 //
-// Words and strings are short, as a rule a few bytes to a few dozen: a look at eight bytes costs about as
-// much as at two one by one, and unlike a loop over bytes it does not mislead the processor at every end.
+// Words and strings are short, as a rule a few bytes to a few dozen. A test of eight bytes costs about as
+// much as two tests of one, and unlike a loop over bytes it does not end in a mispredicted branch each time.
 #pragma once
 
 #include <bit>
@@ -18,7 +18,7 @@ inline constexpr std::ptrdiff_t kWordSize = sizeof(std::uint64_t);
 inline constexpr std::uint64_t kEach = 0x0101010101010101u;
 inline constexpr std::uint64_t kHighBits = kEach * 0x80;
 
-// Marks the bytes below `limit`, at most 0x80, by their highest bit. Only the lowest mark is sure: those
+// Marks the bytes below `limit`, at most 0x80, by their highest bit. Only the lowest mark is reliable: those
 // above it may come from a borrow.
 inline constexpr std::uint64_t MarkBelow(std::uint64_t bytes, unsigned char limit) {
   return (bytes - kEach * limit) & ~bytes & kHighBits;

@@ -1,4 +1,4 @@
-// Counts lines.
+// Counts line feeds.
 #pragma once
 
 #include <cstddef>

@@ -12,17 +12,18 @@ constexpr bool BeginsHarmlessWord(const char* at) {
   return *at == '-' ? IsWordByte(at[1]) : IsWordByte(*at) && !IsAny(*at, kKeywordStart);
 }
 
-// A byte at a time. Ends a block before the end, as the others do, so that no word is scanned over it.
+// A byte at a time. Stops a block before the end of the text, as the others do, so that no word is scanned
+// beyond it.
 template <SkipWhere kWhere>
 const char* SkipPlain(const char* position, const char* end, std::int32_t* lines) {
-  constexpr bool inCommand = kWhere == SkipWhere::InCommand;
+  constexpr bool kInCommand = kWhere == SkipWhere::InCommand;
   while (end - position >= kSkipBlock) {
-    if (IsWordEnd(*position) && !(inCommand && *position == ';')) {
+    if (IsWordEnd(*position) && !(kInCommand && *position == ';')) {
       *lines += *position == '\n' ? 1 : 0;
       ++position;
       continue;
     }
-    if (!BeginsHarmlessWord(position) || (inCommand && *position == '-')) return position;
+    if (!BeginsHarmlessWord(position) || (kInCommand && *position == '-')) return position;
     const char* after = position;
     while (after != end && !IsWordEnd(*after)) ++after;
     if (after == end) return position;

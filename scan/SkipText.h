@@ -1,4 +1,4 @@
-// Passes in bulk over the words of a scene that nobody waits for.
+// Skips, in bulk, the words of a scene that the reader ignores.
 //
 // Between commands the reader acts on keywords alone. Most of a scene is numbers, so it need not see every
 // word: this finds the next place that it has to look at, 64 bytes at a time.
@@ -17,7 +17,7 @@ namespace scan {
 // Reads nothing before `position` and nothing after `end`.
 using SkipText = const char* (*)(const char* position, const char* end, std::int32_t* lines);
 
-// There are several, which differ in nothing but speed.
+// The implementations of SkipText give the same results; only their speed differs.
 struct TextSkipper {
   const char* name;
   SkipText betweenCommands;
@@ -26,7 +26,8 @@ struct TextSkipper {
   SkipText inCommand;
 };
 
-// Those that this processor can run, the fastest last. Never empty; the first one runs on every processor.
+// The implementations that this processor can run, the fastest last. Never empty; the first one runs on every
+// processor. The table lives as long as the program.
 std::span<const TextSkipper> TextSkippers();
 
 }  // namespace scan

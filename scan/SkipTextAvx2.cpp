@@ -35,11 +35,10 @@ struct NibbleTables {
     }
   }
 
-  // As the look-up finds it: a byte of 128 and above finds nothing among the low nibbles.
+  // What the look-up in vector registers gives: nothing for a byte of 128 and above.
   constexpr unsigned BitsOf(unsigned byte) const {
     if (byte >= 128) return 0;
-    const unsigned common = low[byte % 16] & high[byte / 16];
-    return common;
+    return static_cast<unsigned>(low[byte % 16] & high[byte / 16]);
   }
 
  private:
@@ -56,7 +55,7 @@ constexpr std::string_view kLettersLessS = "012456789a";      // from P, p to Z,
 constexpr std::string_view kDigits = "0123456789";
 constexpr std::string_view kControls = "9ad";  // tab, line feed, carriage return
 
-// What the masks are made of. Semicolons and blanks are compared for by themselves.
+// The classes that the masks are made of. Semicolons and blanks have comparisons of their own.
 enum MaskClass : unsigned {
   kHarmlessLetters46 = 1,
   kHarmlessLetters57 = 2,
@@ -75,9 +74,8 @@ constexpr NibbleTables kMaskTables({{kHarmlessLetters46, "46", kLettersLessC},
                                     {kKeywordLetter, "4567", "3"},
                                     {kNumeral, "3", kDigits}});
 
-// Where nothing stops, what comes after the end of a word has a bit; the highest one has a meaning of its
-// own, which of the others does not matter. Between commands, digits have the highest bit: what may come
-// after "-".
+// The bytes at which nothing stops after the end of a word have a bit, no matter which. The highest bit says
+// more: between commands it marks the digits, which may come after "-".
 constexpr unsigned kHighest = 128;
 constexpr NibbleTables kBetweenTables({{1, "46", kLettersLessC},
                                        {2, "57", kLettersLessS},
@@ -87,7 +85,7 @@ constexpr NibbleTables kBetweenTables({{1, "46", kLettersLessC},
                                        {32, "3", "b"},
                                        {kHighest, "3", kDigits}});
 
-// In a command, ";" has it: what stops wherever it stands.
+// In a command the highest bit marks ";", which stops wherever it stands.
 constexpr NibbleTables kInCommandTables({{1, "46", kLettersLessC},
                                          {2, "57", kLettersLessS},
                                          {4, "0", kControls},
@@ -96,7 +94,7 @@ constexpr NibbleTables kInCommandTables({{1, "46", kLettersLessC},
                                          {32, "3", kDigits},
                                          {kHighest, "3", "b"}});
 
-// The tables hold what the one table of classes does.
+// Whether the tables agree with kByteClasses.
 constexpr bool TablesAgree() {
   for (unsigned byte = 0; byte < 256; ++byte) {
     const char c = static_cast<char>(byte);
@@ -116,8 +114,8 @@ constexpr bool TablesAgree() {
 }
 static_assert(TablesAgree());
 
-// The bytes that end a word, each at the place of its low nibble: a byte ends a word where this gives it
-// back. Entry 0 is a blank; no other byte gives back the zeros.
+// The bytes that end a word, each at the index of its low nibble: a byte ends a word when the entry at its
+// low nibble equals it. Entry 0 is a blank; the zeros equal no byte that looks them up.
 alignas(16) constexpr char kWordEnds[16] = {' ', 0, 0, 0, 0, 0, 0, 0, 0, '\t', '\n', ';', 0, '\r', 0, 0};
 
 // ---- The processor ----
@@ -167,13 +165,13 @@ TARGET_AVX2 inline void ClassifyHalf(const char* at, int shift, BlockMasks* mask
 // A byte that may stop has its highest bit set.
 template <SkipWhere kWhere>
 TARGET_AVX2 inline __m256i MayStop(const char* at, __m256i bytes) {
-  constexpr bool inCommand = kWhere == SkipWhere::InCommand;
+  constexpr bool kInCommand = kWhere == SkipWhere::InCommand;
   const __m256i before = Load(at - 1);
   const __m256i afterEnd = _mm256_cmpeq_epi8(_mm256_shuffle_epi8(TableOf(kWordEnds), before), before);
-  const __m256i classes = LookUp(inCommand ? kInCommandTables : kBetweenTables, bytes);
-  const __m256i loud = _mm256_and_si256(afterEnd, _mm256_cmpeq_epi8(classes, _mm256_setzero_si256()));
-  if constexpr (inCommand) return _mm256_or_si256(loud, classes);
-  return _mm256_or_si256(loud, _mm256_andnot_si256(classes, Equal(before, '-')));
+  const __m256i classes = LookUp(kInCommand ? kInCommandTables : kBetweenTables, bytes);
+  const __m256i stops = _mm256_and_si256(afterEnd, _mm256_cmpeq_epi8(classes, _mm256_setzero_si256()));
+  if constexpr (kInCommand) return _mm256_or_si256(stops, classes);
+  return _mm256_or_si256(stops, _mm256_andnot_si256(classes, Equal(before, '-')));
 }
 
 struct Avx2 {
@@ -185,8 +183,8 @@ struct Avx2 {
   }
 
   template <SkipWhere kWhere>
-  TARGET_AVX2 [[gnu::noinline]] static const char* PassQuiet(const char* block, const char* end,
-                                                             std::int32_t* lines) {
+  TARGET_AVX2 [[gnu::noinline]] static const char* SkipWithoutStops(const char* block, const char* end,
+                                                                    std::int32_t* lines) {
     constexpr std::ptrdiff_t kMostBlocks = 255 / 2;  // each adds up to 2 to a counter
     for (;;) {
       const char* const last = block + std::min((end - block) / kSkipBlock, kMostBlocks) * kSkipBlock;

@@ -1,4 +1,4 @@
-// The loop that every TextSkipper in blocks runs around its own classification of 64 bytes.
+// The loop of every TextSkipper that works in blocks, around its own classification of 64 bytes.
 //
 // A block becomes masks with a bit for each byte, the first byte in the lowest bit. With sixteen bytes, the
 // lowest bit on the left, a "." for a 0, and "_" for a blank:
@@ -43,14 +43,14 @@ enum class SkipWhere { BetweenCommands, InCommand };
 // `Processor` has two functions of its own:
 //
 //   BlockMasks Classify(block)                   of the 64 bytes of a block
-//   const char* PassQuiet<kWhere>(block, end, lines)
+//   const char* SkipWithoutStops<kWhere>(block, end, lines)
 //
-// PassQuiet decides in vector registers that nothing stops in a block, which is so for most of them: it
-// passes over such blocks and returns the first one in which something may stop, or which is not whole. A "-"
-// is looked at together with the byte after it, so that one at the very end is left open. The bytes before
-// those of a block are a second load, one byte earlier, and part of the text. Line feeds are counted by
-// subtracting a comparison, 0 or -1 in each byte, from a vector of counters, which is emptied before one of
-// them is full.
+// SkipWithoutStops skips the blocks in which nothing can stop, which are most of them, and decides that in
+// vector registers. It returns the first block in which something may stop, or which is not whole. A "-" is
+// judged together with the byte after it, so the last byte of a block is left to the caller. The byte before
+// each byte of a block comes from a second load, one byte earlier, which is still part of the text. Line
+// feeds are counted by subtracting a comparison, 0 or -1 in each byte, from a vector of counters, which is
+// emptied before one of them is full.
 template <SkipWhere kWhere, typename Processor>
 [[gnu::always_inline]] inline const char* SkipBlocks(const char* position, const char* end,
                                                      std::int32_t* lines) {
@@ -68,10 +68,10 @@ template <SkipWhere kWhere, typename Processor>
       return block + at;
     }
     *lines += std::popcount(masks.lineFeed);
-    block = Processor::template PassQuiet<kWhere>(block + kSkipBlock, end, lines);
+    block = Processor::template SkipWithoutStops<kWhere>(block + kSkipBlock, end, lines);
     if (block[-1] == '-') --block;  // whether it stops depends on what comes after it
   }
-  // A word that the last block cuts is left to be read whole.
+  // A word that the last block cuts is left to the reader.
   if (!startsWord()) {
     while (block != position && !IsWordEnd(block[-1])) --block;
   }

@@ -31,7 +31,7 @@ __m128i Load(const char* at) { return _mm_loadu_si128(reinterpret_cast<const __m
 struct Sse2 {
   static BlockMasks Classify(const char* block);
   template <SkipWhere kWhere>
-  static const char* PassQuiet(const char* block, const char* end, std::int32_t* lines);
+  static const char* SkipWithoutStops(const char* block, const char* end, std::int32_t* lines);
 };
 
 BlockMasks Sse2::Classify(const char* block) {
@@ -61,14 +61,14 @@ BlockMasks Sse2::Classify(const char* block) {
 template <SkipWhere kWhere>
 __m128i MayStop(const char* at, __m128i bytes, __m128i lineFeed) {
   const __m128i before = Load(at - 1);
-  // Vertical tab and form feed among them, after which nothing starts: that is found out with masks.
+  // Vertical tab and form feed are among them, though no word starts after those. The masks sort that out.
   const __m128i control = InRange(before, '\t', '\r' - '\t' + 1);
   const __m128i afterEnd = Either(control, Either(Equal(before, ' '), Equal(before, ';')));
   const __m128i semicolon = Equal(bytes, ';');
   const __m128i space =
       Either(Either(Equal(bytes, ' '), Equal(bytes, '\t')), Either(lineFeed, Equal(bytes, '\r')));
   const __m128i letter = InRange(Either(bytes, _mm_set1_epi8(0x20)), 'a', 26);
-  // The only ones that 0x30 makes an "s" of are c, s, C and S.
+  // Setting the bits of 0x30 makes "s" of c, s, C and S, and of no other byte.
   const __m128i keywordStart = Equal(Either(bytes, _mm_set1_epi8(0x30)), 's');
   const __m128i word = _mm_andnot_si128(keywordStart, letter);
   if constexpr (kWhere == SkipWhere::InCommand) {
@@ -76,13 +76,14 @@ __m128i MayStop(const char* at, __m128i bytes, __m128i lineFeed) {
     return Either(semicolon, _mm_andnot_si128(Either(space, Either(word, numeral)), afterEnd));
   } else {
     const __m128i numeral = _mm_andnot_si128(Equal(bytes, '/'), InRange(bytes, '-', '9' - '-' + 1));
-    const __m128i quiet = Either(Either(space, semicolon), Either(word, numeral));
-    return Either(_mm_andnot_si128(quiet, afterEnd), _mm_andnot_si128(numeral, Equal(before, '-')));
+    const __m128i harmless = Either(Either(space, semicolon), Either(word, numeral));
+    return Either(_mm_andnot_si128(harmless, afterEnd), _mm_andnot_si128(numeral, Equal(before, '-')));
   }
 }
 
 template <SkipWhere kWhere>
-[[gnu::noinline]] const char* Sse2::PassQuiet(const char* block, const char* end, std::int32_t* lines) {
+[[gnu::noinline]] const char* Sse2::SkipWithoutStops(const char* block, const char* end,
+                                                     std::int32_t* lines) {
   constexpr std::ptrdiff_t kMostBlocks = 255 / 4;  // each adds up to 4 to a counter
   for (;;) {
     const char* const last = block + std::min((end - block) / kSkipBlock, kMostBlocks) * kSkipBlock;

@@ -9,7 +9,7 @@ namespace scan {
 const char* SkipBetweenCommandsSse2(const char* position, const char* end, std::int32_t* lines);
 const char* SkipInCommandSse2(const char* position, const char* end, std::int32_t* lines);
 
-// Only where HasAvx2.
+// Whether the processor has AVX2, BMI and POPCNT, which the two functions below need.
 bool HasAvx2();
 const char* SkipBetweenCommandsAvx2(const char* position, const char* end, std::int32_t* lines);
 const char* SkipInCommandAvx2(const char* position, const char* end, std::int32_t* lines);
