@@ -89,8 +89,8 @@ void MAYA_Parse::LookAtPass(VOR_Layer* layer, const MAYA_Camera* camera, std::in
   SetCameraLookAt(layer, camera, &record);
 }
 
-// By the transform that it turns, the first complete constraint. Gathered once, so that many cameras among
-// many transforms are not compared each with each.
+// Finds the first complete constraint of each transform that one turns. Done once, so that the time does not
+// grow with cameras times transforms.
 void MAYA_Parse::CollectConstraints() {
   const std::int64_t count = RecordCount(transforms);
   std::vector<std::int32_t> constraints(static_cast<std::size_t>(count), kNoIndex);

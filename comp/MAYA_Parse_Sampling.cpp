@@ -1,8 +1,8 @@
-// The keys of a node, by index: scenes are baked, so that the n-th key of every channel belongs to the n-th
-// time. Reads `curves`; calls the utility suite only to show a message.
+// The keys of a node, by index: scenes are baked, so the n-th key of every channel belongs to the n-th time.
+// Reads `curves`; calls the utility suite only to show a message.
 //
-// VerifyAnimInfo remembers what it found, so that the two others, which are called for every key, look at no
-// list again. They look for themselves where the node is another one.
+// VerifyAnimInfo remembers what it found, so that the two others, which are called for every key, need no
+// list. For another node they read the lists themselves.
 #include "maya/ListAccess.h"
 #include "maya/MAYA_Parse.h"
 #include "maya/NodeChannels.h"
@@ -26,8 +26,8 @@ T_Time MAYA_Parse::GetKeyTime(const MAYA_Transform* node, std::int32_t n) {
   return key != nullptr ? ConvertTime(key->time, n == 0 ? 1 : 0) : FetchKeyTime(*node, n);
 }
 
-// The time of the first channel that has a key n. Deliberate: a constant channel may lend its time to key 0
-// alone, so that later keys, measured from it, can lie before time 0.
+// The time of the first channel that has a key n. Deliberate: for key 0 that can be a constant channel, which
+// has no later keys. Those are measured from its time and can lie before time 0.
 T_Time MAYA_Parse::FetchKeyTime(const MAYA_Transform& node, std::int32_t n) {
   for (int slot = 0; slot < kChannelCount; ++slot) {
     const NodeChannels::Channel channel = NodeChannels::Find(curves, node.curve[slot]);

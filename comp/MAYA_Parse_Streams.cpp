@@ -9,7 +9,7 @@
 
 namespace {
 
-// A stream that is released at the latest when an exception passes.
+// Releases the stream at the end of its life, unless Release was called before.
 class StreamInUse {
  public:
   StreamInUse(QZGP_SuiteHandler& suites, VOR_Stream* handle) : suites_(suites), handle_(handle) {}
@@ -21,7 +21,7 @@ class StreamInUse {
 
   VOR_Stream* handle() const { return handle_; }
 
-  // An exception out of the release passes; it is not tried again.
+  // Lets an exception of the release through; the release is not tried again.
   void Release() {
     VOR_Stream* const handle = std::exchange(handle_, nullptr);
     if (handle != nullptr) suites_.StreamSuite7().ReleaseStream(handle);

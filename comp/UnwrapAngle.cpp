@@ -12,9 +12,9 @@ bool TurnChanges(double angle) {
   return std::isfinite(angle) && angle - kTurn != angle && angle + kTurn != angle;
 }
 
-// The angle moved by turns (of either sign) until few are left to the previous one. Between two powers of two
-// every turn changes a double by the same amount, so that as many as fit there are taken at once, and the
-// result has the bits of one turn at a time.
+// Moves the angle by turns (of either sign) until only a few are left to the previous one. Between two powers
+// of two every turn changes a double by the same amount, so all turns that fit there are taken at once. The
+// result is the same, to the last bit, as that of one turn at a time.
 [[gnu::noinline]] double TakeManyTurns(double angle, double previous, double turn) {
   while ((previous - angle) / turn > kFewTurns) {
     const double first = angle + turn;

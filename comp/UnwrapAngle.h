@@ -1,17 +1,17 @@
-// Keeps consecutive angles from turning through a whole revolution.
+// Shifts an angle by whole turns, so that it lies next to the one before.
 #pragma once
 
 #include <cmath>
 
 inline constexpr double kHalfTurn = 3.141592653589793;
 
-// The same for angles that lie half a turn apart or more.
+// As UnwrapAngle, for angles that lie half a turn apart or more.
 double UnwrapTurns(double angle, double previous);
 
 // The angle shifted by whole turns until it lies less than half a turn from the previous one (both in
-// radians; a difference of exactly half a turn is shifted too). Takes the same time for any number of turns.
+// radians; a difference of exactly half a turn is shifted too). The time is bounded for any number of turns.
 // An angle that is not finite, or so large that a turn no longer changes it, stays as it is.
 inline double UnwrapAngle(double angle, double previous) {
-  // As it is for nearly every key.
+  // So for nearly every key.
   return std::fabs(angle - previous) < kHalfTurn ? angle : UnwrapTurns(angle, previous);
 }

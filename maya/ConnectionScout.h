@@ -1,5 +1,5 @@
-// Looks ahead over the "connectAttr" commands that follow one another, so that the names they look up are in
-// the processor's caches when their turn comes. Gives hints to the processor and has no other effect.
+// Looks ahead over a run of "connectAttr" commands and prefetches the names that they look up into the
+// processor's caches. Gives hints to the processor and has no other effect.
 #pragma once
 
 #include <cstddef>
@@ -13,9 +13,9 @@ class ConnectionScout {
   void LookAhead(const char* position, const char* end, const NameIndex& curves, const NameIndex& transforms);
 
  private:
-  // Enough for one command's work to cover the wait for memory; more would be pushed out of the caches again.
-  static constexpr std::size_t kFar = 8;   // commands ahead where an index is asked for
-  static constexpr std::size_t kNear = 4;  // and where its name is
+  // Far enough for the work between to cover the wait for memory; what is fetched earlier is evicted again.
+  static constexpr std::size_t kFar = 8;   // commands ahead whose index entries are fetched
+  static constexpr std::size_t kNear = 4;  // commands ahead whose names are fetched
 
   struct Ends {
     std::uint32_t source = 0;  // hashes

@@ -35,7 +35,7 @@ void AppendRecord(RecordList** list, const Record& record) {
   ThrowOnError(RecordListAppend(*list, &record));
 }
 
-// Changes a record in its place. A list that hands out no address is taken as one without the record.
+// Changes a record in its place. Throws HOST_ERR_LIST_INDEX too when the list hands out no address.
 template <typename Record, typename Change>
 void ChangeRecord(RecordList* list, std::int64_t index, Change&& change) {
   void* record = nullptr;

@@ -39,7 +39,7 @@ constexpr std::size_t kLongestKeyword = std::ranges::max_element(kKeywords, {}, 
                                           return keyword.word.size();
                                         })->word.size();
 
-// Few keywords are of one length, and most words that are none are of a length that no keyword has.
+// At most two keywords have the same length, and most other words have a length that no keyword has.
 struct KeywordsOfLength {
   std::array<Keyword, 2> keywords{};
   std::size_t count = 0;
@@ -134,13 +134,13 @@ void MAYA_Lex::SkipHarmless() {
   SkipWhiteSpace();
   if (scan::IsAny(*position, scan::kKeywordStart | scan::kQuote))
     return;  // as a rule the next command begins here
-  static const scan::SkipText skip = scan::TextSkippers().back().betweenCommands;
-  tokenStart = position = skip(position, end_, &line);
+  static const scan::SkipText kSkip = scan::TextSkippers().back().betweenCommands;
+  tokenStart = position = kSkip(position, end_, &line);
 }
 
 void MAYA_Lex::SkipHarmlessInCommand() {
-  static const scan::SkipText skip = scan::TextSkippers().back().inCommand;
-  tokenStart = position = skip(position, end_, &line);
+  static const scan::SkipText kSkip = scan::TextSkippers().back().inCommand;
+  tokenStart = position = kSkip(position, end_, &line);
 }
 
 std::int32_t MAYA_Lex::SkipCharacters(const char* set) {
@@ -177,8 +177,8 @@ MayaToken MAYA_Lex::ParseComment() {
 }
 
 void MAYA_Lex::ParseLineComment() {
-  // Deliberate: a line comment that the text ends in is an error, and its line end is part of it. A scene cut
-  // off in its last comment is refused rather than taken for whole.
+  // Deliberate: a line comment that the text ends in is an error, and its line end is part of it. Otherwise a
+  // scene that was cut off in its last comment would be taken for a complete one.
   while (*position != '\n' && *position != '\r') {
     if (*position == '\0') FailAtEnd();
     ++position;
@@ -187,7 +187,7 @@ void MAYA_Lex::ParseLineComment() {
 
 void MAYA_Lex::ParseBlockComment() {
   // Deliberate: after a "*" the byte after it is consumed too, so that in "/***/" the closing pair is missed
-  // and the comment runs on. Looking for the plain pair would bring text to life that is commented out today.
+  // and the comment runs on. Looking for the plain pair would import text that is a comment today.
   ++position;
   for (;;) {
     ++position;
@@ -236,14 +236,15 @@ void MAYA_Lex::FailReading() {
 }
 
 void MAYA_Lex::FailAtEnd() {
-  // Of a token that is never closed, its beginning says more than the end of the text.
+  // The line of the token's beginning: of a string or a comment that is never closed it helps more than the
+  // end.
   NoteLine(kUnexpectedEnd, tokenStart);
   ReportError(LocalizedText(kUnexpectedEndMessage));
   ThrowCode(kUnexpectedEnd);
 }
 
-// Counted once, when it is needed: `line` leaves out what stands inside strings and comments. A line ends as
-// editors see it, with a line feed, a carriage return or both.
+// Counts the lines only here, after a failure: `line` leaves out what stands inside strings and comments. A
+// line ends as editors see it, with a line feed, a carriage return or both.
 void MAYA_Lex::NoteLine(std::int32_t code, const char* at) const {
   const char* place = std::min(at, end_);
   if (place == end_) {  // after the last line that holds something

@@ -51,11 +51,11 @@ class MAYA_Lex : public QZGP_SuiteHandler {
   // token starts.
   void SkipWhiteSpace();
 
-  // Moves over white space and whole words that are no keyword that acts, in bulk. What it passes over would
-  // have come as tokens that the main loop ignores; it stops before everything else.
+  // Skips, in bulk, white space and whole words that the main loop ignores. Stops before everything else, and
+  // may stop earlier.
   void SkipHarmless();
 
-  // The same inside a command of which only its end, strings, comments and options matter: stops before
+  // The same inside a command of which only the end, strings, comments and options matter: stops before
   // those, and before every word that begins with a "-".
   void SkipHarmlessInCommand();
 

@@ -99,7 +99,7 @@ void MAYA_Parse::BuildQuote(const char* first, const char* last, std::int32_t* l
   *length = static_cast<std::int32_t>(size);
 }
 
-// The next token of a command that is read up to its ";". The end of the text is an error there.
+// The next token inside a command. The end of the text is an error there.
 MayaToken MAYA_Parse::NextInCommand(const char** first, const char** last) {
   const MayaToken kind = GetNextToken(first, last);
   if (kind == EndOfFile) FailAtEnd();
@@ -114,8 +114,8 @@ double MAYA_Parse::ScanNumber(const char* first, const char* last) const {
   return value;
 }
 
-// Reads the plain numbers that stand here one after another, while there is room for them. Returns how many;
-// what is left is for GetNextToken and ScanNumber, which would have read the same numbers.
+// Reads the plain numbers that stand here one after another, while there is room for them. Returns how many.
+// GetNextToken and ScanNumber would give the same numbers; they read what is left.
 std::int64_t MAYA_Parse::ReadPlainNumbers(double* numbers, std::int64_t capacity) {
   constexpr char kCommandEnd = ';';
   std::int64_t count = 0;

@@ -32,7 +32,7 @@ class MAYA_Parse : public MAYA_Lex {
   // Reads the whole text. Records made before a failure stay.
   void Parse();
 
-  // Takes "setAttr" to the parser of the current node; a kind without attributes reads nothing.
+  // Calls the "setAttr" parser of the current node's kind; a kind without attributes reads nothing.
   void ParseSetAttr();
 
   // Commands that change nothing.

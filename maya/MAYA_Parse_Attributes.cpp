@@ -11,12 +11,12 @@
 
 namespace {
 
-// The triples of a transform, and what a component is that the command does not give.
+// The triples of a transform.
 struct TripleAttribute {
   std::string_view shortName;
   std::string_view longName;
   double (MAYA_Transform::*field)[kAxisCount];
-  double start;
+  double start;  // of a component that the command does not give
 };
 
 constexpr TripleAttribute kTriples[] = {
@@ -50,7 +50,7 @@ CameraAttribute FindCameraAttribute(std::string_view name) {
   return CameraAttribute::None;
 }
 
-// The file's values of the film fit that are looked at.
+// The values of the film fit that the importer distinguishes.
 constexpr double kHorizontalFit = 1.0;
 constexpr double kVerticalFit = 2.0;
 
@@ -101,7 +101,7 @@ void MAYA_Parse::ParseCameraSetAttr() {
   const char* last = nullptr;
   MayaToken kind = GetNextToken(&first, &last);
   if (kind == Option) {
-    // Deliberate: one option and the token after it are passed over, whatever that token is.
+    // Deliberate: one option and the token after it are skipped, whatever that token is.
     GetNextToken(&first, &last);
     kind = GetNextToken(&first, &last);
   }
@@ -148,8 +148,8 @@ bool MAYA_Parse::ReadOrthographic() {
   return found;
 }
 
-// Reads on to the ";". The first numbers go to `values`; later ones are not looked at, so that they cannot
-// fail. Returns how many were taken.
+// Reads on to the ";". The first numbers go to `values`; later ones are not converted, so they cannot fail.
+// Returns how many were taken.
 std::int64_t MAYA_Parse::ReadNumbers(double* values, std::int64_t capacity) {
   const char* first = nullptr;
   const char* last = nullptr;

@@ -19,8 +19,8 @@ constexpr ChannelName kChannels[kChannelCount] = {
     {"rz", "rotateZ"},    {"sx", "scaleX"},     {"sy", "scaleY"},     {"sz", "scaleZ"},
 };
 
-// What a constraint turns its object through. Deliberate: the axes of the constraint vector have no short
-// forms of their own; "crx", "cry" and "crz" serve them too, and "cvx" means nothing.
+// The outputs by which a constraint turns its object. Deliberate: the axes of the constraint vector have no
+// short names of their own; "crx", "cry" and "crz" serve them too, and "cvx" means nothing.
 constexpr std::string_view kTurningOutputs[] = {
     "constraintRotate",  "cr",  "constraintRotateX", "crx", "constraintRotateY", "cry",
     "constraintRotateZ", "crz", "constraintVector",  "cv",  "constraintVectorX", "constraintVectorY",

@@ -18,7 +18,7 @@ bool NamesKeys(std::string_view text) {
   return text.find(".ktv") != std::string_view::npos || text.find(".keyTimeValue") != std::string_view::npos;
 }
 
-// How many more keys to make room for, where so many were read: as many as the command says, but never more
+// How many more keys to make room for after `read` of them: as many as the command announces, but never more
 // than the rest of its own text could hold.
 std::int64_t MoreKeys(std::string_view keyCount, std::int64_t read, const char* keys, const char* end) {
   constexpr std::int64_t kShortestKey = 4;  // two digits and two blanks
@@ -33,14 +33,14 @@ std::int64_t MoreKeys(std::string_view keyCount, std::int64_t read, const char* 
 }  // namespace
 
 void MAYA_Parse::ParseAnimSetAttr() {
-  channels_ = NodeChannels();  // keys move when they grow in number
+  channels_ = NodeChannels();  // a list that grows moves its keys
   std::string_view keyCount;
   if (FindKeyAttribute(&keyCount)) ReadKeys(keyCount);
   WriteBackCurve();
 }
 
-// As WriteBack. The record may have held other keys, those of another curve of its name; nobody holds them
-// then.
+// As WriteBack. The record may have held other keys, those of another curve of its name: they are disposed
+// of.
 void MAYA_Parse::WriteBackCurve() {
   if (currentRecord_ == kNoIndex) return;
   ChangeRecord<MAYA_AnimCurve>(curves, currentRecord_, [&](MAYA_AnimCurve& target) {
@@ -49,9 +49,9 @@ void MAYA_Parse::WriteBackCurve() {
   });
 }
 
-// Reads to after the key attribute; hands out the last number before it, the key count as a rule. Numbers
-// after another attribute are passed over, so that the count is then unknown, and no room is made before it
-// is needed. False when the command ends without one.
+// Reads to after the key attribute. Hands out the last number before it, as a rule the key count. Numbers
+// after another attribute are skipped; the count is then unknown, which only means that no room is made
+// ahead. False when the command ends without a key attribute.
 bool MAYA_Parse::FindKeyAttribute(std::string_view* lastNumber) {
   bool otherAttribute = false;
   for (;;) {
@@ -98,10 +98,9 @@ void MAYA_Parse::ReadKeys(std::string_view keyCount) {
   }
 }
 
-// Reads the keys that stand here as plain numbers, many at a time; the rest is read token by token. True when
-// a time is left over, whose value is no plain number. Most curves end within the first run, whose keys then
-// are all that there will be; the text after it is not looked through for the end of the command before it is
-// read.
+// Reads the keys that stand here as plain numbers, many at a time; the caller reads the rest token by token.
+// True when a time is left over whose value is not a plain number. Most curves end within the first run, so
+// only after a full run the text is searched for the end of the command.
 bool MAYA_Parse::ReadPlainKeys(std::string_view keyCount, double* time) {
   constexpr std::int64_t kRun = 256;
   static_assert(sizeof(MAYA_Key) == 2 * sizeof(double) && offsetof(MAYA_Key, time) == 0 &&
@@ -120,7 +119,8 @@ bool MAYA_Parse::ReadPlainKeys(std::string_view keyCount, double* time) {
   return true;
 }
 
-// Appends records of MAYA_Key to the current curve, whose list is made on first use, with room for so many.
+// Appends `count` records of MAYA_Key to the current curve. Its list is made on first use, with room for
+// `room` keys.
 void MAYA_Parse::AppendKeys(const void* keys, std::int64_t count, std::int64_t room) {
   RecordList** const list = &current.curve.keys;
   if (*list == nullptr) {

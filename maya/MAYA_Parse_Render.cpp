@@ -40,7 +40,8 @@ void MAYA_Parse::ParseSelect() {
   for (;;) {
     MayaToken kind = NextInCommand(&first, &last);
     if (kind == Option) continue;
-    // Deliberate: what stands after a colon and is not the render node clears nothing, a ";" included.
+    // Deliberate: after a colon only the render node has an effect. Any other token there, also ";", leaves
+    // the current node as it is.
     const bool afterColon = kind == Colon;
     if (afterColon) kind = NextInCommand(&first, &last);
     if (kind == Identifier && SameWord(WordText(first, last), kRenderNode)) {

@@ -36,7 +36,7 @@ std::uint64_t LoadUpToEight(std::string_view text) {
   return bytes;
 }
 
-// The halves of the words of a name, and its length.
+// The parts of a hash: the halves of the words of a name, and its length.
 constexpr std::size_t kMostParts = kNameCapacity / sizeof(std::uint32_t) + 1;
 using Multipliers = std::array<std::uint64_t, kMostParts>;
 
@@ -45,7 +45,7 @@ Multipliers DrawMultipliers() {
   std::uint64_t seed =
       static_cast<std::uint64_t>(std::chrono::steady_clock::now().time_since_epoch().count()) ^
       reinterpret_cast<std::uintptr_t>(&kFirstCapacity);
-  // Without a source of chance, the time and the place in memory have to do.
+  // Without a source of random numbers the time and the address have to suffice.
   Unreported([&] {
     std::random_device device;
     seed ^= (std::uint64_t{device()} << 32) | device();
@@ -56,15 +56,15 @@ Multipliers DrawMultipliers() {
   return multipliers;
 }
 
-// A hash is the upper half of a sum of the parts, each times a number of its own that nobody knows
-// beforehand. Two names meet by a chance of about one in 2^31 whatever they are, so that no scene can bring
-// names that all meet in one place, as it could with a mixing of known steps.
+// A hash is the upper half of the sum of the parts, each times a random multiplier. Two names collide with a
+// probability of about 2^-31, whatever they are. So no scene can hold names that all collide, as it could if
+// the hash were known beforehand.
 const Multipliers& MultipliersOfThisRun() {
-  static const Multipliers multipliers = DrawMultipliers();
-  return multipliers;
+  static const Multipliers kMultipliers = DrawMultipliers();
+  return kMultipliers;
 }
 
-// Keeps what differs different, and scatters the sums of names that are numbered in a row.
+// A bijection that spreads the sums of names which differ only in a number.
 std::uint32_t Scatter(std::uint32_t sum) {
   sum = (sum ^ (sum >> 16)) * 0x85ebca6bu;
   sum = (sum ^ (sum >> 13)) * 0xc2b2ae35u;

@@ -6,20 +6,19 @@
 #include <vector>
 
 // Knows, for one list of named records, the first record of every name. Names are shorter than a record's
-// name field, and are taken without regard to case. The index keeps them itself, close together: a look into
-// the records, half a kilobyte each, would miss the processor's caches for every name.
+// name field, and are compared without regard to case. The index keeps copies, close together: reading them
+// from the records, half a kilobyte each, would miss the processor's caches for every name.
 class NameIndex {
  public:
-  // Takes in the record of that name which was just appended to the list at `index`. Returns the first record
-  // of the name, which is the new one where the name is new. May throw std::bad_alloc; the index is then
-  // unchanged.
+  // Adds the record that was just appended to the list at `index`. Returns the first record of the name,
+  // which is this one when the name is new. May throw std::bad_alloc; what Find returns is then unchanged.
   std::int32_t Append(std::int32_t index, std::string_view name);
 
   // The first record of that name, or kNoIndex.
   std::int32_t Find(std::string_view name) const;
 
-  // For a caller that knows what will be looked up: what Find will need first, and, a while later, what it
-  // will need then. Hints; the name of a hash is shorter than a record's name field, as above.
+  // For a caller that knows which names it will look up: prefetches what Find reads first, and, a while
+  // later, what it reads then. Hints; a name that is hashed is shorter than a record's name field.
   static std::uint32_t Hash(std::string_view name);
   void PrefetchEntry(std::uint32_t hash) const;
   void PrefetchName(std::uint32_t hash) const;

@@ -27,7 +27,7 @@ bool NodeChannels::TakeNext(const RecordList* curves, const MAYA_Transform& node
 }
 
 void NodeChannels::FetchRuns() {
-  if (samplesAtHand_ != 0) return;
+  if (fetchedSamples_ != 0) return;
   for (Channel& channel : channels_) {
     if (channel.count == 0) continue;
     const void* run = nullptr;
@@ -35,5 +35,5 @@ void NodeChannels::FetchRuns() {
     if (run == nullptr) return;
     channel.run = static_cast<const MAYA_Key*>(run);
   }
-  samplesAtHand_ = static_cast<std::uint32_t>(sharedCount_);
+  fetchedSamples_ = static_cast<std::uint32_t>(sharedCount_);
 }

@@ -1,9 +1,8 @@
-// The keys of the nine channels of one node, at hand in one piece each, so that they can be read one after
-// the other without their lists.
+// Remembers where the keys of the nine channels of one node lie, so that they can be read without a call of
+// the list for each key.
 //
 // The node is recognised by its nine curve indices, never by its address: copies of one record are one node,
-// and another record at the same address is another. This stands beside the records, below what reads it,
-// because the parser keeps one.
+// and another record at the same address is another. The class is in this room because the parser keeps one.
 #pragma once
 
 #include <array>
@@ -18,8 +17,8 @@ class NodeChannels {
   struct Channel {
     const RecordList* keys = nullptr;  // null when the channel has no curve, or its curve no keys
     std::int64_t count = 0;
-    const MAYA_Key* run = nullptr;  // all of them in one place, once they are at hand
-    std::int64_t step = 0;  // from one sample to the next: 0 where the one key is that of every sample
+    const MAYA_Key* run = nullptr;  // all of them, one after the other; null until FetchRuns
+    std::int64_t step = 0;          // keys from one sample to the next; 0 for a constant channel
   };
 
   // Of a node without curves.
@@ -35,6 +34,7 @@ class NodeChannels {
   // The key count of the channels that have two keys or more; 0 when none has.
   std::int32_t sharedCount() const { return static_cast<std::int32_t>(sharedCount_); }
 
+  // Whether these are the channels of the node.
   bool AreOf(const MAYA_Transform& node) const {
     std::uint32_t difference = 0;
     for (std::size_t slot = 0; slot < kChannelCount; ++slot) {
@@ -43,12 +43,12 @@ class NodeChannels {
     return difference == 0;
   }
 
-  // Brings the keys of all channels to hand, where any is animated. Throws the list's code; then none is at
-  // hand, nor where a list hands nothing out. They are at hand until a curve's keys change.
+  // Fetches the keys of all channels, where any is animated. Throws the list's code. After a failure, or when
+  // a list hands nothing out, FindTime and Extract find nothing. Valid until a curve's keys change.
   void FetchRuns();
 
   // The key whose time sample n has: that of the first channel with a key n. Null when the node is another
-  // one, or its keys are not at hand.
+  // one, or its keys are not fetched.
   const MAYA_Key* FindTime(const MAYA_Transform& node, std::int32_t n) const {
     if (!Hold(node, n)) return nullptr;
     const Channel* channel = channels_.data();
@@ -57,7 +57,7 @@ class NodeChannels {
   }
 
   // Overwrites the axes of the group that have keys with those of sample n. False, and nothing written, when
-  // the node is another one, or its keys are not at hand.
+  // the node is another one, or its keys are not fetched.
   bool Extract(const MAYA_Transform& node, std::int32_t group, std::int32_t n,
                double (&values)[kAxisCount]) const {
     if (!Hold(node, n)) return false;
@@ -70,11 +70,11 @@ class NodeChannels {
 
  private:
   bool Hold(const MAYA_Transform& node, std::int32_t n) const {
-    return static_cast<std::uint32_t>(n) < samplesAtHand_ && AreOf(node);
+    return static_cast<std::uint32_t>(n) < fetchedSamples_ && AreOf(node);
   }
 
   std::array<std::int32_t, kChannelCount> curves_;
-  std::uint32_t samplesAtHand_ = 0;
+  std::uint32_t fetchedSamples_ = 0;
   std::array<Channel, kChannelCount> channels_;
   std::size_t taken_ = 0;  // channels
   std::int64_t sharedCount_ = 0;

@@ -14,7 +14,7 @@ inline constexpr HostError kReadingError = HOST_ERR_MAYA_SYNTAX;
 inline constexpr HostError kUnexpectedEnd = HOST_ERR_MAYA_UNEXPECTED_END;
 inline constexpr HostError kInconsistentKeys = HOST_ERR_MAYA_KEY_COUNTS;
 
-// Throws the code as a bare integer, also where it is 0: an object that was not made, with no word why.
+// Throws the code as a bare integer. It may be 0: a host call failed to make an object and gave no reason.
 [[noreturn]] inline void ThrowCode(HostError code) { throw int{code}; }
 
 // Throws a code that is not 0.

@@ -26,8 +26,9 @@ HostError Guarded(Work&& work) {
   }
 }
 
-// The same where nothing may get out: at the C border, and in a destructor while an exception passes. What is
-// neither an integer nor a standard exception is HOST_ERR_EXCEPTION_OTHER, without a message.
+// The same where no exception may leave: at the C border, and while another exception is in flight. An
+// exception that is neither an integer nor a standard one becomes HOST_ERR_EXCEPTION_OTHER, without a
+// message.
 template <typename Work>
 HostError GuardedAtBorder(Work&& work) {
   try {
@@ -37,7 +38,8 @@ HostError GuardedAtBorder(Work&& work) {
   }
 }
 
-// Runs work whose failure nobody reports: a standard exception ends it, and that is all.
+// Runs work whose failure is not reported: a standard exception ends it and is dropped. Any other exception
+// passes through.
 template <typename Work>
 void Unreported(Work&& work) {
   try {

@@ -62,7 +62,7 @@ class FileBuffer {
   const char* text() const { return text_; }
   const char* end() const { return text_ != nullptr ? text_ + size_ : nullptr; }
 
-  // Unlocks and frees the buffer; the one is done also when the other throws.
+  // Unlocks and frees the buffer; frees it also when the unlock throws.
   HostError Release() {
     if (handle_ == nullptr) return kNoError;
     HostError kept = Guarded([&] { suites_.MemorySuite1().UnlockMemHandle(handle_); });
@@ -109,8 +109,8 @@ void ParseAndBuild(const FileBuffer& buffer, HostFile* file, VOR_Item* folder) {
   parser.MakeComp(folder, name.get());
 }
 
-// An exception that Guarded lets through leaves what is open open, the buffer too, but for the parser and the
-// suites; the callback makes a code of it.
+// After an exception that Guarded does not catch, the parser and the suites are released, but the buffer
+// stays allocated. The callback turns the exception into a code.
 HostError Import(const HostUTF16Unit* path, VOR_Item* folder) {
   QZGP_SuiteHandler suites(G_basic_suiteP);
   FileBuffer buffer(suites);

@@ -10,8 +10,7 @@ constexpr const char* kEntries[] = {
     "$$$/QZ/Maya_Import/LStr/0002=^^1: ^^2",
     "$$$/QZ/Maya_Import/LStr/0003=Error reading Maya file.",
     "$$$/QZ/Maya_Import/LStr/0004=Unexpected end of maya file.",
-    // Deliberate: the spelling "Inconsistant". Mended, a search for this text
-    // would not find it.
+    // Deliberate: the spelling "Inconsistant". A search for the text as users see it finds it only so.
     "$$$/QZ/Maya_Import/LStr/0005=Inconsistant number of keyframes for Maya camera.",
     "$$$/QZ/Maya_Import/LStr/0006=Square",
     "$$$/QZ/Maya_Import/LStr/0007=^^1 ^^2",

@@ -19,8 +19,8 @@ enum MessageId : std::int32_t {
   kSquareNamePattern = 7,        // "^^1 ^^2"
 };
 
-// The longest message that is shown where it is formatted or copied first, its NUL included. The reader and
-// the key count hand theirs to the host as they stand in the table.
+// The buffer, its NUL included, of messages that are formatted or copied first; longer ones are not shown.
+// The reader and the key count pass theirs to the host straight from the table, whatever their length.
 inline constexpr std::int64_t kMessageCapacity = 1024;
 
 // Registers the table "Maya_Import" with the host and remembers it in Maya_Import_G_zref.

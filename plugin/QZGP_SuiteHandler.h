@@ -23,8 +23,8 @@ class QZGP_SuiteHandler {
   explicit QZGP_SuiteHandler(const WNBasicSuite* basicSuite);
 
   // Releases every suite that was acquired, in the order of the accessors below. Deliberate: an exception
-  // out of a release ends the process; a destructor that swallowed it would leave the host with a count that
-  // nobody can mend.
+  // out of a release ends the process; a destructor that dropped it would leave the host with a wrong count
+  // of acquisitions for good.
   ~QZGP_SuiteHandler();
 
   QZGP_SuiteHandler(const QZGP_SuiteHandler&) = delete;
