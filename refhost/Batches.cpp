@@ -26,8 +26,8 @@ void dropKeysWithoutValue(Batch& batch) {
   batch.values.resize(kept * dimension);
 }
 
-// Whether the times have one scale and grow. Looks at all of them, so that the compiler can take several at a
-// time.
+// Whether the times have one scale and grow. Compares all of them without a branch, so that the compiler can
+// use vector instructions.
 bool isPlainlyAscending(const std::vector<T_Time>& times) {
   unsigned inOrder = times.front().scale != 0 ? 1 : 0;
   for (std::size_t i = 1; i < times.size(); ++i) {
@@ -81,7 +81,7 @@ void Batch::clear() {
   endFailed = false;
 }
 
-void Batch::setValueApart(std::size_t index, const double* value) {
+void Batch::setValueSlowly(std::size_t index, const double* value) {
   if (index == nextValued) {
     values.makeRoom(kMostDimensions);
     return setValue(index, value);
@@ -111,7 +111,7 @@ void commitKeys(Batch& batch, std::unique_ptr<KeyColumns>& keys, KeyTimes* ascen
   std::vector<double> values;
   if (keys != nullptr) values = std::move(keys->values);
   values.insert(values.end(), batch.values.begin(), batch.values.end());
-  if (keys == nullptr && ascending->are(batch.times.begin(), batch.times.size())) {
+  if (keys == nullptr && ascending->equal(batch.times.begin(), batch.times.size())) {
     keys = std::make_unique<KeyColumns>(KeyColumns{*ascending, std::move(values)});
     return;
   }

@@ -1,4 +1,4 @@
-// Keyframe batches: keys that wait for the commit, in columns.
+// Keyframe batches: keys that are not committed yet, in columns.
 #pragma once
 
 #include <cstddef>
@@ -18,26 +18,26 @@ struct Batch {
   Layer* layer = nullptr;
   Stream* stream = nullptr;
   Column<T_Time> times;
-  Column<double> values;  // dimension numbers per key, as far as keys got values
-  // Which keys have a value, 1 or 0. Empty as long as they got theirs in their order: those that `values`
-  // holds.
+  Column<double> values;  // `dimension` numbers for each key that has a value
+  // 1 for each key that has a value, else 0. Empty while values come in the order of the keys: then the first
+  // `nextValued` keys have one.
   std::vector<std::uint8_t> valued;
-  std::size_t nextValued = 0;  // the key whose turn it is to get its value; none when they came out of order
+  std::size_t nextValued = 0;  // the next key to get a value, or kOutOfOrder once they came out of order
   bool endFailed = false;      // a rehearsal made its EndKeyframeBatch fail
 
   static constexpr std::size_t kOutOfOrder = SIZE_MAX;
   static constexpr std::size_t kMostDimensions = 3;
 
-  // There is room for the key in `times`.
+  // Adds a key without a value. `times` must have room for it.
   void addKey(const T_Time& time) {
     *times.next() = time;
     times.advance(1);
   }
 
-  // Gives the key of that index, which is there, its value: as many of the three numbers as the stream has.
+  // Gives an existing key its value: as many of the three numbers as the stream has dimensions.
   void setValue(std::size_t index, const double* value) {
     if (index != nextValued || !values.hasRoom(kMostDimensions)) [[unlikely]]
-      return setValueApart(index, value);
+      return setValueSlowly(index, value);
     double* const next = values.next();
     next[0] = value[0];
     next[1] = value[1];
@@ -50,14 +50,14 @@ struct Batch {
   void clear();
 
  private:
-  // Where there is no room, or it is not the key's turn.
-  [[gnu::cold]] void setValueApart(std::size_t index, const double* value);
+  // Handles a key out of order, and values without room.
+  [[gnu::cold]] void setValueSlowly(std::size_t index, const double* value);
 };
 
-// Takes the keys of the batch into the columns (null: there are none yet): sorted by time, stably, of equal
-// times the later stays (those of the batch are later than those that are there), keys without a value
-// dropped. Key times that are those of `ascending`, the times that were taken last, are shared with them; it
-// becomes the times that were taken now. The batch is spent afterwards.
+// Merges the keys of the batch into the columns (null: there are none yet): sorted by time, stably. Of keys
+// at equal times the later one stays, and those of the batch are later; keys without a value are dropped.
+// `ascending` holds the times of the last commit: equal times are shared with it, and it becomes the times of
+// this commit. The batch must not be used afterwards.
 void commitKeys(Batch& batch, std::unique_ptr<KeyColumns>& keys, KeyTimes* ascending);
 
 }  // namespace refhost

@@ -8,7 +8,7 @@
 namespace refhost {
 namespace {
 
-// What nobody else can catch by its type.
+// No code outside this file can name it in a catch.
 struct OtherException {};
 
 }  // namespace

@@ -1,8 +1,8 @@
 // One suite call, from its count to its line in the trace.
 //
 // A thunk makes a Call, does its work when goesOn() says so, describes itself when traced() says so, and
-// returns finish(). The work refuses what breaks a promise: each refusal has a code and a sentence. finish()
-// throws when the rehearsal asked for an exception, so nothing that has to happen may come after it.
+// returns finish(). The work refuses what breaks the contract of the operation: each refusal has a code and a
+// sentence. finish() throws when the rehearsal asks for an exception, so it comes last.
 //
 // The operations that an import makes for every key are Calls too, but only where one is rehearsed or traced;
 // see perform() below.
@@ -21,8 +21,8 @@ namespace refhost {
 // The number of the one preference store, in its handle.
 inline constexpr std::size_t kStoreNumber = 1;
 
-// Refusals of the live host: each keeps the sentence, begun with the operation's name, and gives the code.
-// `what` names the part of the call that is refused, such as "the parent".
+// Refusals of the live host: each records a sentence that begins with the operation's name, and returns the
+// code. `what` names the part of the call that is refused, such as "the parent".
 [[gnu::cold]] HostError refuse(Operation operation, HostError code, const std::string& sentence);
 [[gnu::cold]] HostError refuseHandle(Operation operation, const void* handle, HandleKind wanted,
                                      const char* what);
@@ -49,7 +49,7 @@ class Call {
     return false;
   }
 
-  // Of a call that did nothing, and returns 0.
+  // Sets the places to null and 0, unless the call fails.
   template <typename... Outs>
   void handOutNothing(Outs*... outs) {
     if (!failed()) ((outs != nullptr ? void(*outs = Outs{}) : void()), ...);
@@ -63,7 +63,7 @@ class Call {
     error_ = refhost::refuse(operation_, code, sentence);
   }
 
-  // The code is the call's, whether it is a refusal's or that of nobody's broken promise.
+  // Makes the call return the code, without a sentence of its own.
   void fail(HostError code) { error_ = code; }
 
   // The objects of handles. Null after a refusal that says what is wrong; `what` names the handle's part
@@ -131,7 +131,7 @@ class Call {
   bool rehearsed_ = false;
 };
 
-// As perform() does an operation that is rehearsed or traced.
+// perform() for an operation that is rehearsed or traced.
 template <typename Task, typename... Arguments>
 [[gnu::cold, gnu::noinline]] HostError performWatched(Arguments... arguments) {
   Call call(Task::kOperation);
@@ -144,10 +144,10 @@ template <typename Task, typename... Arguments>
   return call.finish();
 }
 
-// An operation that is made for every key; the table of its suite holds it as it is. A task has the
-// operation's number and does it in three parts: work() is the operation and gives its code, idle() is for a
-// call that the rehearsal has do nothing, describe() adds the arguments to the trace. work() ends where it
-// refuses, so that an ordinary call makes no other and needs no stack.
+// An operation that imports call for every key; its suite's table holds perform<Task> itself. A task has the
+// operation's number and three functions: work() does the operation and returns its code, idle() is for a
+// call that does nothing in a rehearsal, describe() adds the arguments to the trace. work() tail-calls its
+// refusals, so that an ordinary call needs no stack.
 template <typename Task, typename... Arguments>
 HostError perform(Arguments... arguments) {
   HostState& host = HostState::live();

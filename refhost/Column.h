@@ -1,4 +1,4 @@
-// A row of plain values that grows at its end and keeps its memory when it is cleared.
+// An array of plain values that grows at its end and keeps its memory when it is cleared.
 #pragma once
 
 #include <algorithm>
@@ -17,17 +17,18 @@ class Column {
   Value& operator[](std::size_t at) { return room_[at]; }
   const Value& operator[](std::size_t at) const { return room_[at]; }
 
-  // Whether so many more values need no more memory, and seeing to it.
+  // Whether `count` more values fit without more memory; makes room for them.
   bool hasRoom(std::size_t count) const { return capacity_ - size_ >= count; }
   [[gnu::cold]] void makeRoom(std::size_t count) {
     if (!hasRoom(count)) grow(size_ + count);
   }
 
-  // Where the next values go, as far as there is room, and so many of them added there.
+  // The place of the next value, writable as far as there is room; adds `count` values that were written
+  // there.
   Value* next() { return room_.data() + size_; }
   void advance(std::size_t count) { size_ += count; }
 
-  // Values that come to it are zero.
+  // New values are zero.
   void resize(std::size_t size) {
     if (size > capacity_) grow(size);
     if (size > size_) std::fill(room_.data() + size_, room_.data() + size, Value{});
@@ -45,7 +46,7 @@ class Column {
 
   std::vector<Value> room_;  // the values, and zeros or old values after them
   std::size_t size_ = 0;
-  std::size_t capacity_ = 0;  // the size of `room_`, which is asked for with every value
+  std::size_t capacity_ = 0;  // the size of `room_`, kept because every value needs it
 };
 
 }  // namespace refhost

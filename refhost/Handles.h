@@ -1,14 +1,14 @@
 // Handles: opaque pointers that are never addresses.
 //
-// A handle packs its kind, its trace number and, for what can be given back, the slot of its
-// object. Checking one is a mask, a compare and a look into a table by index; no handle is ever dereferenced,
-// so a foreign pointer is recognised without being followed. A slot is used again after its handle was given
-// back, with a new number: the old handle stays recognisable as stale.
+// A handle packs its kind, its trace number and, for what can be given back, the slot of its object. To check
+// one takes a mask, a comparison and a table look-up by index. No handle is ever dereferenced, so a foreign
+// pointer is recognised safely. A slot is used again after its handle was given back, with a new number: the
+// old handle is still recognised as stale.
 //
 // With 64-bit pointers the top byte makes every handle a non-canonical address and holds the low six bits of
 // the host's serial number, so that a handle of an earlier host is foreign (until 64 hosts later). With
-// 32-bit pointers neither fits: an earlier host's handle is taken for one of this host's, and a stale handle
-// may pass for a live one after 8192 acquisitions.
+// 32-bit pointers neither fits: a handle of an earlier host is taken for one of this host, and after 8192
+// acquisitions a stale handle may be taken for a live one.
 #pragma once
 
 #include <algorithm>
@@ -37,9 +37,9 @@ class HandleCodec {
 
   explicit HandleCodec(unsigned hostSerial) {
     if constexpr (kWide) {
-      constexpr std::uintptr_t nonCanonical = 0x80;
-      constexpr std::uintptr_t serialMask = 0x3f;
-      mark_ = (nonCanonical | (hostSerial & serialMask)) << kMarkShift;
+      constexpr std::uintptr_t kNonCanonical = 0x80;
+      constexpr std::uintptr_t kSerialMask = 0x3f;
+      mark_ = (kNonCanonical | (hostSerial & kSerialMask)) << kMarkShift;
     }
   }
 
@@ -69,9 +69,9 @@ class HandleCodec {
     return (bits(handle) >> (kKindBits + kSlotBits)) & kNumberMask;
   }
 
-  HandleKind kindOf(const void* handle) const;  // None for what is no handle of this host
+  HandleKind kindOf(const void* handle) const;  // None when it is not a handle of this host
 
-  // "layer:7"; "foreign" for what is no handle of this host. Not for null.
+  // "layer:7"; "foreign" when it is not a handle of this host. The handle is not null.
   std::string describe(const void* handle) const;
 
  private:
@@ -84,16 +84,16 @@ class HandleCodec {
   std::uintptr_t mark_ = 0;
 };
 
-// What is handed out and given back again: the live objects of one kind, each in a slot. Pointers to objects
-// are valid until the next add().
+// The live objects of one kind that is handed out and given back, each in a slot. Pointers to objects are
+// valid until the next add().
 template <typename Object>
 class HandlePool {
  public:
   HandlePool(const HandleCodec& codec, HandleKind kind) : codec_(codec), kind_(kind) {}
 
   Object* find(const void* handle) {
-    // The slot holds the whole handle, so that one comparison checks kind, host, number and life. That of a
-    // free slot would lead to another one.
+    // The slot holds the whole handle, so that one comparison checks kind, host, number and life. The handle
+    // in a free slot names another slot, so it is never found.
     const std::size_t slot = HandleCodec::heldSlot(handle);
     if (slot >= slotCount_ || slots_[slot].handle != handle) [[unlikely]]
       return nullptr;
@@ -111,8 +111,8 @@ class HandlePool {
   // slots.
   Object* add(void** handle) { return makeFreeSlot() ? addToFreeSlot(handle) : nullptr; }
 
-  // The same in steps: whether there is a free slot, seeing to it, and handing it out. False when there are
-  // no more numbers or slots.
+  // add() in steps: checks for a free slot; makes one, false when there are no more numbers or slots; hands
+  // out the free slot, which must exist.
   bool hasFreeSlot() const { return firstFree_ != kNoSlot && handedOut_ != UINT32_MAX; }
   [[gnu::cold]] bool makeFreeSlot() {
     return handedOut_ != UINT32_MAX && (firstFree_ != kNoSlot || makeSlot());
@@ -161,7 +161,7 @@ class HandlePool {
   };
   static constexpr std::uint32_t kNoSlot = UINT32_MAX;
 
-  // Of the last slot, which no pool makes.
+  // Names the last slot, which no pool ever makes.
   static void* freeHandle() { return reinterpret_cast<void*>(UINTPTR_MAX); }
 
   bool makeSlot() {
@@ -182,7 +182,7 @@ class HandlePool {
     firstFree_ = static_cast<std::uint32_t>(index);
   }
 
-  // Makes an object blank. One that has a way of its own may keep memory for the next in its slot.
+  // Makes an object blank. An object with clear() may keep memory for the next one in its slot.
   static void clear(Object& object) {
     if constexpr (requires { object.clear(); }) {
       object.clear();

@@ -11,11 +11,11 @@
 namespace refhost {
 namespace {
 
-// The version that the host gives itself at the entry.
+// The host's own version, which it passes to the entry.
 constexpr std::int32_t kHostMajor = 1;
 constexpr std::int32_t kHostMinor = 0;
 
-// A plug-in owes the host that no exception leaves it, whatever its type; the host survives one that does.
+// No exception of any type may leave a plug-in. The host survives a plug-in that breaks this rule.
 template <typename PluginCall>
 HostError callPlugin(HostState& host, PluginCall pluginCall) {
   try {
@@ -76,7 +76,7 @@ bool Host::load(HostPluginEntry entry, CallbackResult* result) {
   });
   *result = state_->end(code, false);
   if (!state_->preferences.fileExists()) {
-    // A store that cannot be written is none of the import's affairs: the preference holds for this run.
+    // A store that cannot be written is no failure of the import: the preference holds for this run.
     std::string unused;
     state_->preferences.write(&unused);
   }
@@ -118,13 +118,13 @@ CallbackResult Host::unload() {
 }
 
 const std::string& Host::importerName() const {
-  static const std::string none;
-  return state_->importers.empty() ? none : state_->importers.front().name;
+  static const std::string kNone;
+  return state_->importers.empty() ? kNone : state_->importers.front().name;
 }
 
 const std::vector<std::string>& Host::importerExtensions() const {
-  static const std::vector<std::string> none;
-  return state_->importers.empty() ? none : state_->importers.front().extensions;
+  static const std::vector<std::string> kNone;
+  return state_->importers.empty() ? kNone : state_->importers.front().extensions;
 }
 
 const Project& Host::project() const { return state_->editor.project(); }

@@ -1,4 +1,4 @@
-// The embedded host: loads the import module, plays the host for it, and keeps what comes of it.
+// The embedded host: loads the import module, serves it as its host, and keeps the project that it makes.
 //
 // One Host at a time per process: the suites are C tables without a context argument, so they serve the Host
 // that exists. Not for use from several threads.
@@ -38,7 +38,7 @@ struct RefusedSuite {
   std::int32_t version = 0;
 };
 
-// What the host is to do. The defaults are those of an ordinary run.
+// How the host runs. The defaults are those of an ordinary run.
 struct HostOptions {
   std::filesystem::path module;  // the import module; not used by load(entry)
   std::int32_t pluginId = 1;
@@ -66,18 +66,18 @@ struct Leftover {
   bool importFile = false;  // the file object that every import keeps
 };
 
-// What came of one callback. The texts are UTF-8.
+// The result of one callback. The texts are UTF-8.
 struct CallbackResult {
   HostError code = 0;                 // what the callback returned
   std::int64_t line = 0;              // of the scene, from 1, where the failure was found; 0: not known
   bool canImport = false;             // verify only
   std::vector<std::string> messages;  // shown to the user, in order
-  std::vector<std::string> refusals;  // which call broke which promise, in order
+  std::vector<std::string> refusals;  // a sentence for each call that was refused, in order
   std::vector<Leftover> leftovers;    // the ledger after the callback
   const Folder* folder = nullptr;     // import only: where the scene went
   std::int64_t suiteCalls = 0;        // trace lines between enter and leave
 
-  bool ledgerClean() const;  // nothing left but what is kept by design
+  bool ledgerClean() const;  // whether all leftovers are kept by design
 };
 
 class Host {
@@ -111,8 +111,8 @@ class Host {
 
   const Project& project() const;
 
-  // The preference "Use Linear Units" as the plug-in was handed it last since its entry was called. 0 when it
-  // never was: it did not ask, or the call failed.
+  // The value of the preference "Use Linear Units" that the plug-in read last since its entry was called. 0
+  // when it read none: it did not ask, or the call failed.
   std::int32_t linearUnits() const;
 
   // How often a suite call or a utility service was called in the last callback that the rehearsal is for.
@@ -121,8 +121,8 @@ class Host {
   // The root of the suites, for tests that stand in for the plug-in. Valid while the Host lives.
   const WNBasicSuite* basicSuite() const;
 
-  // For tests that stand in for the plug-in: bracket their calls as a callback's, so that handles, folder,
-  // rehearsal and ledger work as they do in an import.
+  // For tests that stand in for the plug-in: the calls between the two count as those of a callback, so that
+  // handles, folder, rehearsal and ledger work as they do in an import.
   VOR_Item* beginCallback(Callback callback, const std::filesystem::path& path);
   CallbackResult endCallback(HostError code);
 

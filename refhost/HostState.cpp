@@ -11,8 +11,8 @@
 namespace refhost {
 namespace {
 
-// Checked before anything of the new host touches what the living one has set up in the utility library.
-HostOptions admit(HostOptions given, const HostState* living) {
+// Throws before the new host touches anything that the living one has set up in the utility library.
+HostOptions checkedOptions(HostOptions given, const HostState* living) {
   if (living != nullptr) throw std::logic_error("a second Host was made while one lives");
   return given;
 }
@@ -47,7 +47,7 @@ void report(void* context, HostError, const char* text) {
 HostState* HostState::live_ = nullptr;
 
 HostState::HostState(HostOptions given)
-    : options(admit(std::move(given), live_)),
+    : options(checkedOptions(std::move(given), live_)),
       codec(nextHostSerial()),
       allowance(options),
       rehearsal(options),

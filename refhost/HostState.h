@@ -1,5 +1,5 @@
-// Everything that the one live Host holds. The suites' thunks find it here, since their tables carry no
-// context.
+// The state of the one live Host. The suites' thunks find it through a static pointer, because their tables
+// have no context argument.
 #pragma once
 
 #include <cstdint>
@@ -54,7 +54,7 @@ struct Importer {
   HostImporterCallbacks callbacks{};
 };
 
-// Hidden, so that every call finds the live one where it lies, without a table of addresses.
+// Hidden, so that every call reaches the static pointer directly, without the table of exported symbols.
 class [[gnu::visibility("hidden")]] HostState {
  public:
   explicit HostState(HostOptions given);
@@ -68,7 +68,7 @@ class [[gnu::visibility("hidden")]] HostState {
   // canImport is written to the trace for verify only.
   CallbackResult end(HostError code, bool canImport);
 
-  // Whether a call may be rehearsed or has to be traced. Settled where a callback begins and ends.
+  // Whether a call may be rehearsed or has to be traced. Set when a callback begins and ends.
   bool watched() const { return watched_; }
 
   // Null when there is none of that handle.
@@ -80,12 +80,12 @@ class [[gnu::visibility("hidden")]] HostState {
 
   // Whether the numbers are finite, or the host takes any.
   bool takesNumbers(const double* values, std::int32_t count) const {
-    double zero = 0.0;  // 0 times what is not finite is not a number
+    double zero = 0.0;  // 0 times a value that is not finite is NaN
     for (std::int32_t i = 0; i < count; ++i) zero += 0.0 * values[i];
     return zero == 0.0 || options.permissive;
   }
 
-  // The same of a stream's value: as many numbers as it has. The others are 0 as a rule.
+  // The same for a stream's value: as many numbers as it has dimensions. The others are 0 as a rule.
   bool takesValue(const StreamValueRecord& record, std::int32_t dimension) const {
     const double* const value = record.value;
     if (0.0 * value[0] + 0.0 * value[1] + 0.0 * value[2] == 0.0) [[likely]]
@@ -118,10 +118,10 @@ class [[gnu::visibility("hidden")]] HostState {
   bool loaded = false;  // the entry was called
 
   Callback callback = Callback::Entry;  // the one that runs or ran last
-  CallbackResult result;                // of the callback that runs, as far as it is known
+  CallbackResult result;                // of the callback that runs, filled in as it goes
 
-  // The number of the stream that was handed out last when version 8 of the stream suite could not be
-  // acquired: the value of no stream up to it could be set from then on.
+  // The number of the last stream that was handed out before version 8 of the stream suite could not be
+  // acquired: from then on no stream up to this one could get a value.
   std::uint32_t streamsWithoutValueSuite = 0;
   std::int32_t linearUnits = 0;   // the preference "Use Linear Units" as handed out last; 0: never
   bool silenceEndFailed = false;  // a rehearsal made an EndSilentErrors of this callback fail

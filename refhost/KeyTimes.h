@@ -1,4 +1,4 @@
-// The times of a stream's keys. Streams whose keys lie at the same times share one row of them.
+// The times of a stream's keys. Streams whose keys lie at the same times share one array of them.
 #pragma once
 
 #include <cstddef>
@@ -31,10 +31,10 @@ class KeyTimes {
   const T_Time& front() const { return times_->front(); }
   const T_Time& back() const { return times_->back(); }
 
-  // Whether these are the times of the row, which may be empty.
-  bool are(const T_Time* row, std::size_t count) const {
-    static_assert(sizeof(T_Time) == sizeof(T_Time::value) + sizeof(T_Time::scale), "no bytes between");
-    return count == size() && (count == 0 || std::memcmp(times_->data(), row, count * sizeof(T_Time)) == 0);
+  // Whether these are the `count` times of the array.
+  bool equal(const T_Time* times, std::size_t count) const {
+    static_assert(sizeof(T_Time) == sizeof(T_Time::value) + sizeof(T_Time::scale), "no padding");
+    return count == size() && (count == 0 || std::memcmp(times_->data(), times, count * sizeof(T_Time)) == 0);
   }
 
  private:

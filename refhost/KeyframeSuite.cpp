@@ -55,7 +55,7 @@ HostError BeginKeyframeBatch(VOR_Stream* stream, VOR_AddKeyframesInfo** batch) {
   return call.finish();
 }
 
-// The tasks of every key: what they refuse is put together apart from them.
+// The tasks of every key. Their refusals are in functions of their own, which keeps them small.
 struct AddingKey {
   static constexpr Operation kOperation = Operation::AddBatchKeyframe;
 
@@ -126,7 +126,7 @@ struct SettingKey {
       return refuseHandle(kOperation, value->stream, HandleKind::Stream, "the record's stream");
     if (recorded->stream != open->stream) [[unlikely]]
       return refuseOtherStream(batch, value->stream);
-    const auto key = static_cast<std::size_t>(index);  // of a negative index, beyond every key
+    const auto key = static_cast<std::size_t>(index);  // a negative index is beyond every key
     if (key >= open->times.size()) [[unlikely]]
       return refuseIndex(batch, index);
     if (!host.takesValue(*value, open->stream->dimension)) [[unlikely]]
@@ -160,7 +160,7 @@ struct SettingKey {
   }
 };
 
-// Keys that the stream does not keep are no longer the host's.
+// Keys that the stream does not keep no longer count against the limit.
 void endBatch(HostState& host, Batch& batch, bool commit) {
   const std::size_t held = batch.stream->keyCount() + batch.times.size();
   if (commit) host.editor.commit(batch);

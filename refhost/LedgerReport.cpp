@@ -14,9 +14,9 @@ std::string property(const Layer& layer, const Stream& stream) {
   return std::string(streamName(stream.id, layer.kind)) + " of layer:" + std::to_string(layer.number);
 }
 
-// Deliberate: a camera's position and zoom handles are no leak when their value could not be set, and its
-// zoom handle is none when the stream already held keys. Counted as leaks, they would make every rehearsal of
-// these failures end with status 1 although the importer keeps the handles on purpose.
+// Deliberate: a camera's position and zoom handles are not leaks when their value could not be set, nor is
+// its zoom handle when the stream already held keys. Counted as leaks, they would make every rehearsal of
+// these failures end with status 1, although the importer keeps the handles on purpose.
 bool isKeptByDesign(const HostState& host, std::uint32_t number, const HeldStream& held) {
   if (held.releaseFailed) return true;
   if (held.layer->kind != LayerKind::Camera) return false;

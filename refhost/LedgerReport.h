@@ -9,10 +9,11 @@ namespace refhost {
 
 class HostState;
 
-// Suites, streams, batches and memory handles, then the files and lists of the utility library.
+// Lists what is still held: suites, streams, batches and memory handles, then the files and lists of the
+// utility library.
 std::vector<Leftover> drawLedger(HostState& host);
 
-// Gives everything of it back.
+// Gives back everything that drawLedger lists.
 void releaseLeftovers(HostState& host);
 
 }  // namespace refhost

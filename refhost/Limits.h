@@ -1,4 +1,4 @@
-// What the host takes at most: layers, keys and bytes of memory.
+// The limits of the host: layers, keys and bytes of memory.
 //
 // The importer makes a null layer for each parent of each camera and marked locator, so that a small text can
 // ask for far more than it holds. Beyond a limit the host refuses; what exists stays.
@@ -23,13 +23,13 @@ struct Allowance {
   std::int64_t memory;  // bytes of memory handles
 };
 
-// Whether the host takes a further layer, so many keys, or so many bytes. False after a refusal. Who makes it
-// takes it off the allowance.
+// Whether the host takes one more layer, `keys` more keys or `bytes` more bytes. False after a refusal. The
+// caller subtracts what it then makes from the allowance.
 bool takesLayer(Call& call);
 bool takesKeys(Call& call, std::int32_t keys);
 bool takesMemory(Call& call, std::int64_t bytes);
 
-// A refusal of a further key.
+// Refuses one more key.
 [[gnu::cold]] HostError refuseKey(Operation operation);
 
 }  // namespace refhost

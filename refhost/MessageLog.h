@@ -13,7 +13,8 @@ class MessageLog {
   void show(std::string text);
 
   void beginSilence(const HostSilentErrorState* state);
-  // False when the innermost span is another's, or none is open; then nothing happens.
+  // False, and nothing done, when the innermost span began with another state, or none is open. With `report`
+  // the messages of the span are shown now, else they are dropped.
   bool endSilence(const HostSilentErrorState* state, bool report);
   bool isSilent() const { return !spans_.empty(); }
 

@@ -19,11 +19,11 @@ std::string loaderComplaint() {
 ModuleLoader::~ModuleLoader() { unload(); }
 
 HostPluginEntry ModuleLoader::load(const std::filesystem::path& file, std::string* failure) {
-  // With a bare name the loader would search the system's folders and not look where the user stands.
+  // With a bare name the loader would search the system's folders, not the current one.
   std::error_code error;
   const std::filesystem::path absolute = std::filesystem::absolute(file, error);
   const std::filesystem::path& place = error ? file : absolute;
-  // The loader would wait for somebody to write into a FIFO. What is missing it says in its own words.
+  // The loader would wait for data from a FIFO. Of a missing file it says so itself.
   std::error_code unknown;
   const std::filesystem::file_status status = std::filesystem::status(place, unknown);
   if (std::filesystem::exists(status) && !std::filesystem::is_regular_file(status)) {

@@ -7,7 +7,7 @@
 namespace refhost {
 namespace {
 
-// The entry that an option of the host stands for.
+// Whether it is the entry that HostOptions::linearUnits replaces.
 bool isLinearUnits(std::string_view section, std::string_view key) {
   return section == HOST_PREF_SECTION && key == HOST_PREF_LINEAR_UNITS;
 }

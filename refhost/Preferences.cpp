@@ -14,7 +14,7 @@ namespace {
 
 namespace fs = std::filesystem;
 
-// The whole text as an integer; nothing when it is none or does not fit.
+// The whole text as an integer; nothing when it is not one or does not fit.
 std::optional<std::int32_t> integerOf(std::string_view text) {
   std::int32_t value = 0;
   const auto result = std::from_chars(text.data(), text.data() + text.size(), value);
@@ -68,7 +68,7 @@ bool Preferences::write(std::string* failure) const {
     return false;
   }
   std::error_code error;
-  // Where the file is a link, what it leads to is written and the link stays.
+  // A link stays; the file that it points to is written.
   fs::path target = fs::weakly_canonical(file_, error);
   if (error) target = file_;
   if (target.has_parent_path()) fs::create_directories(target.parent_path(), error);

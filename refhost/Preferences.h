@@ -3,8 +3,8 @@
 //   [Maya Camera]
 //   Use Linear Units=0
 //
-// A file that is missing counts as empty. It is written beside and renamed, and only by the host when it is
-// missing, or by a user who sets a preference; failing to write it changes nothing else.
+// A missing file counts as empty. The host writes the file only when it is missing, or when a user sets a
+// preference: it writes a new file beside it and renames that. A failure to write changes nothing else.
 #pragma once
 
 #include <cstdint>
@@ -17,7 +17,7 @@ namespace refhost {
 
 class Preferences {
  public:
-  // Reads the file. Lines that are no entry are dropped. A path that is empty: in memory only.
+  // Reads the file. Lines that are no entry are ignored. With an empty path the store is in memory only.
   explicit Preferences(std::filesystem::path file);
 
   std::optional<std::int32_t> find(const std::string& section, const std::string& key) const;
@@ -26,7 +26,7 @@ class Preferences {
   bool fileExists() const;                 // whether the file was there when it was read
   bool write(std::string* failure) const;  // false with a sentence when it cannot be written
 
-  // Where the user's own store lies: $XDG_CONFIG_HOME or ~/.config, then mayascene/preferences. Empty when
+  // The path of the user's own store: mayascene/preferences in $XDG_CONFIG_HOME or in ~/.config. Empty when
   // neither is known.
   static std::filesystem::path userFile();
 

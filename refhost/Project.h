@@ -1,4 +1,4 @@
-// The project that the embedded host holds in memory: what an import has made, for reading.
+// The project that the embedded host holds in memory: what imports have made, for reading.
 //
 // All objects belong to the Project and live as long as it does; pointers among them are never owning.
 // Numbers ("number") count from 1 within each kind, in the order in which the host handed the objects out,

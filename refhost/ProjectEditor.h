@@ -1,4 +1,4 @@
-// The only writer of the Project. It takes what was checked before; it refuses nothing itself.
+// The only writer of the Project. Its callers check the arguments; it refuses nothing itself.
 #pragma once
 
 #include <cstddef>
@@ -42,15 +42,15 @@ class ProjectEditor {
   Composition& addComposition(Folder& folder, CompositionSettings settings);
   void makeItem(Composition& composition);  // gives it an item number if it has none
 
-  // The layers' streams are there at once, with their defaults. interest is a camera's point of interest.
+  // The layers have their streams from the start, with their defaults. `interest` is the camera's point of
+  // interest, x and y in pixels; `zoomKeys` keys are on its zoom stream.
   Layer& addCameraLayer(Composition& composition, const char* name, const double (&interest)[2],
                         std::int32_t zoomKeys);
   Layer& addNullLayer(Composition& composition, const char* name);
   Layer& addCompositionLayer(Composition& composition, Composition& source);
 
   static void setParent(Layer& layer, Layer& parent);
-  static void setFlag(Layer& layer, std::int32_t flag,
-                      bool on);  // flags that mean nothing here are forgotten
+  static void setFlag(Layer& layer, std::int32_t flag, bool on);  // ignores flags that the host does not know
   static void setFilm(Layer& camera, std::int32_t direction, double size);
   static void setValue(Stream& stream, const double* value);
   void commit(Batch& batch);
@@ -59,7 +59,7 @@ class ProjectEditor {
   static Stream* findStream(Layer& layer, std::int32_t id) {
     const std::size_t place = streamPlace(id);
     if (place == kNoStreamPlace) return nullptr;
-    Stream* const found = layer.streams.data() + place;  // or after the last: a zoom is a camera's alone
+    Stream* const found = layer.streams.data() + place;  // after the last one for the zoom of another layer
     return found != layer.streams.data() + layer.streams.size() ? found : nullptr;
   }
 

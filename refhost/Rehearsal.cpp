@@ -11,12 +11,13 @@
 namespace refhost {
 namespace {
 
-// A text cut in two at a separator; nothing when the separator is missing.
+// A text cut in two at a separator.
 struct Cut {
   std::string_view before;
   std::string_view after;
 };
 
+// Nothing when the separator is missing: its place is npos.
 std::optional<Cut> cutAt(std::string_view text, std::size_t place) {
   if (place == std::string_view::npos) return std::nullopt;
   return Cut{text.substr(0, place), text.substr(place + 1)};

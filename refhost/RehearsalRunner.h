@@ -1,4 +1,4 @@
-// Counts the calls of a callback and says which of them are to fail.
+// Counts the calls of a callback and decides which of them fail.
 #pragma once
 
 #include <array>
@@ -12,7 +12,7 @@
 
 namespace refhost {
 
-// What a rehearsal has in store for one call.
+// What a rehearsal does with one call.
 struct Verdict {
   bool rehearsed = false;
   Failure::Kind kind = Failure::Kind::Code;
@@ -31,7 +31,7 @@ class RehearsalRunner {
   void begin(Callback callback);
   void end();
 
-  // Counts a call. True when its verdict is to be asked for; a call without one goes on.
+  // Counts a call. True when the caller has to ask for its verdict; other calls go on.
   bool count(Operation operation) {
     ++(*tally_)[static_cast<std::size_t>(operation)];
     return watching_;

@@ -1,4 +1,4 @@
-// Text on its way out: what other programs wrote becomes UTF-8 that JSON can hold.
+// Text for output: bytes that others wrote become valid UTF-8, and JSON strings.
 #pragma once
 
 #include <string>

@@ -7,7 +7,7 @@
 namespace refhost {
 namespace {
 
-// The tasks of every key: what they refuse is put together apart from them.
+// The tasks of every key. Their refusals are in functions of their own, which keeps them small.
 struct Acquiring {
   static constexpr Operation kOperation = Operation::AcquireLayerStream;
 

@@ -15,7 +15,7 @@ struct StreamFacts {
   const char* name;
 };
 
-// The zoom stands last, so that the layers without one have the table's beginning.
+// The zoom is last, so that the streams of a layer without one are the beginning of the table.
 constexpr StreamFacts kStreams[] = {
     {HOST_STREAM_ANCHOR_POINT, 3, 0.0, "anchor point"},
     {HOST_STREAM_POSITION, 3, 0.0, "position"},
@@ -27,13 +27,13 @@ constexpr StreamFacts kStreams[] = {
 };
 constexpr std::size_t kStreamCount = sizeof(kStreams) / sizeof(kStreams[0]);
 
-constexpr bool standAtTheirPlaces() {
+constexpr bool areInOrderOfPlaces() {
   for (std::size_t place = 0; place < kStreamCount; ++place) {
     if (streamPlace(kStreams[place].id) != place) return false;
   }
   return true;
 }
-static_assert(standAtTheirPlaces());
+static_assert(areInOrderOfPlaces());
 
 }  // namespace
 

@@ -13,7 +13,7 @@ namespace refhost {
 // the composition.
 std::vector<Stream> makeStreams(LayerKind kind);
 
-// Where the stream of that number stands among a layer's; beyond all of them for a number that no layer has.
+// The place of the stream of that number among a layer's; beyond all of them for a number that no layer has.
 inline constexpr std::uint8_t kNoStreamPlace = 7;
 inline constexpr std::uint8_t kStreamPlaces[] = {
     0, 1, 2, 3, kNoStreamPlace, kNoStreamPlace, kNoStreamPlace, kNoStreamPlace, 4, 5, kNoStreamPlace, 6};

@@ -116,8 +116,8 @@ TraceLine& TraceLine::numbers(const char* name, const double* values, std::size_
 }
 
 TraceLine& TraceLine::recordValues(const char* name, const StreamValueRecord* record) {
-  constexpr std::size_t count = std::extent_v<decltype(StreamValueRecord::value)>;
-  return numbers(name, record == nullptr ? nullptr : record->value, count);
+  constexpr std::size_t kCount = std::extent_v<decltype(StreamValueRecord::value)>;
+  return numbers(name, record == nullptr ? nullptr : record->value, kCount);
 }
 
 TraceLine& TraceLine::time(const char* name, const T_Time* time) {

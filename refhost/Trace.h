@@ -1,4 +1,4 @@
-// The call trace: one compact JSON object a line.
+// The call trace: one compact JSON object per line.
 #pragma once
 
 #include <cstddef>
@@ -20,7 +20,7 @@ std::string extensionText(const HostImporterExtension& extension);
 // One line, built in the order of the calls. A null pointer is written as null.
 class TraceLine {
  public:
-  // gave: whether the call handed out what it was asked for. If not, every handed...() writes null.
+  // `gave`: whether the call handed out its results. If not, every handed...() writes null.
   TraceLine(const HandleCodec& codec, const char* call, bool gave);
 
   TraceLine& text(const char* key, const char* bytes);
@@ -38,10 +38,10 @@ class TraceLine {
   TraceLine& types(const char* key, const HostImporterType* types, std::int32_t count);
   TraceLine& extensions(const char* key, const HostImporterExtension* extensions, std::int32_t count);
 
-  // What the call handed out.
+  // The results that the call handed out.
   template <typename Handle>
   TraceLine& handed(const char* key, Handle* const* out) {
-    // NOLINTNEXTLINE(clang-analyzer-core.NullDereference): where no place was given, nothing was.
+    // NOLINTNEXTLINE(clang-analyzer-core.NullDereference): a call without a place for its result gave none.
     return handle(key, gave_ ? *out : nullptr);
   }
   TraceLine& handedInteger(const char* key, const std::int32_t* out);
@@ -67,7 +67,8 @@ class Trace {
 
   bool on() const { return out_ != nullptr; }
   void write(const TraceLine& line);
-  // A line at which the plug-in begins or ends: all lines so far are sent on, whatever the plug-in does next.
+  // Writes a line at which a callback begins or ends, and flushes the stream, so that the lines so far are
+  // there even if the plug-in crashes.
   void writeBracket(const TraceLine& line);
 
  private:

@@ -1,5 +1,5 @@
 // The host's translations of localised strings: a file of lines KEY=TEXT, UTF-8. Blank lines and lines that
-// begin with "#" are passed over.
+// begin with "#" are skipped.
 #pragma once
 
 #include <filesystem>
