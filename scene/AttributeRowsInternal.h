@@ -1,4 +1,4 @@
-// The rows that the tables of attributes are written in.
+// The rows of the tables of attributes.
 #pragma once
 
 #include <limits>
@@ -11,7 +11,7 @@ inline constexpr double kNoFallback = std::numeric_limits<double>::quiet_NaN();
 
 enum class RowShape {
   Single,
-  Triple,    // with components of its own names and x, y, z or X, Y, Z
+  Triple,    // its components have its names with x, y, z or X, Y, Z at the end
   Compound,  // its components are the rows that follow, `components` of them
 };
 
@@ -37,7 +37,7 @@ constexpr AttributeRow Compound(std::string_view shortName, std::string_view lon
   return {shortName, longName, RowShape::Compound, kNoFallback, components};
 }
 
-// The tables, each of a part of what node types have.
+// The tables, each for a part of the attributes of some node types.
 std::span<const AttributeRow> TransformRows();
 std::span<const AttributeRow> JointRows();
 std::span<const AttributeRow> CameraRows();

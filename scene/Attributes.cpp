@@ -13,7 +13,7 @@
 namespace scene {
 namespace {
 
-// One table of rows made into attributes that know one another.
+// The attributes made from one table of rows, with the links between compounds and components.
 class AttributeTable {
  public:
   explicit AttributeTable(std::span<const AttributeRow> rows) {
@@ -64,52 +64,52 @@ using TablesOfType = std::vector<const AttributeTable*>;
 using Types = std::map<std::string_view, TablesOfType>;
 
 Types AllTypes() {
-  static const AttributeTable transformTable(TransformRows());
-  const AttributeTable* const transform = &transformTable;
-  static const AttributeTable joint(JointRows()), camera(CameraRows()), stereoCamera(StereoCameraRows());
-  static const AttributeTable stereoTransform(StereoTransformRows()), locator(LocatorRows());
-  static const AttributeTable constraint(ConstraintRows()), curve(CurveRows());
-  static const AttributeTable unitConversion(UnitConversionRows()), pairBlend(PairBlendRows());
-  static const AttributeTable blendWeighted(BlendWeightedRows()), animBlend(AnimBlendRows());
-  static const AttributeTable reference(ReferenceRows()), script(ScriptRows()), time(TimeRows());
-  static const AttributeTable resolution(ResolutionRows()), renderGlobals(RenderGlobalsRows());
+  static const AttributeTable kTransform(TransformRows());
+  const AttributeTable* const transform = &kTransform;
+  static const AttributeTable kJoint(JointRows()), kCamera(CameraRows()), kStereoCamera(StereoCameraRows());
+  static const AttributeTable kStereoTransform(StereoTransformRows()), kLocator(LocatorRows());
+  static const AttributeTable kConstraint(ConstraintRows()), kCurve(CurveRows());
+  static const AttributeTable kUnitConversion(UnitConversionRows()), kPairBlend(PairBlendRows());
+  static const AttributeTable kBlendWeighted(BlendWeightedRows()), kAnimBlend(AnimBlendRows());
+  static const AttributeTable kReference(ReferenceRows()), kScript(ScriptRows()), kTime(TimeRows());
+  static const AttributeTable kResolution(ResolutionRows()), kRenderGlobals(RenderGlobalsRows());
   Types types = {
       {"transform", {transform}},
-      {"joint", {&joint, transform}},
+      {"joint", {&kJoint, transform}},
       {"fosterParent", {transform}},
-      {"camera", {&camera, transform}},
-      {"stereoRigCamera", {&stereoCamera, &camera, transform}},
-      {"stereoRigTransform", {&stereoTransform, transform}},
-      {"locator", {&locator, transform}},
-      {"unitConversion", {&unitConversion}},
-      {"timeToUnitConversion", {&unitConversion}},
-      {"unitToTimeConversion", {&unitConversion}},
-      {"pairBlend", {&pairBlend}},
-      {"blendWeighted", {&blendWeighted}},
-      {"reference", {&reference}},
-      {"script", {&script}},
-      {"time", {&time}},
-      {"resolution", {&resolution}},
-      {"renderGlobals", {&renderGlobals}},
+      {"camera", {&kCamera, transform}},
+      {"stereoRigCamera", {&kStereoCamera, &kCamera, transform}},
+      {"stereoRigTransform", {&kStereoTransform, transform}},
+      {"locator", {&kLocator, transform}},
+      {"unitConversion", {&kUnitConversion}},
+      {"timeToUnitConversion", {&kUnitConversion}},
+      {"unitToTimeConversion", {&kUnitConversion}},
+      {"pairBlend", {&kPairBlend}},
+      {"blendWeighted", {&kBlendWeighted}},
+      {"reference", {&kReference}},
+      {"script", {&kScript}},
+      {"time", {&kTime}},
+      {"resolution", {&kResolution}},
+      {"renderGlobals", {&kRenderGlobals}},
   };
   for (const char* type : {"lookAt", "aimConstraint", "pointConstraint", "orientConstraint",
                            "parentConstraint", "scaleConstraint"}) {
-    types[type] = {&constraint, transform};
+    types[type] = {&kConstraint, transform};
   }
   for (const char* type : {"animCurveTL", "animCurveTA", "animCurveTU", "animCurveTT", "animCurveUL",
                            "animCurveUA", "animCurveUU", "animCurveUT"}) {
-    types[type] = {&curve};
+    types[type] = {&kCurve};
   }
   for (const char* type : {"animBlendNodeAdditive", "animBlendNodeAdditiveDA", "animBlendNodeAdditiveDL",
                            "animBlendNodeAdditiveF", "animBlendNodeAdditiveFA", "animBlendNodeAdditiveFL",
                            "animBlendNodeAdditiveI16", "animBlendNodeAdditiveI32",
                            "animBlendNodeAdditiveRotation", "animBlendNodeAdditiveScale"}) {
-    types[type] = {&animBlend};
+    types[type] = {&kAnimBlend};
   }
   return types;
 }
 
-// All types and their attributes. Every rule and every line of a scene asks for some.
+// All types and their attributes. Look-ups are frequent: each line of a scene needs one.
 class AttributeIndex {
  public:
   AttributeIndex() {
@@ -132,7 +132,7 @@ class AttributeIndex {
   void Add(std::string_view type, const TablesOfType& tables) {
     const std::uint32_t number = ++count_;
     numbers_.At(0, type) = TypeNumber{number};
-    // What is written last stays: the first table counts, and in it a long name more than a short one.
+    // A later entry replaces an earlier one: the first table wins, and in it long names win over short ones.
     for (auto table = tables.rbegin(); table != tables.rend(); ++table) {
       const std::deque<AttributeInfo>& attributes = (*table)->attributes();
       for (auto at = attributes.rbegin(); at != attributes.rend(); ++at) {
@@ -143,14 +143,14 @@ class AttributeIndex {
   }
 
   std::uint32_t count_ = 0;
-  TypeNumber unknown_ = TypeNumber::Unknown;  // what stands for a type that is not known
+  TypeNumber unknown_ = TypeNumber::Unknown;  // the type that is used for one that is not known
   FlatMap<TypeNumber> numbers_;
   FlatMap<const AttributeInfo*> byName_;  // long and short, by the numbers of the types
 };
 
 const AttributeIndex& Index() {
-  static const AttributeIndex index;
-  return index;
+  static const AttributeIndex kIndex;
+  return kIndex;
 }
 
 }  // namespace

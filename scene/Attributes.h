@@ -1,4 +1,4 @@
-// What is known of node types and their attributes: long and short names, compounds, defaults.
+// The known node types and their attributes: long and short names, compounds, defaults.
 #pragma once
 
 #include <array>
@@ -14,10 +14,9 @@ namespace scene {
 struct AttributeInfo {
   std::string longName;
   std::string shortName;
-  std::optional<double>
-      fallback;  // the value where a scene says none, in the scene's units; a flag is 0 or 1
-  const AttributeInfo* compound = nullptr;       // of which it is a component
-  int component = 0;                             // which, from 0
+  std::optional<double> fallback;                // the default, in the scene's units; of a flag 0 or 1
+  const AttributeInfo* compound = nullptr;       // of which it is a component; null: it is none
+  int component = 0;                             // its place in the compound, from 0
   std::vector<const AttributeInfo*> components;  // of a compound, in order
 };
 
@@ -25,16 +24,16 @@ struct AttributeInfo {
 inline constexpr std::array<std::string_view, 9> kPlaceChannels = {
     "translateX", "translateY", "translateZ", "rotateX", "rotateY", "rotateZ", "scaleX", "scaleY", "scaleZ"};
 
-// A type of nodes, for many questions about one node. It is cheaper to look up once than by name each time.
+// A node type as a number: callers with many look-ups for one node find the type by its name only once.
 enum class TypeNumber : std::uint32_t { Unknown = 0 };
 TypeNumber TypeNumberOf(std::string_view nodeType);
 
-// The attribute by its long or short name; null where the type has none of the name that is known. Of a type
-// that is not known, what all transforms have: it may be a transform that a plug-in brings.
+// The attribute of that long or short name; null where the type has no known attribute of the name. A type
+// that is not known has the attributes of a transform, because it may be a transform of some plug-in.
 const AttributeInfo* FindAttribute(TypeNumber nodeType, std::string_view name);
 const AttributeInfo* FindAttribute(std::string_view nodeType, std::string_view name);
 
-// Whether the type is one whose attributes are kept, all of them. Of other types those are kept that all
+// Whether a scene keeps all attributes of nodes of the type. Of other types it keeps only those that all
 // transforms have.
 bool KeepsAttributes(std::string_view nodeType);
 

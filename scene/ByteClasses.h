@@ -1,4 +1,4 @@
-// What a byte can be in a scene, for the reader of the whole scene.
+// The classes of bytes for the reader of the whole scene.
 #pragma once
 
 #include <array>
@@ -12,9 +12,9 @@ enum ByteClass : std::uint8_t {
   kLetterByte = 4,  // letters and "_": what a command begins with
   kDigitByte = 8,
   kPunctuationByte = 16,  // "(", ")", "}", ",": each a token of its own, as is "{"
-  // Where looking for the end of a command pauses: ";", a quote, "/", a line feed.
+  // The search for the end of a command examines these: ";", a quote, "/", a line feed.
   kPauseByte = 32,
-  // No word, no white space, none of the above. Outside strings and comments nobody can say what it means.
+  // None of the above, and not "{". Outside strings and comments it has no meaning.
   kStrangeByte = 64,
   kBraceByte = 128,  // "{": two of them open a template field
 };

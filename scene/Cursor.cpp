@@ -11,8 +11,8 @@ namespace {
 
 using scan::FindAnyOf;
 
-// Commands that a scene is made of. One of them at the start of a line begins a new command, also where the
-// last one has not ended.
+// The commands of a scene. One of them at the start of a line begins a new command, even where the last one
+// has not ended.
 constexpr std::string_view kCommands[] = {
     "addAttr", "applyMetadata", "connectAttr",  "createNode", "currentUnit", "dataStructure",
     "file",    "fileInfo",      "lockNode",     "namespace",  "parent",      "disconnectAttr",
@@ -96,12 +96,12 @@ std::string_view Cursor::TakeString(bool* closed, bool* escaped) {
     } else {
       ++at_;
     }
-    // A line that begins like a command is either part of a text over several lines, or the string was left
-    // open. What the next quote does says which.
+    // A line that begins like a command: either the string has several lines, or it was left open. The next
+    // quote decides: it closes a string in the first case and opens one in the second.
     if (!CommandAt(at_)) continue;
     const char* const quote = FindQuote(at_);
     if (quote == end_ || !ClosesString(quote)) break;
-    *escaped = true;  // perhaps: nobody looked
+    *escaped = true;  // possibly: what was skipped is not examined
     at_ = quote;
   }
   *closed = false;

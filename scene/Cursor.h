@@ -1,4 +1,4 @@
-// A position in the text of a scene, and the ways in which it moves on. Nothing beyond the end is read.
+// A position in the text of a scene, and the functions that move it. Nothing beyond the end is read.
 #pragma once
 
 #include <cstddef>
@@ -7,12 +7,12 @@
 
 namespace scene {
 
-// Where looking for the end of a command stopped.
+// Where the search for the end of a command stopped.
 enum class StopKind {
   End,           // at its ";"
   NextCommand,   // at a command on a line of its own: this one has no ";"
   ConflictMark,  // at a line with the mark of a merge conflict
-  StrangeByte,   // at a byte that means nothing here, or at the "{{" of a template field
+  StrangeByte,   // at a byte that has no meaning here, or at the "{{" of a template field
   OpenString,    // a string is never closed
   OpenComment,   // a comment has no end
   TextEnd,
@@ -42,31 +42,31 @@ class Cursor {
   bool StartsWith(std::string_view start) const { return rest().substr(0, start.size()) == start; }
   bool atLineStart() const { return at_ == begin_ || at_[-1] == '\n'; }
 
-  // Over white space and comments. From a "/*" without an end it goes to the next line that begins with a
-  // command; its offset is put into *openComment.
+  // Moves over white space and comments. A "/*" without an end is skipped up to the next line that begins
+  // with a command, and its offset is put into *openComment, else kNone.
   static constexpr std::uint32_t kNone = 0xffffffff;
   void SkipBlank(std::uint32_t* openComment);
 
-  // Over a word; what was passed.
+  // Moves over a word and returns it.
   std::string_view TakeWord();
 
-  // Over a string, from its opening quote; what stands between the quotes, escapes as they are. *closed is
-  // false when the string has no end: then the cursor stands where reading can go on, which is the next
-  // command or the end of the text. *escaped: whether there is a backslash in it.
+  // Moves over a string, from its opening quote, and returns what stands between the quotes, escapes as they
+  // are. *closed is false when the string has no end: then the cursor is where reading can go on, which is
+  // the next command or the end of the text. *escaped is false only when there is no backslash in it.
   std::string_view TakeString(bool* closed, bool* escaped);
 
   static constexpr std::uint32_t kMarkLength = 7;  // of "<<<<<<<"
 
-  void SkipLine();  // over the rest of the line and its line feed
+  void SkipLine();  // moves over the rest of the line and its line feed
 
-  bool AtConflictMark() const;  // at the start of a line that is one
+  bool AtConflictMark() const;  // whether the line that begins here is the mark of a merge conflict
 
-  // Whether a command that is known begins here, with nothing but blanks before it on its line.
+  // Whether a known command begins here, with nothing but blanks before it on its line.
   bool AtCommandOnItsOwnLine() const;
 
-  // To where the command ends, or where it turns out not to. Strings and comments are passed over. With
-  // `strange`, stops at strange bytes too. After an open string or comment the cursor stands where reading
-  // can go on: at the next command.
+  // Moves to the end of the command, or to what shows that it has none. Skips strings and comments. With
+  // `strange`, stops at strange bytes too. After an open string or comment the cursor is where reading can go
+  // on: at the next command.
   CommandStop FindCommandEnd(bool strange);
 
  private:

@@ -1,4 +1,4 @@
-// A small hash table for names: open addressing, no removal. Its order is never asked for.
+// A small hash table for names: open addressing, no removal, no iteration.
 #pragma once
 
 #include <cstddef>
@@ -35,14 +35,14 @@ inline std::uint64_t HashOf(std::string_view text, std::uint64_t seed = 0) {
 template <typename Value>
 class FlatMap {
  public:
-  // Null where the key was never asked for by At.
+  // Null where At was never called with the key. Valid until the next call of At.
   const Value* Find(std::uint64_t number, std::string_view name) const {
     if (entries_.empty()) return nullptr;
     const Entry& entry = entries_[SlotOf(number, name, HashOf(name, number))];
     return entry.hash != kUnused ? &entry.value : nullptr;
   }
 
-  // Valid until the next call.
+  // The value of the key, made where there is none. Valid until the next call of At.
   Value& At(std::uint64_t number, std::string_view name) {
     if ((used_ + 1) * 3 > entries_.size() * 2) Grow();
     const std::uint64_t hash = HashOf(name, number);
@@ -57,7 +57,7 @@ class FlatMap {
  private:
   static constexpr std::uint32_t kUnused = 0;
 
-  // The hash is kept so that hardly any other name is looked at, and none when the table grows.
+  // The hash is stored so that names are rarely compared, and never when the table grows.
   struct Entry {
     std::string_view name;
     std::uint64_t number = 0;
@@ -65,7 +65,7 @@ class FlatMap {
     Value value{};
   };
 
-  // The part of a hash that the slot depends on, made different from kUnused.
+  // The part of a hash that determines the slot, made different from kUnused.
   static std::uint32_t Kept(std::uint64_t hash) { return static_cast<std::uint32_t>(hash) | 1u << 31; }
 
   std::size_t SlotOf(std::uint64_t number, std::string_view name, std::uint64_t hash) const {

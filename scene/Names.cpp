@@ -13,7 +13,7 @@ std::string_view Bare(std::string_view name) {
   return name;
 }
 
-// The first name of a path, which is taken off with the "|" after it.
+// Removes the first name of a path with the "|" after it, and returns it.
 std::string_view TakeName(std::string_view* path) {
   const std::size_t bar = path->find('|');
   const std::string_view name = path->substr(0, bar);
@@ -21,7 +21,7 @@ std::string_view TakeName(std::string_view* path) {
   return Bare(name);
 }
 
-// The last name of a path, which is taken off with the "|" before it.
+// Removes the last name of a path with the "|" before it, and returns it.
 std::string_view TakeLastName(std::string_view* path) {
   const std::size_t bar = path->rfind('|');
   const std::string_view name = bar == std::string_view::npos ? *path : path->substr(bar + 1);
@@ -106,7 +106,7 @@ Names::Match Names::Find(std::string_view nameOrPath) const {
     return IsAt(candidate, part.above) ? Below(candidate, part.below) : kNoNode;
   });
   if (match.node != kNoNode) return match;
-  // A node may stand in a second place, which only the way down knows.
+  // A node may be in a second place too, which is found only from the parent down.
   std::string_view below = nameOrPath;
   const Namesakes* const first = byName_.Find(0, TakeName(&below));
   return FindAmong(first, [&](NodeId candidate) { return Below(candidate, below); });

@@ -10,20 +10,21 @@
 
 namespace scene {
 
-// Knows each node by its name and by its place under its parent. Keeps no names: they must outlive it. The
-// time of a call has a bound, however many nodes share a name.
+// Finds each node by its name and by its place under its parent. Does not copy names: they must outlive it.
+// The time of a call is bounded, however many nodes share a name.
 class Names {
  public:
-  // The node stands under the parent (kNoNode: at the top) by the name. Ids are given in rising order. A name
-  // that is taken there stays with the node that has it.
+  // Adds a node under the parent (kNoNode: at the top) with the name. A name that is taken there stays with
+  // the node that has it.
   void Add(NodeId node, NodeId parent, std::string_view name);
 
-  // Takes the node out, by the name and parent that it was added with.
+  // Removes the node; name and parent are those that it was added with.
   void Remove(NodeId node, NodeId parent, std::string_view name);
 
-  // A further place of a node that is known already.
+  // Adds another place of a node that was added before.
   void AddInstance(NodeId node, NodeId parent, std::string_view name);
 
+  // kNoNode where there is none.
   NodeId ChildOf(NodeId parent, std::string_view name) const;
 
   struct Match {
@@ -31,9 +32,9 @@ class Names {
     bool several = false;  // others have the name too; `node` is the first of them
   };
 
-  // "cam", "rig|cam" or "|rig|cam". A ":" before a name, which means the topmost namespace, is passed over.
-  // Nodes are looked for by the name of the path that the fewest of them have; of very many, only
-  // kMostCandidates are looked at.
+  // Finds "cam", "rig|cam" or "|rig|cam". A ":" before a name, which means the topmost namespace, is ignored.
+  // The search begins with the name of the path that the fewest nodes have, and examines at most
+  // kMostCandidates of them.
   static constexpr std::uint32_t kMostCandidates = 64;
   Match Find(std::string_view nameOrPath) const;
 

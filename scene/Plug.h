@@ -14,9 +14,9 @@ inline constexpr NodeId kNoNode = 0xffffffff;
 inline constexpr std::int32_t kNoIndex = -1;
 
 // The attribute has its long name, however the scene writes it: ".t.tx", ".tx" and ".translateX" are all
-// "translateX". An attribute that is not known of the node's type has the name that is written. The index is
-// the array's on the way to it: that of ".tg[2].tt" is 2. A path with several indices is kept as it is
-// written.
+// "translateX". An attribute that the node's type is not known to have keeps the name that is written. The
+// index is that of the array in the path: of ".tg[2].tt" it is 2. A path with several indices is kept as it
+// is written.
 struct Plug {
   NodeId node = kNoNode;
   std::string_view attribute = {};

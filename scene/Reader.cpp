@@ -14,10 +14,10 @@ namespace {
 
 using diag::Code;
 
-// More arguments of one command are not kept: no command that is read in this way has as many.
+// No more arguments of one command are kept: no command that is read in this way has more.
 constexpr std::size_t kMostArguments = 10000;
 
-// What is shown of a template field.
+// The bytes of a template field that are shown, at most.
 constexpr std::size_t kLongestField = 60;
 
 // The length of the template field at the front of the text; 0 where none stands there.
@@ -41,7 +41,7 @@ std::size_t FieldLength(std::string_view text) {
   return end;
 }
 
-// The bytes of the character at the front of the text, which may be no valid UTF-8.
+// The length in bytes of the character at the front of the text, which need not be valid UTF-8.
 std::size_t CharacterLength(std::string_view text) {
   std::size_t length = 1;
   if ((static_cast<unsigned char>(text[0]) & 0xc0) != 0xc0) return length;
@@ -112,10 +112,10 @@ void Reader::ReadCommand() {
 
 // ---- tokens ----
 
-// Reports, and passes over the rest of the command.
+// Reports, and skips the rest of the command.
 Reader::Token Reader::Broken(Code code, std::uint32_t offset, std::uint32_t end) {
   diagnostics_->Report(code, {offset, end - offset});
-  PassOver();
+  SkipCommand();
   return {};
 }
 
@@ -126,7 +126,7 @@ Reader::Token Reader::StrangeByte() {
   const Code code = field != 0 ? Code::TemplateField : Code::UnexpectedByte;
   diagnostics_->Report(code, {cursor_.offset(), length}, {rest.substr(0, length)});
   cursor_.Advance(length);
-  PassOver();
+  SkipCommand();
   return {};
 }
 
@@ -211,14 +211,14 @@ bool Reader::FindEnd(bool strange, std::uint32_t* end) {
   }
 }
 
-void Reader::PassOver() {
+void Reader::SkipCommand() {
   for (;;) {
     switch (cursor_.FindCommandEnd(false).kind) {
       case StopKind::End:
         return cursor_.Advance(1);
       case StopKind::ConflictMark:
         cursor_.SkipLine();
-        // Its line feed is passed once more: the next line may begin with a command.
+        // Steps back before the line feed: the next line may begin with a command.
         if (cursor_.atLineStart()) cursor_.MoveTo(cursor_.offset() - 1);
         break;
       default:

@@ -1,4 +1,4 @@
-// Reads the commands of a scene, and has the builder do what they say.
+// Reads the commands of a scene and carries them out with the builder.
 #pragma once
 
 #include <cstdint>
@@ -13,7 +13,8 @@ namespace scene {
 
 class Reader {
  public:
-  // All must outlive the reader, the text the scene too. `notes` may be null: they are reported then.
+  // All must outlive the reader; the text must outlive the scene too. With null as `notes` the notes are
+  // reported as diagnostics.
   Reader(std::string_view text, diag::Collector* diagnostics, std::vector<NodeNote>* notes);
 
   Scene Read();
@@ -25,11 +26,11 @@ class Reader {
     String,
     Punctuation,
     End,     // ";"
-    Broken,  // what could not be read; it is reported, and the command is passed over
+    Broken,  // it could not be read; it is reported, and the command is skipped
   };
   struct Token {
     TokenKind kind = TokenKind::Broken;
-    std::string_view text = {};  // of a string, what it means
+    std::string_view text = {};  // of a string, with its escapes read
     std::uint32_t offset = 0;    // of a string, after its quote
     std::uint32_t end = 0;
   };
@@ -43,16 +44,16 @@ class Reader {
   Token Broken(diag::Code code, std::uint32_t offset, std::uint32_t end);
   Token StrangeByte();
 
-  // The tokens of the command up to its ";", into arguments_. False where the command could not be read.
-  // Of very many only the first are kept.
+  // Reads the tokens of the command up to its ";" into arguments_. False where the command could not be read.
+  // Keeps the first 10000 tokens only.
   bool ReadArguments();
 
-  // On to the end of the command; what is wrong with it is reported. False where something is; the command is
-  // then passed over. *end is where its ";" stands.
+  // Moves to the end of the command; *end is the offset of its ";". False when the command is broken: that is
+  // reported, and the command is skipped.
   bool FindEnd(bool strange, std::uint32_t* end);
 
-  // To the end of a command that cannot be read. Reports nothing.
-  void PassOver();
+  // Skips to the end of a command that cannot be read. Reports nothing.
+  void SkipCommand();
 
   void Lacks(std::string_view what);
   static bool Is(const Token& token, std::string_view shortName, std::string_view longName);
@@ -98,7 +99,7 @@ class Reader {
   SceneBuilder builder_;
   NodeId current_ = kNoNode;
   bool currentIsLost_ = false;  // the command that makes a node current could not be read
-  std::string_view command_;    // the one that is read
+  std::string_view command_;    // the name of the command that is being read
   std::uint32_t commandOffset_ = 0;
   std::vector<Token> arguments_;
 };

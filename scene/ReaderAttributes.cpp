@@ -20,8 +20,8 @@ bool StandsAlone(std::string_view option) {
 
 }  // namespace
 
-// The node that an attribute without a node belongs to. Where there is none, that is reported, but not where
-// the command that would have made one could not be read: that is reported already.
+// The node that an attribute without a node belongs to. Reports where there is none, unless the command that
+// would have made one could not be read: that was reported already.
 NodeId Reader::Current(Named attribute) {
   if (current_ == kNoNode && !currentIsLost_) {
     diagnostics_->Report(diag::Code::NoCurrentNode, attribute.place, {attribute.text});
@@ -29,8 +29,8 @@ NodeId Reader::Current(Named attribute) {
   return current_;
 }
 
-// From the token on, over options and what they take, to the first token that is neither. False where the
-// command cannot be read.
+// Skips options and their arguments, from the token on; *token becomes the first token that is neither. False
+// where the command cannot be read.
 bool Reader::SkipOptions(Token* token) {
   for (; token->kind == TokenKind::Option; *token = NextToken()) {
     if (StandsAlone(token->text)) continue;
@@ -63,7 +63,7 @@ void Reader::ReadSetAttr() {
   if (!SkipOptions(&token) || token.kind == TokenKind::End) return;
   const std::uint32_t value = token.kind == TokenKind::String ? token.offset - 1 : token.offset;
   cursor_.MoveTo(token.kind == TokenKind::String ? token.end + 1 : token.end);
-  // The edits of a reference are not read: what is strange in them does not matter.
+  // The edits of a reference are not read, so strange bytes in them do not matter.
   if (!FindEnd(path.name != "ed" && path.name != "edits", &end)) return;
   builder_.Set(node, path, value, end - value);
 }

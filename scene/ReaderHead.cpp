@@ -1,4 +1,4 @@
-// The commands at the head of a file: what it needs, what it refers to, its units.
+// The commands at the head of a file: its requirements, file information, references and units.
 #include "scene/Reader.h"
 #include "scene/Units.h"
 

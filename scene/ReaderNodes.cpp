@@ -5,7 +5,7 @@ namespace scene {
 
 // createNode TYPE -n NAME -p PARENT -s
 void Reader::ReadCreateNode() {
-  // What follows a command that cannot be read is not the last node's.
+  // After a command that cannot be read, attributes must not go to the node before.
   current_ = kNoNode;
   currentIsLost_ = true;
   if (!ReadArguments()) return;
@@ -29,7 +29,7 @@ void Reader::ReadCreateNode() {
   currentIsLost_ = false;
 }
 
-// rename [NODE] NAME; with -uid it says a node's number in some data base.
+// rename [NODE] NAME; with -uid it sets a node's identifier, which is ignored.
 void Reader::ReadRename() {
   if (!ReadArguments()) return;
   std::vector<Named> names;
@@ -42,8 +42,8 @@ void Reader::ReadRename() {
   if (node != kNoNode) builder_.Rename(node, names.back());
 }
 
-// parent NODE ... PARENT, or parent -w NODE ...; with -add the node stands in both places. Values stay as
-// they are: a scene writes what holds under the new parent.
+// parent NODE ... PARENT, or parent -w NODE ...; with -add the node is in both places. Values stay as they
+// are: a scene writes those that hold under the new parent.
 void Reader::ReadParent() {
   if (!ReadArguments()) return;
   std::vector<Named> names;

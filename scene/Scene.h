@@ -1,9 +1,8 @@
 // A whole scene, as its author wrote it: nodes, attributes, connections, references, each with its place in
 // the file.
 //
-// Nothing is evaluated and no other file is read. The text stays where it is: names and values refer to it,
-// and it must outlive the scene. A scene does not change once it is read; its const members may be called
-// from several threads.
+// Nothing is evaluated and no other file is read. Names and values refer to the text, which must outlive the
+// scene. A scene does not change after it is read; its const members may be called from several threads.
 #pragma once
 
 #include <array>
@@ -27,14 +26,14 @@ namespace scene {
 
 enum class Origin : std::uint8_t {
   Created,    // by createNode
-  Program,    // one that every scene has (":time1"), named here
+  Program,    // exists in every scene (":time1"), and is named here
   Elsewhere,  // named, but not created: in a referenced file, or nowhere
-  Forward,    // named before it was created: all that is said of it is with the created node
+  Forward,    // named before it was created; the created node has all its attributes and connections
 };
 
 struct Node {
   std::string_view type;  // as it is written; may be empty where the node was not created here
-  std::string_view name;  // its own, with its namespace; of a node from elsewhere, what it is called here
+  std::string_view name;  // its own, with its namespace; of a node from elsewhere, as this file writes it
   NodeId parent = kNoNode;
   NodeId firstChild = kNoNode;  // children in the order of the file
   NodeId nextSibling = kNoNode;
@@ -52,8 +51,8 @@ struct Connection {
 
 // What drives a plug.
 struct Driver {
-  Plug plug;           // the source, or its component that fits
-  int component = -1;  // which one of the source it is, where the source's components are not known; else -1
+  Plug plug;           // the source, or the component of it that belongs to the plug
+  int component = -1;  // the component's number, where the source's components are not known; else -1
   const Connection* connection = nullptr;
 };
 
@@ -62,15 +61,15 @@ struct AddedAttribute {
   NodeId node = kNoNode;
   std::string_view longName;
   std::string_view shortName;
-  std::string_view type = {};      // -at: "double", "doubleAngle", "double3" …; empty where it is not said
+  std::string_view type = {};      // -at: "double", "doubleAngle", "double3" …; empty where it is not given
   std::string_view compound = {};  // -p: the long name of the attribute of which it is a component
-  int component = 0;               // which, from 0
+  int component = 0;               // its place in the compound, from 0
   std::optional<double> fallback;  // -dv
   diag::Range place;
   std::vector<std::uint32_t> components = {};  // of a compound, in order: in Scene::addedAttributes()
 };
 
-// A piece of an array: the values of the elements first to last.
+// Part of an array: the values of the elements first to last.
 struct Piece {
   std::int32_t first;
   std::int32_t last;
@@ -79,7 +78,7 @@ struct Piece {
 
 struct Reference {
   std::string_view node;       // -rfn: the reference's name
-  std::string_view nameSpace;  // -ns: what its names begin with
+  std::string_view nameSpace;  // -ns: the prefix of its names
   std::string_view file;
   diag::Range place;
 };
@@ -96,7 +95,7 @@ struct FileInfo {
   diag::Range place;
 };
 
-// A word of currentUnit; empty where the scene does not say it.
+// A word of currentUnit; empty where the scene does not set the unit.
 struct UnitWord {
   std::string_view word;
   diag::Range place;
@@ -114,27 +113,27 @@ class Scene {
   std::span<const Node> nodes() const { return nodes_; }
   const Node& node(NodeId id) const { return nodes_[id]; }
 
-  // By name or path; kNoNode where there is none. Of several the first is found.
+  // The node of a name or path, the first of several; kNoNode where there is none.
   NodeId Find(std::string_view nameOrPath) const { return names_.Find(nameOrPath).node; }
 
-  // "|rig|cam". Without the first "|" where the topmost node is from elsewhere. Of a path of more than
-  // `longest` bytes the names at its end that fit, after "...": a rig can be as deep as its file is long.
+  // "|rig|cam", without the first "|" where the topmost node is from elsewhere. A path of more than `longest`
+  // bytes becomes "..." and the names at its end that fit: a rig can be as deep as its file is long.
   std::string PathOf(NodeId id, std::size_t longest = static_cast<std::size_t>(-1)) const;
 
   // A plug by a long or a short name, or a path of attributes ("tg[0].tt").
   Plug PlugOf(NodeId node, std::string_view attribute) const;
   Plug PlugOf(NodeId node, std::string_view attribute, std::int32_t index) const;
 
-  // What the file sets: the last value for the attribute, its compound included. With an index, that
-  // element's. The time does not depend on how much is set on the node, but for its logarithm.
+  // The value that the file sets last for the attribute or its compound; with an index, for that element.
+  // None where it sets none. The time grows with the logarithm of the number of settings on the node.
   std::optional<Value> Written(NodeId node, std::string_view attribute, std::int32_t index = kNoIndex) const;
 
   // The number that is written, or the attribute's default. None where what is written cannot be read, and
   // where nothing is written and there is no default.
   std::optional<double> Number(NodeId node, std::string_view attribute, std::int32_t index = kNoIndex) const;
 
-  // The attributes of which something is set or driven, by their long names as they stand in Plug; each as
-  // often as it is said.
+  // The attributes that are set or driven, with the names that they have in Plug; each as often as the file
+  // sets or connects it.
   std::vector<std::string_view> TouchedAttributes(NodeId node) const;
 
   // Hands each of them to `take`.
@@ -148,19 +147,19 @@ class Scene {
     }
   }
 
-  // The default alone: that of addAttr, or that of the node's type.
+  // The default: that of addAttr, or that of the node's type. None where there is none.
   std::optional<double> Default(NodeId node, std::string_view attribute) const;
 
   // All pieces of an array, in the order of the file.
   std::vector<Piece> Pieces(NodeId node, std::string_view attribute) const;
 
-  // Whether anything is connected into the node. Cheaper than to ask for a plug.
+  // Whether anything is connected into the node. Cheaper than SourceOf.
   bool IsDriven(NodeId node) const { return lists_[node].firstInto != kNone; }
 
-  // What drives the plug: itself, or its compound, of which it is then the component.
+  // The driver of the plug or of its compound. None where nothing drives it.
   std::optional<Driver> SourceOf(const Plug& plug) const;
 
-  // What the plug drives: itself, its compound or, of a compound, its components.
+  // The plugs that are driven by the plug, by its compound or by its components.
   std::vector<Plug> DestinationsOf(const Plug& plug) const;
 
   // All connections into a node, or out of it, in the order of the file.
@@ -169,7 +168,7 @@ class Scene {
 
   std::span<const AddedAttribute> addedAttributes() const { return added_; }
 
-  // By its long or short name; null where addAttr made none of the name.
+  // The added attribute of that long or short name; null where addAttr made none.
   const AddedAttribute* Added(NodeId node, std::string_view name) const;
 
   std::span<const Reference> references() const { return references_; }
@@ -202,7 +201,7 @@ class Scene {
     std::uint32_t plusOne = 0;  // 0: none
   };
 
-  // How an attribute is made up, whether its type has it or addAttr made it.
+  // Compound and width of an attribute, of the node's type or of addAttr.
   struct Form {
     std::string_view compound = {};  // of which it is a component; empty where it is none
     int component = 0;
@@ -235,23 +234,24 @@ class Scene {
   UnitWord linearUnit_;
   UnitWord angularUnit_;
   UnitWord timeUnit_;
-  std::deque<std::string> made_;  // names that do not stand in the text as they are
+  std::deque<std::string> made_;  // strings that do not stand in the text as they are
 };
 
-// Reads all of the text, whatever its bytes are. What cannot be read is passed over to the end of its command
-// and reported; it costs nothing else. Time and memory grow in proportion to the text. A text of 4 GiB or
-// more is not read: the scene is then empty.
+// Reads all of the text, whatever its bytes are. A command that cannot be read is reported and skipped; the
+// others are not affected. Time and memory grow in proportion to the text. A text of 4,294,967,295 bytes or
+// more is reported and not read: the scene is then empty.
 Scene Read(std::string_view text, diag::Collector& diagnostics);
 
-// What is to be said of one node, where it may be that nobody asks for the node.
+// A diagnostic about one node, which the caller can drop when it does not need the node.
 struct NodeNote {
   diag::Code code;
   NodeId node;
   diag::Range place;
-  std::array<std::string_view, 3> arguments;  // as many as the code has; they last as long as the scene
+  std::array<std::string_view, 3> arguments;  // as many as the code has; they live as long as the scene
 };
 
-// The same, but ParentInReference and AlreadyConnected are put into `notes`, and not reported.
+// The same, but ParentInReference and AlreadyConnected are appended to `notes` instead of being reported.
+// With null as `notes` they are reported.
 Scene Read(std::string_view text, diag::Collector& diagnostics, std::vector<NodeNote>* notes);
 
 void Report(const NodeNote& note, diag::Collector* diagnostics);

@@ -9,7 +9,7 @@
 namespace scene {
 namespace {
 
-// No array is longer.
+// The largest index of an array.
 constexpr std::uint32_t kLastElement = 0x7ffffffe;
 
 std::uint64_t KeyOf(const Plug& plug) {
@@ -35,7 +35,7 @@ void SceneBuilder::Set(NodeId node, const AttributePath& path, std::uint32_t val
                               .last = path.last});
 }
 
-// An attribute of a name that its type has already is that one.
+// An attribute that the node's type has already is not added.
 void SceneBuilder::AddAttribute(AddedAttribute attribute, NodeId node) {
   if (scene_.InfoOf(node, attribute.longName) != nullptr) return;
   attribute.node = node;
@@ -64,7 +64,7 @@ void SceneBuilder::Index(std::uint32_t connection) {
   scene_.connectionByName_.At(KeyOf(plug), plug.attribute).plusOne = connection + 1;
 }
 
-// The connection that was made last from the one to an element of the other by -na.
+// The last connection that -na made from the source to an element of the destination.
 Scene::IndexOfOne& SceneBuilder::Appended(const Plug& source, const Plug& destination) {
   const std::uint64_t from = HashOf(source.attribute, KeyOf(source));
   return appended_.At(from ^ HashOf({}, destination.node), destination.attribute);

@@ -1,5 +1,5 @@
-// Makes a scene out of commands. What a command names is looked up when the command comes; what is not there
-// yet is looked up once more at the end.
+// Makes a scene out of commands. A name in a command is looked up at once; a node that does not exist yet is
+// looked up again at the end.
 #pragma once
 
 #include <cstdint>
@@ -14,7 +14,7 @@ namespace scene {
 
 class SceneBuilder {
  public:
-  // All must outlive the builder. `notes` may be null: they are reported then.
+  // All must outlive the builder. With null as `notes` the notes are reported as diagnostics.
   SceneBuilder(std::string_view text, diag::Collector* diagnostics, std::vector<NodeNote>* notes);
 
   // A name as a command gives it, and where.
@@ -25,10 +25,10 @@ class SceneBuilder {
 
   // ---- nodes: SceneBuilderNodes.cpp ----
 
-  // Makes the node, or finds it where it is shared and there already. Empty texts: no name, no parent.
+  // Makes the node, or finds a shared one that exists already. Empty texts: no name, no parent.
   NodeId CreateNode(Named type, Named name, Named parent, bool shared);
 
-  // The node of the name or path; where there is none, one from elsewhere that stands for it.
+  // The node of the name or path; where there is none, a node with Origin::Elsewhere.
   NodeId Resolve(Named name);
 
   // The same for commands that change a node: kNoNode, and a note, where there is none.
@@ -62,10 +62,11 @@ class SceneBuilder {
   UnitWord& angularUnit() { return scene_.angularUnit_; }
   UnitWord& timeUnit() { return scene_.timeUnit_; }
 
-  // Keeps a text that does not stand in the file as it is, as long as the scene lives.
+  // Stores a string that does not stand in the file as it is. The result lives as long as the scene.
   std::string_view Keep(std::string text);
 
-  // The scene: parents and connections found as far as they can be. The builder is empty afterwards.
+  // Resolves parents and connections as far as possible and returns the scene. The builder must not be used
+  // afterwards.
   Scene Finish();
 
  private:
@@ -102,9 +103,9 @@ class SceneBuilder {
   std::uint64_t referencesRead_ = 0;
   Reference firstRead_;
   std::string_view nameSpace_;
-  FlatMap<Scene::IndexOfOne> fromElsewhere_;  // nodes by the name they are called
+  FlatMap<Scene::IndexOfOne> fromElsewhere_;  // nodes by their names
   FlatMap<Counter> counters_;                 // by parent and name without its number
-  FlatMap<Counter> nextElements_;             // of arrays: the index that nothing is connected to yet
+  FlatMap<Counter> nextElements_;             // of arrays: the first index after all that are connected
   FlatMap<Scene::IndexOfOne> appended_;       // connections made with -na, by both ends
   FlatMap<Scene::IndexOfOne> referenceByName_;
   FlatMap<Scene::IndexOfOne> referenceBySpace_;

@@ -1,5 +1,5 @@
-// The end of a scene: what was named before it was created is found, circles of parents are cut, lists are
-// linked. Each step is one pass.
+// The end of a scene: finds nodes that were named before they were created, cuts circles of parents, and
+// links the lists. Each step is one pass.
 #include <cstddef>
 #include <string>
 #include <utility>
@@ -20,8 +20,8 @@ Scene SceneBuilder::Finish() {
   return std::move(scene_);
 }
 
-// For each node the one that it turned out to be: itself, but for a name that was used before its node was
-// created.
+// For each node the node that replaces it: itself, unless it stands for a name that was used before its node
+// was created.
 std::vector<NodeId> SceneBuilder::FindForward() {
   std::vector<NodeId> replacement(scene_.nodes_.size());
   for (NodeId id = 0; id < replacement.size(); ++id) {
@@ -52,7 +52,7 @@ void SceneBuilder::ReplaceForward(const std::vector<NodeId>& replacement) {
   }
   for (Setting& setting : scene_.settings_) {
     if (replacement[setting.node] == setting.node) continue;
-    // Its attribute may be known by now under another name.
+    // The created node may have a long name for the attribute.
     setting.node = replacement[setting.node];
     setting.attribute = scene_.PlugOf(setting.node, setting.attribute, setting.first).attribute;
   }
@@ -67,7 +67,7 @@ void SceneBuilder::ReplaceForward(const std::vector<NodeId>& replacement) {
   }
 }
 
-// A node that is met again on the way up from itself loses its parent. Every node is passed once.
+// A node that is its own ancestor loses its parent. Every node is visited once.
 void SceneBuilder::CutCircles() {
   enum class State : std::uint8_t { New, OnTheWay, Done };
   std::vector<State> states(scene_.nodes_.size(), State::New);

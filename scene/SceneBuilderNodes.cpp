@@ -42,7 +42,7 @@ NodeId SceneBuilder::AddNode(const Node& node) {
   return id;
 }
 
-// The name that a node gets: the last one of a path, in the namespace that is set.
+// The node's own name: the last name of a path, in the current namespace.
 std::string_view SceneBuilder::OwnName(Named name) {
   std::string_view own = name.text;
   if (const std::size_t bar = own.rfind('|'); bar != std::string_view::npos) own = own.substr(bar + 1);
@@ -95,7 +95,8 @@ NodeId SceneBuilder::Resolve(Named name) {
 NodeId SceneBuilder::NodeFromElsewhere(Named name) {
   Scene::IndexOfOne& known = fromElsewhere_.At(0, name.text);
   if (known.plusOne != 0) return known.plusOne - 1;
-  // A name from the topmost namespace is that of a node which every scene has; others are looked for again.
+  // A name in the topmost namespace is that of a node that every scene has. Others are looked up again at the
+  // end.
   const bool program =
       !name.text.empty() && name.text[0] == ':' && name.text.find('|') == std::string_view::npos;
   const std::string_view own = WithoutTopmost(name.text);
@@ -115,7 +116,7 @@ NodeId SceneBuilder::FindCreated(Named name, std::string_view command) {
   return match.node;
 }
 
-// Whether the node is not the file's own, and cannot be changed. It is reported.
+// Whether the node is from elsewhere and cannot be changed. Reports it then.
 bool SceneBuilder::IsElsewhere(NodeId id, diag::Range place, std::string_view command) {
   if (scene_.nodes_[id].origin != Origin::Elsewhere) return false;
   diagnostics_->Report(diag::Code::UnknownNode, place, {command, scene_.nodes_[id].name});

@@ -46,8 +46,8 @@ SettingIndex::SettingIndex(std::span<const Setting> settings, std::size_t nodeCo
   firstPart_.push_back(parts_.size());
 }
 
-// Goes over the elements from the first one up. `open` has the settings that may reach the element; the one
-// on top, which comes last in the file, counts up to its end or to the start of the next.
+// Goes over the elements in ascending order. `open` holds the settings that may cover the element. The one on
+// top, the last in the file, counts up to its end or to the start of the next setting.
 void SettingIndex::AddParts(std::span<const Setting> settings, std::span<const std::uint32_t> ofAttribute) {
   std::priority_queue<std::uint32_t> open;
   std::size_t next = 0;

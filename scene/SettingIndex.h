@@ -1,4 +1,4 @@
-// What the file sets on nodes, and which of it counts for an element of an attribute.
+// The settings that the file makes on nodes, and which of them counts for an element of an attribute.
 #pragma once
 
 #include <cstddef>
@@ -11,8 +11,8 @@
 
 namespace scene {
 
-// What one setAttr says: a value for the elements first to last, or for the attribute where both are
-// kNoIndex.
+// The setting of one setAttr: a value for the elements first to last, or for the whole attribute when both
+// are kNoIndex.
 struct Setting {
   static constexpr std::uint32_t kNone = 0xffffffff;
 
@@ -26,8 +26,8 @@ struct Setting {
 };
 
 // Finds the last setting of an element in logarithmic time, however many settings a node has and however
-// their ranges overlap. It names settings by their places in the vector that it was made of and keeps no copy
-// of them.
+// their ranges overlap. Refers to settings by their indices in the vector that it was made from, and keeps no
+// copy of them.
 class SettingIndex {
  public:
   SettingIndex() = default;
@@ -35,7 +35,7 @@ class SettingIndex {
   // Takes n log n steps for n settings. Every node of a setting is below nodeCount.
   SettingIndex(std::span<const Setting> settings, std::size_t nodeCount);
 
-  // The place of the setting; Setting::kNone where nothing is set. The settings are those it was made of.
+  // The index of the setting; Setting::kNone where nothing is set. `settings` are those it was made from.
   std::uint32_t Find(std::span<const Setting> settings, const Plug& plug) const;
 
  private:

@@ -9,7 +9,7 @@
 namespace scene {
 namespace {
 
-// The first version whose new scenes have the resolution 960 x 540. What the year before had is not known.
+// The first version whose new scenes have the resolution 960 x 540. That of the version before is not known.
 constexpr int kWideSince = 2013;
 constexpr double kNarrowWidth = 640.0;
 constexpr double kNarrowHeight = 480.0;
@@ -40,7 +40,7 @@ void ReadUnits(const Scene& scene, Settings& settings) {
   if (const auto unit = TimeUnitOf(scene.timeUnit().word)) settings.rate = {*unit, scene.timeUnit().place};
 }
 
-// The first word of a text, which is taken off with the white space around it.
+// Removes the first word of a text with the white space around it, and returns it.
 std::string_view TakeWord(std::string_view* text) {
   std::size_t start = 0;
   while (start < text->size() && IsByte((*text)[start], kSpaceByte)) ++start;
@@ -51,7 +51,7 @@ std::string_view TakeWord(std::string_view* text) {
   return word;
 }
 
-// What a script runs when its scene is opened, where it sets the playback.
+// The text that a script runs when its scene is opened; none where it does not set the playback.
 std::optional<Value> PlaybackOf(const Scene& scene, NodeId script) {
   if (script == kNoNode || scene.node(script).type != "script") return std::nullopt;
   const std::optional<Value> body = scene.Written(script, "before");
@@ -59,7 +59,8 @@ std::optional<Value> PlaybackOf(const Scene& scene, NodeId script) {
   return plays ? body : std::nullopt;
 }
 
-// The script that a scene keeps its settings in; where it has another name, the first that sets the playback.
+// The text of the script in which Maya stores the settings; without one, of the first script that sets the
+// playback.
 std::optional<Value> FindPlayback(const Scene& scene) {
   std::optional<Value> body = PlaybackOf(scene, scene.Find("sceneConfigurationScriptNode"));
   for (NodeId id = 0; id < scene.nodes().size() && !body; ++id) body = PlaybackOf(scene, id);

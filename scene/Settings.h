@@ -1,4 +1,4 @@
-// What holds for a scene as a whole: units, frame rate, ranges, resolution, and where each is said.
+// The settings of a whole scene: units, frame rate, ranges, resolution, and where the file sets each.
 #pragma once
 
 #include <optional>
@@ -10,7 +10,7 @@
 
 namespace scene {
 
-// A value, and where the file says it; without a place it is the default.
+// A value, and where the file sets it; without a place it is the default.
 template <typename T>
 struct Said {
   T value{};
@@ -44,8 +44,8 @@ struct Settings {
   Said<double> height{540.0};
   Said<double> deviceAspect{1.7777777};
 
-  // The year of the version that wrote the scene, which `requires` or, without it, the file's product says; 0
-  // where neither does.
+  // The year of the version that wrote the scene, from `requires` or else from the file's product; 0 where
+  // neither has it.
   Said<int> version{0};
   std::string product = {};  // "Maya 2018"
 

@@ -1,4 +1,4 @@
-// Names that have a meaning of their own for an import and for a bake.
+// Names with a special meaning for an import and for a bake.
 #pragma once
 
 #include <string_view>

@@ -5,7 +5,7 @@
 namespace scene {
 namespace {
 
-char Meant(char escaped) {
+char CharacterOf(char escaped) {
   switch (escaped) {
     case 'n':
       return '\n';
@@ -25,16 +25,16 @@ char Meant(char escaped) {
 }  // namespace
 
 std::string Unescaped(std::string_view text) {
-  std::string meant;
-  meant.reserve(text.size());
+  std::string unescaped;
+  unescaped.reserve(text.size());
   for (std::size_t at = 0; at < text.size(); ++at) {
     if (text[at] != '\\' || at + 1 == text.size()) {
-      meant += text[at];
+      unescaped += text[at];
     } else {
-      meant += Meant(text[++at]);
+      unescaped += CharacterOf(text[++at]);
     }
   }
-  return meant;
+  return unescaped;
 }
 
 }  // namespace scene

@@ -1,4 +1,4 @@
-// The text of values and names.
+// Escapes in strings.
 #pragma once
 
 #include <string>
@@ -6,8 +6,8 @@
 
 namespace scene {
 
-// A string as it is meant, from what stands between its quotes: \n, \t, \r, \b and \f are the characters that
-// they name; a backslash before any other byte goes away. A backslash at the very end stays.
+// The string with its escapes read, from what stands between its quotes: \n, \t, \r, \b and \f become the
+// characters that they name; a backslash before any other byte is removed. A backslash at the very end stays.
 std::string Unescaped(std::string_view text);
 
 }  // namespace scene

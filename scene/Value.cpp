@@ -17,7 +17,7 @@ std::optional<double> NumberOrFlag(std::string_view word) {
   return NumberOf(word);
 }
 
-// Over white space, comments and what lists are written with.
+// Skips white space, comments, and the brackets and commas of lists.
 void SkipBetween(Cursor& cursor) {
   for (;;) {
     std::uint32_t openComment = 0;
@@ -30,7 +30,7 @@ void SkipBetween(Cursor& cursor) {
 }  // namespace
 
 std::optional<double> NumberOf(std::string_view word) {
-  // A number that letters follow is none here: where a scene has units, they are words of their own.
+  // A number with letters after it is not accepted: units in a scene are separate words.
   if (word.empty() || !(IsByte(word.back(), kDigitByte) || word.back() == '.')) return std::nullopt;
   double value = 0.0;
   const auto status = scan::ReadNumber(word.data(), static_cast<std::int64_t>(word.size()), &value);
@@ -40,8 +40,7 @@ std::optional<double> NumberOf(std::string_view word) {
 std::vector<double> Value::Numbers(std::size_t most) const {
   std::vector<double> numbers;
   Cursor cursor(text_);
-  // A number before the last white space ends within the text, so that it can be read without looking for its
-  // end.
+  // A number before the last white space ends within the text, so it can be read without a check for the end.
   const std::size_t lastSpace = text_.find_last_of(" \t\n\r");
   const char* const sure = text_.data() + (lastSpace == std::string_view::npos ? 0 : lastSpace);
   for (std::size_t passed = 0; numbers.size() < most;) {

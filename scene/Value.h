@@ -1,4 +1,4 @@
-// A value as a scene has it: a piece of the text, read when it is asked for.
+// A value of a scene: part of the text, converted when a caller asks for it.
 #pragma once
 
 #include <cstddef>
@@ -14,25 +14,25 @@ namespace scene {
 // Refers to the scene's text, which must outlive it.
 class Value {
  public:
-  // `text` is what stands at `offset` of the file, from the first value to the last. Numbers count from
-  // `first` on.
+  // `text` stands at `offset` of the file and reaches from the first value to the last. The first `first`
+  // numbers are skipped.
   Value(std::string_view text, std::uint64_t offset, std::size_t first = 0)
       : text_(text), offset_(offset), first_(first) {}
 
   // As it is written.
   std::string_view text() const { return text_; }
 
-  // Where it stands in the file.
+  // Its place in the file.
   diag::Range range() const { return {offset_, text_.size()}; }
 
   // The first number. The words yes, on, true and no, off, false are 1 and 0. None where something else
   // stands, and where the number is too large for a double.
   std::optional<double> Number() const;
 
-  // All numbers, at most `most`, up to the first word that is none.
+  // The numbers up to the first word that is none, at most `most`.
   std::vector<double> Numbers(std::size_t most = static_cast<std::size_t>(-1)) const;
 
-  // Whether Number() is there and not 0.
+  // Whether there is a first number, and it is not 0.
   bool IsOn() const;
 
   // The first string, with its escapes read; strings that are joined by "+" are one. None where no string
