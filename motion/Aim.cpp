@@ -12,8 +12,8 @@ bool Normalised(const Vector& vector, Vector* direction) {
   return true;
 }
 
-// The part of a vector square to a direction, as a direction. What is less than a rounding of it counts as
-// none.
+// The direction of the part of a vector at right angles to a direction. False when that part is no more than
+// rounding.
 bool SquareTo(const Vector& direction, const Vector& vector, Vector* square) {
   constexpr double kParallel = 1e-12;
   Vector unit;
@@ -34,15 +34,11 @@ Matrix Frame(const Vector& direction, const Vector& square) {
   return {direction, square, Cross(direction, square), {}};
 }
 
-Matrix Transposed(const Matrix& m) {
-  return {{m.x.x, m.y.x, m.z.x}, {m.x.y, m.y.y, m.z.y}, {m.x.z, m.y.z, m.z.z}, {}};
-}
-
 Vector PlaceOf(const ConstrainedNode& node) {
   return node.translate + node.rotatePivot + node.rotatePivotTranslate;
 }
 
-// What is up at the node, in its parent's space.
+// The direction that counts as up at the node, in its parent's space.
 Vector UpIn(const Aim& aim, const Matrix& toParent, const Vector& place) {
   switch (aim.upType) {
     case UpType::kScene:

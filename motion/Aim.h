@@ -8,7 +8,7 @@
 
 namespace motion {
 
-// What a constraint takes from one target to find its place.
+// The values of one target that determine its place.
 struct TargetPoint {
   Vector translate;
   Vector rotatePivot;
@@ -17,10 +17,10 @@ struct TargetPoint {
   double weight = 1.0;
 };
 
-// The mean of the targets' places in the world, by weight. Fails where the weights add up to nothing.
+// The mean of the targets' places in the world, by weight. False where the weights add up to 0.
 bool MeanTarget(const std::vector<TargetPoint>& targets, Vector* mean);
 
-// Where the constrained node is, and how its angles are read.
+// The place of the constrained node, and how its angles are applied.
 struct ConstrainedNode {
   Vector translate;
   Vector rotatePivot;
@@ -44,21 +44,21 @@ UpType UpTypeOf(int code);
 
 struct Aim {
   Vector aim{1.0, 0.0, 0.0};      // of the node, turned to the target
-  Vector up{0.0, 1.0, 0.0};       // of the node, turned as far up as can be
-  Vector worldUp{0.0, 1.0, 0.0};  // what up is
+  Vector up{0.0, 1.0, 0.0};       // of the node, turned up as far as possible
+  Vector worldUp{0.0, 1.0, 0.0};  // the direction that counts as up
   UpType upType = UpType::kVector;
   Matrix upObject;     // for the two types with an object: its world matrix
   Vector offset;       // a rotation in XYZ order, before the turn
   double twist = 0.0;  // about the aim, of a scene's up or a vector's; a positive one is right-handed
 };
 
-// The angles that turn the node: in its order, nearest to `near`. Fails where there is no direction: no
-// weights, or a target where the node is, an aim of no length, or a parent that cannot be undone.
+// The angles that turn the node: in its order, nearest to `near`. False where there is no direction: weights
+// that add up to 0, a target at the node's place, an aim of length 0, or a parent without an inverse.
 bool AimAngles(const Aim& aim, const std::vector<TargetPoint>& targets, const ConstrainedNode& node,
                const Vector& near, Vector* angles);
 
-// The rotation that takes `from` to `to`, and the part of `fromUp` square to it to that of `toUp`. Where one
-// of the two has no such part, the shortest turn. Fails where `from` or `to` has no length.
+// The rotation that takes `from` to `to`, and the part of `fromUp` at right angles to it to that of `toUp`.
+// Where one of the two has no such part, the shortest turn. False where `from` or `to` has length 0.
 bool TurnTo(const Vector& from, const Vector& fromUp, const Vector& to, const Vector& toUp, Matrix* rotation);
 
 }  // namespace motion

@@ -77,7 +77,7 @@ std::vector<std::int32_t> Binder::Indices(std::span<const std::string_view> attr
   }
   for (const std::string_view attribute : attributes) {
     for (const scene::Piece& piece : scene().Pieces(node_, attribute)) {
-      // A range that is longer than its values says nothing of the elements beyond them.
+      // A range can be longer than its values: the elements beyond them are not written.
       const std::size_t longest = piece.value.text().size();
       for (std::int32_t index = piece.first; index <= piece.last; ++index) {
         if (static_cast<std::size_t>(index - piece.first) >= longest) break;

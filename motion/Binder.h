@@ -1,4 +1,4 @@
-// How a node type gets at its attributes.
+// Connects the attributes of a node with the fields of its step.
 #pragma once
 
 #include <cstdint>
@@ -15,25 +15,25 @@ namespace motion {
 
 class Evaluator;
 
-// Binds the attributes of one node to the fields of its step. What nothing drives is put into the field at
-// once; what is driven is put there each time before the step runs. An attribute that the scene does not
-// write and that has no default leaves its field as it is.
+// Binds the attributes of one node to the fields of its step. A stored value is put into the field at once, a
+// driven one each time before the step runs. An attribute that the scene does not write and that has no
+// default leaves its field as it is.
 class Binder {
  public:
   Binder(Evaluator* evaluator, scene::NodeId node) : evaluator_(evaluator), node_(node) {}
 
-  // The step that the bindings belong to. Fields are part of it and do not move.
+  // The step that the following bindings belong to. The fields must stay at their addresses while it lives.
   void Begin(Step* step) { step_ = step; }
 
-  // From here on a number that is driven but not known leaves its field as it is.
+  // From here on a driven number that is unknown leaves its field as it is.
   void KeepFields() { keepsFields_ = true; }
 
   scene::NodeId node() const { return node_; }
   const scene::Scene& scene() const;
   const Measures& measures() const;
 
-  // Whether the scene sets or drives the attribute, or one of its components. Where it does not, its field
-  // need not be bound: that is the quick way past the many attributes of a transform.
+  // Whether the scene sets or drives the attribute, or one of its components. If not, its field need not be
+  // bound, which saves most of the many look-ups for a transform.
   bool Touches(std::string_view attribute);
 
   // Angles as radians, all else in the scene's units.

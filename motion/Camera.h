@@ -1,5 +1,5 @@
-// What a camera sees: its film back in the picture, and where a point lands. The camera looks along its -Z,
-// +Y is up.
+// The picture of a camera: the part of the film back that it shows, and where a point appears. The camera
+// looks along its -Z, +Y is up.
 #pragma once
 
 #include "motion/Matrix.h"
@@ -16,10 +16,10 @@ constexpr int kVertical = 2;
 constexpr int kOverscan = 3;
 }  // namespace filmfit
 
-// A perspective camera at one time. Where the scene is silent these values hold.
+// A perspective camera at one time, with the defaults of a scene.
 struct Camera {
   double focalLength = 35.0;            // millimetres
-  double horizontalAperture = 1.41732;  // this and all that follow but the factors: inches
+  double horizontalAperture = 1.41732;  // inches, as all that follow but the factors
   double verticalAperture = 0.94488;
   int filmFit = filmfit::kHorizontal;
   double lensSqueeze = 1.0;
@@ -44,10 +44,10 @@ struct Picture {
 double PixelAspect(const Picture& picture);
 double DeviceAspect(const Picture& picture);
 
-// Width by height of the film, the squeeze of the lens taken in.
+// Width by height of the film, times the squeeze of the lens.
 double FilmAspect(const Camera& camera);
 
-// kHorizontal or kVertical: which side of the film back fills the picture.
+// The side of the film back that fills the picture: kHorizontal or kVertical.
 int ResolvedFit(const Camera& camera, const Picture& picture);
 
 // The part of the film plane that the picture shows, at the focal length: inches.
@@ -60,7 +60,7 @@ struct FilmWindow {
 
 FilmWindow FilmWindowOf(const Camera& camera, const Picture& picture);
 
-// The focal length with the camera's scale taken in: millimetres. Beside it the scale is 1.
+// The focal length in millimetres that gives the same picture with a camera scale of 1.
 double EffectiveFocalLength(const Camera& camera);
 
 // A place in the picture: 0, 0 at the lower left, 1, 1 at the upper right.
@@ -69,7 +69,7 @@ struct PicturePoint {
   double v;
 };
 
-// Where a point in the camera's space lands, inside the picture or not. Fails for a point that is not in
+// Where a point in the camera's space appears, inside the picture or not. False for a point that is not in
 // front of the camera, and where the camera has no picture.
 bool Project(const Camera& camera, const Picture& picture, const Vector& point, PicturePoint* landed);
 

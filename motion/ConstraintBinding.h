@@ -1,4 +1,4 @@
-// What the constraints have in common: how the constrained node and the targets are bound.
+// The bindings that all constraints need: those of the constrained node and of the targets.
 #pragma once
 
 #include <vector>
@@ -8,13 +8,13 @@
 
 namespace motion {
 
-// A rotate order as its code, which may be driven.
+// A constrained node whose rotate order is bound as its code, because it may be driven.
 struct BoundNode {
   ConstrainedNode node;
   double order = 0.0;
   Matrix parentInverse;
 
-  // The node as it is now. False where the parent's inverse cannot be undone.
+  // Updates `node` from the bound fields. False where the parent's inverse matrix has no inverse.
   bool Take();
 };
 
@@ -25,7 +25,7 @@ std::vector<std::int32_t> TargetIndices(const Binder& binder);
 
 void BindTargetPoint(Binder* binder, std::int32_t index, TargetPoint* target);
 
-// A code that was computed: -1 where it is no whole number of a sensible size.
+// A computed number as a code, truncated; -1 where it is not finite or beyond 1000.
 int CodeOf(double number);
 
 }  // namespace motion

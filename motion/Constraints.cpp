@@ -5,12 +5,7 @@
 namespace motion {
 namespace {
 
-// Rotations alone: the inverse of one.
-Matrix Undone(const Matrix& m) {
-  return {{m.x.x, m.y.x, m.z.x}, {m.x.y, m.y.y, m.z.y}, {m.x.z, m.y.z, m.z.z}, {}};
-}
-
-// The mean of rotations by weight, taken in one after the other.
+// The mean of rotations by weight, which are added one after the other.
 class MeanRotation {
  public:
   void Add(const Matrix& rotation, double weight) {
@@ -28,8 +23,8 @@ class MeanRotation {
 
 // From a rotation in the world to the angles of the node.
 Vector NodeAngles(const Matrix& world, const ConstrainedNode& node, const Vector& near) {
-  const Matrix local = world * Undone(RotationOf(node.parentMatrix)) *
-                       Undone(RotationMatrix(node.jointOrient, RotateOrder::kXYZ));
+  const Matrix local = world * Transposed(RotationOf(node.parentMatrix)) *
+                       Transposed(RotationMatrix(node.jointOrient, RotateOrder::kXYZ));
   return NearestAngles(AnglesOf(local, node.order, near), node.order, near);
 }
 

@@ -9,12 +9,12 @@
 
 namespace motion {
 
-// The translation that puts the node on the mean of its targets, plus `offset` in its parent's space. Fails
-// where the weights add up to nothing or the parent cannot be undone.
+// The translation that puts the node on the mean of its targets, plus `offset` in its parent's space. False
+// where the weights add up to 0 or the parent matrix has no inverse.
 bool PointConstraint(const std::vector<TargetPoint>& targets, const ConstrainedNode& node,
                      const Vector& offset, Vector* translate);
 
-// What a constraint takes from one target to find how it is turned.
+// The values of one target that determine its rotation.
 struct TargetRotation {
   Vector rotate;
   RotateOrder order = RotateOrder::kXYZ;
@@ -24,11 +24,11 @@ struct TargetRotation {
 };
 
 // The angles that turn the node as its targets are turned, `offset` first. Several targets are mixed along
-// the shorter arc, which no fact confirms. Fails as above.
+// the shorter arc; that rule is an assumption. False as above.
 bool OrientConstraint(const std::vector<TargetRotation>& targets, const ConstrainedNode& node,
                       const Vector& offset, const Vector& near, Vector* angles);
 
-// A target of a parent constraint: all of its transform, and where the node is held in its space.
+// A target of a parent constraint: its whole transform, and the node's place and rotation in its space.
 struct TargetParent {
   Vector translate;
   Vector rotate;
@@ -48,8 +48,8 @@ struct Pose {
   Vector rotate;
 };
 
-// The pose of a node that is held by its targets as by a parent. Of several targets the places are averaged
-// and the turns mixed, which no fact confirms. Fails as above.
+// The pose of a node that follows its targets as it would follow a parent. Of several targets the places are
+// averaged and the rotations mixed; that rule is an assumption. False as above.
 bool ParentConstraint(const std::vector<TargetParent>& targets, const ConstrainedNode& node,
                       const Vector& near, Pose* pose);
 
@@ -59,8 +59,8 @@ struct TargetScale {
   double weight = 1.0;
 };
 
-// The scale that makes the node as large in the world as the mean of its targets, times `offset`. Fails as
-// above, and where the parent has an axis of no length.
+// The scale that makes the node as large in the world as the mean of its targets, times `offset`. False as
+// above, and where the parent has an axis of length 0.
 bool ScaleConstraint(const std::vector<TargetScale>& targets, const Matrix& parentMatrix,
                      const Vector& offset, Vector* scale);
 

@@ -126,7 +126,7 @@ double Curve::Repeated(int code, double distance, bool after, CurveCursor* curso
   const double length = last.time - first.time;
   double rest = std::fmod(distance, length);
   double turns = std::round((distance - rest) / length);
-  // A whole turn that rounding left incomplete: the value at its end is that of the next one's start.
+  // Rounding can leave the rest just short of a whole turn, which then counts as whole.
   if (length - rest <= kOnKey) {
     rest = 0.0;
     turns += 1.0;

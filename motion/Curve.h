@@ -8,11 +8,11 @@
 
 namespace motion {
 
-// What a curve holds of which nobody knows for certain how the program that wrote the scene treats it. Bits.
+// Properties of a curve for which the rules of the program that wrote the scene are not certain. Bits.
 enum class CurveDoubt : unsigned {
   kTangentType = 1u << 0,             // slow, fast, or no legal type: taken as spline
   kStepInTangent = 1u << 1,           // a step on the way into a key: taken as flat
-  kAutoMix = 1u << 2,                 // the rule is known, the code is likely
+  kAutoMix = 1u << 2,                 // the rule is known, the code only likely
   kFixedWithoutTangent = 1u << 3,     // a fixed key without its tangent: taken as spline
   kFixedEmptyOutTangent = 1u << 4,    // a fixed tangent (0, 0) at the start of a span: taken as flat
   kInfinityCode = 1u << 5,            // no known code: taken as constant
@@ -22,8 +22,8 @@ enum class CurveDoubt : unsigned {
   kRotationInterpolation = 1u << 9,   // the three curves of a rotation belong together: evaluated one by one
 };
 
-// Where the evaluation of a curve stands. A sweep over ascending times with one cursor takes constant time
-// for each step. A cursor belongs to one curve, and holds nothing of it.
+// Remembers the last span that was evaluated, so that a sweep over ascending times takes constant time for
+// each step. A cursor is used with one curve only, and does not refer to it.
 class CurveCursor {
  private:
   friend class Curve;
@@ -41,14 +41,14 @@ class Curve {
   // dropped.
   explicit Curve(CurveData data);
 
-  // In the unit of the keys' values, and exactly a key's value at the key's time. 0 without keys.
+  // The value in the unit of the keys' values; at a key's time it is exactly the key's. 0 without keys.
   double At(double seconds) const;
   double At(double seconds, CurveCursor* cursor) const;
 
   // The curve as it is evaluated. Lives as long as the curve.
   const CurveData& Data() const { return data_; }
 
-  // The sum of the CurveDoubt bits that hold.
+  // The CurveDoubt bits that apply, added up.
   unsigned Doubts() const;
 
  private:

@@ -37,7 +37,8 @@ constexpr std::uint8_t kAutoMix = 27;
 constexpr std::uint8_t kAutoEase = 28;
 }  // namespace tangent
 
-// Codes of what goes on before the first key and after the last one. Every other code counts as constant.
+// Codes of what a curve does before the first key and after the last one. Every other code counts as
+// constant.
 namespace infinity {
 constexpr int kConstant = 0;
 constexpr int kLinear = 1;
@@ -46,8 +47,8 @@ constexpr int kCycleWithOffset = 4;
 constexpr int kOscillate = 5;
 }  // namespace infinity
 
-// The direction of a curve beside a key. Where tangents are weighted, x and y are three times the way from
-// the key to the handle; elsewhere only y / x counts.
+// The direction of a curve beside a key. Where tangents are weighted, x and y are three times the distance
+// from the key to the handle; elsewhere only y / x counts.
 struct Tangent {
   double x = std::numeric_limits<double>::quiet_NaN();  // not a number: the file writes none
   double y = 0.0;
@@ -55,7 +56,7 @@ struct Tangent {
   bool Written() const { return !std::isnan(x); }
 };
 
-// What a curve says about one side of its keys, which is less than there are keys, mostly nothing.
+// Types and tangents on one side of the keys. Mostly empty: files write few of them.
 struct CurveSide {
   std::vector<std::uint8_t> types;  // by key; a key beyond the end has the curve's type
   std::size_t firstTangent = 0;     // the key of tangents[0]

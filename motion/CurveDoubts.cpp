@@ -1,4 +1,4 @@
-// What a curve leaves open: Curve::Doubts.
+// Finds what is not certain about a curve: Curve::Doubts.
 #include <algorithm>
 #include <cmath>
 

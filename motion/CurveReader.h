@@ -1,4 +1,4 @@
-// A curve's keys and tangents out of a scene.
+// Reads a curve's keys and tangents from a scene.
 #pragma once
 
 #include "motion/CurveData.h"
@@ -7,8 +7,8 @@
 
 namespace motion {
 
-// Values in the scene's units, times in seconds; of a driven key "time" is the driving number. What cannot be
-// read is left out.
+// Values are in the scene's units, times in seconds; for a driven key "time" is the driving number. What
+// cannot be read is left out.
 CurveData ReadCurve(const scene::Scene& scene, scene::NodeId node, const Measures& measures);
 
 }  // namespace motion

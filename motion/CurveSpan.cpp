@@ -27,9 +27,9 @@ void MoveTo(double reach, const Tangent& tangent, double length, Handle* handle)
   *handle = {reach, Slope(tangent) * reach * length};
 }
 
-// Two handles of which one lies outside the span can make time run back. It does not for those inside the
-// ellipse X² + Y² + XY - 2X - 2Y + 1 = 0, X and Y being how far each reaches. X stays as it is where it can,
-// and Y goes to the nearer edge.
+// Where a handle lies outside the span, the curve can run back in time. It does not when X and Y, the reaches
+// of the two handles, are inside the ellipse X² + Y² + XY - 2X - 2Y + 1 = 0. Keeps X where possible, and
+// moves Y to the nearer edge.
 void MakeMonotone(double* x, double* y) {
   if (*x >= kFarthest) {
     *x = kFarthest;
@@ -111,8 +111,8 @@ void CurveSpan::SetBezier(const CurveData& curve, std::size_t key) {
   times_[2] = 1.0 + 3.0 * (left.reach - second);
 }
 
-// The u at which that share of the time has passed. Newton's steps, and a halving where a step leaves the
-// bounds or gains too little; the share grows with u.
+// The u at which that share of the time has passed; the share grows with u. Takes Newton steps, and halves
+// the interval where a step leaves it or gains too little.
 double CurveSpan::SolveTime(double share) const {
   constexpr int kMostSteps = 200;
   double low = 0.0;

@@ -1,4 +1,4 @@
-// The piece of a curve between two neighbouring keys, made ready to be evaluated many times.
+// The part of a curve between two neighbouring keys, prepared for many evaluations.
 #pragma once
 
 #include <cstddef>
@@ -29,7 +29,7 @@ class CurveSpan {
   double start_ = 0.0;
   double length_ = 1.0;
   double values_[4] = {};  // of the polynomial in u, lowest power first
-  double times_[3] = {};   // of the share of the time by u, from the first power on
+  double times_[3] = {};   // of the polynomial that gives the share of the time by u, from the first power on
 };
 
 }  // namespace motion

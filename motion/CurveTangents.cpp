@@ -21,7 +21,7 @@ Tangent WrittenTangent(const CurveData& curve, Side side, std::size_t key) {
   return tangent;
 }
 
-// A key between two others: what the rules look at.
+// A key between two others: the slopes that the rules use.
 struct Neighbourhood {
   double before;     // slope of the span before the key
   double after;      // slope of the span after it

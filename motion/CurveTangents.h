@@ -1,4 +1,4 @@
-// The slopes of a curve at its keys: the written ones, and by rule those that are not written.
+// The slopes of a curve at its keys: as the file writes them, else by the rule of the tangent's type.
 #pragma once
 
 #include <cstddef>

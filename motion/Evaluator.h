@@ -1,6 +1,6 @@
 // The values of a scene at its frames.
 //
-// First say which values are wanted, then go from frame to frame:
+// First ask for values, then go from frame to frame:
 //
 //   Evaluator evaluator(scene, &diagnostics);
 //   const NumberId focal = evaluator.Number(camera, "focalLength");
@@ -10,8 +10,9 @@
 //     ... evaluator.Value(focal), evaluator.Value(world) ...
 //   }
 //
-// What a value depends on is found once and computed in that order at every frame; what does not move is
-// computed once. Time and memory grow with what is asked for and what that depends on; nothing is recursive.
+// The dependencies of a value are found once and computed in their order at every frame; values that do not
+// move are computed once. Time and memory grow with the values that are asked for and their dependencies;
+// nothing is recursive.
 #pragma once
 
 #include <cmath>
@@ -36,16 +37,16 @@ namespace motion {
 class LocalStep;
 struct NodeType;
 
-// Why a value is what it is.
+// Where a value comes from.
 enum class Standing : std::uint8_t {
   kStored,       // nothing drives it
   kDriven,       // computed
-  kUnsupported,  // what drives it cannot be computed: the stored value is kept
+  kUnsupported,  // its driver cannot be computed: the stored value is kept
   kCircle,       // it would drive itself: the stored value is kept
-  kFailed,       // what drives it has no answer at some frame: the stored value is kept there
+  kFailed,       // its driver has no value at some frame: the stored value is kept there
 };
 
-// A channel that does not have the value that drives it.
+// A channel that keeps its stored value, although something drives it.
 struct Kept {
   scene::Plug plug;
   Standing standing;
@@ -53,7 +54,8 @@ struct Kept {
 
 class Evaluator {
  public:
-  // Both must outlive the evaluator. Diagnostics are given for what is asked for and what that depends on.
+  // Both must outlive the evaluator. It reports diagnostics about the values that are asked for and their
+  // dependencies.
   Evaluator(const scene::Scene& scene, diag::Collector* diagnostics);
   ~Evaluator();
   Evaluator(const Evaluator&) = delete;
@@ -61,11 +63,11 @@ class Evaluator {
 
   // ---- asking; values are there after the next MoveTo ----
 
-  // A number in the scene's units, to the bit as it is written where nothing drives it.
+  // A number in the scene's units. Where nothing drives it, it is exactly the number that is written.
   NumberId Number(scene::NodeId node, std::string_view attribute, std::int32_t index = scene::kNoIndex);
 
-  // Lengths in the scene's unit. `Local` is what the channels say; with the node's offset matrix it is
-  // `InParent`, from the node's space to its parent's. `World` leads on to the world.
+  // Lengths are in the scene's unit. `Local` is the matrix of the channels; with the node's offset matrix it
+  // is `InParent`, from the node's space to its parent's. `World` goes from the node's space to the world.
   MatrixId Local(scene::NodeId node);
   MatrixId InParent(scene::NodeId node);
   MatrixId World(scene::NodeId node);
@@ -74,7 +76,7 @@ class Evaluator {
   bool Moves(NumberId number) const;
   bool Moves(MatrixId matrix) const;
 
-  // The nodes that compute what was asked for so far, and what that depends on: curves, constraints …
+  // The nodes that compute the values asked for so far and their dependencies: curves, constraints …
   const std::vector<scene::NodeId>& computingNodes() const { return computingNodes_; }
 
   // ---- frames ----
@@ -82,8 +84,8 @@ class Evaluator {
   // Any frame after any other; ascending ones are fastest.
   void MoveTo(double frame);
 
-  // The same in parts: of values that are looked at together, which part holds all that they depend on. What
-  // one part computes no other one needs. What does not move is in kStill. Holds until more is asked for.
+  // Divides what moves into parts that do not depend on each other. Returns, for each set of values, the part
+  // that computes it; kStill for a set that does not move. Valid until more values are asked for.
   struct Wanted {
     std::vector<NumberId> numbers;
     std::vector<MatrixId> matrices;
@@ -91,17 +93,17 @@ class Evaluator {
   static constexpr std::uint32_t kStill = 0;
   std::vector<std::uint32_t> Split(std::span<const Wanted> wanted);
   std::size_t partCount() const { return parts_.size(); }
-  // The values of the other parts stay what they are.
+  // Moves one part only; the values of the others stay as they are.
   void MoveTo(double frame, std::uint32_t part);
 
-  // Of a number that is not known, the attribute's default, and 0 where it has none.
+  // Where a number is unknown, the attribute's default, or 0 where it has none.
   double Value(NumberId number) const {
     const double value = values_[number];
     return std::isnan(value) ? DefaultOf(number) : value;
   }
   const Matrix& Value(MatrixId matrix) const { return values_[matrix]; }
 
-  // What the local matrix of a node was made from, with the node's own lengths and radians.
+  // The channels that the local matrix of a node was made from: lengths in the scene's unit, radians.
   const Transform& TransformOf(MatrixId local) const;
 
   const Measures& measures() const { return measures_; }

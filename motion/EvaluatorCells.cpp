@@ -1,4 +1,4 @@
-// The cells of an evaluator: which step writes each, found by what drives its plug.
+// The cells of an evaluator: the step that writes each of them follows from the driver of its plug.
 #include <optional>
 
 #include "motion/Evaluator.h"
@@ -46,15 +46,15 @@ NumberId Evaluator::Reserve(const Plug& plug) {
   return id;
 }
 
-// A plug whose attribute nobody knows has the name by which it was asked for, and that may be put together on
-// the spot: the evaluator keeps its own.
+// The name of an attribute that is not known comes from the caller, and may be temporary: the evaluator keeps
+// a copy.
 Plug Evaluator::WithLastingName(const Plug& plug) {
   if (scene::FindAttribute(scene_.node(plug.node).type, plug.attribute) != nullptr) return plug;
   if (scene_.Added(plug.node, plug.attribute) != nullptr) return plug;
   return {plug.node, unknownNames_.emplace_back(plug.attribute), plug.index};
 }
 
-// Null where the plug is nothing that a node computes.
+// Null where no node computes the plug.
 const NodeType* Evaluator::TypeOfOutput(const Plug& plug) const {
   if (plug.index != scene::kNoIndex) return nullptr;
   const NodeType* const type = FindNodeType(scene_.node(plug.node).type);
@@ -104,14 +104,14 @@ void Evaluator::Settle() {
   Order();
 }
 
-// Whether the node stands in the hierarchy, so that it has the attributes of a transform.
+// Whether the node is in the hierarchy and so has the attributes of a transform.
 bool Evaluator::IsPlaced(NodeId id) const {
   const scene::Node& node = scene_.node(id);
   return node.parent != scene::kNoNode || node.firstChild != scene::kNoNode ||
          scene::KeepsAttributes(node.type);
 }
 
-// Whether a source's number can be had: an output that is computed, or a value that the scene holds.
+// Whether the number of a source is available: as a computed output, or as a value of the scene.
 bool Evaluator::CanGive(const scene::Driver& driver) const {
   const Plug& plug = driver.plug;
   const scene::Node& node = scene_.node(plug.node);
@@ -123,7 +123,7 @@ bool Evaluator::CanGive(const scene::Driver& driver) const {
          scene_.Default(plug.node, plug.attribute).has_value();
 }
 
-// What the scene writes for a channel that is driven: what it showed when it was saved, if anything.
+// The value that the scene writes for a driven channel: the one at the time of saving. Unknown without one.
 double Evaluator::StoredNumber(const Plug& plug) const {
   const auto written = scene_.Written(plug.node, plug.attribute, plug.index);
   return written ? written->Number().value_or(kUnknown) : kUnknown;

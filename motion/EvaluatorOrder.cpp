@@ -1,5 +1,4 @@
-// The order of an evaluator's steps: each after those that it reads. Nothing that is connected in a circle
-// counts.
+// The order of an evaluator's steps: each after those that it reads. Connections in a circle are cut.
 #include <tuple>
 
 #include "motion/Evaluator.h"
@@ -21,16 +20,15 @@ void Evaluator::Order() {
   ReportFailures();
 }
 
-// The step that writes an input, counted from the numbers on; kNone where it is written once and for all.
+// The step that writes an input; matrix inputs count after the number inputs. kNone where no step writes it.
 std::uint32_t Evaluator::StepOfInput(const Step& step, std::size_t input) const {
   const std::size_t numbers = step.numberInputs.size();
   if (input < numbers) return numbers_[static_cast<std::size_t>(step.numberInputs[input].cell)].step;
   return matrices_[static_cast<std::size_t>(step.matrixInputs[input - numbers].cell)].step;
 }
 
-// Every channel of the circle keeps the value that the scene holds for it. A circle always passes
-// connections, for the parents of a node form none. It is reported once, by the first of its channels in the
-// scene.
+// Every channel of the circle keeps its stored value. A circle always contains connections, because parents
+// form no circles. It is reported once, at the first of its channels in the scene.
 void Evaluator::CutCircle(std::span<const std::uint32_t> circle) {
   const scene::Plug* first = nullptr;
   const auto take = [&first](const scene::Plug& plug) {

@@ -1,5 +1,5 @@
-// What moves, in parts that depend on nothing of each other. A sweep over all frames of one part after the
-// other keeps what it computes near the processor, however large the scene is.
+// Divides what moves into parts that do not depend on each other. A sweep over all frames of one part after
+// the other keeps its values in the processor's caches, however large the scene is.
 #include <numeric>
 
 #include "motion/Evaluator.h"
@@ -7,7 +7,7 @@
 namespace motion {
 namespace {
 
-// Things that are joined are of one group.
+// Disjoint sets: joined things are in one group.
 class Groups {
  public:
   explicit Groups(std::size_t count) : above_(count) { std::iota(above_.begin(), above_.end(), 0u); }

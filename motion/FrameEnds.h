@@ -1,4 +1,4 @@
-// The first and the last frame of what a scene plays and keys.
+// The first and the last frame of the playback range and the keys of a scene.
 #pragma once
 
 #include <optional>
@@ -18,8 +18,8 @@ struct FrameEnds {
 // Times nearer to a whole frame than this count as that frame.
 inline constexpr double kFrameTolerance = 1e-6;
 
-// What is played and all keys of the curves of time among the nodes, outward to whole frames. Nothing is
-// played where the last frame lies before the first one. None where nothing is played or keyed.
+// The range of `played` and of all keys of time curves among the nodes, rounded outward to whole frames. A
+// `played` whose last frame lies before its first one is ignored. None where there is neither.
 std::optional<FrameEnds> FindFrameEnds(const scene::Scene& scene, const std::optional<FrameEnds>& played,
                                        std::span<const scene::NodeId> nodes, const Measures& measures);
 

@@ -1,8 +1,7 @@
 // Values that are computed from one another, frame by frame.
 //
-// A number or a matrix is a cell with an id. A step reads cells, computes, and writes cells of its own. A
-// number that is not known is NaN, a matrix that is not known has NaN in it; a step that reads one writes
-// what is not known.
+// A number or a matrix is a cell with an id. A step reads cells, computes, and writes cells of its own. An
+// unknown number is NaN, an unknown matrix contains NaN; a step that reads one writes unknown values.
 #pragma once
 
 #include <cstdint>
@@ -25,7 +24,7 @@ struct Values {
   double frame = 0.0;
   std::vector<double> numbers;
   std::vector<Matrix> matrices;
-  std::vector<NumberId> failed;  // channels that have begun to keep their stored value
+  std::vector<NumberId> failed;  // channels that keep their stored value since the last report
 
   double& operator[](NumberId id) { return numbers[static_cast<std::size_t>(id)]; }
   double operator[](NumberId id) const { return numbers[static_cast<std::size_t>(id)]; }
@@ -33,8 +32,8 @@ struct Values {
   const Matrix& operator[](MatrixId id) const { return matrices[static_cast<std::size_t>(id)]; }
 };
 
-// Where a step finds an input, and the field of its own that the input goes to. The field is the cell times
-// the factor; where the cell is not known it is `fallback`, which may be unknown too.
+// The cell of an input, and the field of the step that receives it: the cell times the factor. Where the cell
+// is unknown the field is `fallback`, which may be unknown too.
 struct NumberInput {
   NumberId cell;
   double* field;
@@ -55,8 +54,8 @@ class Step {
 
   virtual void Run(Values* values) = 0;
 
-  // Of a step that passes on what is connected: from now on it gives what the scene holds instead, and reads
-  // nothing. False for others, which stay as they are.
+  // Makes a step that passes on a connected value give the stored value from now on, and read nothing. False
+  // for other steps, which stay as they are.
   virtual bool Cut() { return false; }
 
   std::vector<NumberInput> numberInputs;
@@ -64,7 +63,7 @@ class Step {
   bool readsFrame = false;
 
  protected:
-  // Brings the inputs to their fields. False where one is not known.
+  // Copies the inputs to their fields. False where one is unknown.
   bool Load(const Values& values);
 };
 
@@ -77,7 +76,7 @@ class NumberStep : public Step {
   std::uint32_t outputCount = 0;
 
  private:
-  // Writes outputCount numbers. False where there is no answer.
+  // Writes outputCount numbers. False where they cannot be computed: they are then unknown.
   virtual bool Compute(double frame, double* outputs) = 0;
 };
 

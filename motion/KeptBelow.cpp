@@ -12,7 +12,7 @@ KeptBelow::KeptBelow(const Evaluator& evaluator)
   for (const std::uint32_t at : evaluator.placed_) listOfStep_[at] = ListBelow(*evaluator.steps_[at]);
 }
 
-// The list of what the step reads. Where all that is kept lies below one input, that input's list is shared.
+// The list of a step: the lists of its inputs together. Where only one input has a list, that list is shared.
 std::uint32_t KeptBelow::ListBelow(const Step& step) {
   std::uint32_t only = 0;
   bool several = false;

@@ -1,4 +1,4 @@
-// What of all that a value depends on does not have the value that drives it.
+// Finds the channels that keep their stored value among all that a value depends on.
 #pragma once
 
 #include <cstdint>
@@ -9,15 +9,14 @@
 
 namespace motion {
 
-// One pass over all that an evaluator computes; afterwards a question costs no more than what is asked. What
-// a value depends on is counted up to kMost: a rig of thousands of unsupported nodes says so by a few of
-// them.
+// Makes one pass over all that an evaluator computes; afterwards a call costs no more than its arguments. At
+// most kMost channels are kept for a value: of a rig with thousands of unsupported nodes a few are enough.
 class KeptBelow {
  public:
   static constexpr std::size_t kMost = 8;
 
-  // As things stand now: a driver that has no answer at some frame is known after that frame. The evaluator
-  // must outlive it.
+  // The evaluator must outlive it. A driver without a value at some frame is known only after that frame, so
+  // this comes after all frames.
   explicit KeptBelow(const Evaluator& evaluator);
 
   // Each once, at most kMost.
@@ -34,11 +33,11 @@ class KeptBelow {
   std::uint32_t ListBelow(const Step& step);
 
   const Evaluator& evaluator_;
-  std::vector<std::uint32_t> listOfStep_;  // of what is kept below a step: 0 is nothing
+  std::vector<std::uint32_t> listOfStep_;  // the index in lists_ of what is kept below a step; 0: nothing
   std::vector<std::vector<Kept>> lists_;
 };
 
-// What is said of it: the sentence of its diagnostic.
+// The sentence of its diagnostic.
 std::string SentenceOf(const Evaluator& evaluator, const Kept& kept);
 
 }  // namespace motion

@@ -5,7 +5,7 @@
 namespace motion {
 namespace {
 
-// The direction of a vector; false where it has none.
+// Makes the vector one of length 1; false where it has no direction.
 bool Normalise(Vector* vector) {
   const double length = Length(*vector);
   if (!(length > 0.0) || !std::isfinite(length)) return false;
@@ -13,7 +13,7 @@ bool Normalise(Vector* vector) {
   return true;
 }
 
-// A direction square to a unit vector.
+// A direction at right angles to a unit vector.
 Vector AnySquare(const Vector& unit) {
   const bool awayFromX = std::fabs(unit.x) < 0.5;
   Vector square = Cross(unit, awayFromX ? Vector{1.0, 0.0, 0.0} : Vector{0.0, 1.0, 0.0});
@@ -21,8 +21,8 @@ Vector AnySquare(const Vector& unit) {
   return square;
 }
 
-// What of a vector is square to a unit vector, as a direction. Twice, because the first difference carries
-// the rounding of a long vector.
+// Replaces the vector by the direction of its part at right angles to a unit vector. Done twice, because the
+// first difference has the rounding of a long vector.
 bool NormaliseSquareTo(const Vector& unit, Vector* vector) {
   if (!Normalise(vector)) return false;
   for (int round = 0; round < 2; ++round) {

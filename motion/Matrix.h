@@ -1,8 +1,8 @@
 // Points and matrices, as a scene writes them.
 //
-// Row vectors: a point p becomes p·M, and in A·B what A does comes first. The rows of a matrix are where the
-// unit axes go; the last one is where the origin goes. Right-handed. The last column is always 0 0 0 1 and
-// not kept.
+// Row vectors: a point p becomes p·M, and A·B applies A first. The rows of a matrix are the images of the
+// unit axes; the last one is the image of the origin. Right-handed. The last column is always 0 0 0 1 and is
+// not stored.
 #pragma once
 
 #include <cmath>
@@ -29,7 +29,7 @@ inline double Dot(const Vector& a, const Vector& b) { return a.x * b.x + a.y * b
 inline Vector Cross(const Vector& a, const Vector& b) {
   return {a.y * b.z - a.z * b.y, a.z * b.x - a.x * b.z, a.x * b.y - a.y * b.x};
 }
-// No overflow and no underflow on the way.
+// Without overflow or underflow in between.
 inline double Length(const Vector& a) { return std::hypot(a.x, a.y, a.z); }
 
 struct Matrix {
@@ -68,17 +68,22 @@ inline Matrix WithoutOrigin(Matrix matrix) {
   return matrix;
 }
 
+// Rows and columns exchanged, without the origin: the inverse of a rotation.
+inline Matrix Transposed(const Matrix& m) {
+  return {{m.x.x, m.y.x, m.z.x}, {m.x.y, m.y.y, m.z.y}, {m.x.z, m.y.z, m.z.z}, {}};
+}
+
 bool IsFinite(const Vector& vector);
 bool IsFinite(const Matrix& matrix);
 
 // The volume of the unit cube's image; negative where the matrix mirrors.
 double Determinant(const Matrix& matrix);
 
-// Fails where the matrix is flat or not finite; *inverse is then unchanged.
+// False where the matrix is flat or not finite; *inverse is then unchanged.
 bool Invert(const Matrix& matrix, Matrix* inverse);
 
-// The axes turned square to each other, the first one keeping its direction and the second one its plane, all
-// of length 1 and right-handed. An axis of no length takes what the others leave.
+// The rotation nearest to the axes: at right angles, of length 1, right-handed. The first axis keeps its
+// direction, the second one its plane with the first. An axis of length 0 is completed from the others.
 Matrix RotationOf(const Matrix& matrix);
 
 }  // namespace motion

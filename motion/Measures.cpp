@@ -80,14 +80,10 @@ std::string_view WithoutAxis(std::string_view name) {
   return axis ? name.substr(0, name.size() - 1) : name;
 }
 
-bool EndsWith(std::string_view text, std::string_view end) {
-  return text.size() >= end.size() && text.substr(text.size() - end.size()) == end;
-}
-
-// animCurveTA: what it gives is the last letter, what it takes the one before.
+// animCurveTA: the last letter is the kind of the output, the one before that of the input.
 Kind KindOfCurve(std::string_view type, std::string_view attribute) {
   if (attribute == "input")
-    return EndsWith(type.substr(0, type.size() - 1), "T") ? Kind::kTime : Kind::kPlain;
+    return type.substr(0, type.size() - 1).ends_with('T') ? Kind::kTime : Kind::kPlain;
   if (attribute != "output") return Kind::kPlain;
   switch (type.back()) {
     case 'L':
@@ -110,8 +106,8 @@ Kind KindOfOffset(std::string_view type) {
 Kind KindOfBlend(std::string_view type, std::string_view attribute) {
   const bool value = attribute == "inputA" || attribute == "inputB" || attribute == "output";
   if (!value) return Kind::kPlain;
-  if (EndsWith(type, "DL") || EndsWith(type, "FL")) return Kind::kLength;
-  return EndsWith(type, "DA") || EndsWith(type, "FA") ? Kind::kAngle : Kind::kPlain;
+  if (type.ends_with("DL") || type.ends_with("FL")) return Kind::kLength;
+  return type.ends_with("DA") || type.ends_with("FA") ? Kind::kAngle : Kind::kPlain;
 }
 
 // What addAttr's types measure.
@@ -121,7 +117,7 @@ Kind KindOfAdded(std::string_view type) {
   return type == "time" ? Kind::kTime : Kind::kPlain;
 }
 
-// The inputs of these measure whatever drives them.
+// Their inputs have the kind of what drives them.
 bool TakesAnything(std::string_view type) { return type == "unitConversion" || type == "blendWeighted"; }
 
 Kind KindByName(const scene::Scene& scene, const scene::Plug& plug) {

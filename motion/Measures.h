@@ -1,4 +1,4 @@
-// What the numbers of a scene mean.
+// The units of the numbers in a scene.
 #pragma once
 
 #include <cstdint>
@@ -29,8 +29,7 @@ enum class Kind : std::uint8_t { kPlain, kLength, kAngle, kTime };
 
 Kind KindOf(const scene::Scene& scene, const scene::Plug& plug);
 
-// Internal units (centimetres, radians, ticks) in one unit of the scene. What is connected passes on internal
-// units.
+// Internal units (centimetres, radians, ticks) in one unit of the scene. Connections pass on internal units.
 double InternalUnits(const Measures& measures, Kind kind);
 
 }  // namespace motion

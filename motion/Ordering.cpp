@@ -9,7 +9,8 @@ Ordering::Mark& Ordering::MarkOf(std::uint32_t step) {
   return marks_[step];
 }
 
-// Sets of steps that all lead to one another come out after those that they lead to: Tarjan's way.
+// Tarjan's algorithm for strongly connected components, without recursion: sets of steps that all lead to one
+// another come after those that they lead to.
 void Ordering::Place(std::uint32_t step) {
   if (MarkOf(step).state != State::kNew) return;
   Walk walk;

@@ -1,4 +1,4 @@
-// Puts what reads one another in order.
+// Puts steps into an order in which each comes after those that it reads.
 #pragma once
 
 #include <cstddef>
@@ -28,11 +28,11 @@ class Ordering {
 
   explicit Ordering(Graph graph) : graph_(std::move(graph)) {}
 
-  // Places the step, and before it what it leads to, but for what is placed already.
+  // Places the step, and before it all that it reads; what is placed already stays.
   void Place(std::uint32_t step);
 
-  // Places the steps of a circle once more, after some of what they read was taken away. For placeCircle. A
-  // circle that is still there is an error of the caller's: its steps are placed as they come.
+  // Places the steps of a circle again, after some of their inputs were removed. For placeCircle. Leaving a
+  // circle is an error of the caller: its steps are then placed in any order.
   void PlaceOpened(std::span<const std::uint32_t> circle);
 
  private:

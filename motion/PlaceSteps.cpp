@@ -64,7 +64,7 @@ void ReadLimits(Binder* binder, Transform* transform) {
   }
 }
 
-// The node's own matrix, or none, then what stands above it.
+// The node's own matrix, where there is one, then those above it.
 class PlaceStep final : public MatrixStep {
  public:
   explicit PlaceStep(bool inverted) : inverted_(inverted) {}

@@ -1,4 +1,4 @@
-// The matrices that a node has by its place: local, world, those of its parents, and their inverses.
+// The matrices of a node in the hierarchy: local, world, those of its parents, and their inverses.
 #pragma once
 
 #include <memory>
@@ -16,7 +16,7 @@ inline constexpr std::string_view kWorldMatrix = "worldMatrix";
 inline constexpr std::string_view kWorldInverseMatrix = "worldInverseMatrix";
 inline constexpr std::string_view kParentMatrix = "parentMatrix";
 inline constexpr std::string_view kParentInverseMatrix = "parentInverseMatrix";
-inline constexpr std::string_view kDagLocalMatrix = "dagLocalMatrix";  // the offset matrix is in it
+inline constexpr std::string_view kDagLocalMatrix = "dagLocalMatrix";  // with the offset matrix
 inline constexpr std::string_view kOffsetParentMatrix = "offsetParentMatrix";
 
 // Whether the attribute is one of the first seven.

@@ -1,11 +1,11 @@
-// Rotations that are mixed.
+// Mixing of rotations.
 #pragma once
 
 #include "motion/Matrix.h"
 
 namespace motion {
 
-// A rotation a share of the way (0 to 1) from one to another, along the shorter arc. Both are rotations.
+// The rotation at a share (0 to 1) of the shorter arc from one rotation to another.
 Matrix MixRotations(const Matrix& from, const Matrix& to, double share);
 
 }  // namespace motion

@@ -9,7 +9,7 @@ constexpr double kPi = 3.141592653589793;
 constexpr double kTurn = 2.0 * kPi;
 constexpr double kPole = 1e-9;  // the cosine of the second angle below which the others are not separable
 
-// The axes in the order of their turns, and whether they follow each other as x, y, z do.
+// The axes in the order of their rotations; the sign is 1 when they follow each other as x, y, z do, else -1.
 struct Turns {
   int first;
   int second;
@@ -73,9 +73,9 @@ Matrix RotationMatrix(const Vector& angles, RotateOrder order) {
          RotationAbout(turns.third, angles[turns.third]);
 }
 
-// With a, b, c the angles in the order of the turns, the first row is (cos b cos c, cos b sin c, -sin b). The
-// third angle is read off it, and the others off what is left when that turn is taken back: so the three fit
-// each other also near the pole, where each of them is uncertain.
+// With a, b, c the angles in the order of the rotations, the first row is (cos b cos c, cos b sin c, -sin b).
+// The third angle follows from it, and the others from what is left when that rotation is undone. So the
+// three fit each other near the pole too, where each of them is uncertain.
 Vector AnglesOf(const Matrix& rotation, RotateOrder order, const Vector& near) {
   const auto [i, j, k, sign] = TurnsOf(order);
   const auto at = [&rotation](int row, int column) { return rotation.Axis(row)[column]; };

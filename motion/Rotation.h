@@ -5,7 +5,7 @@
 
 namespace motion {
 
-// The order in which the axes take their turn; the codes of the scene.
+// The order of the rotations about the axes; the codes of the scene.
 enum class RotateOrder { kXYZ = 0, kYZX = 1, kZXY = 2, kXZY = 3, kYXZ = 4, kZYX = 5 };
 
 // The order of a code; XYZ for every other number.
@@ -21,8 +21,8 @@ Matrix RotationAbout(int axis, double angle);
 // the sum or the difference of the others is fixed: the last one is then taken to be that of `near`.
 Vector AnglesOf(const Matrix& rotation, RotateOrder order, const Vector& near = {});
 
-// The same rotation by the angles that lie nearest to others: moved by whole turns, or through the other way
-// to turn there. Angles so large that a turn changes nothing stay.
+// The angles of the same rotation that lie nearest to `near`: shifted by whole turns, or replaced by the
+// other three angles that give the rotation. Angles so large that a turn changes nothing stay.
 Vector NearestAngles(const Vector& angles, RotateOrder order, const Vector& near);
 
 }  // namespace motion

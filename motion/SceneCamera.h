@@ -11,24 +11,24 @@
 
 namespace motion {
 
-// Asks an evaluator for all that a camera's picture depends on.
+// The values of a camera that its picture depends on, from an evaluator.
 class SceneCamera {
  public:
   // The evaluator must outlive the camera. `shape` is a node of a camera's type.
   SceneCamera(Evaluator* evaluator, scene::NodeId shape);
 
-  // The camera at the frame that the evaluator stands at.
+  // The camera at the evaluator's current frame.
   Camera Now() const;
 
-  // Whether something changes the picture at that frame that a Camera does not know: the film fit offset
-  // where the film is not as wide as the picture, what is done to the film after the projection, and the pan
-  // and zoom of the view where they are rendered.
+  // Whether something changes the picture at that frame that Camera does not contain: a film fit offset where
+  // film and picture have different shapes, changes after the projection, and pan and zoom of the view where
+  // they are rendered.
   bool HasFurtherChanges(const Picture& picture) const;
 
-  // Whether anything of it can change from frame to frame.
+  // Whether any of the values can change from frame to frame.
   bool Moves() const;
 
-  // What is asked for, for KeptBelow.
+  // The ids of the values, for KeptBelow.
   std::vector<NumberId> Numbers() const { return {numbers_.begin(), numbers_.end()}; }
 
  private:

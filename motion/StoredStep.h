@@ -1,5 +1,5 @@
-// Cells that another cell drives, with the value that the scene writes for them, if any: it is taken where
-// the other one is not known.
+// Steps of driven cells. They pass on the driving cell; where that is unknown they give the value that the
+// scene stores, if any.
 #pragma once
 
 #include "motion/Graph.h"

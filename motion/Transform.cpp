@@ -14,7 +14,7 @@ Matrix ShearMatrix(const Shear& shear) {
   return {{1.0, 0.0, 0.0}, {shear.xy, 1.0, 0.0}, {shear.xz, shear.yz, 1.0}, {}};
 }
 
-// A parent's scale of 0 cannot be taken back.
+// A parent's scale of 0 cannot be undone.
 double Inverse(double scale) { return scale == 0.0 ? 1.0 : 1.0 / scale; }
 
 Matrix JointMatrix(const Transform& joint, const Vector& translate, const Matrix& turned,

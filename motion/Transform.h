@@ -6,7 +6,7 @@
 
 namespace motion {
 
-// What a channel may not go beyond, where that is switched on.
+// The limits of a channel, each of which can be off.
 struct Limit {
   double least = 0.0;
   double most = 0.0;
@@ -34,21 +34,21 @@ struct Transform {
   Vector scalePivot;
   Vector scalePivotTranslate;
 
-  // A joint has no pivots and no shear, whatever stands above.
+  // A joint ignores the pivots and the shear above.
   bool isJoint = false;
   Vector jointOrient;
   bool segmentScale = true;
-  Vector inverseScale{1.0, 1.0, 1.0};  // the scale of the parent joint, which segmentScale takes back
+  Vector inverseScale{1.0, 1.0, 1.0};  // the scale of the parent joint, which segmentScale undoes
 
   Limit translateLimit[3];
   Limit rotateLimit[3];
   Limit scaleLimit[3];
 };
 
-// From the node's own space to the space that its parent matrix starts from.
+// From the node's own space to its parent's, without the node's offset matrix.
 Matrix LocalMatrix(const Transform& transform);
 
-// What of a transform would be lost if it were written as translation, rotation in XYZ order and scale.
+// What a transform loses when it is written as translation, rotation in XYZ order and scale.
 enum class TransformForm {
   kPlain,    // nothing
   kPivoted,  // the rotate pivot and the scale pivot
@@ -65,19 +65,19 @@ struct MatrixParts {
   Shear shear;
 };
 
-// A matrix that mirrors has a negative x scale. An axis of no length has scale 0 and no shear. `near` are the
-// angles of the previous frame, which the new ones follow. The matrix is finite.
+// A matrix that mirrors has a negative x scale. An axis of length 0 has scale 0 and no shear. `near` are the
+// angles of the previous frame; the result is nearest to them. The matrix must be finite.
 MatrixParts TakeApart(const Matrix& matrix, const Vector& near = {});
 
-// The angles of a camera, in XYZ order. It looks along its third axis, also where the axes are not square to
-// each other, and its second one keeps its plane. `near` as above.
+// The angles of a camera, in XYZ order. It looks along its third axis, even where the axes are not at right
+// angles, and its second axis keeps its plane. `near` as above.
 Vector ViewAngles(const Matrix& matrix, const Vector& near = {});
 
-// The length of the longest axis over that of the shortest; infinite where one has none.
+// The length of the longest axis over that of the shortest; infinite where one has length 0.
 double Unevenness(const Matrix& matrix);
 
-// The largest cosine between two axes of a matrix: what no translation, rotation and scale can say. 0 where
-// they are square.
+// The largest cosine between two axes of a matrix, which translation, rotation and scale cannot express. 0
+// where all are at right angles.
 double Skew(const Matrix& matrix);
 
 }  // namespace motion
