@@ -1,5 +1,5 @@
-// Makes of a scene a small one that the importer takes: cameras, what stands above them, locators, with a
-// value at every frame.
+// Makes a small scene that the importer takes: the cameras and locators of a scene and the transforms above
+// them, with a value at every frame.
 #pragma once
 
 #include <cstddef>
@@ -17,11 +17,11 @@ namespace bake {
 
 // How a node comes over.
 enum class Method {
-  kHierarchy,  // under the transforms that stand above it
-  kWorld,      // against the world, without them
+  kHierarchy,  // under the transforms above it
+  kWorld,      // in world space, without them
 };
 
-// What became of one camera.
+// The result for one camera.
 struct CameraReport {
   std::string path;  // in the scene
   std::string name;  // in the bake; empty where it was not written
@@ -29,7 +29,7 @@ struct CameraReport {
   bool moves = false;      // its place, or that of something above it
   bool lensMoves = false;  // its focal length
   bool written = false;
-  std::vector<std::string> differences;  // sentences: what a composition shows otherwise
+  std::vector<std::string> differences;  // a sentence for each thing that a composition shows differently
 };
 
 struct Report {
@@ -46,8 +46,9 @@ struct Origin {
   std::string options;  // as they were given
 };
 
-// Writes the bake of the scene. Cameras that can be written are written also where another one cannot.
-// Nothing is written where the report has no frames. The same input gives the same bytes.
+// Writes the bake of the scene. A camera that cannot be written does not keep the others from being written.
+// Nothing is written when the report has no frames. A write that fails shows in the stream's state. The same
+// input gives the same bytes.
 Report Bake(const scene::Scene& scene, const Options& options, const Origin& origin,
             diag::Collector* diagnostics, std::ostream& out);
 

@@ -1,4 +1,4 @@
-// What is baked, and how each part of it comes over.
+// Chooses what is baked, and the method for each part of it.
 #include "bake/Baker.h"
 
 namespace bake {
@@ -43,7 +43,7 @@ void Baker::Choose() {
   if (cameras_.empty() && options_.cameras.empty()) diagnostics_->Report(diag::Code::NoCamera, {});
 }
 
-// All that can move what is written is asked for before the range is looked for.
+// Asks for all values before FindRange, because their curves determine the range.
 void Baker::AskForHierarchy() {
   local_.emplace(&evaluator_, head_.picture, head_.unitsPerFrame);
   if (!options_.world) chains_.AskFor(&*local_);
@@ -61,7 +61,7 @@ void Baker::SampleHierarchy() {
   if (!options_.world) chains_.Judge(&*local_, motion::KeptBelow(evaluator_));
 }
 
-// A camera's picture depends on what its chain does to it; a null only has to say its place.
+// Scale in the chain changes a camera's picture; of a null only the place matters.
 bool Baker::ComesInHierarchy(const Item& item, bool camera) const {
   if (item.link == Link::kNone) return true;
   if (options_.world) return false;
@@ -69,7 +69,7 @@ bool Baker::ComesInHierarchy(const Item& item, bool camera) const {
   return link.finite && link.square && !link.cutOff && (link.unscaled || !camera);
 }
 
-// What does not come in its hierarchy is asked for against the world.
+// Asks for the world matrix of each item that cannot be written under its hierarchy.
 void Baker::AskForWorld() {
   world_.emplace(&evaluator_, head_.picture, head_.unitsPerFrame);
   const auto decide = [this](Item* item, bool camera) {

@@ -16,11 +16,11 @@
 
 namespace bake {
 
-// A camera or a locator on its way.
+// A camera or a locator that is baked.
 struct Item {
   scene::NodeId shape = scene::kNoNode;
   std::uint32_t link = Link::kNone;  // of its transform
-  std::size_t world = 0;             // the track against the world, with kWorld
+  std::size_t world = 0;             // the track in world space, with kWorld
   std::size_t lens = 0;              // of a camera
   Method method = Method::kHierarchy;
 };

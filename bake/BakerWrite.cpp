@@ -1,4 +1,4 @@
-// What is written, in the order of the file, and what is said about it.
+// Writes the bake, in the order of the file, and reports about each camera.
 #include <cmath>
 #include <string_view>
 
@@ -11,7 +11,7 @@ namespace {
 
 constexpr std::string_view kMark = "null_";
 
-// Of a path in comments and reports.
+// The bytes of a path that comments and reports show, at most.
 constexpr std::size_t kLongestPath = 1'000;
 
 }  // namespace
@@ -27,7 +27,7 @@ void Baker::Write(const Origin& origin, std::ostream& out) {
   writer.End(head_);
 }
 
-// Writes the links from the first one that is not there yet down to this one; the name of this one.
+// Writes the links above this one that are not written yet, then this one. Returns its name.
 std::string Baker::WriteChain(std::uint32_t link, Writer* writer) {
   std::vector<std::uint32_t> missing;
   for (std::uint32_t at = link; at != Link::kNone && chains_.link(at).name.empty();
@@ -43,7 +43,7 @@ std::string Baker::WriteChain(std::uint32_t link, Writer* writer) {
   return chains_.link(link).name;
 }
 
-// Writes the transform of a camera or a locator; its name, empty where there is none.
+// Writes the transform of a camera or a locator. Returns its name, empty where there is none.
 std::string Baker::WriteTransform(const Item& item, Writer* writer) {
   if (item.link == Link::kNone) return "";
   if (item.method == Method::kHierarchy) return WriteChain(item.link, writer);
@@ -92,7 +92,7 @@ void Baker::Differ(diag::Code code, const Item& item, const std::string& path, C
   report->differences.push_back(diag::SentenceOf({.code = code, .arguments = {path}}));
 }
 
-// The channels that keep their stored values: each is a diagnostic already, once for all cameras.
+// Adds the channels that keep their stored values. Each is reported already, once for all cameras.
 void Baker::ReportKept(const Item& item, CameraReport* report) const {
   std::vector<motion::Kept> kept = local_->KeptOfLens(item.lens, *kept_);
   if (item.method == Method::kWorld) {
@@ -132,7 +132,7 @@ void Baker::WriteLocator(const Item& item, Writer* writer) {
   }
   const std::string parent = WriteTransform(item, writer);
   const std::string_view own = scene_.node(item.shape).name;
-  // A mark beyond what is kept of a long name would be lost.
+  // A long name is cut: a mark near its end would be lost.
   const bool marked = scene::IsMarked(own.substr(0, UniqueNames::kLongest / 2));
   const std::string name = writer->TakeName(marked ? std::string(own) : std::string(kMark).append(own));
   writer->Locator(name, parent, path);

@@ -1,4 +1,4 @@
-// The transforms above what is written, each once.
+// The transforms above the written cameras and locators, each once.
 #pragma once
 
 #include <cstddef>
@@ -19,9 +19,9 @@ struct Link {
   scene::NodeId node = scene::kNoNode;
   std::uint32_t above = kNone;  // the link of its parent
   std::size_t track = 0;        // of the node against its parent
-  bool cutOff = false;          // what stands above it, or above that, is not in the file or not always there
+  bool cutOff = false;          // a node above it is not in the file, or its inheritance can change
 
-  // What holds of the link and of all those above it. Known after Judge.
+  // True when it holds for the link and for all those above it. Known after Judge.
   bool finite = true;
   bool square = true;    // without shear
   bool unscaled = true;  // scale 1, and not mirrored
@@ -36,14 +36,14 @@ class Chains {
  public:
   explicit Chains(const scene::Scene& scene) : scene_(scene) {}
 
-  // The link of a transform; those above it are added too, up to a node that takes over nothing from above.
+  // The link of a transform; those above it are added too, up to a node that does not inherit transforms.
   // kNone for kNoNode. The same transform has the same link.
   std::uint32_t Add(scene::NodeId transform);
 
   // Asks for a track of each link.
   void AskFor(Sampler* sampler);
 
-  // Looks at the tracks, after the sampler has run.
+  // Sets the properties of the links from their tracks, after the sampler has run.
   void Judge(Sampler* sampler, const motion::KeptBelow& below);
 
   Link& link(std::uint32_t index) { return links_[index]; }

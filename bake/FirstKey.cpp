@@ -20,7 +20,7 @@ class FirstKeys {
   void TakeShape(scene::NodeId shape) {
     const auto lens = FindKeys(scene_, shape, "focalLength", measures_);
     if (lens) TakeKey(lens->curve.keys.front().time);
-    // A circle of parents is cut by the reader; a shared chain is gone up once.
+    // The reader has cut circles of parents. A shared chain is visited once.
     for (scene::NodeId node = scene_.node(shape).parent; node != scene::kNoNode && seen_.insert(node).second;
          node = scene_.node(node).parent) {
       TakeTransform(node);
@@ -30,7 +30,8 @@ class FirstKeys {
   std::optional<double> smallest() const { return smallest_; }
 
  private:
-  // Of a node with a channel of two keys all channels count from its first channel that has a key.
+  // A node is animated when one of its channels has two keys. Its keys then begin at the first key of its
+  // first channel that has any.
   void TakeTransform(scene::NodeId node) {
     std::optional<double> first;
     bool animated = false;

@@ -1,4 +1,4 @@
-// Where the keys of an import begin.
+// The frame at which the keys of an import begin.
 #pragma once
 
 #include <optional>
@@ -7,7 +7,7 @@
 
 namespace bake {
 
-// The smallest first key among what an import takes of the scene: its cameras, its marked locators, and the
+// The smallest first key of the nodes that an import takes: the cameras, the marked locators, and the
 // transforms above them. In frames of the scene; none where none of them has keys.
 std::optional<double> FirstKeyOfImport(const scene::Scene& scene);
 

@@ -11,7 +11,7 @@ namespace {
 
 using scene::NodeId;
 
-// Later frames are no time that a composition could hold.
+// The time of a composition can hold no more frames.
 constexpr double kMostTimes = 2'000'000;
 
 std::optional<FrameRange> RangeOf(double first, double last, double step, bool bounded,

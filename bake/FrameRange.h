@@ -1,4 +1,4 @@
-// Which frames are baked.
+// The frames that are baked.
 #pragma once
 
 #include <cstddef>
@@ -23,12 +23,12 @@ struct FrameRange {
   double Last() const { return Frame(count - 1); }
 };
 
-// The most frames that a scene may have where nobody says which ones.
+// The most frames of a bake without chosen frames.
 inline constexpr std::size_t kMostFrames = 100'000;
 
-// The range of the options; else what the scene plays and all keys of the curves among the nodes, outward to
-// whole frames; with neither, frame 1. `nodes` are those that compute what is written. None after an error:
-// too many frames, or more than a composition's time can hold.
+// The range of the options; else the playback range and all keys of the curves among the nodes, rounded
+// outward to whole frames; else frame 1. `nodes` are those that compute what is written. None after reporting
+// an error: too many frames, or more than a composition's time can hold.
 std::optional<FrameRange> FindFrames(const scene::Scene& scene, const std::vector<scene::NodeId>& nodes,
                                      const Options& options, const Head& head,
                                      const motion::Measures& measures, diag::Collector* diagnostics);

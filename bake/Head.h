@@ -1,4 +1,4 @@
-// The settings of a scene as a bake has them: units, rate, resolution.
+// The settings of a bake, from those of its scene: units, rate, resolution.
 #pragma once
 
 #include <optional>
@@ -12,15 +12,15 @@
 namespace bake {
 
 struct Head {
-  std::string linearUnit;      // as the scene says it
-  std::string timeUnit;        // as the scene says it, but one that the importer takes for a rate
+  std::string linearUnit;      // the scene's word
+  std::string timeUnit;        // the scene's word, or another one that the importer takes for the same rate
   double unitsPerFrame = 1.0;  // one frame of the bake in the scene's time unit
   motion::Picture picture;
-  std::optional<FrameSpan> playback;  // what the scene plays, in frames of the bake
+  std::optional<FrameSpan> playback;  // the scene's playback range, in frames of the bake
 };
 
-// Reports a time unit that is no rate, and values that cannot be read. Where the scene is silent the defaults
-// of the version that wrote it hold.
+// Reports a time unit that is no rate, and values that cannot be read. What the scene does not set has the
+// defaults of the version that wrote it.
 Head ReadHead(const scene::Scene& scene, diag::Collector* diagnostics);
 
 }  // namespace bake

@@ -1,4 +1,4 @@
-// What an import did not bring, although it ended well.
+// Finds what an import did not bring, although it ended without an error.
 #include <cmath>
 #include <string>
 #include <unordered_map>
@@ -20,7 +20,7 @@ namespace {
 
 using scene::NodeId;
 
-constexpr double kTolerance = 1e-6;  // of a value: what a scene's digits make of it
+constexpr double kTolerance = 1e-6;  // relative: scenes write values with limited digits
 
 bool Differ(double a, double b) {
   return std::fabs(a - b) > kTolerance * std::fmax(1.0, std::fmax(std::fabs(a), std::fabs(b)));
@@ -33,7 +33,7 @@ std::string Digits(double number) {
   return text;
 }
 
-// Looks through a scene, camera by camera, until something is found that a bake brings.
+// Searches a scene, camera by camera, until it finds something that a bake would bring.
 class LossSearch {
  public:
   LossSearch(const scene::Scene& scene, const CameOver& import)
@@ -97,7 +97,7 @@ class LossSearch {
     LookAtLens(camera, layer);
   }
 
-  // The nine channels of a node; `keys` is how many came over.
+  // Checks the nine channels of a node; `keys` is the number of keys that came over.
   void LookAtPlace(NodeId node, std::size_t keys, bool aimed) {
     std::optional<KeyedChannel> first;
     std::vector<KeyedChannel> single;
@@ -138,7 +138,7 @@ class LossSearch {
     return true;
   }
 
-  // Of a node whose channels have one key each no key comes over, and no value of one.
+  // When all channels of a node have one key at most, the import takes the stored values and no keys.
   void LookAtSingle(NodeId node, const KeyedChannel& channel) {
     const double stored = scene_.Number(node, channel.attribute).value_or(0.0);
     if (!Differ(channel.curve.keys.front().value, stored)) return;
@@ -146,7 +146,7 @@ class LossSearch {
                                               std::string(channel.attribute) + ", which does not come over");
   }
 
-  // What is no curve, and drives the channel.
+  // Checks a channel that something other than a curve may drive.
   void LookAtDriver(NodeId node, std::string_view attribute, bool aimed) {
     const scene::Plug plug = scene_.PlugOf(node, attribute);
     const auto driver = scene_.SourceOf(plug);
@@ -173,7 +173,7 @@ class LossSearch {
            scene_.Number(node, attribute).value_or(0.0) != 0.0;
   }
 
-  // What of a transform an import does not look at.
+  // Checks the parts of a transform that an import does not read.
   void LookAtForm(NodeId node) {
     if (found_) return;
     const scene::Node& transform = scene_.node(node);
@@ -276,7 +276,7 @@ class LossSearch {
          "the rate of " + Digits(rate) + " frames a second comes over as " + Digits(import_.framesPerSecond));
   }
 
-  // A scene of which nothing at all comes over, and that has locators.
+  // Checks the locators of a scene of which nothing at all comes over.
   void LookAtLocators() {
     for (NodeId id = 0; id < scene_.nodes().size(); ++id) {
       const scene::Node& node = scene_.node(id);
@@ -293,7 +293,7 @@ class LossSearch {
   Head head_;
   motion::Evaluator evaluator_;
   motion::Measures measures_;
-  std::optional<double> firstKey_;  // of the camera that is looked at, in seconds
+  std::optional<double> firstKey_;  // of the camera that is being checked, in seconds
   std::optional<Loss> found_;
   std::optional<Loss> unmended_;
 };

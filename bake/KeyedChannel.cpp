@@ -12,7 +12,8 @@ namespace {
 
 constexpr std::size_t kLongestShown = 100;
 
-// Of the larger of a value and the way between two keys: what a bake is held to where handles were moved.
+// Relative to the larger of the values of two keys and their difference. As exact as bakes are tested to be
+// where handles were moved.
 constexpr double kTolerance = 1e-5;
 
 }  // namespace

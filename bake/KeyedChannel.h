@@ -15,14 +15,14 @@ namespace bake {
 struct KeyedChannel {
   std::string_view attribute;  // of the node that is driven
   scene::NodeId node;          // the curve's
-  motion::CurveData curve;     // with a key at least
+  motion::CurveData curve;     // with at least one key
 };
 
 // None where something else drives the channel, or nothing.
 std::optional<KeyedChannel> FindKeys(const scene::Scene& scene, scene::NodeId node,
                                      std::string_view attribute, const motion::Measures& measures);
 
-// Whether a straight line from key to key leaves the curve at some frame.
+// Whether the curve differs from straight lines between its keys, where these are more than a frame apart.
 bool IsCurvedBetweenFrames(const motion::CurveData& curve, double framesPerSecond);
 
 // The node's own name between quotes, harmless on a terminal; of a very long one the beginning.

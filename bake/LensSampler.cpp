@@ -1,4 +1,4 @@
-// The lens of a camera at each frame, in what the importer takes: one focal length over one aperture.
+// The lens of a camera at each frame, in the values that the importer takes: focal length and aperture.
 #include <cmath>
 
 #include "bake/Sampler.h"
@@ -8,7 +8,8 @@ namespace {
 
 bool IsUsable(double value) { return std::isfinite(value) && value > 0.0; }
 
-// The side that fills the picture, and its aperture. *window is that aperture: what the focal length is for.
+// Sets the side that fills the picture, and the apertures. *window is the aperture of that side, to which the
+// focal lengths refer.
 void FixAperture(const motion::Camera& camera, const motion::Picture& picture, LensTrack* lens,
                  double* window) {
   lens->vertical = motion::ResolvedFit(camera, picture) == motion::filmfit::kVertical;
@@ -26,8 +27,8 @@ std::size_t Sampler::AddLens(scene::NodeId camera) {
   return lenses_.size() - 1;
 }
 
-// The side and the aperture are those of the first frame. What the picture shows of the film at a later one
-// becomes the focal length.
+// Side and aperture are those of the first frame. Where the picture shows another part of the film later, the
+// focal length is changed to give the same picture.
 void Sampler::SampleLens(LensSource* source, LensTrack* lens) {
   const motion::Camera camera = source->camera.Now();
   const motion::FilmWindow window = motion::FilmWindowOf(camera, picture_);

@@ -1,4 +1,4 @@
-// What a plain import lacks of a scene, and why.
+// What an import does not bring of a scene, and what stopped one.
 #pragma once
 
 #include <cstddef>
@@ -14,12 +14,13 @@ namespace bake {
 
 struct Loss {
   std::string sentence;               // without a full stop; harmless on a terminal
-  std::optional<diag::Range> place;   // none: the file does not say it anywhere
-  bool comesWithBake = true;          // a bake of the scene brings it over
-  bool comesWithAllLocators = false;  // where all locators are asked for
+  std::optional<diag::Range> place;   // none: it has no place in the file
+  bool comesWithBake = true;          // a bake of the scene brings it
+  bool comesWithAllLocators = false;  // only a bake with all locators brings it
 };
 
-// What an import shows of itself. The names are those of the layers, and must outlive it.
+// The result of an import, as far as FindLoss needs it. The names are those of the layers, which must outlive
+// it.
 struct CameOver {
   struct Null {
     std::string_view name;
@@ -42,8 +43,8 @@ struct CameOver {
   double framesPerSecond = 0.0;
 };
 
-// The first thing that an import without an error did not bring, or not as it is in the scene: camera by
-// camera in the order of the file, then the picture. What a bake would bring goes before what it would not.
+// The first thing that an import without an error did not bring as it is in the scene: camera by camera in
+// the order of the file, then the picture. A loss that a bake would mend comes before one that it would not.
 // None where all came over.
 std::optional<Loss> FindLoss(const scene::Scene& scene, const CameOver& import);
 
@@ -55,9 +56,10 @@ enum class Stop {
   kKeyCounts,  // at channels of a node with different numbers of keys
 };
 
-// What stopped the import; none where the scene does not show it. `line` is where it did, 0 where that is not
-// known. `layer` is the name of the last layer that was made, empty where there is none; with kKeyCounts it
-// is the node's or its camera's. `diagnostics` are those of the reading of the scene.
+// What stopped the import; none where the scene does not show it. `line` counts from 1, with line ends as
+// diag::LineAndColumn has them; 0: not known. `layer` is the name of the last layer that was made, empty
+// where there is none; with kKeyCounts it is that of the node or of its camera. `diagnostics` are those of
+// the reading of the scene.
 std::optional<Loss> FindStop(const scene::Scene& scene, diag::Collector* diagnostics, Stop stop,
                              std::uint32_t line, std::string_view layer);
 

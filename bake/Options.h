@@ -1,4 +1,4 @@
-// What a bake is asked for.
+// The options of a bake.
 #pragma once
 
 #include <optional>
@@ -20,7 +20,7 @@ enum class Locators {
 };
 
 struct Options {
-  std::optional<FrameSpan> frames;   // none: what the scene plays, and all keys of what is written
+  std::optional<FrameSpan> frames;   // none: the playback range and all keys of what is written
   double step = 1.0;                 // frames from one key to the next; positive
   std::vector<std::string> cameras;  // names or paths of transforms or cameras, with case; none: all of them
   bool world = false;                // without the transforms above

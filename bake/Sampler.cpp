@@ -13,14 +13,14 @@ namespace {
 
 constexpr double kDegrees = 57.29577951308232;  // in a radian
 
-// Channels that come out of a matrix are level where they differ by rounding alone.
+// Channels from a matrix count as level where they differ only by rounding.
 constexpr double kMatrixRounding = 1e-12;
 
 static_assert(scene::kPlaceChannels.size() == kSlotCount);  // a slot is a place in this list
 
 bool IsRotation(std::size_t slot) { return slot >= kRotateX && slot <= kRotateZ; }
 
-// Whether a constraint gives one of the angles. It knows no turns: they jump where it passes half a turn.
+// Whether a constraint gives one of the angles. Its angles jump by a whole turn where they pass half a turn.
 bool IsTurnedByConstraint(const scene::Scene& scene, scene::NodeId node) {
   const auto first = scene::kPlaceChannels.begin();
   return std::any_of(first + kRotateX, first + kRotateZ + 1, [&](std::string_view channel) {
@@ -29,7 +29,7 @@ bool IsTurnedByConstraint(const scene::Scene& scene, scene::NodeId node) {
   });
 }
 
-// The angle, in degrees, by whole turns as near to the one of the frame before as it can be.
+// The angle, in degrees, shifted by whole turns so that it is nearest to that of the frame before.
 double NextTo(double before, double angle) {
   constexpr double kTurn = 360.0;
   return angle - kTurn * std::round((angle - before) / kTurn);
@@ -84,7 +84,8 @@ std::vector<motion::Evaluator::Wanted> Sampler::Wanted() const {
   return wanted;
 }
 
-// All frames of one part, then those of the next one: what a part needs stays near the processor.
+// Samples all frames of one part, then those of the next one: the values of a part stay in the processor's
+// caches.
 void Sampler::Run(const FrameRange& frames) {
   const std::vector<std::uint32_t> partOf = evaluator_->Split(Wanted());
   std::vector<Part> parts(evaluator_->partCount());

@@ -1,4 +1,4 @@
-// Evaluates what is written, frame by frame.
+// Evaluates the written channels, frame by frame.
 #pragma once
 
 #include <array>
@@ -25,18 +25,18 @@ class Sampler {
   Sampler(motion::Evaluator* evaluator, const motion::Picture& picture, double unitsPerFrame)
       : evaluator_(evaluator), picture_(picture), unitsPerFrame_(unitsPerFrame) {}
 
-  // The node against its parent: its own channels to the bit where they say all.
+  // The node in its parent's space: exactly its own channels where IsPlain.
   std::size_t AddLocal(scene::NodeId node);
 
-  // The node against the world. What is not `scaled` is a camera: it has scale 1 and keeps its direction.
+  // The node in world space. Without `scaled`, as for a camera, the scale is 1 and the direction is kept.
   std::size_t AddWorld(scene::NodeId node, bool scaled);
 
   std::size_t AddLens(scene::NodeId camera);
 
-  // What does not move is looked at once.
+  // Samples all frames; what does not move is sampled once.
   void Run(const FrameRange& frames);
 
-  // What of a track or a lens keeps its stored value instead of what drives it.
+  // The channels below a track or a lens that keep their stored values.
   std::vector<motion::Kept> KeptOfTrack(std::size_t number, const motion::KeptBelow& below) const;
   std::vector<motion::Kept> KeptOfLens(std::size_t number, const motion::KeptBelow& below) const;
 
@@ -57,7 +57,7 @@ class Sampler {
     double window = 0.0;  // of the first frame, along the side that fills the picture: inches
   };
 
-  // What of a track's or a lens' values is wanted together.
+  // The sets of values for Evaluator::Split: one for each track, then one for each lens.
   std::vector<motion::Evaluator::Wanted> Wanted() const;
   // The tracks and the lenses of one part of what moves.
   struct Part {

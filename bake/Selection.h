@@ -1,4 +1,4 @@
-// Which cameras and locators of a scene are written.
+// The cameras and locators of a scene that are written.
 #pragma once
 
 #include <cstddef>
@@ -18,11 +18,12 @@ struct Selection {
   std::size_t locatorsLeftOut = 0;  // without a mark, where only marked ones are wanted
 };
 
-// Whether the node is a camera that somebody set up: no orthographic one, and none that every scene begins
-// with.
+// Whether the node is a camera that an author set up: not an orthographic one, and not one that every scene
+// begins with.
 bool IsSetUp(const scene::Scene& scene, scene::NodeId id);
 
-// The cameras that somebody set up, and locators. Reports each name of the options that fits none of them.
+// The cameras that an author set up, and locators. Reports each name of the options that fits none of the
+// cameras.
 Selection Select(const scene::Scene& scene, const Options& options, diag::Collector* diagnostics);
 
 }  // namespace bake

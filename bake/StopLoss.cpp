@@ -1,4 +1,4 @@
-// What stopped an import, from the place where it did.
+// Finds what stopped an import, from the line where it stopped.
 #include <algorithm>
 #include <string>
 
@@ -11,19 +11,20 @@ namespace {
 
 using scene::NodeId;
 
-// The bytes of a line without its end. Empty where the text has no such line.
+// The bytes of a line without its end. Empty where the text has no such line. A line ends after a line feed,
+// or after a carriage return that no line feed follows.
 diag::Range LineRange(std::string_view text, std::uint32_t line) {
   std::size_t start = 0;
   for (std::uint32_t at = 1; at < line; ++at) {
-    const std::size_t feed = text.find('\n', start);
-    if (feed == std::string_view::npos) return {text.size(), 0};
-    start = feed + 1;
+    const std::size_t end = text.find_first_of("\r\n", start);
+    if (end == std::string_view::npos) return {text.size(), 0};
+    start = end + (text.substr(end, 2) == "\r\n" ? 2 : 1);
   }
-  return {start, std::min(text.find('\n', start), text.size()) - start};
+  return {start, std::min(text.find_first_of("\r\n", start), text.size()) - start};
 }
 
-// The first byte of the line, outside of quotes, that begins a word and can begin none; 0 where there is
-// none.
+// The first byte of the line, outside of quotes, that stands where a word begins and can begin none; 0 where
+// there is none.
 char StrangeByte(std::string_view line) {
   bool quoted = false;
   char before = ' ';
@@ -75,7 +76,7 @@ Loss End(const scene::Scene& scene, diag::Collector* diagnostics) {
           .place = diag::Range{start, text.size() - start}};
 }
 
-// The transform that a layer stands for: that of the camera, or the one of the name.
+// The transform of a layer: the parent of the camera of that name, or the transform of that name.
 NodeId TransformOf(const scene::Scene& scene, std::string_view layer) {
   for (NodeId id = 0; id < scene.nodes().size(); ++id) {
     const scene::Node& node = scene.node(id);
@@ -85,7 +86,7 @@ NodeId TransformOf(const scene::Scene& scene, std::string_view layer) {
   return scene::kNoNode;
 }
 
-// A node with channels of different numbers of keys.
+// Whether two animated channels of the node have different numbers of keys.
 std::optional<Loss> UnequalKeys(const scene::Scene& scene, NodeId node, const motion::Measures& measures) {
   std::optional<KeyedChannel> first;
   for (const std::string_view name : scene::kPlaceChannels) {
@@ -105,7 +106,8 @@ std::optional<Loss> UnequalKeys(const scene::Scene& scene, NodeId node, const mo
   return std::nullopt;
 }
 
-// The last layer's node; where its keys are in order the import went on to another one, a look-at's target.
+// Checks the node of the last layer first. Where its keys agree, the import stopped at another node, such as
+// the target of a look-at.
 std::optional<Loss> KeyCounts(const scene::Scene& scene, std::string_view layer) {
   const motion::Measures measures = motion::MeasuresOf(scene);
   const NodeId last = TransformOf(scene, layer);

@@ -1,4 +1,4 @@
-// The channels of one written node over all frames.
+// The values of one written node over all frames.
 #pragma once
 
 #include <array>
@@ -7,7 +7,7 @@
 
 namespace bake {
 
-// One number a frame; a single one where it does not move.
+// One number per frame; a single one where it does not move.
 struct Channel {
   std::vector<double> values;
 
@@ -31,10 +31,11 @@ enum ChannelSlot : std::size_t {
 // Translation in the scene's unit, rotation in degrees, XYZ, and scale.
 struct Track {
   std::array<Channel, kSlotCount> channels;
-  double skew = 0.0;        // the largest of any frame: what the channels cannot say
-  double unevenness = 1.0;  // of a camera in the world: how much more one axis is scaled than another
-  bool mirrors = false;     // at some frame
-  bool finite = true;       // at all frames
+  double skew = 0.0;  // the largest of any frame, as motion::Skew has it
+  double unevenness =
+      1.0;               // of a camera in world space: the largest of any frame, as motion::Unevenness has it
+  bool mirrors = false;  // at some frame
+  bool finite = true;    // at all frames
 
   bool moves() const;
 
@@ -48,22 +49,22 @@ struct Track {
   bool IsScaled() const;
 };
 
-// The lens of a camera: what the importer takes of it.
+// The lens of a camera, in the values that the importer takes.
 struct LensTrack {
   Channel focalLength;              // millimetres
   double horizontalAperture = 0.0;  // inches
   double verticalAperture = 0.0;
-  bool vertical = false;  // which side of the film fills the picture
-  bool usable = true;     // at all frames: finite, and not 0
+  bool vertical = false;  // whether the vertical side of the film fills the picture
+  bool usable = true;     // at all frames: finite and above 0
 
-  // What is not said, or said in another way, at any frame.
+  // What is lost, or written in another way, at any frame.
   bool offset = false;        // the film offset
   bool squeezed = false;      // the lens squeeze is in the aperture
   bool otherEffects = false;  // changes of the picture after the projection
 };
 
-// The channel as it is written: with one value where all are the same, or nearer to each other than
-// `tolerance`.
+// Reduces the channel to one value where no value differs from the first by more than `tolerance`. The
+// channel has at least one value.
 void Settle(Channel* channel, double tolerance = 0.0);
 
 }  // namespace bake

@@ -5,7 +5,7 @@
 namespace bake {
 namespace {
 
-// What a suffix may take: "_" and ten digits.
+// The bytes of the longest suffix: "_" and ten digits.
 constexpr std::size_t kSuffixRoom = 11;
 
 // The importer drops a camera of this name.
@@ -43,7 +43,7 @@ std::string UniqueNames::Take(std::string_view wanted) {
   if (base.empty()) base = "node";
   base = CutTo(base, kLongest);
   if (taken_.insert(Lowered(base)).second) return base;
-  // Long names count together where they begin alike: each by itself would try all numbers of the others.
+  // Long names with the same beginning share a counter: each alone would try all numbers of the others.
   const std::string stem(CutTo(base, kLongest - kSuffixRoom));
   std::uint64_t& number = next_.try_emplace(Lowered(stem), 2).first->second;
   std::string name;

@@ -9,16 +9,15 @@
 
 namespace bake {
 
-// Gives each node a name of its own, without regard to case: the one that it has where that is free, else
-// with _2, _3 … at its end. A name has at most 200 bytes and never one that the importer gives a meaning of
-// its own.
+// Gives each node a unique name, without regard to case: the wanted one where it is free, else with _2, _3 …
+// at its end. A name has at most 200 bytes, and is never perspShape, which the importer drops.
 class UniqueNames {
  public:
   static constexpr std::size_t kLongest = 200;
 
   UniqueNames();
 
-  // What of `wanted` cannot stand in a name of a scene becomes "_".
+  // Bytes of `wanted` that a name cannot have become "_". An empty name becomes "node".
   std::string Take(std::string_view wanted);
 
  private:

@@ -186,7 +186,7 @@ void Writer::End(const Head& head) {
   const double pixelAspect = motion::PixelAspect(head.picture);
   Number(pixelAspect);
   Text(";\n\tsetAttr \".dar\" ");
-  // As it is, so that the same pixel aspect follows from it again.
+  // Unchanged where the pixels are not square, so that the same pixel aspect follows from it again.
   Number(pixelAspect == 1.0 ? head.picture.width / head.picture.height : head.picture.deviceAspect);
   Text(";\n");
   Text(connections_);

@@ -25,7 +25,7 @@ class Writer {
   // The beginning of the file; comes first.
   void Begin(const Origin& origin, const Head& head);
 
-  // A transform and what moves it. Names are those that TakeName gave; an empty parent is the world.
+  // A transform with its curves. Names are those that TakeName gave; an empty parent is the world.
   void Transform(const std::string& name, const std::string& parent, std::string_view path,
                  const Track& track);
   void Camera(const std::string& name, const std::string& parent, std::string_view path,
@@ -62,7 +62,7 @@ class Writer {
   UniqueNames names_;
   std::string buffer_;
   std::string connections_;
-  std::string times_;                    // of all keys, each after what parts it from the key before
+  std::string times_;                    // of all keys, each after the white space before it
   std::vector<std::uint32_t> timeEnds_;  // in times_, by key
 };
 

@@ -312,6 +312,14 @@ TEST(LossTest, AByteThatEndsTheReadingIsExplainedByItsLine) {
   EXPECT_EQ(reading.Line(), 6u);
 }
 
+TEST(LossTest, ALineEndsWithALineFeedACarriageReturnOrBoth) {
+  const std::string text = "createNode transform;\rcreateNode camera;\r\nsetAttr \".fl\" 1e999;\rselect x;\n";
+  Reading reading(text);
+  EXPECT_EQ(reading.Stopped(bake::Stop::kNumber, 3), "a number that cannot be read ends the import");
+  const diag::Range place = reading.loss().place.value();
+  EXPECT_EQ(text.substr(place.offset, place.length), "setAttr \".fl\" 1e999;");
+}
+
 TEST(LossTest, TheEndOfTheTextIsExplainedByWhatItCutsOff) {
   const auto stopped = [](const std::string& text) { return Reading(text).Stopped(bake::Stop::kEnd, 1); };
   EXPECT_EQ(stopped("createNode camera;\n// End of scene.ma"),
