@@ -19,7 +19,7 @@ void fewKeys(SceneText& scene, std::string_view type, const std::string& name, d
 
 }  // namespace
 
-// Every other camera hangs under a group and turns in another order; every fourth has a lens that moves.
+// Every other camera is under a group and has another rotation order; every fourth has an animated lens.
 Built writeCameras(std::ostream& out, double scale, std::uint64_t seed) {
   constexpr std::size_t kPlaceAndRotation = 6;
   SceneText scene(out, seed);

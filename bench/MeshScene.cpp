@@ -1,4 +1,4 @@
-// Mostly geometry, which an import passes over.
+// Mostly geometry, which an import skips.
 #include "bench/SceneParts.h"
 #include "bench/Scenes.h"
 

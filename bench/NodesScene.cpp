@@ -1,4 +1,4 @@
-// A crowd: many nodes and connections, few keys. Every other chain of groups that has locators ends in a
+// Many nodes and connections, few keys. Every other chain of groups that has locators ends in a
 // marked one, and one chain ends in the camera, so that these chains become layers.
 #include <vector>
 
@@ -17,7 +17,7 @@ std::string group(std::int64_t number) { return numbered("crowd_group_", number)
 
 std::int64_t lastOf(std::int64_t chain) { return (chain + 1) * kGroupsInChain - 1; }
 
-// So many of the first groups have a locator.
+// The number of groups, the first ones, that have a locator.
 bool isMarked(std::int64_t chain, std::int64_t locators) {
   return chain % kMarkedOneIn == 0 && lastOf(chain) < locators;
 }

@@ -7,7 +7,7 @@
 namespace bench {
 namespace {
 
-// A word that begins with a byte that none may begin with.
+// The code for a word that begins with a byte that no word may begin with.
 constexpr std::int32_t kSyntaxError = 1289985;
 
 constexpr std::array<Workload, 7> kWorkloads = {{
@@ -31,7 +31,7 @@ constexpr std::array<Workload, 7> kWorkloads = {{
 
 }  // namespace
 
-std::span<const Workload> Workloads() { return kWorkloads; }
+std::span<const Workload> workloads() { return kWorkloads; }
 
 const Workload* findWorkload(std::string_view name) {
   for (const Workload& workload : kWorkloads) {

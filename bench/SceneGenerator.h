@@ -1,4 +1,4 @@
-// Writes the scenes that the import is measured with. The same workload, scale and seed give the same bytes.
+// Writes the scenes of the measurements. The same workload, scale and seed give the same bytes.
 #pragma once
 
 #include <cstdint>
@@ -8,7 +8,7 @@
 
 namespace bench {
 
-// What an import of a scene makes in its composition: layers of any kind, keys of all their streams.
+// The layers of any kind, and the keys of all their streams, that an import of a scene makes.
 struct Built {
   std::int64_t layers = 0;
   std::int64_t keys = 0;
@@ -25,7 +25,7 @@ struct Workload {
   std::int32_t code = 0;
 };
 
-std::span<const Workload> Workloads();
+std::span<const Workload> workloads();
 
 // Null when there is none of that name.
 const Workload* findWorkload(std::string_view name);

@@ -1,4 +1,4 @@
-// What more than one workload is made of.
+// The parts that several workloads use.
 #pragma once
 
 #include <array>
@@ -29,7 +29,8 @@ inline constexpr std::array<Channel, 9> kChannels = {{
     {"sz", "scaleZ", "animCurveTU"},
 }};
 
-// An import gives each sample of an animated transform to so many streams: place, scale and three rotations.
+// The streams to which an import writes each sample of an animated transform: place, scale and three
+// rotations.
 inline constexpr std::int64_t kStreams = 5;
 
 // At least `least`.

@@ -1,4 +1,4 @@
-// Maya ASCII commands with made-up numbers.
+// Maya ASCII commands with random numbers.
 #pragma once
 
 #include <charconv>
@@ -65,7 +65,7 @@ class SceneText {
     text("// End of measured.ma\n");
   }
 
-  // A node, and the name that no other node of any scene has. Without a parent it lies at the top.
+  // A node, and its unique identifier. Without a parent it is at the top.
   SceneText& node(std::string_view type, std::string_view name, std::string_view parent = {}) {
     text("createNode ").text(type).text(" -n \"").text(name);
     if (!parent.empty()) text("\" -p \"").text(parent);
@@ -104,7 +104,7 @@ class SceneText {
     text(";\n");
   }
 
-  // What a curve that was edited after baking holds for each key beside its value, in commands of their own.
+  // The commands for each key that a curve has when it was edited after baking.
   void tangents(int keys) {
     for (const auto& [attribute, word] :
          {std::pair{".kit", " 18"}, {".kot", " 18"}, {".ktl", " no"}, {".kwl", " no"}}) {

@@ -8,9 +8,9 @@
 
 namespace bench {
 
-// How large the parts are.
+// The sizes of the parts.
 struct ShotSize {
-  std::int64_t references = 10;   // files that are referenced
+  std::int64_t references = 10;   // referenced files
   std::int64_t controls = 650;    // animated controls of each
   std::int64_t rigs = 12;         // of the scene's own
   std::int64_t joints = 40;       // of each
@@ -27,7 +27,7 @@ enum class EditPaths { Quoted, Unquoted };
 // The "file" commands at the head of the scene.
 void referenceFiles(SceneText& scene, const ShotSize& size);
 
-// The "reference" nodes with their edits, and the curves that drive what is referenced.
+// The "reference" nodes with their edits, and the curves that drive referenced nodes.
 void referenceNodes(SceneText& scene, const ShotSize& size, EditPaths paths);
 void referenceCurves(SceneText& scene, const ShotSize& size);
 void referenceConnections(SceneText& scene, const ShotSize& size);
@@ -41,7 +41,7 @@ void rigConnections(SceneText& scene, const ShotSize& size);
 
 // ---- SparseCurve.cpp ----
 
-// A curve as an animator sets it, in whole frames and of few keys; where `fixed`, with tangents of its own.
+// A curve as an animator sets it: few keys, at whole frames; with `fixed`, its tangents are written.
 void sparseCurve(SceneText& scene, std::string_view type, const std::string& name, int keys, bool fixed);
 
 }  // namespace bench

@@ -1,5 +1,5 @@
-// What a shot says of the files that it references: where they are, what it changes in them, and the curves
-// that drive their controls through place holders.
+// The referenced files of a shot: where they are, the edits of their contents, and the curves that drive
+// their controls through place holders.
 #include <array>
 
 #include "bench/SceneParts.h"
@@ -45,7 +45,7 @@ void changeTriple(SceneText& scene, const std::string& path, std::string_view at
 }
 
 void addAttribute(SceneText& scene, const std::string& path, EditPaths paths) {
-  // Not quoted, the path is followed by two blanks more: both forms are of one size.
+  // An unquoted path is followed by two more blanks, so that both forms have the same size.
   scene.text(paths == EditPaths::Quoted ? "\n\t\t1 \"" : "\n\t\t1 ").text(path);
   scene.text(paths == EditPaths::Quoted ? "\" " : "   ");
   scene.text("\n\t\t\"followRoot\" \"followRoot\" \" -ci 1 -min 0 -max 1 -at \\\"double\\\"\"");
@@ -68,7 +68,7 @@ bool hasAddedAttribute(std::int64_t control) { return control % 4 == 0; }
 
 bool isConstrained(std::int64_t control) { return control % 20 == 7; }
 
-// How many edits editControl writes.
+// The number of edits that editControl writes.
 std::int64_t editsOf(std::int64_t control) {
   constexpr std::int64_t kChannelEdits = kDriven;
   return 6 + kChannelEdits + (hasAddedAttribute(control) ? 1 : 0) +

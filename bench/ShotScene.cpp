@@ -1,6 +1,6 @@
 // A production shot: a tracked camera in a set of referenced files, with their edits and the curves that
 // drive them, rigs and meshes of its own. An import takes the camera, its chain, and the points that it was
-// solved from; it reads or passes over all the rest.
+// solved from; it reads or skips all the rest.
 #include <array>
 
 #include "bench/SceneParts.h"

@@ -12,20 +12,20 @@
 namespace bench {
 namespace {
 
-bool IsSpace(char c) { return c == ' ' || (c >= '\t' && c <= '\r'); }
+bool isSpace(char c) { return c == ' ' || (c >= '\t' && c <= '\r'); }
 
-// Goes on with a text whose byte before `text` was white space or not.
-std::size_t CountOn(const char* text, const char* end, bool afterSpace) {
+// Counts the rest of a text; the flag says whether the byte before `text` is white space.
+std::size_t countRest(const char* text, const char* end, bool afterSpace) {
   std::size_t words = 0;
   for (; text != end; ++text) {
-    const bool space = IsSpace(*text);
+    const bool space = isSpace(*text);
     words += afterSpace && !space ? 1 : 0;
     afterSpace = space;
   }
   return words;
 }
 
-std::size_t CountPlain(const char* text, std::size_t size) { return CountOn(text, text + size, true); }
+std::size_t countPlain(const char* text, std::size_t size) { return countRest(text, text + size, true); }
 
 #if defined(__x86_64__)
 
@@ -34,7 +34,7 @@ constexpr std::size_t kBlock = 64;
 // 64 bytes at a time: `spacesOf` gives a bit for each that is white space. A word starts at a byte that is
 // none and comes after one, or at the text's first byte.
 template <typename SpacesOf>
-[[gnu::always_inline]] inline std::size_t CountBlocks(const char* text, std::size_t size, SpacesOf spacesOf) {
+[[gnu::always_inline]] inline std::size_t countBlocks(const char* text, std::size_t size, SpacesOf spacesOf) {
   std::size_t words = 0;
   std::uint64_t afterSpace = 1;
   const char* const end = text + size;
@@ -43,10 +43,10 @@ template <typename SpacesOf>
     words += static_cast<std::size_t>(std::popcount((spaces << 1 | afterSpace) & ~spaces));
     afterSpace = spaces >> (kBlock - 1);
   }
-  return words + CountOn(text, end, afterSpace != 0);
+  return words + countRest(text, end, afterSpace != 0);
 }
 
-std::uint64_t SpacesSse2(const char* block) {
+std::uint64_t spacesSse2(const char* block) {
   std::uint64_t spaces = 0;
   for (int at = 0; at < static_cast<int>(kBlock); at += 16) {
     const __m128i bytes = _mm_loadu_si128(reinterpret_cast<const __m128i*>(block + at));
@@ -58,11 +58,11 @@ std::uint64_t SpacesSse2(const char* block) {
   return spaces;
 }
 
-std::size_t CountSse2(const char* text, std::size_t size) { return CountBlocks(text, size, SpacesSse2); }
+std::size_t countSse2(const char* text, std::size_t size) { return countBlocks(text, size, spacesSse2); }
 
 #define TARGET_AVX2 [[gnu::target("avx2,popcnt")]]
 
-TARGET_AVX2 inline std::uint32_t SpacesOfHalf(const char* half) {
+TARGET_AVX2 inline std::uint32_t spacesOfHalf(const char* half) {
   const __m256i bytes = _mm256_loadu_si256(reinterpret_cast<const __m256i*>(half));
   const __m256i fromTab = _mm256_sub_epi8(bytes, _mm256_set1_epi8('\t'));
   const __m256i control = _mm256_cmpeq_epi8(_mm256_min_epu8(fromTab, _mm256_set1_epi8('\r' - '\t')), fromTab);
@@ -70,30 +70,30 @@ TARGET_AVX2 inline std::uint32_t SpacesOfHalf(const char* half) {
   return static_cast<std::uint32_t>(_mm256_movemask_epi8(space));
 }
 
-TARGET_AVX2 inline std::uint64_t SpacesAvx2(const char* block) {
-  return SpacesOfHalf(block) | std::uint64_t{SpacesOfHalf(block + 32)} << 32;
+TARGET_AVX2 inline std::uint64_t spacesAvx2(const char* block) {
+  return spacesOfHalf(block) | std::uint64_t{spacesOfHalf(block + 32)} << 32;
 }
 
-TARGET_AVX2 std::size_t CountAvx2(const char* text, std::size_t size) {
-  return CountBlocks(text, size, SpacesAvx2);
+TARGET_AVX2 std::size_t countAvx2(const char* text, std::size_t size) {
+  return countBlocks(text, size, spacesAvx2);
 }
 
 #endif
 
 }  // namespace
 
-std::span<const WordCounter> WordCounters() {
+std::span<const WordCounter> wordCounters() {
 #if defined(__x86_64__)
   static constexpr std::array<WordCounter, 3> kCounters = {
-      {{"plain", CountPlain}, {"SSE2", CountSse2}, {"AVX2", CountAvx2}}};
+      {{"plain", countPlain}, {"SSE2", countSse2}, {"AVX2", countAvx2}}};
   const bool hasAvx2 = __builtin_cpu_supports("avx2") && __builtin_cpu_supports("popcnt");
   return std::span(kCounters).first(hasAvx2 ? 3 : 2);
 #else
-  static constexpr std::array<WordCounter, 1> kCounters = {{{"plain", CountPlain}}};
+  static constexpr std::array<WordCounter, 1> kCounters = {{{"plain", countPlain}}};
   return kCounters;
 #endif
 }
 
-std::size_t CountWords(const char* text, std::size_t size) { return WordCounters().back().count(text, size); }
+std::size_t countWords(const char* text, std::size_t size) { return wordCounters().back().count(text, size); }
 
 }  // namespace bench

@@ -1,6 +1,6 @@
-// How many words a text has, as fast as the processor's vector registers give it. A word is a run of bytes
-// that are no white space; white space is what isspace of the C locale names: blank, tab, line feed, vertical
-// tab, form feed, carriage return.
+// Counts the words of a text with vector instructions. A word is a run of bytes that are no white space;
+// white space is that of isspace in the C locale: blank, tab, line feed, vertical tab, form feed, carriage
+// return.
 #pragma once
 
 #include <cstddef>
@@ -8,15 +8,15 @@
 
 namespace bench {
 
-// Reads `size` bytes from `text` on, and nothing beside them. Uses the best of WordCounters.
-std::size_t CountWords(const char* text, std::size_t size);
+// Reads the `size` bytes from `text` on, and no others. Uses the best of wordCounters().
+std::size_t countWords(const char* text, std::size_t size);
 
 struct WordCounter {
   const char* name;
   std::size_t (*count)(const char* text, std::size_t size);
 };
 
-// Those that this processor can run, the best one last.
-std::span<const WordCounter> WordCounters();
+// The counters that this processor can run, the fastest last. The table lives as long as the program.
+std::span<const WordCounter> wordCounters();
 
 }  // namespace bench

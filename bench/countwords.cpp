@@ -1,6 +1,6 @@
 // A yardstick: reads the file whole, into a buffer on large pages, and counts its words. An import has to do
-// as much at least. A read into fresh small pages mostly waits for their faults, and those cost one
-// processor several times what they cost another.
+// at least as much. A read into fresh small pages mostly waits for page faults, whose cost differs several
+// times between processors.
 #include <fcntl.h>
 #include <sys/mman.h>
 #include <sys/stat.h>
@@ -15,7 +15,7 @@ namespace {
 
 // Room for `size` bytes that begins on the boundary of a large page and asks for such pages. Null when there
 // is none. It goes with the process.
-char* TakeLargePages(std::size_t size) {
+char* takeLargePages(std::size_t size) {
   constexpr std::size_t kLargePage = std::size_t{2} << 20;
   const std::size_t wholePages = (size / kLargePage + 1) * kLargePage;
   void* const room =
@@ -27,7 +27,7 @@ char* TakeLargePages(std::size_t size) {
   return first;
 }
 
-bool ReadWhole(int file, char* buffer, std::size_t size) {
+bool readWhole(int file, char* buffer, std::size_t size) {
   for (std::size_t done = 0; done < size;) {
     const ssize_t count = read(file, buffer + done, size - done);
     if (count <= 0) return false;
@@ -47,10 +47,10 @@ int main(int argc, char** argv) {
     return 2;
   }
   const auto size = static_cast<std::size_t>(status.st_size);
-  char* const buffer = TakeLargePages(size);
-  if (buffer == nullptr || !ReadWhole(file, buffer, size)) {
+  char* const buffer = takeLargePages(size);
+  if (buffer == nullptr || !readWhole(file, buffer, size)) {
     std::fprintf(stderr, "bench-countwords: cannot read %s\n", argv[1]);
     return 2;
   }
-  std::printf("%zu\n", bench::CountWords(buffer, size));
+  std::printf("%zu\n", bench::countWords(buffer, size));
 }

@@ -1,5 +1,5 @@
-// bench-generate WORKLOAD FILE [SCALE]: writes a scene to measure the import with, and says what the
-// import makes of it.
+// bench-generate WORKLOAD FILE [SCALE]: writes a scene for measurements, and prints what an import makes of
+// it.
 #include <cstdlib>
 #include <fstream>
 #include <iostream>
@@ -14,7 +14,7 @@ int main(int argc, char** argv) {
   const double scale = argc >= 4 ? std::atof(argv[3]) : 1.0;
   if (workload == nullptr || !(scale > 0.0)) {
     std::cerr << "usage: bench-generate WORKLOAD FILE [SCALE]\n";
-    for (const bench::Workload& known : bench::Workloads()) {
+    for (const bench::Workload& known : bench::workloads()) {
       std::cerr << "  " << known.name << ": " << known.what << '\n';
     }
     return kWrongUsage;

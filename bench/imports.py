@@ -1,4 +1,4 @@
-"""What an import takes, beside its yardstick."""
+"""Time and memory of an import, beside its yardstick."""
 
 import subprocess
 
@@ -10,7 +10,7 @@ BLOCKS = 5  # of runs in a row, of each size that growth is measured from
 
 
 class Measured:
-    """What is measured of one workload."""
+    """The measurements of one workload."""
 
     def __init__(self, workload, arguments, folder):
         self.workload, self.arguments, self.folder = workload, arguments, folder

@@ -12,7 +12,7 @@ from limits import MB
 
 def run(command, expected=0):
     """Wall seconds, peak MB and processor seconds of one run."""
-    # A run that is to fail says why; nobody needs to read it each time.
+    # A run that should fail prints why, which is not needed each time.
     errors = subprocess.DEVNULL if expected else None
     begin = time.perf_counter()
     with subprocess.Popen(command, stdout=subprocess.DEVNULL, stderr=errors) as process:
@@ -27,7 +27,7 @@ def run(command, expected=0):
 def take_turns(commands, rounds, in_a_row=1):
     """Medians of what run() returns, by the names of the commands, each of which comes with its exit status.
 
-    In its turn each command runs once uncounted, and then counts so many times in a row. A virtual machine gives memory
+    In its turn each command runs once uncounted, and then `in_a_row` times counted. A virtual machine gives memory
     that was free for some seconds back to its host, and takes long to get it again: without a run right before, whichever
     command comes after the longest one would pay for that.
     """

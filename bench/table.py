@@ -1,4 +1,4 @@
-"""A table of what was measured, each value beside its limit."""
+"""A table of measurements, each value beside its limit."""
 
 
 class Table:
@@ -16,7 +16,7 @@ class Table:
                        for cell, width in zip(cells, self.WIDTHS)), flush=True)
 
     def row(self, name, plain, judged):
-        """What is named and plain stands as it is; each of `judged` is a sentence, a value, its limit and its form."""
+        """`name` and `plain` are cells; each of `judged` is a sentence, a value, its limit and its form."""
         cells = [*name, *plain]
         for what, value, limit, form in judged:
             cells += ["-" if value is None else form.format(value)]

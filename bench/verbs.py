@@ -1,4 +1,4 @@
-"""What the other verbs of the tool take, beside the import of the same scene."""
+"""Time and memory of the other verbs of the tool, beside those of the import of the same scene."""
 
 import os
 import shutil

@@ -1,5 +1,5 @@
-// The bake of a scene from arbitrary bytes: that it ends and has a bound, that it can be read again whole,
-// and that the same scene gives the same bytes.
+// Bakes a scene of arbitrary bytes: the bake ends and is bounded, it can be read again without a diagnostic,
+// and the same scene gives the same bytes.
 #include <cstdint>
 #include <sstream>
 #include <string>
@@ -15,7 +15,7 @@
 
 namespace {
 
-// Few frames: what is long about a bake is its frames, and each is computed like the next.
+// Few frames: all are computed alike, and more would only take longer.
 constexpr bake::FrameSpan kFrames{-2.0, 5.5};
 constexpr double kStep = 1.5;
 constexpr std::size_t kCount = 6;
@@ -36,7 +36,7 @@ Baked BakeOf(const scene::Scene& read, const bake::Options& options, diag::Colle
   return baked;
 }
 
-// Nothing of a bake is strange to the reader: all of it is a warning or an error less.
+// The reader has no diagnostic about a bake.
 void CheckReadable(const std::string& text) {
   diag::Collector diagnostics(text);
   const scene::Scene again = scene::Read(text, diagnostics);
@@ -77,7 +77,8 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   Check(read, text, options);
   options.world = true;
   Check(read, text, options);
-  // Its own range: what it plays and its keys, however far away they are. Only that it is found or refused.
+  // The scene's own range, which its playback and its keys give, however far away they are: it is found or
+  // refused.
   options.frames.reset();
   options.cameras = {"no camera has this name"};
   options.locators = bake::Locators::kNone;

@@ -1,5 +1,5 @@
-// An input taken apart into values, first to last. What is asked for beyond its end is zero or empty, so that
-// every input means something.
+// Reads values from an input, first to last. Beyond its end all values are zero or empty, so that every input
+// is usable.
 #pragma once
 
 #include <algorithm>
@@ -38,7 +38,7 @@ class Bytes {
 
   std::size_t TakeBelow(std::size_t bound) { return Take<std::uint8_t>() % bound; }
 
-  // A length, then so many bytes.
+  // A byte with the length, then that many bytes.
   std::string TakeText() { return std::string(TakeRun(Take<std::uint8_t>())); }
 
  private:

@@ -1,5 +1,5 @@
-// The check of a scene over arbitrary bytes, imported first: that the report agrees with the import, that it
-// is bounded, and that nothing of the scene reaches a terminal or a document unescaped.
+// Imports and checks a scene of arbitrary bytes: the report agrees with the import, it is bounded, and
+// nothing of the scene reaches a terminal or a document unescaped.
 #include <cstdint>
 #include <map>
 #include <nlohmann/json.hpp>
@@ -32,7 +32,7 @@ constexpr std::size_t kLongestFinding = 8000;
 constexpr std::size_t kShortestReport = 20'000;
 
 HostPluginEntry LoadModule() {
-  // Never unloaded: what it counts for the fuzzer is looked at until the end.
+  // Never unloaded: the fuzzer reads its coverage counters until the end.
   static auto* const loader = new refhost::ModuleLoader;
   std::string failure;
   const HostPluginEntry entry = loader->load(MAYASCENE_MODULE, &failure);

@@ -1,4 +1,4 @@
-// The fuzzer's library asks here for a changed scene. Linked to the targets that read scenes.
+// The function that the fuzzer's library calls for a changed scene. Linked to the targets that read scenes.
 #include <algorithm>
 #include <cstddef>
 #include <cstdint>

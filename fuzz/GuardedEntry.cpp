@@ -11,7 +11,7 @@
 namespace fuzz {
 namespace {
 
-// What nobody wrote looks like text that is never harmless.
+// Fills memory that was not written: a quote always has an effect on the reader.
 constexpr int kFilling = '"';
 
 // Suites are tables without a context.

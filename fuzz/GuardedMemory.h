@@ -1,4 +1,4 @@
-// Memory that ends at a page which nobody may read or write: one byte too far ends the process.
+// Memory that ends at a page that cannot be read or written: one byte too far ends the process.
 #pragma once
 
 #include <cstddef>

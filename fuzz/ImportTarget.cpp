@@ -1,7 +1,7 @@
 // The whole import: file, module, embedded host. The module stays loaded; each run has a host of its own.
 //
-// Bytes 6 to 9 of a scene stand after what the header test looks at. Here they say how the host behaves; "
-// ASC", which a scene has there, is an ordinary host.
+// Bytes 6 to 9 of a scene come after those that the header test compares. Here they choose the host's
+// behaviour; " ASC", which an ordinary scene has there, is an ordinary host.
 #include <cmath>
 #include <cstdint>
 #include <iterator>
@@ -40,7 +40,7 @@ constexpr const char* kOperations[] = {"",
 #undef FUZZ_SERVICE
 };
 
-// Takes the trace, and looks at every byte of it.
+// Takes the trace, and checks every byte of it.
 class TraceSink : public std::streambuf {
  protected:
   int_type overflow(int_type c) override {
@@ -145,7 +145,7 @@ void CheckResult(const refhost::CallbackResult& result, const Behaviour& behavio
 }
 
 HostPluginEntry LoadModule() {
-  // Never unloaded: what it counts for the fuzzer is looked at until the end.
+  // Never unloaded: the fuzzer reads its coverage counters until the end.
   static auto* const loader = new refhost::ModuleLoader;
   std::string failure;
   const HostPluginEntry entry = loader->load(MAYASCENE_MODULE, &failure);

@@ -1,5 +1,5 @@
-// The tool's writers over a run that never was: every name, number and tree of layers that a host can hold.
-// What comes out is read back.
+// Writes an invented run with the tool's writers: every name, number and tree of layers that a host can hold.
+// What they write is read back.
 #include <bit>
 #include <cmath>
 #include <cstdint>
@@ -124,7 +124,7 @@ void TakeScene(Bytes bytes, Scene* scene) {
   scene->run.scenes.push_back(std::move(report));
 }
 
-// What the document holds for a number: the same bits, or the word for what JSON has no number for.
+// The document has the same bits for a number, or a word where JSON has no number.
 void CheckNumber(const json& found, double expected) {
   if (!std::isfinite(expected)) {
     const char* const word = std::isnan(expected) ? "nan" : expected > 0.0 ? "inf" : "-inf";

@@ -1,5 +1,5 @@
-// The lexer over arbitrary bytes: that tokens follow one another within the text, and that every way of
-// passing over harmless text in bulk finds what reading token by token finds.
+// Runs the lexer on arbitrary bytes: tokens follow one another within the text, and every bulk skipper gives
+// the same result as reading token by token.
 #include <cstdint>
 #include <vector>
 
@@ -16,7 +16,7 @@ namespace {
 
 using fuzz::Require;
 
-// A token that the reader looks at, or the error that reading ended with.
+// A token that the reader acts on, or the error that reading ended with.
 struct Event {
   std::int32_t kind;  // of the token, or the code of the error
   std::int64_t first;
@@ -28,7 +28,7 @@ struct Event {
 
 enum class Where { BetweenCommands, InCommand };
 
-// What every skipper stops at. In a command these are its end, strings, comments and options.
+// Whether every skipper stops at the token. In a command these are its end, strings, comments and options.
 bool Acts(Where where, MayaToken kind) {
   switch (kind) {
     case CreateNode:

@@ -1,5 +1,5 @@
-// The lines of a text by the book: ended by line feeds, with one carriage return before each that is no part
-// of them.
+// The lines of a text, as documented: they end with a line feed; a carriage return before it is not part of
+// them.
 #pragma once
 
 #include <string_view>

@@ -1,4 +1,4 @@
-// A file that has a path but lies on no disk: what reads files can be fed without writing any.
+// A file in memory, with a path, for code that reads files.
 #pragma once
 
 #include <filesystem>

@@ -1,5 +1,5 @@
-// Every channel that is driven and every place of a scene, from arbitrary bytes: that they end, and that a
-// frame has the same values whatever was looked at in between.
+// Evaluates every driven channel and every world matrix of a scene of arbitrary bytes: it ends, and a frame
+// has the same values whatever frames came in between.
 #include <bit>
 #include <cmath>
 #include <cstdint>

@@ -1,4 +1,4 @@
-// The number scanner, one number and runs of them, against the C library's own conversion; and the
+// Compares the number scanner, for one number and for runs, with the C library's conversion; and checks the
 // comparison of ratios.
 #include <bit>
 #include <cmath>
@@ -36,7 +36,7 @@ std::size_t DigitsAt(std::string_view text, std::size_t at) {
   return count;
 }
 
-// How many bytes of a whole exponent stand there.
+// The length of the exponent at the place; 0 where there is no whole one.
 std::size_t ExponentAt(std::string_view text, std::size_t at) {
   if (at >= text.size() || (text[at] != 'e' && text[at] != 'E')) return 0;
   const bool sign = at + 1 < text.size() && (text[at + 1] == '+' || text[at + 1] == '-');
@@ -45,7 +45,7 @@ std::size_t ExponentAt(std::string_view text, std::size_t at) {
   return digits == 0 ? 0 : prefix + digits;
 }
 
-// The number by the book: the form as it is documented, the value by the C library.
+// The expected result: the form as documented, the value by the C library.
 Scanned Expected(std::string_view text) {
   text = text.substr(0, text.find('\0'));
   std::size_t at = !text.empty() && (text[0] == '-' || text[0] == '+') ? 1 : 0;

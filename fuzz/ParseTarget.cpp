@@ -1,5 +1,5 @@
-// The reader over arbitrary bytes: that its records are whole, its errors documented, and that it gives
-// everything back.
+// Runs the reader on arbitrary bytes: its records are whole, its errors documented, and it gives everything
+// back.
 #include <cmath>
 #include <cstdint>
 #include <cstring>

@@ -1,4 +1,4 @@
-// The reader and the writer of preference files, against a second reader.
+// Compares the reader and the writer of preference files with a second reader.
 #include <cstdint>
 #include <filesystem>
 #include <iterator>
@@ -23,7 +23,7 @@ using fuzz::Require;
 using Entries = std::map<std::pair<std::string, std::string>, std::int32_t>;
 
 constexpr const char* kFileName = "preferences";
-// So many texts are read for one that is written too, which takes ten times as long.
+// One text of this many is written too, which takes ten times as long as reading.
 constexpr std::size_t kOneIn = 16;
 
 // Decimal digits with an optional "-" that fit 32 bits, and nothing else.
@@ -68,7 +68,7 @@ void Add(refhost::Preferences& preferences, Entries& entries, std::string_view s
   entries[{std::string(section), std::string(key)}] = value;
 }
 
-// Values more than the file has, beside which the others stay. Two have names of any bytes.
+// Adds values to those of the file, which stay. Two have names of any bytes.
 void CheckAdditions(refhost::Preferences& preferences, Entries& entries, std::string_view text) {
   constexpr std::int32_t kValue = -7;
   const std::size_t half = text.size() / 2;
@@ -96,7 +96,7 @@ void Write(const refhost::Preferences& preferences, const std::filesystem::path&
   Require(std::distance(begin(files), end(files)) == 1, "nothing is left beside the file");
 }
 
-// The text as a file that is read, written, read back and written again.
+// Reads the text as a file, writes it, reads it back and writes it again.
 void CheckWriter(std::string_view text, Entries entries) {
   static const testsupport::TemporaryFolder folder;
   refhost::Preferences preferences(folder.write(kFileName, text));

@@ -1,4 +1,4 @@
-// The least of a host that the reader needs: a utility suite that counts the messages that it is to show.
+// The smallest host that the reader needs: a utility suite that counts messages.
 #pragma once
 
 #include "hostapi/WNBasicSuite.h"

@@ -1,4 +1,4 @@
-// The one way in which a fuzz target complains.
+// How a fuzz target reports a finding.
 #pragma once
 
 #include <cstdio>

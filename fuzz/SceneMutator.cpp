@@ -82,7 +82,7 @@ std::string Units(Dice& dice) {
 
 std::string Comment(Dice& dice) { return dice.OneIn(2) ? "// setAttr \"x\"" : "/* createNode camera; */"; }
 
-// Curves with their keys and connections come together, or no key would ever move anything.
+// Makes a curve, its keys and its connection together: made apart they would hardly ever fit.
 std::string AnimatedChannel(Dice& dice) {
   const std::string curve(dice.Pick(kNames));
   return "createNode animCurveTL -n " + Quoted(curve) + ";\n\t" + SetKeys(dice) + ";\nconnectAttr " +
@@ -112,7 +112,7 @@ struct Span {
   std::size_t size = 0;
 };
 
-// The span between two separators that a byte lies in, with the separator that ends it. Long spans are met
+// The span of a random byte between two separators, with the separator that ends it. So long spans are picked
 // more often.
 Span PickSpan(std::string_view text, std::string_view separators, Dice& dice) {
   if (text.empty()) return {};

@@ -1,4 +1,4 @@
-// Changes to scenes that know what a scene is made of: commands, node kinds, names, options, numbers.
+// Changes scenes by their grammar: commands, node kinds, names, options, numbers.
 #pragma once
 
 #include <cstddef>
@@ -26,7 +26,8 @@ class Dice {
   std::uint64_t state_;
 };
 
-// A whole command, with its ";" and line end. Names come from a small set, so that commands meet.
+// A whole command, with its ";" and line end. Names come from a small set, so that commands refer to the same
+// nodes.
 std::string MakeCommand(Dice& dice);
 
 // One change: a command made, taken out, doubled or moved; a token replaced, put in or taken out; the end cut

@@ -1,5 +1,5 @@
-// The reader of the whole scene over arbitrary bytes: that what it gives is whole, that reading again gives
-// the same, and that whatever a text holds costs none of the commands after it.
+// Runs the reader of the whole scene on arbitrary bytes: its result is consistent, and no text keeps the
+// commands after it from being read.
 #include <algorithm>
 #include <cstdint>
 #include <string>

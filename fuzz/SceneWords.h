@@ -1,4 +1,4 @@
-// The words that scenes are made of.
+// The words of scenes, for the mutator.
 #pragma once
 
 #include <string_view>
@@ -25,12 +25,12 @@ inline constexpr std::string_view kNodeKinds[] = {
     "script",
 };
 
-// Few, and some that differ only in case, so that nodes meet and names repeat.
+// Few, and some that differ only in case, so that names repeat and commands refer to the same nodes.
 inline constexpr std::string_view kNames[] = {"a",   "b",    "c",       "cam",  "camShape", "A",  "rig",
                                               "loc", "aim",  "k1",      "k2",   "k3",       "k4", "",
                                               "a.b", "null", "NULLish", "|a|b", "x\\\"y"};
 
-// What a constraint gives to the node that it turns, and what it takes from there.
+// The outputs of a constraint to the node that it turns, and its inputs from there.
 inline constexpr std::string_view kTurningAttributes[] = {".cr",
                                                           ".crx",
                                                           ".cry",
@@ -53,7 +53,7 @@ inline constexpr std::string_view kFollowingAttributes[] = {".ct",
                                                             ".constraintTranslateY",
                                                             ".constraintTranslateZ"};
 
-// Those between which a connection means something come more often.
+// Attributes between which a connection has an effect come more often.
 inline constexpr std::string_view kSourceAttributes[] = {
     ".o", ".output", ".o", ".t", ".r", ".cr", ".crx", ".constraintRotateY", ".cv", ".pim", "", ".w0"};
 inline constexpr std::string_view kDestinationAttributes[] = {".tx",

@@ -1,4 +1,4 @@
-// What every fuzz target offers, under the names that the fuzzer's library calls.
+// The function of every fuzz target, under the name that the fuzzer's library calls.
 #pragma once
 
 #include <cstddef>

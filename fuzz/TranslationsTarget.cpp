@@ -1,4 +1,4 @@
-// The reader of translation files, against a second reader; and what the formatter makes of such texts.
+// Compares the reader of translation files with a second reader, and formats the texts.
 #include <cstdint>
 #include <cstring>
 #include <string>

@@ -1,4 +1,4 @@
-// Stands in for the fuzzer's library where there is none: runs a target over files, and over all files of
+// The main program of a target without the fuzzer's library: runs the target on files, and on all files of
 // folders.
 //
 //   fuzz-TARGET [--changes N] FILE-OR-FOLDER ...
@@ -37,13 +37,14 @@ std::vector<fs::path> FilesAt(const fs::path& place) {
   return files;
 }
 
-// In memory of just its size, so that a sanitizer sees every byte too far.
+// Runs a copy in memory of exactly its size, so that a sanitizer sees every byte too far.
 void Run(const std::string& bytes) {
   const std::vector<std::uint8_t> input(bytes.begin(), bytes.end());
   LLVMFuzzerTestOneInput(input.data(), input.size());
 }
 
-// Up to so many changes on top of one another; then it begins anew, before nothing of a scene is left.
+// The most changes on top of one another. Then it begins with the original again, before nothing of the scene
+// is left.
 constexpr int kChangesInARow = 10;
 
 void RunChanged(const std::string& original, int changes) {

@@ -1,6 +1,6 @@
-// Keys on their way into the embedded host: as the suite calls of one stream, and as the importer's walk over
-// an animated transform, which gives each key sample to five streams. The items are keys; the bytes are those
-// of their times and values.
+// Adding keys to the embedded host: as the suite calls of one stream, and as the importer does it for an
+// animated transform, which has five streams. The items are keys; the bytes are those of their times and
+// values.
 #include <optional>
 
 #include "bench/micro/MicroBenchmark.h"
@@ -18,7 +18,7 @@ namespace {
 constexpr std::int32_t kPluginId = 1;
 constexpr int kKeys = 240;
 
-// How many layers a host gets before a new one takes over, so that memory stays bounded.
+// The number of layers in a host before a new one is made, so that memory stays bounded.
 constexpr int kLayersPerHost = 256;
 
 // Streams by their numbers, with the values of a key.

@@ -1,5 +1,5 @@
-// A transform's way through a matrix: composed from pivots, scale, rotations and translation, then taken
-// apart. The items are transforms, the bytes those of their matrices.
+// Composes the matrix of a transform from pivots, scale, rotations and translation, and takes it apart. The
+// items are transforms, the bytes those of their matrices.
 #include <array>
 #include <cmath>
 

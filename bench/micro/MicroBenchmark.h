@@ -1,4 +1,4 @@
-// What the micro-benchmarks share.
+// The helpers of the micro-benchmarks.
 #pragma once
 
 #include <benchmark/benchmark.h>
@@ -21,13 +21,13 @@ inline std::string sceneOf(std::string_view workload, double scale) {
   return std::move(out).str();
 }
 
-// What each iteration did, as items and bytes per second.
+// Reports the work of each iteration, as items and bytes per second.
 inline void countWork(benchmark::State& state, std::int64_t items, std::int64_t bytes) {
   state.SetItemsProcessed(static_cast<std::int64_t>(state.iterations()) * items);
   state.SetBytesProcessed(static_cast<std::int64_t>(state.iterations()) * bytes);
 }
 
-// A benchmark of something that failed measures nothing.
+// Ends the process where something failed: its time would mean nothing.
 inline void require(bool success) {
   if (!success) std::abort();
 }

@@ -1,6 +1,6 @@
 // The skippers of text over meshes, beside a count of the words of the same text, which is about the least
-// that a look at every byte costs. The counter "of_count" is a skipper's speed as a share of the count's; the
-// two take turns. Once the text fits the processor's caches, once it does not.
+// that reading every byte costs. The counter "of_count" is a skipper's speed as a share of the count's; the
+// two take turns. One text fits the processor's caches, one does not.
 #include <time.h>
 
 #include <chrono>
@@ -46,7 +46,7 @@ void skipText(benchmark::State& state, const std::string& text, scan::SkipText s
   std::int64_t stops = 0;
   for (auto _ : state) {
     const Seconds begin = now();
-    benchmark::DoNotOptimize(CountWords(text.data(), text.size()));
+    benchmark::DoNotOptimize(countWords(text.data(), text.size()));
     const Seconds between = now();
     stops = skipAll(text, skip);
     const Seconds end = now();

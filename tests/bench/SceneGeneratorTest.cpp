@@ -51,7 +51,7 @@ TEST(SceneGeneratorTest, WorkloadsAreOfTheSizesInTheDocuments) {
 
 TEST(SceneGeneratorTest, SizeLayersAndKeysGrowWithTheScale) {
   constexpr double kSmall = 0.02;
-  for (const Workload& workload : Workloads()) {
+  for (const Workload& workload : workloads()) {
     std::ostringstream texts[3];
     Built built[3];
     for (int i = 0; i < 3; ++i) built[i] = workload.write(texts[i], kSmall * (1 << i), kSeed);
@@ -132,7 +132,7 @@ TEST(SceneGeneratorTest, ShotHoldsReferencesRigsMeshesAndATrackedCamera) {
 }
 
 TEST(SceneGeneratorTest, EveryNodeHasAnIdentifierOfItsOwn) {
-  for (const Workload& workload : Workloads()) {
+  for (const Workload& workload : workloads()) {
     const std::string scene = Scene(workload.name, 0.002);
     constexpr std::string_view kAfterNode = "\";\n\trename -uid \"";
     constexpr std::string_view kForm = "XXXXXXXX-XXXX-XXXX-XXXX-XXXXXXXXXXXX";
@@ -151,7 +151,7 @@ TEST(SceneGeneratorTest, EveryNodeHasAnIdentifierOfItsOwn) {
 }
 
 TEST(SceneGeneratorTest, TheSameSeedGivesTheSameScene) {
-  for (const Workload& workload : Workloads()) {
+  for (const Workload& workload : workloads()) {
     const std::string scene = Scene(workload.name, 0.002);
     EXPECT_EQ(scene, Scene(workload.name, 0.002)) << workload.name;
     EXPECT_NE(scene, Scene(workload.name, 0.002, kSeed + 1)) << workload.name;

@@ -24,10 +24,10 @@ std::size_t WordsOf(const std::string& text) {
 }
 
 void ExpectWords(std::string_view text, std::size_t expected) {
-  for (const WordCounter& counter : WordCounters()) {
+  for (const WordCounter& counter : wordCounters()) {
     EXPECT_EQ(counter.count(text.data(), text.size()), expected) << counter.name << ": " << text;
   }
-  EXPECT_EQ(CountWords(text.data(), text.size()), expected);
+  EXPECT_EQ(countWords(text.data(), text.size()), expected);
 }
 
 TEST(WordCountTest, AnEmptyTextHasNone) { ExpectWords("", 0); }

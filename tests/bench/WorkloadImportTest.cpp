@@ -69,8 +69,8 @@ TEST_P(WorkloadImportTest, WhatIsStoppedMakesNothing) {
   EXPECT_EQ(Import(out.str()).built, Built());
 }
 
-INSTANTIATE_TEST_SUITE_P(Workloads, WorkloadImportTest,
-                         testing::ValuesIn(Workloads().begin(), Workloads().end()),
+INSTANTIATE_TEST_SUITE_P(workloads, WorkloadImportTest,
+                         testing::ValuesIn(workloads().begin(), workloads().end()),
                          [](const auto& workload) { return std::string(workload.param.name); });
 
 }  // namespace
