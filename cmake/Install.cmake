@@ -1,5 +1,5 @@
-# What `cmake --install` puts where: tool, module, utility library, the headers of a host, examples and documents;
-# tools/mayascene adds manual pages and completions. All of it finds its parts from where it lies, so that the folder
+# What `cmake --install` installs: tool, module, utility library, the headers of a host, examples and documents;
+# tools/mayascene adds manual pages and completions. All parts find one another by relative paths, so that the folder
 # can be moved as a whole.
 include(CMakePackageConfigHelpers)
 

@@ -1,4 +1,4 @@
-# What every target is built with.
+# The options of all targets.
 
 set(CMAKE_C_STANDARD 11)
 set(CMAKE_C_STANDARD_REQUIRED ON)
@@ -16,12 +16,12 @@ option(MAYASCENE_SANITIZE "Build with the address, leak and undefined behaviour 
 option(MAYASCENE_COVERAGE "Build for line and branch coverage" OFF)
 option(MAYASCENE_FUZZ "Build the fuzz targets as fuzzers, with the integer sanitizers too; needs clang" OFF)
 
-# bin/ holds the tool, lib/ the utility library and the module; they find each other from where they lie.
+# bin/ holds the tool, lib/ the utility library and the module; they find each other by relative paths.
 set(CMAKE_RUNTIME_OUTPUT_DIRECTORY ${CMAKE_BINARY_DIR}/bin)
 set(CMAKE_LIBRARY_OUTPUT_DIRECTORY ${CMAKE_BINARY_DIR}/lib)
 set(CMAKE_BUILD_RPATH_USE_ORIGIN ON)
 
-# What all code is compiled with, the code under test, and the tests.
+# Options for all code, for the product, and for the tests.
 add_library(mayascene_common_options INTERFACE)
 add_library(mayascene_options INTERFACE)
 add_library(mayascene_test_options INTERFACE)
@@ -36,18 +36,18 @@ target_compile_options(
             -Wshadow
             # Arithmetic gives the same bits on every processor.
             -ffp-contract=off)
-# Tests are compiled more often than run: not to optimise them is the faster way to know.
+# Tests are compiled more often than run, so compiling them without optimisation takes less time in all.
 target_compile_options(mayascene_test_options INTERFACE -O0)
-# 1 under the sanitizers, where what takes long is done in part; the other builds do all of it.
+# 1 under the sanitizers, where long tests do only a part of their work.
 target_compile_definitions(mayascene_test_options INTERFACE MAYASCENE_SANITIZED=$<BOOL:${MAYASCENE_SANITIZE}>)
 if(MAYASCENE_SANITIZE)
-  # "function" checks a call through a pointer by the address of a type's description, of which every shared library has
-  # its own: it would take each call across the border for a wrong one.
+  # "function" checks a call through a pointer by the address of a type's description. Every shared library has a copy
+  # of its own, so it would report each call across the border.
   set(MAYASCENE_SANITIZERS -fsanitize=address,undefined,float-cast-overflow -fno-sanitize-recover=all
                            $<$<CXX_COMPILER_ID:Clang>:-fno-sanitize=function>)
   target_compile_options(mayascene_options INTERFACE ${MAYASCENE_SANITIZERS} -fno-omit-frame-pointer)
-  # The tests' own code has those that see a bad read or write in either and bad arithmetic in inline functions,
-  # and compiles faster so.
+  # The tests' own code has only those that find bad reads and writes, and bad arithmetic in inline functions of the
+  # product; so it compiles faster.
   target_compile_options(
     mayascene_test_options
     INTERFACE -fsanitize=address,float-cast-overflow,signed-integer-overflow,shift,integer-divide-by-zero,bounds
@@ -56,13 +56,13 @@ if(MAYASCENE_SANITIZE)
   target_link_options(mayascene_common_options INTERFACE ${MAYASCENE_SANITIZERS})
 endif()
 if(MAYASCENE_COVERAGE)
-  # Only these are compiled with counters (see add_room); whatever they are linked into writes them down.
+  # Only these are compiled with counters (see add_room); every program that links them writes the counts.
   set(MAYASCENE_MEASURED_ROOMS scan hostutil plugin_services plugin_entry MayaImport maya comp)
   target_link_options(mayascene_common_options INTERFACE --coverage)
 endif()
 if(MAYASCENE_FUZZ)
   # "function" is left out as above. Comparisons are not traced: the dictionary and the mutator know the words, and
-  # tracing takes half of the runs.
+  # without tracing there are twice as many runs.
   target_compile_options(
     mayascene_options
     INTERFACE -fsanitize=fuzzer-no-link,address,undefined,float-cast-overflow,integer

@@ -1,4 +1,4 @@
-# How the libraries of the product are made.
+# The helper for the libraries of the product.
 
 # add_room(NAME KIND SOURCES ... [LINKS ...]): one library of the house. KIND is STATIC, SHARED or MODULE.
 function(add_room name kind)
@@ -7,8 +7,8 @@ function(add_room name kind)
   target_link_libraries(${name} PUBLIC ${ROOM_LINKS} PRIVATE $<BUILD_INTERFACE:mayascene_options>)
   target_include_directories(${name} PUBLIC ${PROJECT_SOURCE_DIR})
   if(MAYASCENE_COVERAGE AND name IN_LIST MAYASCENE_MEASURED_ROOMS)
-    # Every source has copies of its own of inline functions and templates: of shared ones the linker keeps a single
-    # copy, and the others would read as never run. The compiler warns of each.
+    # Every source gets its own copies of inline functions and templates: of shared ones the linker keeps a single copy,
+    # and the others would count as never run. The compiler would warn about each copy.
     target_compile_options(${name} PRIVATE --coverage -fno-weak -w)
   endif()
 endfunction()

@@ -1,6 +1,6 @@
-# How the programs of the tests are made.
+# The helpers for the programs of the tests.
 
-# What every test program is compiled with.
+# set_test_options(NAME): the options and definitions of every test program.
 function(set_test_options name)
   target_link_libraries(${name} PRIVATE mayascene_test_options GTest::gmock)
   target_compile_definitions(
@@ -9,8 +9,8 @@ function(set_test_options name)
             MAYASCENE_MODULE="$<TARGET_FILE:MayaImport>")
 endfunction()
 
-# share_test_headers(NAME): has a library of tests begin with the precompiled headers of the test programs, and compiles
-# it as these are, for a program and not for a shared library.
+# share_test_headers(NAME): gives a library of tests the precompiled headers of the test programs, and compiles it like
+# them, for a program and not for a shared library.
 function(share_test_headers name)
   set_test_options(${name})
   set_target_properties(${name} PROPERTIES POSITION_INDEPENDENT_CODE OFF)
@@ -19,7 +19,7 @@ function(share_test_headers name)
 endfunction()
 
 # add_room_test(NAME [ALONE] SOURCES ... [LINKS ...]): one GoogleTest program; each of its tests is a test of ctest. The
-# headers that all test sources include are compiled once, for all programs. ALONE: it runs neither tool nor module.
+# headers that all test sources include are compiled once, for all programs. ALONE: the test runs neither tool nor module.
 function(add_room_test name)
   cmake_parse_arguments(TEST "ALONE" "" "SOURCES;LINKS" ${ARGN})
   add_executable(${name} ${TEST_SOURCES})

@@ -1,4 +1,4 @@
-# find_package(mayascene): what the developer of a host builds with.
+# find_package(mayascene): the targets and variables for the developer of a host.
 #
 #   mayascene::hostapi        the headers of the border
 #   mayascene::hostutil       the utility library, which host and module share

@@ -1,7 +1,7 @@
-# What the scripts share: installing what is missing, and building a preset. Sourced, not run. Everything that is
-# said goes to standard error, so that a script's standard output is its own.
+# What the scripts share: installing what is missing, and building a preset. Sourced, not run. All messages go to
+# standard error, so that a script's standard output is its own.
 
-# The status with which a script ends when the machine could not be set up. None of the tool's own.
+# The status with which a script ends when the machine could not be set up. The tool itself never ends with it.
 readonly SETUP_FAILED=10
 
 say() { printf '%s: %s\n' "$(basename -- "$0")" "$*" >&2; }
@@ -63,7 +63,7 @@ build_preset() {
     say "setting up build/$preset"
     cmake --fresh -S "$root" --preset "$preset" >&2 9>&- || give_up "cmake could not set up build/$preset"
   fi
-  # The first build shows how far it is; later ones mostly have nothing to do, and then say nothing.
+  # The first build shows its progress. Later ones mostly have nothing to do, and then print nothing.
   if [ ! -e "$directory/.built" ]; then
     say "building build/$preset; the first time takes some minutes"
     ninja -C "$directory" "$@" >&2 9>&- || give_up "build/$preset could not be built"

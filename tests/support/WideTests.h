@@ -1,7 +1,8 @@
-// How much is done by the tests that could go on for minutes. MAYASCENE_TESTS in the environment chooses:
+// How much the tests do that could go on for minutes. MAYASCENE_TESTS in the environment chooses:
+//
 //   (not set)  a quick share, so that all tests together take about a minute
-//   wide       what scripts/test --all runs; under the sanitizers a part of it, because they take ten times
-//   as long all        everything, where there is an end to it; else as wide
+//   wide       what scripts/test --all runs; under the sanitizers, which take ten times as long, a part of it
+//   all        everything, where there is an end to it; else as wide
 #pragma once
 
 #include <cstddef>

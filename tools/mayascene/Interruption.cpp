@@ -58,13 +58,13 @@ extern "C" void endInterrupted(int signal) {
 
 // The importer ends the process where an exception leaves the release of a suite.
 [[noreturn]] void endTerminated() {
-  constexpr std::string_view farewell =
+  constexpr std::string_view kFarewell =
       "mayascene: an exception escaped where none may, in the importer or the tool; the run ends here\n";
   endChildren();
   removeUnfinished();
   // The log's last line is the call that ends the run.
   if (terminationLog != nullptr) terminationLog->pubsync();
-  if (::write(STDERR_FILENO, farewell.data(), farewell.size()) < 0) std::abort();
+  if (::write(STDERR_FILENO, kFarewell.data(), kFarewell.size()) < 0) std::abort();
   std::abort();
 }
 
