@@ -83,7 +83,7 @@ ENTRIES = [
         "Options before an attribute are treated by kind of node",
         ["OptionBeforeATransformAttributeMakesItIgnored", "OptionOfACameraAttributeEatsTheNextToken", "OptionOfACurveEatsTheSemicolon"],
         [
-            ("maya/MAYA_Parse_Attributes.cpp", "one option and the token after it are passed over"),
+            ("maya/MAYA_Parse_Attributes.cpp", "one option and the token after it are skipped"),
             ("maya/MAYA_Parse_Keys.cpp", "any other option eats the token after it"),
         ],
     ),
@@ -110,7 +110,7 @@ ENTRIES = [
     (
         "`select` leaves no node current, unless it ends after a colon",
         ["SelectLeavesNoNodeCurrentUnlessItEndsAfterAColon"],
-        [("maya/MAYA_Parse_Render.cpp", "what stands after a colon and is not the render node clears nothing")],
+        [("maya/MAYA_Parse_Render.cpp", "after a colon only the render node has an effect")],
     ),
     (
         "The key attribute is looked for with its case, anywhere in the text",
@@ -221,7 +221,7 @@ ENTRIES = [
     (
         "A constant curve can lend its time to key 0",
         ["ConstantCurveLendsItsTimeToTheFirstKey"],
-        [("comp/MAYA_Parse_Sampling.cpp", "a constant channel may lend its time to key 0")],
+        [("comp/MAYA_Parse_Sampling.cpp", "for key 0 that can be a constant channel, which has no later keys")],
     ),
     (
         "One key animates a focal length, but no transform",
