@@ -8,10 +8,10 @@
 #include "bake/Bake.h"
 #include "diag/Collector.h"
 #include "fuzz/Bytes.h"
-#include "fuzz/GuardedMemory.h"
 #include "fuzz/Require.h"
 #include "fuzz/Target.h"
 #include "scene/Scene.h"
+#include "tests/support/GuardedMemory.h"
 
 namespace {
 
@@ -66,7 +66,7 @@ void Check(const scene::Scene& read, std::string_view text, const bake::Options&
 }  // namespace
 
 int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-  static fuzz::GuardedMemory memory;
+  static testsupport::GuardedMemory memory;
   const std::string_view text(memory.Hold(fuzz::TextOf(data, size), 0), size);
   diag::Collector diagnostics(text);
   const scene::Scene read = scene::Read(text, diagnostics);

@@ -9,13 +9,13 @@
 
 #include "check/Check.h"
 #include "fuzz/Bytes.h"
-#include "fuzz/GuardedMemory.h"
 #include "fuzz/MemoryFile.h"
 #include "fuzz/Require.h"
 #include "fuzz/Target.h"
 #include "refhost/Host.h"
 #include "refhost/ModuleLoader.h"
 #include "tests/check/StopContradictions.h"
+#include "tests/support/GuardedMemory.h"
 #include "text/JsonWriter.h"
 #include "tools/mayascene/CheckJson.h"
 #include "tools/mayascene/CheckText.h"
@@ -86,7 +86,7 @@ void CheckOutputs(const mayascene::CheckedScene& scene, std::size_t size) {
 
 int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   static fuzz::MemoryFile file;
-  static fuzz::GuardedMemory memory;
+  static testsupport::GuardedMemory memory;
   const std::string_view text(memory.Hold(fuzz::TextOf(data, size), 0), size);
   file.Write(text);
   const check::CameOver cameOver = Import(file.path());

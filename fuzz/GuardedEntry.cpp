@@ -4,9 +4,9 @@
 #include <cstring>
 #include <string_view>
 
-#include "fuzz/GuardedMemory.h"
 #include "hostapi/ErrorCodes.h"
 #include "hostapi/MemorySuite.h"
+#include "tests/support/GuardedMemory.h"
 
 namespace fuzz {
 namespace {
@@ -29,7 +29,7 @@ HostError NewMemHandle(std::int32_t pluginId, const char* name, std::int64_t siz
 HostError FreeMemHandle(HostMemHandle* handle) { return hostMemory->FreeMemHandle(handle); }
 
 HostError LockMemHandle(HostMemHandle* handle, void** address) {
-  static GuardedMemory memory;
+  static testsupport::GuardedMemory memory;
   const HostError code = hostMemory->LockMemHandle(handle, address);
   if (code != HOST_ERR_NONE || *address == nullptr) return code;
   *address = memory.Take(blockSize);

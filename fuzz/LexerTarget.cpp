@@ -4,13 +4,13 @@
 #include <vector>
 
 #include "fuzz/Bytes.h"
-#include "fuzz/GuardedMemory.h"
 #include "fuzz/ReaderHost.h"
 #include "fuzz/Require.h"
 #include "fuzz/Target.h"
 #include "hostapi/ErrorCodes.h"
 #include "maya/MAYA_Lex.h"
 #include "scan/SkipText.h"
+#include "tests/support/GuardedMemory.h"
 
 namespace {
 
@@ -105,7 +105,7 @@ void Read(const Text& text, Where where, scan::SkipText skip, std::vector<Event>
 }  // namespace
 
 int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-  static fuzz::GuardedMemory memory;
+  static testsupport::GuardedMemory memory;
   static std::vector<Event> plain;
   static std::vector<Event> skipped;
   const char* const begin = memory.Hold(fuzz::TextOf(data, size), 1);

@@ -8,12 +8,12 @@
 
 #include "diag/Collector.h"
 #include "fuzz/Bytes.h"
-#include "fuzz/GuardedMemory.h"
 #include "fuzz/Require.h"
 #include "fuzz/Target.h"
 #include "motion/Evaluator.h"
 #include "motion/KeptBelow.h"
 #include "scene/Scene.h"
+#include "tests/support/GuardedMemory.h"
 
 namespace {
 
@@ -60,7 +60,7 @@ std::uint64_t Digest(const motion::Evaluator& evaluator, const Asked& asked) {
 }  // namespace
 
 int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-  static fuzz::GuardedMemory memory;
+  static testsupport::GuardedMemory memory;
   const std::string_view text(memory.Hold(fuzz::TextOf(data, size), 0), size);
   diag::Collector diagnostics(text);
   const scene::Scene read = scene::Read(text, diagnostics);

@@ -8,11 +8,11 @@
 #include <string_view>
 
 #include "fuzz/Bytes.h"
-#include "fuzz/GuardedMemory.h"
 #include "fuzz/Require.h"
 #include "fuzz/Target.h"
 #include "hostapi/ErrorCodes.h"
 #include "hostutil/HostNumbers.h"
+#include "tests/support/GuardedMemory.h"
 
 namespace {
 
@@ -67,7 +67,7 @@ Scanned Expected(std::string_view text) {
   return {HOST_ERR_NONE, value};
 }
 
-void CheckScan(fuzz::GuardedMemory& memory, std::string_view text) {
+void CheckScan(testsupport::GuardedMemory& memory, std::string_view text) {
   constexpr double kUntouched = -123.25;
   double value = kUntouched;
   const HostError code = HostNumberScan(memory.Hold(text, 0), static_cast<std::int64_t>(text.size()), &value);
@@ -89,7 +89,7 @@ void CheckTruncation(double value) {
 
 // Each number that was taken stands in the text, has the value that the scanner gives it alone, and is
 // followed by white space or the terminator.
-void CheckRun(fuzz::GuardedMemory& memory, std::string_view text, char terminator) {
+void CheckRun(testsupport::GuardedMemory& memory, std::string_view text, char terminator) {
   constexpr std::int64_t kCapacity = 16;
   double numbers[kCapacity];
   const char* const begin = memory.Hold(text, 1);
@@ -129,7 +129,7 @@ void CheckRatios(fuzz::Bytes bytes) {
 }  // namespace
 
 int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-  static fuzz::GuardedMemory memory;
+  static testsupport::GuardedMemory memory;
   const std::string_view text = fuzz::TextOf(data, size);
   CheckScan(memory, text);
   CheckScan(memory, text.substr(0, text.find_first_of(" ;\n")));

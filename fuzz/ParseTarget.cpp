@@ -6,12 +6,12 @@
 #include <string_view>
 
 #include "fuzz/Bytes.h"
-#include "fuzz/GuardedMemory.h"
 #include "fuzz/ReaderHost.h"
 #include "fuzz/Require.h"
 #include "fuzz/Target.h"
 #include "hostapi/ErrorCodes.h"
 #include "maya/MAYA_Parse.h"
+#include "tests/support/GuardedMemory.h"
 
 namespace {
 
@@ -109,7 +109,7 @@ void CheckScene(const MAYA_Parse& scene) {
 }  // namespace
 
 int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-  static fuzz::GuardedMemory memory;
+  static testsupport::GuardedMemory memory;
   const char* const text = memory.Hold(fuzz::TextOf(data, size), 1);
   const fuzz::ReaderHost host;
   MAYA_Parse scene(host.basicSuite(), text, text + size);

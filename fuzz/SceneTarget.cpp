@@ -7,12 +7,12 @@
 
 #include "diag/Collector.h"
 #include "fuzz/Bytes.h"
-#include "fuzz/GuardedMemory.h"
 #include "fuzz/Require.h"
 #include "fuzz/Target.h"
 #include "scene/Scene.h"
 #include "scene/Settings.h"
 #include "tests/scene/CheckedScene.h"
+#include "tests/support/GuardedMemory.h"
 
 namespace {
 
@@ -36,7 +36,7 @@ bool HasLastNode(const scene::Scene& read) {
 }  // namespace
 
 int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-  static fuzz::GuardedMemory memory;
+  static testsupport::GuardedMemory memory;
   const std::string_view text(memory.Hold(fuzz::TextOf(data, size), 0), size);
   diag::Collector diagnostics(text);
   const scene::Scene read = scene::Read(text, diagnostics);

@@ -7,7 +7,6 @@
 #include <vector>
 
 #include "fuzz/Bytes.h"
-#include "fuzz/GuardedMemory.h"
 #include "fuzz/Lines.h"
 #include "fuzz/MemoryFile.h"
 #include "fuzz/Require.h"
@@ -16,6 +15,7 @@
 #include "hostutil/HostSetup.h"
 #include "hostutil/HostStrings.h"
 #include "refhost/Translations.h"
+#include "tests/support/GuardedMemory.h"
 
 namespace {
 
@@ -61,7 +61,7 @@ std::string Formatted(std::string_view pattern, std::string_view first, std::str
 
 // Into a buffer that ends at a forbidden page. What does not fit is refused, not cut off.
 void CheckFormat(const std::string& pattern, const std::string& first, const std::string& second) {
-  static fuzz::GuardedMemory memory;
+  static testsupport::GuardedMemory memory;
   constexpr std::size_t kCapacity = 96;
   char* const buffer = memory.Take(kCapacity);
   std::memset(buffer, '?', kCapacity);

@@ -1,16 +1,14 @@
 #include "bench/WordCount.h"
 
 #include <gtest/gtest.h>
-#include <sys/mman.h>
-#include <unistd.h>
 
 #include <algorithm>
-#include <cstdlib>
-#include <new>
 #include <random>
 #include <sstream>
 #include <string>
 #include <string_view>
+
+#include "tests/support/GuardedMemory.h"
 
 namespace bench {
 namespace {
@@ -60,32 +58,12 @@ TEST(WordCountTest, EveryCounterAgreesWithTheLibrary) {
   }
 }
 
-// A page between two that nobody may read.
-class LonePage {
- public:
-  LonePage() : size_(static_cast<std::size_t>(sysconf(_SC_PAGESIZE))) {
-    region_ = mmap(nullptr, 3 * size_, PROT_NONE, MAP_PRIVATE | MAP_ANONYMOUS, -1, 0);
-    if (region_ == MAP_FAILED) throw std::bad_alloc();
-    if (mprotect(begin(), size_, PROT_READ | PROT_WRITE) != 0) std::abort();
-  }
-  ~LonePage() { munmap(region_, 3 * size_); }
-  LonePage(const LonePage&) = delete;
-  LonePage& operator=(const LonePage&) = delete;
-
-  char* begin() const { return static_cast<char*>(region_) + size_; }
-  char* end() const { return begin() + size_; }
-
- private:
-  std::size_t size_;
-  void* region_ = nullptr;
-};
-
 TEST(WordCountTest, NothingIsReadBesideTheText) {
-  const LonePage page;
-  std::fill(page.begin(), page.end(), 'a');
+  testsupport::GuardedMemory memory;
   for (std::size_t size = 1; size < 200; ++size) {
-    ExpectWords({page.begin(), size}, 1);
-    ExpectWords({page.end() - size, size}, 1);
+    const std::string word(size, 'a');
+    ExpectWords({memory.PutFirst(word) - size, size}, 1);
+    ExpectWords({memory.Hold(word, 0), size}, 1);
   }
 }
 

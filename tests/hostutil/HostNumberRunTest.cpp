@@ -10,7 +10,7 @@
 
 #include "UtilityTest.h"
 #include "hostutil/HostNumbers.h"
-#include "tests/support/GuardedText.h"
+#include "tests/support/GuardedMemory.h"
 
 namespace hostutil_tests {
 namespace {

@@ -2,17 +2,13 @@
 #include "maya/ConnectionScout.h"
 
 #include <gtest/gtest.h>
-#include <sys/mman.h>
-#include <unistd.h>
 
-#include <cstdlib>
-#include <cstring>
 #include <string>
 #include <string_view>
 
 #include "maya/SceneRecords.h"
 #include "tests/scan/HostileTexts.h"
-#include "tests/scan/TextRoom.h"
+#include "tests/support/GuardedMemory.h"
 
 namespace testsupport {
 namespace {
@@ -37,9 +33,16 @@ class ConnectionScoutTest : public ::testing::Test {
     }
   }
 
+  // Looks ahead in a text of which no more than this beginning may be read.
+  void LookAheadAtMost(std::string_view beginning) {
+    const char* const text = room_.Hold(beginning, 0);
+    ConnectionScout().LookAhead(text, text + beginning.size() + GuardedMemory::kForbiddenAfter - 1, curves_,
+                                transforms_);
+  }
+
   NameIndex curves_;
   NameIndex transforms_;
-  TextRoom room_;
+  GuardedMemory room_;
 };
 
 TEST_F(ConnectionScoutTest, ACommandCutAtAnyByteIsReadNoFurther) {
@@ -76,32 +79,6 @@ TEST_F(ConnectionScoutTest, RandomHostileTextsAreReadNoFurtherThanTheirEnd) {
   }
 }
 
-// A text whose middle may not be read. Only a reader that keeps its bound never gets there.
-class Chasm {
- public:
-  explicit Chasm(std::string_view before) {
-    const auto page = static_cast<std::size_t>(sysconf(_SC_PAGESIZE));
-    size_ = 3 * page;
-    void* const region = mmap(nullptr, size_, PROT_READ | PROT_WRITE, MAP_PRIVATE | MAP_ANONYMOUS, -1, 0);
-    if (region == MAP_FAILED) std::abort();
-    begin_ = static_cast<char*>(region);
-    text_ = begin_ + page - before.size();
-    std::memcpy(text_, before.data(), before.size());
-    if (mprotect(begin_ + page, page, PROT_NONE) != 0) std::abort();
-  }
-  ~Chasm() { munmap(begin_, size_); }
-  Chasm(const Chasm&) = delete;
-  Chasm& operator=(const Chasm&) = delete;
-
-  const char* text() const { return text_; }
-  const char* end() const { return begin_ + size_ - 1; }
-
- private:
-  std::size_t size_ = 0;
-  char* begin_ = nullptr;
-  char* text_ = nullptr;
-};
-
 TEST_F(ConnectionScoutTest, OneCommandIsLookedForInTwoThousandBytesHoweverLongTheTextIs) {
   constexpr std::size_t kBound = 2100;
   for (const std::string& head :
@@ -110,8 +87,7 @@ TEST_F(ConnectionScoutTest, OneCommandIsLookedForInTwoThousandBytesHoweverLongTh
     for (const char fill : {' ', 'n', ';'}) {
       std::string text = head;
       text.resize(kBound, fill);
-      const Chasm chasm(text);
-      ConnectionScout().LookAhead(chasm.text(), chasm.end(), curves_, transforms_);
+      LookAheadAtMost(text);
     }
   }
 }
@@ -119,8 +95,7 @@ TEST_F(ConnectionScoutTest, OneCommandIsLookedForInTwoThousandBytesHoweverLongTh
 TEST_F(ConnectionScoutTest, NoMoreThanEightCommandsAreLookedAtAhead) {
   std::string text = "\n";
   for (int i = 0; i < 8; ++i) text += kCommand;
-  const Chasm chasm(text + std::string(1, 'c'));
-  ConnectionScout().LookAhead(chasm.text(), chasm.end(), curves_, transforms_);
+  LookAheadAtMost(text + 'c');
 }
 
 }  // namespace

@@ -7,7 +7,7 @@
 #include <string>
 #include <string_view>
 
-#include "tests/support/GuardedText.h"
+#include "tests/support/GuardedMemory.h"
 
 namespace testsupport {
 namespace {

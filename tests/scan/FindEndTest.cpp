@@ -8,7 +8,7 @@
 #include <string_view>
 
 #include "tests/scan/HostileTexts.h"
-#include "tests/scan/TextRoom.h"
+#include "tests/support/GuardedMemory.h"
 
 namespace testsupport {
 namespace {
@@ -37,7 +37,7 @@ class FindEndTest : public ::testing::Test {
     }
   }
 
-  TextRoom room_;
+  GuardedMemory room_;
 };
 
 TEST_F(FindEndTest, EveryPairOfNeighboursIsDistinguished) {

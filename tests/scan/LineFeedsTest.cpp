@@ -4,7 +4,7 @@
 
 #include <string_view>
 
-#include "tests/scan/TextRoom.h"
+#include "tests/support/GuardedMemory.h"
 
 namespace scan_tests {
 namespace {
@@ -30,7 +30,7 @@ TEST(LineFeedsTest, OnesOutsideAreNotCounted) {
 }
 
 TEST(LineFeedsTest, NothingAfterTheEndIsRead) {
-  testsupport::TextRoom room;
+  testsupport::GuardedMemory room;
   const char* const end = room.Put("1\n2\n", 0) + 1;  // the page after it may not be touched
   EXPECT_EQ(scan::CountLineFeeds(end - 5, end), 2);
 }

@@ -9,7 +9,7 @@
 #include <vector>
 
 #include "scan/Decimal.h"
-#include "tests/scan/TextRoom.h"
+#include "tests/support/GuardedMemory.h"
 
 namespace scan_tests {
 namespace {
@@ -35,7 +35,7 @@ class PlainNumberTest : public testing::Test {
     }
   }
 
-  testsupport::TextRoom room_;
+  testsupport::GuardedMemory room_;
 };
 
 using Values = std::vector<double>;

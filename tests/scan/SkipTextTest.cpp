@@ -5,7 +5,7 @@
 
 #include "tests/maya/RichScene.h"
 #include "tests/scan/HostileTexts.h"
-#include "tests/scan/TextRoom.h"
+#include "tests/support/GuardedMemory.h"
 #include "tests/support/ReaderFixture.h"
 #include "tests/support/WideTests.h"
 
@@ -95,7 +95,7 @@ class SkipTextTest : public ReaderTest {
     }
   }
 
-  TextRoom room_;
+  GuardedMemory room_;
   Seen plain_;
   Seen skipped_;
   std::int64_t bytesSkipped_ = 0;

@@ -11,7 +11,7 @@
 
 #include "diag/Collector.h"
 #include "scene/Scene.h"
-#include "tests/support/GuardedText.h"
+#include "tests/support/GuardedMemory.h"
 
 namespace scene {
 

@@ -13,7 +13,7 @@
 
 #include "maya/MAYA_Parse.h"
 #include "tests/support/FakeHost.h"
-#include "tests/support/GuardedText.h"
+#include "tests/support/GuardedMemory.h"
 #include "tests/support/Ledger.h"
 
 namespace testsupport {
