@@ -127,7 +127,11 @@ void RunRules(const CameOver& cameOver, const Options& options, const scene::Sce
   const std::vector<Camera> cameras = FindCameras(scene, cameOver);
   const motion::Measures measures = motion::MeasuresOf(scene);
   *head = ReadHead({scene, settings, measures, cameOver, cameras, collector->lines(), options.all});
-  const std::vector<Link> links = FindLinks(scene, cameras);
+  // Without a camera no locator comes over either, and one diagnostic says so.
+  const bool anyLayer = !cameOver.layers.empty() || cameOver.stop != Stop::None;
+  const std::vector<scene::NodeId> locators =
+      anyLayer ? FindMarkedLocators(scene) : std::vector<scene::NodeId>();
+  const std::vector<Link> links = FindLinks(scene, cameras, locators);
   Channels channels(scene);
   std::set<std::uint64_t> driversSaid;
   const Subject subject{.scene = scene,
@@ -135,6 +139,7 @@ void RunRules(const CameOver& cameOver, const Options& options, const scene::Sce
                         .measures = measures,
                         .cameOver = cameOver,
                         .cameras = cameras,
+                        .locators = locators,
                         .links = links,
                         .channels = channels,
                         .diagnostics = *collector,

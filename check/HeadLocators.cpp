@@ -1,6 +1,6 @@
 // The marked locators in the head, and the layers that the import made of them.
 #include "check/HeadInternal.h"
-#include "scene/SpecialNames.h"
+#include "check/Links.h"
 
 namespace check {
 namespace {
@@ -26,11 +26,8 @@ void DescribeLocators(const HeadSource& source, Head* head) {
   const scene::Scene& scene = source.scene;
   const std::vector<const CameOverLayer*> nulls = LowestNulls(source.cameOver);
   auto null = nulls.begin();
-  for (scene::NodeId id = 0; id < scene.nodes().size(); ++id) {
-    const scene::Node& node = scene.node(id);
-    if (node.origin != scene::Origin::Created || !SameName(node.type, "locator")) continue;
-    const std::string_view name = ImportName(scene, node);
-    if (!scene::IsMarked(name)) continue;
+  for (const scene::NodeId id : FindMarkedLocators(scene)) {
+    const std::string_view name = ImportName(scene, scene.node(id));
     const CameOverLayer* const layer = null != nulls.end() && (*null)->name == name ? *null++ : nullptr;
     AddOrCount(source, &head->locators, &head->locatorsNotShown, [&] {
       ShapeHead locator;

@@ -92,7 +92,7 @@ class Infinities {
 
 void ReportInfinities(const Subject& subject, const motion::FrameEnds& frames) {
   const Infinities rule(subject, frames);
-  for (const Link& link : subject.links) rule.Report(link.node, subject.channels.KeyedOf(link.node));
+  for (const Link& link : subject.links) rule.Report(link.node, KeyedOf(subject, link));
   for (const Camera& camera : subject.cameras) {
     if (camera.taken) rule.Report(camera.shape, subject.channels.LensOf(camera.shape));
   }

@@ -1,8 +1,8 @@
 #include "check/LookAts.h"
 
 #include <algorithm>
-
-#include "check/Cameras.h"
+#include <unordered_map>
+#include <unordered_set>
 
 namespace check {
 namespace {
@@ -18,6 +18,39 @@ std::string_view WrittenAttribute(const scene::Scene& scene, const diag::Range& 
   return dot == std::string_view::npos ? std::string_view() : text.substr(dot + 1);
 }
 
+LookAt WiringOf(const scene::Scene& scene, scene::NodeId lookAt,
+                const std::unordered_map<scene::NodeId, const Camera*>& cameraOf) {
+  LookAt wiring{.node = lookAt};
+  for (const scene::Connection* const connection : scene.ConnectionsFrom(lookAt)) {
+    if (!connection->destination.attribute.starts_with("rotate")) continue;
+    wiring.turned = connection->destination.node;
+    const auto camera = cameraOf.find(wiring.turned);
+    if (camera != cameraOf.end()) wiring.camera = camera->second;
+    break;
+  }
+  return wiring;
+}
+
+// The node that the importer takes for the target: the last one of a transform's type that is connected.
+scene::NodeId TargetOf(const scene::Scene& scene, scene::NodeId lookAt) {
+  scene::NodeId target = scene::kNoNode;
+  for (const scene::Connection* const connection : TargetsOf(scene, lookAt)) {
+    if (IsImportedTransform(scene.node(connection->source.node).type)) target = connection->source.node;
+  }
+  return target;
+}
+
+// By transform, the first camera under it that came over; without any, the first.
+std::unordered_map<scene::NodeId, const Camera*> CamerasByTransform(const std::vector<Camera>& cameras) {
+  std::unordered_map<scene::NodeId, const Camera*> cameraOf;
+  for (const Camera& camera : cameras) {
+    const Camera*& kept = cameraOf.try_emplace(camera.transform, &camera).first->second;
+    if (kept->layer == nullptr) kept = &camera;
+  }
+  cameraOf.erase(scene::kNoNode);
+  return cameraOf;
+}
+
 }  // namespace
 
 bool IsLookAt(std::string_view type) { return SameName(type, "lookAt") || SameName(type, "aimConstraint"); }
@@ -31,6 +64,27 @@ std::vector<const scene::Connection*> TargetsOf(const scene::Scene& scene, scene
     return one->destinationPlace.offset < other->destinationPlace.offset;
   });
   return targets;
+}
+
+std::vector<LookAt> FindLookAts(const scene::Scene& scene, const std::vector<Camera>& cameras) {
+  const auto cameraOf = CamerasByTransform(cameras);
+  std::vector<LookAt> lookAts;
+  for (scene::NodeId id = 0; id < scene.nodes().size(); ++id) {
+    const scene::Node& node = scene.node(id);
+    if (node.origin == scene::Origin::Created && IsLookAt(node.type))
+      lookAts.push_back(WiringOf(scene, id, cameraOf));
+  }
+  std::stable_partition(lookAts.begin(), lookAts.end(),
+                        [](const LookAt& one) { return one.camera != nullptr; });
+  // Where several turn one camera, the first that has a target aims it.
+  std::unordered_set<const Camera*> aimed;
+  for (LookAt& one : lookAts) {
+    const bool mayAim = one.camera != nullptr && one.camera->layer != nullptr && one.camera->layer->aimed &&
+                        !aimed.contains(one.camera);
+    if (mayAim) one.target = TargetOf(scene, one.node);
+    if (one.target != scene::kNoNode) aimed.insert(one.camera);
+  }
+  return lookAts;
 }
 
 }  // namespace check

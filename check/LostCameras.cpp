@@ -59,6 +59,14 @@ void ReportCameras(const Subject& subject) {
   subject.diagnostics.Report(Code::StartupCameras, firstStartup->place, {std::to_string(startup)});
 }
 
+// Nothing comes over, which no other rule says.
+void ReportNoCamera(const Subject& subject) {
+  const std::vector<NodeId> locators = FindMarkedLocators(subject.scene);
+  if (locators.empty()) return subject.diagnostics.Report(Code::NoCameraToImport, {});
+  subject.diagnostics.Report(Code::LocatorsWithoutCamera, subject.scene.node(locators.front()).place,
+                             {std::to_string(locators.size())});
+}
+
 void ReportLocators(const Subject& subject) {
   std::size_t unmarked = 0;
   const scene::Node* first = nullptr;
@@ -77,6 +85,7 @@ void ReportLocators(const Subject& subject) {
 void ReportLostCameras(const Subject& subject) {
   ReportCameras(subject);
   ReportLocators(subject);
+  if (subject.cameOver.stop == Stop::None && subject.cameOver.layers.empty()) ReportNoCamera(subject);
 }
 
 }  // namespace check

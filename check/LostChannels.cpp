@@ -74,6 +74,7 @@ void ReportDrivers(const Subject& subject, const Link& link) {
     }
     // Of a camera's look-at its own rule says what became of it.
     if (link.own && link.ofCamera && IsLookAt(type) && channel.starts_with("rotate")) continue;
+    if (link.target && !channel.starts_with("translate")) continue;
     KeepAsSaid(subject, driver);
     Driven& driven = drivers.try_emplace(driver.plug.node, Driven{{}, place}).first->second;
     Add(channel, &driven.channels);
@@ -91,7 +92,7 @@ void ReportDrivers(const Subject& subject, const Link& link) {
 void ReportOneKey(const Subject& subject, const Link& link) {
   std::string channels;
   diag::Range place;
-  for (const KeyedChannel& keyed : subject.channels.KeyedOf(link.node)) {
+  for (const KeyedChannel& keyed : KeyedOf(subject, link)) {
     if (keyed.keys > 1) return;
     const double stored = subject.scene.Number(link.node, keyed.channel).value_or(0.0);
     if (keyed.keys == 0 || std::fabs(stored - keyed.firstValue) <= 1e-9 * (1.0 + std::fabs(stored))) continue;

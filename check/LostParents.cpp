@@ -1,14 +1,19 @@
-// Nodes above a camera that the importer does not find.
+// Nodes above a camera, a marked locator or a target that the importer does not find or look at.
 #include <algorithm>
+#include <array>
 #include <string>
+#include <string_view>
 
+#include "check/Difference.h"
 #include "check/RulesInternal.h"
+#include "check/Times.h"
 
 namespace check {
 namespace {
 
 using diag::Code;
 using diag::Range;
+using scene::NodeId;
 
 // What stands in quotes after "-p" in the command that created the node; empty where it is not found.
 Range WrittenParent(std::string_view text, const scene::Node& node) {
@@ -62,13 +67,48 @@ void ReportParent(const Subject& subject, const scene::Node& node) {
   }
 }
 
+// Whether the file says anything of where the transform stands.
+bool IsPlaced(const Subject& subject, NodeId node) {
+  constexpr std::array<std::string_view, 6> kFromZero = {"translateX", "translateY", "translateZ",
+                                                         "rotateX",    "rotateY",    "rotateZ"};
+  constexpr std::array<std::string_view, 3> kFromOne = {"scaleX", "scaleY", "scaleZ"};
+  const auto from = [&](double neutral) {
+    return [&subject, node, neutral](std::string_view one) {
+      return DifferenceFrom(subject, node, one, neutral).has_value();
+    };
+  };
+  return std::any_of(kFromZero.begin(), kFromZero.end(), from(0.0)) ||
+         std::any_of(kFromOne.begin(), kFromOne.end(), from(1.0));
+}
+
+// The import aims at a target's translation, whatever stands above the target.
+void ReportTarget(const Subject& subject, const Link& link) {
+  const scene::Scene& scene = subject.scene;
+  std::size_t length = 0;
+  for (NodeId id = scene.node(link.node).parent; id != scene::kNoNode && ++length <= kLongestChain;
+       id = scene.node(id).parent) {
+    const bool elsewhere = scene.node(id).origin != scene::Origin::Created;
+    if (!elsewhere && !IsPlaced(subject, id)) continue;
+    const scene::Node& target = scene.node(link.node);
+    return subject.diagnostics.Report(Code::TargetLosesItsChain, target.place,
+                                      {target.name, scene.node(link.shape).name, scene.node(id).name});
+  }
+}
+
 }  // namespace
 
 void ReportLostParents(const Subject& subject) {
   for (const Camera& camera : subject.cameras) {
     if (camera.taken) ReportParent(subject, subject.scene.node(camera.shape));
   }
-  for (const Link& link : subject.links) ReportParent(subject, subject.scene.node(link.node));
+  for (const NodeId locator : subject.locators) ReportParent(subject, subject.scene.node(locator));
+  for (const Link& link : subject.links) {
+    if (link.target) {
+      ReportTarget(subject, link);
+    } else {
+      ReportParent(subject, subject.scene.node(link.node));
+    }
+  }
 }
 
 }  // namespace check

@@ -26,6 +26,7 @@ struct Subject {
   const motion::Measures& measures;
   const CameOver& cameOver;
   const std::vector<Camera>& cameras;
+  const std::vector<scene::NodeId>& locators;  // the marked ones, where any layer comes over
   const std::vector<Link>& links;
   Channels& channels;
   diag::Collector& diagnostics;
@@ -33,6 +34,9 @@ struct Subject {
   // what the evaluation says of the same connection is said, too.
   std::set<std::uint64_t>* driversSaid;
 };
+
+// The curves of the channels that the import takes of the link's node: of a target those of its translation.
+std::span<const KeyedChannel> KeyedOf(const Subject& subject, const Link& link);  // Links.cpp
 
 // ---- why the import stopped, and where ----
 

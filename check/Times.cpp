@@ -149,17 +149,37 @@ std::vector<NodeKeys> ChainKeys(const Subject& subject, const Camera& camera) {
   return chain;
 }
 
-void ReportStarts(const Subject& subject, const Camera& camera) {
-  const std::vector<NodeKeys> chain = ChainKeys(subject, camera);
-  if (chain.empty()) return;
+const NodeKeys* Earliest(const std::vector<NodeKeys>& chain) {
   const auto earliest = std::min_element(
       chain.begin(), chain.end(), [](const NodeKeys& a, const NodeKeys& b) { return a.first < b.first; });
-  for (const NodeKeys& one : chain) {
-    if (one.first - earliest->first < 1e-3) continue;
-    subject.diagnostics.Report(
-        Code::KeysStartApart, one.channels.front().place,
-        {subject.scene.node(one.node).name, text::RoundedNumber(one.first),
-         subject.scene.node(earliest->node).name, text::RoundedNumber(earliest->first)});
+  return earliest == chain.end() ? nullptr : &*earliest;
+}
+
+void ReportStart(const Subject& subject, const NodeKeys& one, const NodeKeys& other) {
+  if (std::fabs(one.first - other.first) < 1e-3) return;
+  subject.diagnostics.Report(Code::KeysStartApart, one.channels.front().place,
+                             {subject.scene.node(one.node).name, text::RoundedNumber(one.first),
+                              subject.scene.node(other.node).name, text::RoundedNumber(other.first)});
+}
+
+// Each node of a camera's chain begins with the earliest of them. What stands above locators, and what a
+// camera looks at, begins with the first camera that is keyed; without one with the first of themselves.
+void ReportStarts(const Subject& subject) {
+  std::optional<NodeKeys> lead;
+  for (const Camera& camera : subject.cameras) {
+    if (!camera.taken) continue;
+    const std::vector<NodeKeys> chain = ChainKeys(subject, camera);
+    const NodeKeys* const earliest = Earliest(chain);
+    if (earliest == nullptr) continue;
+    for (const NodeKeys& one : chain) ReportStart(subject, one, *earliest);
+    if (!lead) lead = *earliest;
+  }
+  for (const Link& link : subject.links) {
+    if (link.ofCamera) continue;
+    const auto keys = KeysOf(link.node, KeyedOf(subject, link), 2);
+    if (!keys) continue;
+    if (!lead) lead = *keys;
+    ReportStart(subject, *keys, *lead);
   }
 }
 
@@ -188,15 +208,14 @@ std::optional<double> FirstKey(const Subject& subject, const Camera& camera) {
 
 void ReportTimes(const Subject& subject) {
   for (const Link& link : subject.links) {
-    if (const auto keys = KeysOf(link.node, subject.channels.KeyedOf(link.node), 2))
-      ReportKeys(subject, *keys);
+    if (const auto keys = KeysOf(link.node, KeyedOf(subject, link), 2)) ReportKeys(subject, *keys);
   }
   for (const Camera& camera : subject.cameras) {
     if (!camera.taken) continue;
     if (const auto keys = KeysOf(camera.shape, subject.channels.LensOf(camera.shape), 1))
       ReportKeys(subject, *keys);
-    if (CountsFrames(subject.scene)) ReportStarts(subject, camera);
   }
+  if (CountsFrames(subject.scene)) ReportStarts(subject);
 }
 
 }  // namespace check

@@ -118,7 +118,9 @@ class TransformRules {
 }  // namespace
 
 void ReportTransforms(const Subject& subject) {
-  for (const Link& link : subject.links) TransformRules(subject, link).Report();
+  for (const Link& link : subject.links) {
+    if (!link.target) TransformRules(subject, link).Report();
+  }
 }
 
 }  // namespace check

@@ -119,6 +119,9 @@ enum class Code : std::uint16_t {
   AttributesWithoutPlace = 814,
   OrthographicAsPerspective = 815,
   ParentElsewhere = 816,
+  LocatorsWithoutCamera = 821,
+  NoCameraToImport = 822,
+  TargetLosesItsChain = 823,
   // Where the picture differs: diag/PictureCodes.cpp
   PictureShifts = 901,
   KeysAreNoBake = 902,

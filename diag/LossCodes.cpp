@@ -45,9 +45,9 @@ constexpr Entry kLossCodes[] = {
      .symbol = "ParentNotImported",
      .sentence =
          "\"{0}\" loses its place: the import does not take its parent \"{1}\", a node of the type {2}",
-     .meaning =
-         "A node above the camera is of a type that the importer does not know, such as a joint. The camera "
-         "comes over as if that node stood at the origin.",
+     .meaning = "A node above the camera or the marked locator is of a type that the importer does not know, "
+                "such as "
+                "a joint. The camera or locator comes over as if that node stood at the origin.",
      .example = "createNode joint -n \"arm\";\ncreateNode transform -n \"shotCam\" -p \"arm\";\n"
                 "createNode camera -n \"shotCamShape\" -p \"shotCam\";",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
@@ -173,12 +173,48 @@ constexpr Entry kLossCodes[] = {
      .severity = Severity::Warning,
      .symbol = "ParentElsewhere",
      .sentence = "\"{0}\" loses its place: its parent \"{1}\" is not in this file{2}",
-     .meaning = "A node above the camera stands in a referenced file, or in no known file. The camera "
-                "comes over as if that node stood at the origin. A bake cannot read the other file either.",
+     .meaning =
+         "A node above the camera or the marked locator stands in a referenced file, or in none that is "
+         "known. The camera or locator comes over as if that node stood at the origin. A bake cannot read "
+         "the other file either.",
      .example = "file -r -ns \"rig\" -rfn \"rigRN\" \"rig.ma\";\ncreateNode transform -n \"shotCam\" -p "
                 "\"rig:root\";\ncreateNode camera -n \"shotCamShape\" -p \"shotCam\";",
      .help = "Import the reference into the scene before the export, or export the camera together with "
              "everything above it."},
+    {.code = Code::LocatorsWithoutCamera,
+     .severity = Severity::Warning,
+     .symbol = "LocatorsWithoutCamera",
+     .sentence = "the marked locators do not come over: {0}, and no camera with them",
+     .meaning =
+         "The importer makes null layers of marked locators beside a camera layer. Without a camera that it "
+         "takes it makes no composition.",
+     .example = "createNode transform -n \"mark\";\ncreateNode locator -n \"mark_nullShape\" -p \"mark\";",
+     .help = "Export the locators together with the camera of the shot."},
+    {.code = Code::NoCameraToImport,
+     .severity = Severity::Note,
+     .symbol = "NoCameraToImport",
+     .sentence = "nothing comes over: the scene has no camera that the import takes",
+     .meaning =
+         "A composition is made for a camera. The file creates none, or none of a kind that comes over.",
+     .example = "createNode transform -n \"group\";",
+     .help = "Choose the file that the camera of the shot is in. Cameras of references stand in files of "
+             "their own."},
+    {.code = Code::TargetLosesItsChain,
+     .severity = Severity::Warning,
+     .symbol = "TargetLosesItsChain",
+     .sentence = "\"{0}\", which \"{1}\" looks at, loses the place of what it stands under: \"{2}\"",
+     .meaning =
+         "The importer aims a camera at the translation of the target alone. What stands above the target "
+         "has no effect, so the camera looks at another point.",
+     .example =
+         "createNode transform -n \"rig\";\n  setAttr \".t\" -type \"double3\" 0 10 0 ;\n"
+         "createNode transform -n \"aim\" -p \"rig\";\n"
+         "createNode transform -n \"shotCam\";\ncreateNode camera -n \"shotCamShape\" -p \"shotCam\";\n"
+         "createNode lookAt -n \"look\";\n"
+         "connectAttr \"look.constraintRotate\" \"shotCam.rotate\";\n"
+         "connectAttr \"shotCam.translate\" \"look.constraintTranslate\";\n"
+         "connectAttr \"aim.translate\" \"look.target[0].targetTranslate\";",
+     .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
 };
 
 }  // namespace

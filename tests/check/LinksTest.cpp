@@ -1,0 +1,102 @@
+// What cameras look at and marked locators stand under has diagnostics of its own.
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include "tests/check/CheckedText.h"
+
+namespace check_test {
+namespace {
+
+using diag::Code;
+using testing::AllOf;
+using testing::HasSubstr;
+
+std::string Transform(const std::string& name, const std::string& parent, const std::string& rest) {
+  return "createNode transform -n \"" + name + (parent.empty() ? "" : "\" -p \"" + parent) + "\";\n" + rest;
+}
+
+// "shotCam" looks at "aim", which the caller makes.
+std::string AimedScene(const std::string& aim) {
+  return CameraScene("\tsetAttr \".t\" -type \"double3\" 0 0 10 ;\n", "",
+                     aim +
+                         "createNode lookAt -n \"look\";\n\tsetAttr \".a\" -type \"double3\" 0 0 -1 ;\n"
+                         "connectAttr \"look.constraintRotate\" \"shotCam.rotate\";\n"
+                         "connectAttr \"shotCam.translate\" \"look.constraintTranslate\";\n"
+                         "connectAttr \"aim.translate\" \"look.target[0].targetTranslate\";\n");
+}
+
+TEST(LinksTest, ATargetThatComesOverAsItIsGetsNoWarning) {
+  const Checked checked(AimedScene(Transform("aim", "", "\tsetAttr \".t\" -type \"double3\" 1 2 3 ;\n")));
+  ASSERT_EQ(checked.cameOver().layers.size(), 1u);
+  EXPECT_TRUE(checked.cameOver().layers.front().aimed);
+  EXPECT_EQ(checked.All(), "");
+}
+
+TEST(LinksTest, ATargetUnderAMovedNodeLosesIt) {
+  const Checked checked(AimedScene(Transform("still", "", "") +
+                                   Transform("rig", "still", "\tsetAttr \".t\" -type \"double3\" 0 7 0 ;\n") +
+                                   Transform("aim", "rig", "")));
+  EXPECT_THAT(checked.SentenceOf(Code::TargetLosesItsChain),
+              AllOf(HasSubstr("\"aim\""), HasSubstr("\"shotCamShape\""), HasSubstr("\"rig\"")));
+  const Checked unmoved(AimedScene(Transform("rig", "", "") + Transform("aim", "rig", "")));
+  EXPECT_EQ(unmoved.CountOf(Code::TargetLosesItsChain), 0u);
+}
+
+TEST(LinksTest, WhatMovesATargetIsLookedAtAsWhatMovesACamera) {
+  const std::string aim = Transform("aim", "", "");
+  const Checked one(AimedScene(aim + CurveOf("aimX", "5 3", "aim.tx")));
+  EXPECT_THAT(one.SentenceOf(Code::ChannelsOfOneKey), HasSubstr("\"aim\""));
+  const Checked curved(AimedScene(aim + CurveOf("aimX", "1 0 65 100", "aim.tx", "animCurveTL", 3)));
+  EXPECT_THAT(curved.SentenceOf(Code::KeysAreNoBake), HasSubstr("\"aim\""));
+  const Checked driven(AimedScene(aim + "createNode multiplyDivide -n \"half\";\n"
+                                        "connectAttr \"half.ox\" \"aim.tx\";\n"));
+  EXPECT_THAT(driven.SentenceOf(Code::DrivenByNoCurve), AllOf(HasSubstr("\"aim\""), HasSubstr("\"half\"")));
+  // The importer takes the translation of a target alone.
+  const Checked turned(AimedScene(aim + CurveOf("aimR", "5 30", "aim.rx", "animCurveTA")));
+  EXPECT_EQ(turned.CountOf(Code::ChannelsOfOneKey), 0u);
+}
+
+TEST(LinksTest, ALocatorUnderANodeThatIsNotTakenLosesItsPlace) {
+  const std::string locator =
+      "createNode joint -n \"hand\";\n\tsetAttr \".t\" -type \"double3\" 1 2 3 ;\n"
+      "createNode locator -n \"hand_null\" -p \"hand\";\n";
+  const Checked joint(CameraScene("", "", locator));
+  EXPECT_THAT(joint.SentenceOf(Code::ParentNotImported),
+              AllOf(HasSubstr("\"hand_null\""), HasSubstr("\"hand\""), HasSubstr("joint")));
+  const Checked path(
+      CameraScene("", "", Transform("rig", "", "") + "createNode locator -n \"rig_null\" -p \"|rig\";\n"));
+  EXPECT_EQ(path.MarkedBy(Code::ParentIsPath), "|rig");
+}
+
+TEST(LinksTest, WithoutACameraNothingComesOverAndOneDiagnosticSaysSo) {
+  const std::string locators = Transform("a", "", "") +
+                               "createNode locator -n \"a_null\" -p \"a\";\n"
+                               "createNode joint -n \"b\";\n"
+                               "createNode locator -n \"b_null\" -p \"b\";\n";
+  const Checked marked(kHead + kResolution + locators);
+  EXPECT_THAT(marked.SentenceOf(Code::LocatorsWithoutCamera), HasSubstr(": 2, "));
+  EXPECT_EQ(marked.MarkedBy(Code::LocatorsWithoutCamera), "a_null");
+  EXPECT_EQ(marked.CountOf(Code::ParentNotImported), 0u);
+  const Checked empty(kHead + kResolution + Transform("a", "", ""));
+  EXPECT_EQ(empty.CountOf(Code::NoCameraToImport), 1u);
+  EXPECT_EQ(empty.report().warnings, 0u);
+  const Checked some(CameraScene("", "", locators));
+  EXPECT_EQ(some.CountOf(Code::LocatorsWithoutCamera) + some.CountOf(Code::NoCameraToImport), 0u);
+}
+
+TEST(LinksTest, LocatorsAndTargetsThatStartApartFromTheCameraAreNamed) {
+  const std::string moving = CurveOf("camX", "10 0 11 5", "shotCam.tx");
+  const std::string locator = Transform("mark", "", "") +
+                              "createNode locator -n \"mark_null\" -p \"mark\";\n" +
+                              CurveOf("markX", "4 0 5 2", "mark.tx");
+  const Checked late(CameraScene("", "", moving + locator));
+  EXPECT_THAT(late.SentenceOf(Code::KeysStartApart),
+              AllOf(HasSubstr("\"mark\" begins at frame 4"), HasSubstr("\"shotCam\" at frame 10")));
+  const Checked aim(AimedScene(Transform("aim", "", "") + CurveOf("aimX", "6 0 7 2", "aim.tx") + moving));
+  EXPECT_THAT(aim.SentenceOf(Code::KeysStartApart), HasSubstr("\"aim\" begins at frame 6"));
+  const Checked together(CameraScene("", "", CurveOf("camX", "4 0 5 5", "shotCam.tx") + locator));
+  EXPECT_EQ(together.CountOf(Code::KeysStartApart), 0u);
+}
+
+}  // namespace
+}  // namespace check_test
