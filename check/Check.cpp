@@ -147,8 +147,9 @@ void RunRules(const CameOver& cameOver, const Options& options, const scene::Sce
   ReportNodeNotes(subject, notes);
   if (cameOver.stop == Stop::UnequalKeys) ReportKeyCounts(subject);
   for (const auto rule :
-       {ReportLostCameras, ReportLostParents, ReportLostChannels, ReportLostLookAts, ReportNames,
-        ReportLenses, ReportTransforms, ReportTimes, ReportPicture, ReportShifts}) {
+       {ReportLostCameras, ReportLostParents, ReportLostChannels, ReportLostLookAts, ReportStoredValues,
+        ReportNames, ReportLenses, ReportTransforms, ReportChannelValues, ReportTimes, ReportKeysAtOneTime,
+        ReportPicture, ReportShifts}) {
     rule(subject);
   }
 }

@@ -15,8 +15,12 @@ constexpr std::array<std::string_view, 1> kFocalLength = {"focalLength"};
 // Nearer to a whole frame no composition can say it: its times are thousandths of a frame.
 constexpr double kWholeFrame = 1e-3;
 
+// Keys that lie further apart than this cannot land on one time of the composition.
+constexpr double kApart = 2.5e-3;
+
 void TakeInTime(double time, double unitsPerFrame, KeyedChannel* channel) {
   const double frame = time / unitsPerFrame;
+  if (channel->keys != 0 && !(time - channel->last > kApart)) channel->crowded = true;
   if (channel->keys == 0) channel->first = time;
   const double step = frame - channel->last / unitsPerFrame;
   if (channel->keys != 0 && std::fabs(step - 1.0) > kWholeFrame) channel->whole = false;

@@ -21,6 +21,7 @@ struct KeyedChannel {
   bool whole = true;        // a key at every frame from the first to the last
   bool fractional = false;  // a key lies at a fraction of a frame
   double fraction = 0.0;    // the first that does, in frames
+  bool crowded = false;     // keys may land on one time of the composition: they lie close, or go back
   diag::Range place;        // of the first keys
 };
 

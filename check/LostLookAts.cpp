@@ -18,20 +18,26 @@ const scene::Connection* LastTarget(const scene::Scene& scene, NodeId lookAt) {
   return targets.empty() ? nullptr : targets.back();
 }
 
-void ReportLookAt(const Subject& subject, NodeId lookAt, const Camera& camera) {
+// The camera does not turn as the look-at has it. That a bake finds no answer for the look-at either is then
+// no news.
+void Say(const Subject& subject, Code code, const diag::Range& place, NodeId lookAt, const Camera& camera) {
   const scene::Scene& scene = subject.scene;
-  const scene::Node& node = scene.node(lookAt);
-  const std::string_view shown = scene.node(camera.shape).name;
-  const scene::Connection* const target = LastTarget(scene, lookAt);
+  subject.diagnostics.Report(code, place, {scene.node(lookAt).name, scene.node(camera.shape).name});
+  if (subject.driversSaid == nullptr) return;
+  for (const scene::Connection* const connection : scene.ConnectionsInto(camera.transform)) {
+    if (connection->source.node == lookAt) subject.driversSaid->insert(connection->destinationPlace.offset);
+  }
+}
+
+void ReportLookAt(const Subject& subject, NodeId lookAt, const Camera& camera) {
+  const scene::Connection* const target = LastTarget(subject.scene, lookAt);
   if (camera.layer != nullptr && camera.layer->aimed) {
-    if (target != nullptr && target->source.node == lookAt) {
-      subject.diagnostics.Report(Code::LookAtWeightLast, target->destinationPlace, {node.name, shown});
-    }
+    if (target != nullptr && target->source.node == lookAt)
+      Say(subject, Code::LookAtWeightLast, target->destinationPlace, lookAt, camera);
     return;
   }
-  if (target == nullptr)
-    return subject.diagnostics.Report(Code::LookAtShortNames, node.place, {node.name, shown});
-  subject.diagnostics.Report(Code::LookAtNotTaken, node.place, {node.name, shown});
+  const Code code = target == nullptr ? Code::LookAtShortNames : Code::LookAtNotTaken;
+  Say(subject, code, subject.scene.node(lookAt).place, lookAt, camera);
 }
 
 // The look-ats that turn the transform, each once.

@@ -62,15 +62,18 @@ void ReportLostCameras(const Subject& subject);   // LostCameras.cpp
 void ReportLostParents(const Subject& subject);   // LostParents.cpp
 void ReportLostChannels(const Subject& subject);  // LostChannels.cpp
 void ReportLostLookAts(const Subject& subject);   // LostLookAts.cpp
+void ReportStoredValues(const Subject& subject);  // StoredValues.cpp
 void ReportNames(const Subject& subject);         // Names.cpp
 
 // ---- where the picture differs ----
 
-void ReportLenses(const Subject& subject);      // Lenses.cpp
-void ReportTransforms(const Subject& subject);  // Transforms.cpp
-void ReportTimes(const Subject& subject);       // Times.cpp
-void ReportPicture(const Subject& subject);     // PictureSize.cpp
-void ReportShifts(const Subject& subject);      // PictureShift.cpp
+void ReportLenses(const Subject& subject);         // Lenses.cpp
+void ReportTransforms(const Subject& subject);     // Transforms.cpp
+void ReportChannelValues(const Subject& subject);  // ChannelValues.cpp
+void ReportTimes(const Subject& subject);          // Times.cpp
+void ReportKeysAtOneTime(const Subject& subject);  // KeysAtOneTime.cpp
+void ReportPicture(const Subject& subject);        // PictureSize.cpp
+void ReportShifts(const Subject& subject);         // PictureShift.cpp
 
 // Curves that go on outside their keys, within the frames: Infinities.cpp.
 void ReportInfinities(const Subject& subject, const motion::FrameEnds& frames);

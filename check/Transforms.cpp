@@ -1,9 +1,11 @@
 // What of a transform the importer does not take.
 #include <algorithm>
 #include <array>
+#include <cmath>
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 #include "check/Difference.h"
 #include "check/RulesInternal.h"
@@ -21,6 +23,8 @@ constexpr std::array<std::string_view, 3> kShear = {"shearXY", "shearXZ", "shear
 constexpr std::array<std::string_view, 6> kPivotTranslations = {
     "rotatePivotTranslateX", "rotatePivotTranslateY", "rotatePivotTranslateZ",
     "scalePivotTranslateX",  "scalePivotTranslateY",  "scalePivotTranslateZ"};
+constexpr std::array<std::string_view, 3> kRotatePivot = {"rotatePivotX", "rotatePivotY", "rotatePivotZ"};
+constexpr std::array<std::string_view, 3> kScalePivot = {"scalePivotX", "scalePivotY", "scalePivotZ"};
 constexpr std::array<std::string_view, 3> kScale = {"scaleX", "scaleY", "scaleZ"};
 
 class TransformRules {
@@ -32,6 +36,8 @@ class TransformRules {
     if (touched.order) ReportOrder();
     if (touched.rotateAxis) ReportFirst(Code::RotateAxisLost, kRotateAxis, 0.0);
     if (touched.shear) ReportFirst(Code::ShearLost, kShear, 0.0);
+    if (touched.offsetMatrix) ReportOffsetMatrix();
+    if (touched.pivots) ReportAimedPivot();
     if (touched.pivotTranslations) ReportFirst(Code::PivotTranslationLost, kPivotTranslations, 0.0);
     if (touched.inheritance) ReportInheritance();
     if (touched.scale) ReportScale();
@@ -47,6 +53,8 @@ class TransformRules {
     bool rotateAxis = false;
     bool shear = false;
     bool pivotTranslations = false;
+    bool pivots = false;
+    bool offsetMatrix = false;
     bool inheritance = false;
     bool scale = false;
   };
@@ -58,6 +66,8 @@ class TransformRules {
       touched.rotateAxis |= attribute.starts_with("rotateAxis");
       touched.shear |= attribute.starts_with("shear");
       touched.pivotTranslations |= attribute.find("PivotTranslate") != std::string_view::npos;
+      touched.pivots |= attribute.starts_with("rotatePivot") || attribute.starts_with("scalePivot");
+      touched.offsetMatrix |= attribute == "offsetParentMatrix";
       touched.inheritance |= attribute == "inheritsTransform";
       touched.scale |= attribute.starts_with("scale");
     });
@@ -95,6 +105,38 @@ class TransformRules {
     }
     if (std::is_sorted(turns.begin(), turns.end())) return;
     subject_.diagnostics.Report(Code::RotateOrderLost, written->range(), {name(), order});
+  }
+
+  void ReportOffsetMatrix() {
+    constexpr std::size_t kNumbers = 16;
+    if (const auto driver = scene().SourceOf(scene().PlugOf(link_.node, "offsetParentMatrix"))) {
+      return subject_.diagnostics.Report(Code::OffsetMatrixLost, driver->connection->destinationPlace,
+                                         {name()});
+    }
+    const auto written = scene().Written(link_.node, "offsetParentMatrix");
+    if (!written) return;
+    const std::vector<double> numbers = written->Numbers(kNumbers);
+    for (std::size_t i = 0; i < numbers.size(); ++i) {
+      const double neutral = i % 5 == 0 ? 1.0 : 0.0;  // the diagonal of four rows
+      if (std::fabs(numbers[i] - neutral) <= 1e-9) continue;
+      return subject_.diagnostics.Report(Code::OffsetMatrixLost, written->range(), {name()});
+    }
+  }
+
+  // A pivot of the scale matters where there is one.
+  void ReportAimedPivot() {
+    if (!link_.own || !link_.ofCamera || !IsAimed()) return;
+    auto place = FirstOf(kRotatePivot, 0.0);
+    if (!place && FirstOf(kScale, 1.0)) place = FirstOf(kScalePivot, 0.0);
+    if (place) subject_.diagnostics.Report(Code::AimedPivotLost, *place, {name()});
+  }
+
+  bool IsAimed() const {
+    const auto& cameras = subject_.cameras;  // in the order of their shapes
+    const auto camera = std::lower_bound(cameras.begin(), cameras.end(), link_.shape,
+                                         [](const Camera& one, NodeId shape) { return one.shape < shape; });
+    const bool found = camera != cameras.end() && camera->shape == link_.shape;
+    return found && camera->layer != nullptr && camera->layer->aimed;
   }
 
   void ReportInheritance() {

@@ -181,6 +181,18 @@ constexpr Entry kLossCodes[] = {
                 "\"rig:root\";\ncreateNode camera -n \"shotCamShape\" -p \"shotCam\";",
      .help = "Import the reference into the scene before the export, or export the camera together with "
              "everything above it."},
+    {.code = Code::StoredValueSkipped,
+     .severity = Severity::Warning,
+     .symbol = "StoredValueSkipped",
+     .sentence = "\"{0}\" gets {1} for {2}, not {3}: the import does not read a setAttr that {4}",
+     .meaning =
+         "The importer reads the values of a node from the commands that follow its createNode, and of those "
+         "only the ones that begin with a name it knows: .t, .r, .s, .rp and .sp of a transform; .cap, .fl "
+         "and .ff of a camera, before which one option with its value may stand. It reads no part of them "
+         "(.tx, .hfa), no command that begins with an option otherwise, and none that names its node or "
+         "follows a select. The node then has the value that was read last, or the importer's default.",
+     .example = "createNode transform -n \"shotCam\";\n  setAttr -l on \".t\" -type \"double3\" 1 2 3 ;",
+     .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
     {.code = Code::LocatorsWithoutCamera,
      .severity = Severity::Warning,
      .symbol = "LocatorsWithoutCamera",

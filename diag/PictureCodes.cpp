@@ -239,6 +239,79 @@ constexpr Entry kPictureCodes[] = {
                 "connectAttr \"moveX.o\" \"shotCam.tx\";",
      .help = "Write the scene anew, with a key at every frame: mayascene bake SCENE -o OUT, or mayascene "
              "import --bake."},
+    {.code = Code::OffsetMatrixLost,
+     .severity = Severity::Warning,
+     .symbol = "OffsetMatrixLost",
+     .sentence = "the offset parent matrix of \"{0}\" is lost",
+     .meaning =
+         "The matrix moves, turns or scales the node once more, after its own channels. The importer does "
+         "not read it, nor what drives it.",
+     .example = "createNode transform -n \"shotCam\";\n"
+                "  setAttr \".opm\" -type \"matrix\" 1 0 0 0 0 1 0 0 0 0 1 0 9 0 0 1 ;",
+     .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
+    {.code = Code::LimitLost,
+     .severity = Severity::Warning,
+     .symbol = "LimitLost",
+     .sentence = "\"{0}\" goes past a limit: {1} comes over as {2}, where the scene holds it at {3}",
+     .meaning =
+         "A limit of a transform is switched on, and a value or a key lies outside it. The scene shows the "
+         "limit there. The importer does not read limits.",
+     .example = "createNode transform -n \"shotCam\";\n"
+                "  setAttr \".t\" -type \"double3\" 9 0 0 ;\n"
+                "  setAttr \".mxtl\" -type \"double3\" 4 1 1 ;\n"
+                "  setAttr \".xtxe\" yes;",
+     .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
+    {.code = Code::RadiansLost,
+     .severity = Severity::Warning,
+     .symbol = "RadiansLost",
+     .sentence = "\"{0}\" hardly turns: {1} is {2} in radians, and comes over as {3} degrees",
+     .meaning =
+         "The scene's unit of angle is the radian. The importer multiplies such an angle by 0.01745, where "
+         "57.3 makes degrees of it, so that next to nothing is left of a rotation. The diagnostic names "
+         "the first angle of the node; it holds for all.",
+     .example = "currentUnit -l centimeter -a radian -t film;\n"
+                "createNode transform -n \"shotCam\";\n"
+                "  setAttr \".r\" -type \"double3\" 0.5 0 0 ;",
+     .help =
+         "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake. Or set the unit of "
+         "angle to degrees, and export again."},
+    {.code = Code::KeysAtOneTime,
+     .severity = Severity::Warning,
+     .symbol = "KeysAtOneTime",
+     .sentence =
+         "\"{0}\" loses a key: those of \"{1}\" at {2} (line {3}) and {4} (line {5}) land on one time",
+     .meaning =
+         "A time of a composition is a whole number of thousandths of a frame. Of two keys that land on "
+         "the same time the later one in the file stays. All channels of the node lose that key.",
+     .example = "createNode animCurveTL -n \"moveX\";\n"
+                "  setAttr -s 3 \".ktv[0:2]\" 1 0 1.0002 5 24 10;\n"
+                "connectAttr \"moveX.o\" \"shotCam.tx\";",
+     .help =
+         "Take one of the two keys out. Or write the scene anew, with a key at every frame: mayascene bake "
+         "SCENE -o OUT, or mayascene import --bake."},
+    {.code = Code::AimedPivotLost,
+     .severity = Severity::Warning,
+     .symbol = "AimedPivotLost",
+     .sentence =
+         "\"{0}\" is aimed and has a pivot: the scene moves it about the pivot as it turns, the import "
+         "does not",
+     .meaning =
+         "A look-at turns the camera about its pivot, so that it moves as it turns. The importer finds "
+         "the place of the camera from the pivot and the rotation that is stored, and aims the layer from "
+         "there.",
+     .example = "createNode transform -n \"shotCam\";\n"
+                "  setAttr \".rp\" -type \"double3\" 0 0 5 ;\n"
+                "createNode camera -n \"shotCamShape\" -p \"shotCam\";\n"
+                "createNode transform -n \"point\";\n"
+                "  setAttr \".t\" -type \"double3\" 20 0 -20 ;\n"
+                "createNode aimConstraint -n \"aim\" -p \"shotCam\";\n"
+                "  setAttr \".a\" -type \"double3\" 0 0 -1 ;\n"
+                "connectAttr \"aim.constraintRotate\" \"shotCam.rotate\";\n"
+                "connectAttr \"shotCam.translate\" \"aim.constraintTranslate\";\n"
+                "connectAttr \"point.translate\" \"aim.target[0].targetTranslate\";",
+     .help =
+         "Write the scene anew, with a key at every frame: mayascene bake SCENE -o OUT, or mayascene import "
+         "--bake."},
 };
 
 }  // namespace

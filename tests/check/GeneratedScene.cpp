@@ -17,7 +17,8 @@ class Generator {
   explicit Generator(std::uint64_t seed) : random_(seed * 7919) {}
 
   std::string Run() {
-    text_ = "//Maya ASCII 2018 scene\ncurrentUnit -l centimeter -a degree -t " +
+    text_ = "//Maya ASCII 2018 scene\ncurrentUnit -l centimeter -a " +
+            std::string(Chance(8) ? "radian" : "degree") + " -t " +
             std::string(kUnits[Below(kUnits.size())]) + ";\n";
     const std::size_t cameras = 1 + Below(3);
     for (std::size_t i = 0; i < cameras; ++i) Camera(std::to_string(i));
@@ -33,14 +34,23 @@ class Generator {
     text_ += "createNode " + type + " -n \"" + name + "\";\n\tsetAttr \".tan\" 18;\n\tsetAttr -s " +
              std::to_string(keys) + " \".ktv[0:" + std::to_string(keys - 1) + "]\" ";
     const std::size_t step = 1 + Below(3);
-    for (std::size_t i = 0; i < keys; ++i) text_ += ' ' + std::to_string(1 + i * step) + ' ' + Number();
+    const bool close = Chance(12);
+    for (std::size_t i = 0; i < keys; ++i) {
+      const std::string time = close && i == 1 ? "1.0002" : std::to_string(1 + i * step);
+      text_ += ' ' + time + ' ' + Number();
+    }
     text_ += ";\nconnectAttr \"" + name + ".o\" \"" + plug + "\";\n";
   }
 
   void Place(const std::string& node) {
-    text_ += "\tsetAttr \".t\" -type \"double3\" " + Number() + ' ' + Number() + ' ' + Number() + " ;\n";
+    const char* const option = Chance(10) ? "-l on " : "";
+    text_ += std::string("\tsetAttr ") + option + "\".t\" -type \"double3\" " + Number() + ' ' + Number() +
+             ' ' + Number() + " ;\n";
     if (Chance(2)) text_ += "\tsetAttr \".ro\" " + std::to_string(Below(6)) + ";\n";
     if (Chance(4)) text_ += "\tsetAttr \".rp\" -type \"double3\" 0 " + Number() + " 0 ;\n";
+    if (Chance(10)) text_ += "\tsetAttr \".sy\" 2.5;\n";
+    if (Chance(10)) text_ += "\tsetAttr \".xtxe\" yes;\n";
+    if (Chance(10)) text_ += "\tsetAttr \".opm\" -type \"matrix\" 1 0 0 0 0 1 0 0 0 0 1 0 9 0 0 1 ;\n";
     moved_.push_back(node);
   }
 

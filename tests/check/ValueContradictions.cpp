@@ -144,23 +144,21 @@ std::string PlaceContradiction(const Author& author, const check::Report& report
     ++compared->channels;
     compared->keys += channel.stream.times.size();
     const std::string differ = KeysDiffer(author, report, channel.stream, keys);
-    if (!differ.empty() && !IsSaidOf(author, report, {node}, {Code::KeysAreNoBake}))
+    if (!differ.empty() && !IsSaidOf(author, report, {node}, {Code::KeysAreNoBake, Code::KeysAtOneTime}))
       return Unexplained(author, node, channel.name, differ);
   }
   if (!keys.together) return "";
   const bool driven = IsSaidOf(author, report, {node},
                                {Code::DrivenByNoCurve, Code::CurveThroughNode, Code::ChannelsOfOneKey});
   if (driven) return "";
-  // Angles in radians are taken for degrees of another scale: of a camera the shift says it.
-  const bool radians =
-      author.measures.radians == 1.0 && IsSaidOf(author, report, {shape}, {Code::PictureShifts});
   // About a pivot, another rotation is another position too.
   const bool turned =
-      radians || IsSaidOf(author, report, {node, shape},
-                          {Code::RotateOrderLost, Code::RotateAxisLost, Code::ShearLost,
-                           Code::LookAtShortNames, Code::LookAtNotTaken, Code::LookAtWeightLast});
-  const bool moved = turned || IsSaidOf(author, report, {node}, {Code::PivotTranslationLost}) ||
-                     (layer.aimed && IsSaidOf(author, report, {shape}, {Code::PictureShifts}));
+      IsSaidOf(author, report, {node, shape},
+               {Code::RadiansLost, Code::RotateOrderLost, Code::RotateAxisLost, Code::ShearLost,
+                Code::StoredValueSkipped, Code::OffsetMatrixLost, Code::LimitLost, Code::KeysAtOneTime,
+                Code::LookAtShortNames, Code::LookAtNotTaken, Code::LookAtWeightLast});
+  const bool moved =
+      turned || IsSaidOf(author, report, {node}, {Code::PivotTranslationLost, Code::AimedPivotLost});
   diag::Collector unreported(author.text);
   motion::Evaluator evaluator(author.scene, &unreported);
   const motion::MatrixId place = evaluator.InParent(node);
