@@ -12,8 +12,8 @@
 #include <vector>
 
 #include "refhost/Host.h"
+#include "tests/check/ChannelJudge.h"
 #include "tests/check/GeneratedScene.h"
-#include "tests/check/LayerContradictions.h"
 #include "tests/check/StopContradictions.h"
 #include "tests/support/LeftOut.h"
 #include "tests/support/SplitMix.h"
@@ -37,7 +37,8 @@ class Agreement {
 
   ~Agreement() {
     std::cout << compared_.scenes << " scenes, " << compared_.stops << " stops, " << compared_.layers
-              << " layers, " << compared_.channels << " channels, " << compared_.keys << " keys\n";
+              << " layers, " << compared_.channels << " channels, " << compared_.keys << " keys, "
+              << compared_.ambiguous << " layers of no certain node\n";
   }
   Agreement(const Agreement&) = delete;
   Agreement& operator=(const Agreement&) = delete;
@@ -53,7 +54,8 @@ class Agreement {
     compared_.stops += cameOver.stop == check::Stop::None ? 0 : 1;
     const std::string wrong = StopContradictionIn(cameOver, report, wellFormed);
     if (!wrong.empty() || !wellFormed || cameOver.stop != check::Stop::None) return wrong;
-    return LayerContradictionIn(text, cameOver, report, &compared_);
+    const PlainScene scene(text);
+    return ChannelJudge(scene, cameOver, report, &compared_).Run();
   }
 
  private:
