@@ -99,6 +99,15 @@ TEST(StopsTest, UnequalKeyCountsNameTheNodeTheCurvesAndTheirKeys) {
   EXPECT_EQ(checked.MarkedBy(Code::UnequalKeys), "1 0 3 90");
 }
 
+TEST(StopsTest, UnequalKeyCountsAreFoundAmongCurvesOfOneName) {
+  const std::string twins = "createNode transform -n \"shotCam\";\n" +
+                            CurveOf("turnY", "1 0 3 90 7 2 8 4", "shotCam.ry", "animCurveTA");
+  const Checked checked(CameraScene("", "", CurveOf("moveX", "1 0 2 5 3 9", "shotCam.tx") + twins));
+  EXPECT_EQ(checked.cameOver().stop, Stop::UnequalKeys);
+  EXPECT_EQ(checked.MarkedBy(Code::UnequalKeys), "1 0 3 90 7 2 8 4");
+  EXPECT_EQ(checked.CountOf(Code::ImportStopped), 0u);
+}
+
 TEST(StopsTest, WhatTheHostRefusesIsSaidWithItsSentence) {
   const Checked checked(CameraScene("", "\tsetAttr \".cap\" -type \"double2\" 0 0 ;\n"));
   EXPECT_EQ(checked.cameOver().stop, Stop::Other);
