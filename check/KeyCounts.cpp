@@ -17,7 +17,7 @@ struct Counted {
   std::string_view channel;
   NodeId curve = scene::kNoNode;
   std::size_t keys = 0;
-  diag::Range place;  // of the first keys
+  diag::Range place{};  // of the first keys
 };
 
 std::vector<Counted> CountKeys(const Subject& subject, NodeId node) {

@@ -8,6 +8,39 @@
 
 namespace check {
 
+diag::Range WrittenParent(std::string_view text, const scene::Node& node) {
+  constexpr std::size_t kLongestCommand = 4000;
+  constexpr std::string_view kOptions[] = {"-p \"", "-parent \""};
+  const auto name = static_cast<std::size_t>(node.place.offset);
+  const std::size_t earliest = name > kLongestCommand ? name - kLongestCommand : 0;
+  const std::size_t begin = text.substr(earliest, name - earliest).rfind("createNode");
+  if (begin == std::string_view::npos) return {};
+  const std::string_view rest = text.substr(earliest + begin, 2 * kLongestCommand);
+  const std::string_view command = rest.substr(0, std::min(rest.find(';'), rest.size()));
+  for (const std::string_view option : kOptions) {
+    const std::size_t at = command.find(option);
+    if (at == std::string_view::npos) continue;
+    const std::size_t start = at + option.size();
+    const std::size_t end = std::min(command.find('"', start), command.size());
+    return {earliest + begin + start, end - start};
+  }
+  return {};
+}
+
+bool IsFosterParent(const scene::Node& node) { return node.type == "fosterParent"; }
+
+ParentLoss ParentLossOf(const scene::Scene& scene, const scene::Node& node) {
+  if (node.parent == scene::kNoNode) return ParentLoss::None;
+  const diag::Range written = WrittenParent(scene.text(), node);
+  const auto begin = scene.text().begin() + static_cast<std::ptrdiff_t>(written.offset);
+  const bool path = std::find(begin, begin + static_cast<std::ptrdiff_t>(written.length), '|') !=
+                    begin + static_cast<std::ptrdiff_t>(written.length);
+  if (path) return ParentLoss::Path;
+  const scene::Node& parent = scene.node(node.parent);
+  if (parent.origin != scene::Origin::Created || IsFosterParent(parent)) return ParentLoss::Elsewhere;
+  return IsImportedTransform(parent.type) ? ParentLoss::None : ParentLoss::NotImported;
+}
+
 std::vector<scene::NodeId> FindMarkedLocators(const scene::Scene& scene) {
   std::vector<scene::NodeId> locators;
   for (scene::NodeId id = 0; id < scene.nodes().size(); ++id) {
@@ -23,13 +56,12 @@ std::vector<Link> FindLinks(const scene::Scene& scene, const std::vector<Camera>
   std::vector<Link> links;
   std::vector<bool> seen(scene.nodes().size(), false);
   const auto add = [&](scene::NodeId shape, bool camera) {
-    bool own = true;
-    for (scene::NodeId id = scene.node(shape).parent; id != scene::kNoNode && !seen[id];
-         id = scene.node(id).parent) {
+    for (scene::NodeId id = shape; ParentLossOf(scene, scene.node(id)) == ParentLoss::None;) {
+      const bool own = id == shape;
+      id = scene.node(id).parent;
+      if (id == scene::kNoNode || seen[id]) break;
       seen[id] = true;
-      if (scene.node(id).origin != scene::Origin::Created) break;
       links.push_back({.node = id, .shape = shape, .own = own, .ofCamera = camera});
-      own = false;
     }
   };
   for (const Camera& camera : cameras) {

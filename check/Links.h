@@ -1,6 +1,7 @@
 // The transforms that a camera, its aim or a marked locator depends on.
 #pragma once
 
+#include <string_view>
 #include <vector>
 
 #include "check/Cameras.h"
@@ -16,11 +17,27 @@ struct Link {
   bool target = false;                   // the camera looks at it; no more than its translation is taken
 };
 
+// Stands for a node of another file.
+bool IsFosterParent(const scene::Node& node);
+
+// Why the importer has no layer for what a node stands under.
+enum class ParentLoss {
+  None,         // it has one, or the node stands under nothing
+  Path,         // the file names the parent by a path
+  Elsewhere,    // the file does not create it
+  NotImported,  // it is no transform
+};
+
+ParentLoss ParentLossOf(const scene::Scene& scene, const scene::Node& node);
+
+// What stands in quotes after "-p" in the command that created the node; empty where it is not found.
+diag::Range WrittenParent(std::string_view text, const scene::Node& node);
+
 // The marked locators that the file creates, in its order.
 std::vector<scene::NodeId> FindMarkedLocators(const scene::Scene& scene);
 
 // Those of the cameras that the importer takes, of the locators, and what the cameras look at, each once:
-// from the shape's own upwards, of a target itself alone.
+// from the shape's own upwards, as far as the importer has layers, of a target itself alone.
 std::vector<Link> FindLinks(const scene::Scene& scene, const std::vector<Camera>& cameras,
                             const std::vector<scene::NodeId>& locators);
 

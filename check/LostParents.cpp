@@ -15,29 +15,6 @@ using diag::Code;
 using diag::Range;
 using scene::NodeId;
 
-// What stands in quotes after "-p" in the command that created the node; empty where it is not found.
-Range WrittenParent(std::string_view text, const scene::Node& node) {
-  constexpr std::size_t kLongestCommand = 4000;
-  constexpr std::string_view kOptions[] = {"-p \"", "-parent \""};
-  const auto name = static_cast<std::size_t>(node.place.offset);
-  const std::size_t earliest = name > kLongestCommand ? name - kLongestCommand : 0;
-  const std::size_t begin = text.substr(earliest, name - earliest).rfind("createNode");
-  if (begin == std::string_view::npos) return {};
-  const std::string_view rest = text.substr(earliest + begin, 2 * kLongestCommand);
-  const std::string_view command = rest.substr(0, std::min(rest.find(';'), rest.size()));
-  for (const std::string_view option : kOptions) {
-    const std::size_t at = command.find(option);
-    if (at == std::string_view::npos) continue;
-    const std::size_t start = at + option.size();
-    const std::size_t end = std::min(command.find('"', start), command.size());
-    return {earliest + begin + start, end - start};
-  }
-  return {};
-}
-
-// Stands for a node of another file.
-bool IsFosterParent(const scene::Node& node) { return node.type == "fosterParent"; }
-
 std::string WhereItIs(const scene::Scene& scene, const scene::Node& parent) {
   for (const scene::Reference& reference : scene.references()) {
     const std::string prefix = std::string(reference.nameSpace) + ':';
@@ -50,19 +27,20 @@ std::string WhereItIs(const scene::Scene& scene, const scene::Node& parent) {
 }
 
 void ReportParent(const Subject& subject, const scene::Node& node) {
-  if (node.parent == scene::kNoNode) return;
   const scene::Scene& scene = subject.scene;
+  const ParentLoss loss = ParentLossOf(scene, node);
+  if (loss == ParentLoss::None) return;
   const Range written = WrittenParent(scene.text(), node);
   const std::string_view path =
       scene.text().substr(static_cast<std::size_t>(written.offset), static_cast<std::size_t>(written.length));
   const scene::Node& parent = scene.node(node.parent);
   const Range place = written == Range{} ? node.place : written;
-  if (path.find('|') != std::string_view::npos) {
+  if (loss == ParentLoss::Path) {
     subject.diagnostics.Report(Code::ParentIsPath, place, {node.name, path});
-  } else if (parent.origin != scene::Origin::Created || IsFosterParent(parent)) {
+  } else if (loss == ParentLoss::Elsewhere) {
     subject.diagnostics.Report(Code::ParentElsewhere, place,
                                {node.name, parent.name, WhereItIs(scene, parent)});
-  } else if (!IsImportedTransform(parent.type)) {
+  } else {
     subject.diagnostics.Report(Code::ParentNotImported, place, {node.name, parent.name, parent.type});
   }
 }

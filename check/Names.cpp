@@ -6,6 +6,7 @@
 #include <deque>
 #include <string>
 #include <string_view>
+#include <unordered_set>
 #include <utility>
 #include <vector>
 
@@ -59,7 +60,21 @@ class NamesThatCount {
       if (camera.taken) addWithDrivers(camera.shape);
     }
     for (const Link& link : subject.links) addWithDrivers(link.node);
+    const auto addLostParent = [&](NodeId id) {
+      if (ParentLossOf(subject.scene, subject.scene.node(id)) == ParentLoss::None) return;
+      add(subject.scene.node(id).parent);
+      lostParents_.insert(subject.scene.node(id).parent);
+    };
+    for (const Camera& camera : subject.cameras) {
+      if (camera.taken) addLostParent(camera.shape);
+    }
+    for (const NodeId locator : subject.locators) addLostParent(locator);
+    for (const Link& link : subject.links) addLostParent(link.node);
   }
+
+  // A parent that does not come over counts too: the importer looks for its name, and can find another
+  // node's.
+  bool IsLostParent(NodeId id) const { return lostParents_.contains(id); }
 
   // Takes in a node of the list. The name of the one that had the name before it; empty where none had, and
   // where the name does not count.
@@ -93,6 +108,7 @@ class NamesThatCount {
   std::string lowered_;
   std::deque<std::string> names_;  // without case
   scene::FlatMap<std::uint32_t> numbers_;
+  std::unordered_set<NodeId> lostParents_;
   std::vector<std::array<std::string_view, kLists>> met_;  // by number and list, the first one of the file
 };
 
@@ -128,8 +144,9 @@ void ReportTextAfterNul(const Subject& subject) {
 
 void ReportNames(const Subject& subject) {
   NamesThatCount names(subject);
-  for (const scene::Node& node : subject.scene.nodes()) {
-    const List list = ListOf(node);
+  for (NodeId id = 0; id < subject.scene.nodes().size(); ++id) {
+    const scene::Node& node = subject.scene.node(id);
+    const List list = names.IsLostParent(id) ? List::Transforms : ListOf(node);
     if (list == List::None) continue;
     const std::string_view name = ImportName(subject.scene, node);
     if (name.empty()) {

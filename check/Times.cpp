@@ -137,13 +137,15 @@ void ReportKeys(const Subject& subject, const NodeKeys& keys) {
   if (bad != nullptr) say(Code::BeyondCompositionTime, *bad, bad->last);
 }
 
-// Everything that is keyed above the shape, and its lens.
-std::vector<NodeKeys> ChainKeys(const Subject& subject, const Camera& camera) {
+// Everything that is keyed above the shape, and its lens; or of that only what comes over.
+std::vector<NodeKeys> ChainKeys(const Subject& subject, const Camera& camera, bool whole) {
   std::vector<NodeKeys> chain;
   if (auto lens = KeysOf(camera.shape, subject.channels.LensOf(camera.shape), 1)) chain.push_back(*lens);
   std::size_t length = 0;
-  for (NodeId id = camera.transform; id != scene::kNoNode && ++length <= kLongestChain;
-       id = subject.scene.node(id).parent) {
+  NodeId id = camera.shape;
+  while (whole || ParentLossOf(subject.scene, subject.scene.node(id)) == ParentLoss::None) {
+    id = subject.scene.node(id).parent;
+    if (id == scene::kNoNode || ++length > kLongestChain) break;
     if (auto keys = KeysOf(id, subject.channels.KeyedOf(id), 2)) chain.push_back(*keys);
   }
   return chain;
@@ -168,7 +170,7 @@ void ReportStarts(const Subject& subject) {
   std::optional<NodeKeys> lead;
   for (const Camera& camera : subject.cameras) {
     if (!camera.taken) continue;
-    const std::vector<NodeKeys> chain = ChainKeys(subject, camera);
+    const std::vector<NodeKeys> chain = ChainKeys(subject, camera, false);
     const NodeKeys* const earliest = Earliest(chain);
     if (earliest == nullptr) continue;
     for (const NodeKeys& one : chain) ReportStart(subject, one, *earliest);
@@ -201,7 +203,7 @@ bool CountsFrames(const scene::Scene& scene) {
 
 std::optional<double> FirstKey(const Subject& subject, const Camera& camera) {
   std::optional<double> first;
-  for (const NodeKeys& keys : ChainKeys(subject, camera))
+  for (const NodeKeys& keys : ChainKeys(subject, camera, true))
     first = std::min(first.value_or(keys.first), keys.first);
   return first;
 }

@@ -9,8 +9,6 @@ using check::CameOverLayer;
 using check::LayerKind;
 using diag::Code;
 
-bool IsCamera(const PlainNode& node) { return node.type == "camera" || node.type == "stereoRigCamera"; }
-
 bool IsMarked(std::string_view name) {
   return name.find("null") != std::string_view::npos || name.find("Null") != std::string_view::npos ||
          name.find("NULL") != std::string_view::npos;
@@ -36,13 +34,20 @@ ChannelJudge::ChannelJudge(const PlainScene& scene, const check::CameOver& cameO
       cameOver_(cameOver),
       report_(report),
       compared_(*compared),
-      taken_(cameOver.layers.size(), false) {}
+      taken_(cameOver.layers.size(), false),
+      others_(StartOfCameras()) {}
+
+bool ChannelJudge::IsCamera(const PlainNode& node) {
+  return node.type == "camera" || node.type == "stereoRigCamera";
+}
 
 std::string ChannelJudge::Run() {
   for (const auto judge : {&ChannelJudge::JudgeCameras, &ChannelJudge::JudgeLocators}) {
     const std::string wrong = (this->*judge)();
     if (!wrong.empty()) return wrong;
   }
+  const bool scaled = !scene_.countsCentimeters();
+  if (scaled != SaysAnywhere({Code::OtherLengthUnit})) return "of the unit of length the wrong is said";
   return JudgeLeftOver();
 }
 
@@ -94,7 +99,7 @@ std::string ChannelJudge::JudgeCamera(int shape, const CameOverLayer& layer, con
   std::string wrong = head != nullptr ? JudgeHead(*head, layer, shape) : "";
   if (wrong.empty()) wrong = JudgeZoom(shape, layer, start);
   if (wrong.empty()) wrong = JudgeShapeAndChain(shape, place, layer.aimed);
-  if (wrong.empty() && transform != kNone) wrong = JudgeInterest(transform, shape, layer, start);
+  if (wrong.empty() && transform != kNone) wrong = JudgeInterest(transform, shape, layer);
   return wrong;
 }
 
@@ -114,7 +119,7 @@ std::string ChannelJudge::JudgeHead(const check::CameraHead& head, const CameOve
 // The shape's own transform is the layer; each transform above it is the null that is the parent of the one
 // before.
 std::string ChannelJudge::JudgeShapeAndChain(int shape, std::size_t layer, bool aimed) {
-  const Start start = StartOf(shape);
+  const bool ofCamera = IsCamera(scene_.node(shape));
   int below = shape;
   for (bool own = true;; own = false) {
     ++compared_.layers;
@@ -145,6 +150,7 @@ std::string ChannelJudge::JudgeShapeAndChain(int shape, std::size_t layer, bool 
         return child.name + " does not inherit, and nothing is said of it";
     }
     below = child.parent;
+    const Start start = ofCamera ? StartOf(shape) : StartOfOthers(FirstKeyOf(below));
     std::string wrong = JudgeMotion(below, shape, own && aimed, cameOver_.layers[layer], start);
     if (!wrong.empty()) return wrong;
   }
@@ -161,6 +167,7 @@ std::string ChannelJudge::JudgeLocators() {
     }
     const CameOverLayer* const layer = TakeNext(LayerKind::Null, node.name);
     if (layer == nullptr) {
+      if (cameOver_.layers.empty() && SaysAnywhere({Code::LocatorsWithoutCamera})) continue;
       if (!IsAmbiguous(id)) return "the locator " + node.name + " did not come over";
       continue;
     }

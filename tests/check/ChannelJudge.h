@@ -2,6 +2,7 @@
 // that names the node.
 #pragma once
 
+#include <array>
 #include <cstddef>
 #include <initializer_list>
 #include <optional>
@@ -47,13 +48,22 @@ class ChannelJudge {
  private:
   using Codes = std::initializer_list<diag::Code>;
 
-  // Where the time of a camera or locator begins, in the scene's unit; nothing where a node above it is
-  // ambiguous.
+  struct Channel {
+    const char* name;
+    const char* longName;
+    double neutral;
+  };
+  static const std::array<Channel, 9> kChannels;
+
+  // Where the time of a layer begins, in the scene's unit: infinite where nothing has keys, and nothing where
+  // a node that counts is ambiguous.
   using Start = std::optional<double>;
 
   // What one channel of a transform, or a focal length, comes from.
   struct Source {
     double stored = 0.0;
+    bool skipped = false;              // the report says that the scene stores another number
+    bool lost = false;                 // what drives it does not come over
     const PlainNode* curve = nullptr;  // that the import can follow
     std::size_t keys() const { return curve != nullptr ? curve->keys.size() / 2 : 0; }
     double time(std::size_t key) const { return curve->keys[2 * key]; }
@@ -62,10 +72,10 @@ class ChannelJudge {
 
   // A transform as the import can take it.
   struct Motion {
-    std::vector<Source> channels;  // translate, rotate, scale
-    std::size_t keys = 0;          // 0: it stands still
-    std::vector<double> times;     // of its keys, in the scene's unit
-    bool together = true;          // all of its curves have their keys at these times
+    std::vector<Source> channels;   // translate, rotate, scale
+    std::vector<std::size_t> keys;  // their numbers in the scene; none: it stands still
+    std::vector<double> times;      // of its keys, in the scene's unit
+    bool together = true;           // all of its curves have their keys at these times
   };
 
   // ---- what the report says: ChannelJudgeWords.cpp ----
@@ -75,9 +85,11 @@ class ChannelJudge {
   bool SaysAt(Codes codes, Bytes text) const;
   bool SaysAnywhere(Codes codes) const;
   bool SaysOfChannel(int node, std::string_view channel, std::string_view driver) const;
+  std::optional<double> NumberInstead(int node, const std::string& attribute) const;
   bool IsAmbiguous(int node) const;
 
   // ---- layers: ChannelJudge.cpp ----
+  static bool IsCamera(const PlainNode& node);
   std::string JudgeCameras();
   std::string JudgeCamera(int shape, const check::CameOverLayer& layer, const check::CameraHead* head);
   std::string JudgeLocators();
@@ -87,20 +99,25 @@ class ChannelJudge {
   std::string JudgeHead(const check::CameraHead& head, const check::CameOverLayer& layer, int shape) const;
 
   // ---- places: ChannelJudgeMotion.cpp ----
-  static bool AreTogether(const std::vector<Source>& channels, const std::vector<double>& times);
+  static bool AreTogether(const Motion& motion, std::size_t channels);
+  void TakeKeys(int node, double first, const Source& lead, Motion* motion) const;
   Source SourceOf(int node, const std::string& attribute, double neutral) const;
   std::string ReadMotion(int node, int shape, bool aimed, Motion* motion) const;
+  std::string JudgeDriver(int node, int shape, bool aimed, const Channel& channel) const;
+  std::string JudgeAim(int node, int shape, const Motion& motion) const;
   std::string JudgeMotion(int node, int shape, bool aimed, const check::CameOverLayer& layer, Start start);
   std::string JudgeTimes(int node, const Motion& motion, const check::CameOverStream& stream,
                          Start start) const;
-  PlainParts PartsAt(int node, int shape, const Motion& motion, std::optional<std::size_t> key) const;
+  PlainParts PartsAt(int node, const Motion& motion, std::optional<std::size_t> key) const;
   std::optional<double> FirstKeyOf(int node) const;
   Start StartOf(int shape) const;
+  Start StartOfCameras() const;
+  Start StartOfOthers(std::optional<double> first);
 
   // ---- zooms and points of interest: ChannelJudgeLens.cpp ----
   std::string JudgeZoom(int shape, const check::CameOverLayer& layer, Start start);
   double ZoomOfAnInch(int shape) const;
-  std::string JudgeInterest(int transform, int shape, const check::CameOverLayer& layer, Start start);
+  std::string JudgeInterest(int transform, int shape, const check::CameOverLayer& layer);
   static bool IsLookAt(const PlainNode& node);
   int LookAtOf(int transform) const;
   int TargetOf(int lookAt) const;
@@ -110,6 +127,7 @@ class ChannelJudge {
   const check::Report& report_;
   Compared& compared_;
   std::vector<bool> taken_;  // layers
+  Start others_;             // where locators and targets begin; infinite before one is known
 };
 
 }  // namespace check_test

@@ -22,20 +22,21 @@ std::string ChannelJudge::JudgeZoom(int shape, const CameOverLayer& layer, Start
   if (driver != nullptr && lens.curve == nullptr && !SaysAt({Code::ConnectionToPath}, driver->text) &&
       !SaysWith({Code::FocalLengthElsewhere}, {name}))
     return "nothing is said of what drives the focal length of " + name;
-  if (layer.zoom.times.size() != lens.keys())
-    return name + " has " + std::to_string(lens.keys()) + " zoom keys, " +
-           std::to_string(layer.zoom.times.size()) + " came over";
-  compared_.keys += lens.keys();
   Motion motion;
-  for (std::size_t key = 0; key < lens.keys(); ++key) motion.times.push_back(lens.time(key));
+  if (lens.keys() != 0) TakeKeys(shape, lens.time(0), lens, &motion);
+  const std::size_t keys = motion.keys.size();
+  if (layer.zoom.times.size() != keys)
+    return name + " has " + std::to_string(keys) + " zoom keys, " + std::to_string(layer.zoom.times.size()) +
+           " came over";
+  compared_.keys += keys;
   const std::string wrong = motion.times.empty() ? "" : JudgeTimes(shape, motion, layer.zoom, start);
   if (!wrong.empty()) return wrong;
   // The default aperture has five digits, and a pixel aspect is shown in thousandths.
   const double same = cameOver_.composition->pixelAspect == 1.0 ? 3e-5 : 1e-3;
   const double factor = ZoomOfAnInch(shape);
-  for (std::size_t key = 0; key < std::max<std::size_t>(lens.keys(), 1); ++key) {
-    const double wanted = (lens.keys() == 0 ? lens.stored : lens.value(key)) / 25.4 * factor;
-    const double came = lens.keys() == 0 ? layer.zoom.value[0] : layer.zoom.values[key];
+  for (std::size_t key = 0; key < std::max<std::size_t>(keys, 1); ++key) {
+    const double wanted = (keys == 0 ? lens.stored : lens.value(motion.keys[key])) / 25.4 * factor;
+    const double came = keys == 0 ? layer.zoom.value[0] : layer.zoom.values[key];
     if (!(std::fabs(came - wanted) <= same * std::fabs(wanted)))
       return name + " has the zoom " + std::to_string(came) + ", not " + std::to_string(wanted);
   }
@@ -77,7 +78,7 @@ int ChannelJudge::TargetOf(int lookAt) const {
   return target;
 }
 
-std::string ChannelJudge::JudgeInterest(int transform, int shape, const CameOverLayer& layer, Start start) {
+std::string ChannelJudge::JudgeInterest(int transform, int shape, const CameOverLayer& layer) {
   if (IsAmbiguous(shape) || IsAmbiguous(transform)) return "";
   const std::string& name = scene_.node(shape).name;
   const int lookAt = LookAtOf(transform);
@@ -90,15 +91,23 @@ std::string ChannelJudge::JudgeInterest(int transform, int shape, const CameOver
   std::string wrong = ReadMotion(target, kNone, false, &motion);
   if (!wrong.empty()) return wrong;
   ++compared_.channels;
-  compared_.keys += motion.keys;
-  if (layer.interest.times.size() != motion.keys)
-    return "what " + name + " is aimed at has " + std::to_string(motion.keys) + " keys, " +
+  const std::size_t keys = motion.keys.size();
+  compared_.keys += keys;
+  if (layer.interest.times.size() != keys)
+    return "what " + name + " is aimed at has " + std::to_string(keys) + " keys, " +
            std::to_string(layer.interest.times.size()) + " came over";
-  if (motion.keys != 0) wrong = JudgeTimes(target, motion, layer.interest, start);
+  const auto end = motion.channels.begin() + 3;
+  const auto isDriven = [](const Source& channel) { return channel.keys() != 0; };
+  const bool moves =
+      std::any_of(motion.channels.begin(), end, [](const Source& channel) { return channel.keys() > 1; });
+  if (moves) {
+    const double first = std::find_if(motion.channels.begin(), end, isDriven)->time(0);
+    wrong = JudgeTimes(target, motion, layer.interest, StartOfOthers(first));
+  }
   if (!wrong.empty()) return wrong;
-  for (std::size_t key = 0; key < std::max<std::size_t>(motion.keys, 1); ++key) {
-    const auto at = motion.keys == 0 ? std::nullopt : std::optional(key);
-    const Triple wanted = PartsAt(target, shape, motion, at).translate;
+  for (std::size_t key = 0; key < std::max<std::size_t>(keys, 1); ++key) {
+    const auto at = keys == 0 ? std::nullopt : std::optional(key);
+    const Triple wanted = PartsAt(target, motion, at).translate;
     const Triple came = StreamAt(layer.interest, at, 3);
     if (!(OriginsApart(Moved(wanted), Moved({came[0], -came[1], -came[2]})) <= kSamePlace))
       return name + " is aimed at another place than that of " + scene_.node(target).name;

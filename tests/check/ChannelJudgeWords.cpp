@@ -1,5 +1,7 @@
 // What the report says of a node.
 #include <algorithm>
+#include <cstdlib>
+#include <sstream>
 
 #include "tests/check/ChannelJudge.h"
 
@@ -67,6 +69,22 @@ bool ChannelJudge::SaysOfChannel(int node, std::string_view channel, std::string
     return IsOneOf(finding.diagnostic.code, {Code::DrivenByNoCurve, Code::CurveThroughNode}) &&
            words[0] == scene_.node(node).name && Lists(words[1], channel) && words[2] == driver;
   });
+}
+
+// The number that comes over in place of the one that is stored, where the report has one.
+std::optional<double> ChannelJudge::NumberInstead(int node, const std::string& attribute) const {
+  const std::string wanted = PlainScene::LongName(attribute);
+  for (const Finding& finding : report_.findings) {
+    const std::vector<std::string>& words = finding.diagnostic.arguments;
+    if (finding.diagnostic.code != Code::StoredValueSkipped || words[0] != scene_.node(node).name) continue;
+    std::istringstream numbers(words[1]);
+    std::istringstream components(words[2]);
+    std::string number;
+    for (std::string component; components >> component && numbers >> number;) {
+      if (component == wanted || component == wanted + ',') return std::strtod(number.c_str(), nullptr);
+    }
+  }
+  return std::nullopt;
 }
 
 // Which of several nodes a name means for the import is said, and no more.

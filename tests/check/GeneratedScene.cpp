@@ -16,29 +16,6 @@ constexpr std::array<std::string_view, 11> kRates = {"film", "pal",   "ntsc",  "
                                                      "show", "ntscf", "30fps", "23.976fps", "film"};
 constexpr std::array<std::string_view, 6> kLengths = {"centimeter", "centimeter", "m", "in", "cm", "mm"};
 
-// Forms that the report does not explain everywhere yet: one that is opened, with true, is generated, and
-// held like any other.
-struct Forms {
-  // The camera looks at a target that moves.
-  bool movingTargets = false;
-  // A chain above a locator has a node that does not come over, or a parent that is given as a path.
-  bool locatorsBelowLostNodes = false;
-  // A marked locator stands in a scene without a camera.
-  bool locatorsAlone = false;
-  // The nodes of one chain, or a lens, have their first keys at different frames.
-  bool chainsStartApart = false;
-  // The value of a channel stands after an option: setAttr -l on ".tx" 5.
-  bool lockedValues = false;
-  // The stored value of one axis stands alone: setAttr ".tx" 5.
-  bool oneAxisAlone = false;
-  // Angles are in radians.
-  bool radians = false;
-  // A curve has two keys at one time.
-  bool keysAtOneTime = false;
-};
-
-constexpr Forms kForms;
-
 class Generator {
  public:
   explicit Generator(std::uint64_t seed) : random_(seed * 7919) {}
@@ -47,8 +24,7 @@ class Generator {
     text_ = "//Maya ASCII 2018 scene\n";
     if (!Chance(20)) {
       text_ += "currentUnit -l " + std::string(kLengths[Below(kLengths.size())]) + " -a " +
-               (kForms.radians && Chance(8) ? "radian" : "degree") + " -t " +
-               std::string(kRates[Below(kRates.size())]) + ";\n";
+               (Chance(8) ? "radian" : "degree") + " -t " + std::string(kRates[Below(kRates.size())]) + ";\n";
     }
     if (Chance(2)) {
       text_ +=
@@ -56,7 +32,7 @@ class Generator {
           "createNode transform -s -n \"top\";\ncreateNode camera -s -n \"topShape\" -p \"top\";\n"
           "\tsetAttr \".o\" yes;\n";
     }
-    const std::size_t cameras = kForms.locatorsAlone && Chance(10) ? 0 : 1 + Below(3);
+    const std::size_t cameras = Chance(10) ? 0 : 1 + Below(3);
     for (std::size_t i = 0; i < cameras; ++i) Camera(std::to_string(i));
     const std::size_t locators = Below(3);
     for (std::size_t i = 0; i < locators; ++i) Locator(std::to_string(i));
@@ -94,8 +70,8 @@ class Generator {
   // What stands still of a transform.
   void Place(const std::string& node) {
     Set(Chance(5) ? ".translate" : ".t", Numbers());
-    if (kForms.oneAxisAlone && Chance(6)) text_ += "\tsetAttr \".tx\" " + Number() + ";\n";
-    if (kForms.lockedValues && Chance(6)) text_ += "\tsetAttr -l on \".ry\" " + Number() + ";\n";
+    if (Chance(6)) text_ += "\tsetAttr \".tx\" " + Number() + ";\n";
+    if (Chance(6)) text_ += "\tsetAttr -l on \".ry\" " + Number() + ";\n";
     if (Chance(2)) Set(".r", Numbers());
     if (Chance(5)) Set(".s", Factor() + ' ' + Factor() + ' ' + Factor());
     if (Chance(2)) text_ += "\tsetAttr \".ro\" " + std::to_string(Below(6)) + ";\n";
@@ -106,14 +82,16 @@ class Generator {
     if (Chance(16)) Set(".spt", "0 0 " + Number());
     if (Chance(16)) Set(".sh", Factor() + " 0 0");
     if (Chance(16)) text_ += "\tsetAttr \".it\" no;\n";
+    if (Chance(16)) text_ += "\tsetAttr \".opm\" -type \"matrix\" 1 0 0 0 0 1 0 0 0 0 1 0 9 0 0 1 ;\n";
+    if (Chance(16)) text_ += "\tsetAttr \".xtxe\" yes;\n\tsetAttr \".mxtx\" 20;\n";
     moved_.push_back(node);
   }
 
   // Curves, a conversion of a curve or a constraint, or nothing, for each channel.
   void Drive(const std::string& node, const std::string& path) {
     const std::size_t keys = 1 + Below(4);
-    const std::size_t first = kForms.chainsStartApart && Chance(3) ? Below(12) : first_;
-    const std::size_t step = kForms.keysAtOneTime && Chance(20) ? 0 : 1 + Below(3);
+    const std::size_t first = Chance(3) ? Below(12) : first_;
+    const std::size_t step = Chance(20) ? 0 : 1 + Below(3);
     for (std::size_t i = 0; i < kChannels.size(); ++i) {
       const std::string_view channel = kChannels[i];
       const std::string name = node + '_' + std::string(channel);
@@ -129,7 +107,7 @@ class Generator {
           Curve(name, keys + (Chance(60) ? 2 : 0), plug, type, first, Chance(15) ? step + 1 : step);
           break;
         case 3:
-          Curve(name, 1, plug, type, first + (kForms.chainsStartApart && Chance(4) ? 1 : 0), 1);
+          Curve(name, 1, plug, type, first + (Chance(4) ? 1 : 0), 1);
           break;
         case 4:
           text_ += "createNode unitConversion -n \"" + name + "_unit\";\n";
@@ -160,20 +138,19 @@ class Generator {
     if (longNames && Chance(3)) {
       text_ += "connectAttr \"" + aim + ".pointW0\" \"" + aim + ".target[0].targetWeight\";\n";
     }
-    if (kForms.movingTargets && Chance(2)) Drive(aim + "_point", '|' + aim + "_point");
+    if (Chance(2)) Drive(aim + "_point", '|' + aim + "_point");
   }
 
   // Transforms above each other; hands out the lowest, and *path to it. Now and then the importer finds one
   // of them not: a joint, or one that is given as a path.
-  std::string Chain(const std::string& prefix, std::size_t depth, bool losesNodes, std::string* path) {
+  std::string Chain(const std::string& prefix, std::size_t depth, std::string* path) {
     std::string above;
     for (std::size_t i = 0; i < depth; ++i) {
       // Now and then two names that differ in case alone.
       const std::string name =
           (Chance(60) ? "RIG" : "rig") + (Chance(60) ? "0" : prefix) + '_' + std::to_string(i);
-      text_ += "createNode " + std::string(losesNodes && Chance(20) ? "joint" : "transform") + " -n \"" +
-               name + '"' +
-               (above.empty() ? "" : " -p \"" + (losesNodes && Chance(20) ? *path : above) + '"') + ";\n";
+      text_ += "createNode " + std::string(Chance(20) ? "joint" : "transform") + " -n \"" + name + '"' +
+               (above.empty() ? "" : " -p \"" + (Chance(20) ? *path : above) + '"') + ";\n";
       *path += '|' + name;
       Place(name);
       above = name;
@@ -184,7 +161,7 @@ class Generator {
   void Camera(const std::string& number) {
     std::string path;
     first_ = 1 + Below(12);
-    const std::string above = Chain(number, Below(4), true, &path);
+    const std::string above = Chain(number, Below(4), &path);
     const std::string camera = "cam" + number;
     text_ +=
         "createNode transform -n \"" + camera + '"' + (above.empty() ? "" : " -p \"" + above + '"') + ";\n";
@@ -199,8 +176,8 @@ class Generator {
     if (Chance(12)) text_ += "\tsetAttr \".lsr\" 2;\n";
     if (Chance(12)) text_ += "\tsetAttr \".cs\" 1.5;\n";
     if (Chance(3))
-      Curve(camera + "_zoom", 1 + Below(4), camera + "Shape.fl", "animCurveTU",
-            first_ + (kForms.chainsStartApart ? Below(3) : 0), 1 + Below(3));
+      Curve(camera + "_zoom", 1 + Below(4), camera + "Shape.fl", "animCurveTU", first_ + Below(3),
+            1 + Below(3));
     DriveAll(camera);
     if (Chance(4)) LookAt(camera);
   }
@@ -218,7 +195,7 @@ class Generator {
   void Locator(const std::string& number) {
     std::string path;
     first_ = 1 + Below(12);
-    const std::string own = Chain("9" + number, 1 + Below(3), kForms.locatorsBelowLostNodes, &path);
+    const std::string own = Chain("9" + number, 1 + Below(3), &path);
     const std::string_view mark = Chance(2) ? "_null" : "";
     text_ += "createNode locator -n \"" + own + std::string(mark) + "Shape\" -p \"" + own + "\";\n";
     DriveAll(own);

@@ -84,6 +84,19 @@ TEST(LinksTest, WithoutACameraNothingComesOverAndOneDiagnosticSaysSo) {
   EXPECT_EQ(some.CountOf(Code::LocatorsWithoutCamera) + some.CountOf(Code::NoCameraToImport), 0u);
 }
 
+TEST(LinksTest, WhatStandsAboveALostParentIsLostWithItAndIsNotNamed) {
+  const std::string chain =
+      "createNode transform -n \"top\";\n\tsetAttr \".ro\" 3;\n\tsetAttr \".r\" -type \"double3\" 10 20 30 "
+      ";\n"
+      "createNode joint -n \"bone\" -p \"top\";\n"
+      "createNode transform -n \"shotCam\" -p \"bone\";\n"
+      "createNode camera -n \"shotCamShape\" -p \"shotCam\";\n";
+  const Checked checked(kHead + kResolution + chain + CurveOf("topX", "2 0 3 5", "top.tx") +
+                        CurveOf("camX", "10 0 11 5", "shotCam.tx"));
+  EXPECT_EQ(checked.CountOf(Code::ParentNotImported), 1u);
+  EXPECT_EQ(checked.CountOf(Code::RotateOrderLost) + checked.CountOf(Code::KeysStartApart), 0u);
+}
+
 TEST(LinksTest, LocatorsAndTargetsThatStartApartFromTheCameraAreNamed) {
   const std::string moving = CurveOf("camX", "10 0 11 5", "shotCam.tx");
   const std::string locator = Transform("mark", "", "") +

@@ -36,6 +36,17 @@ TEST(NamesTest, NamesThatNoCameraDependsOnDoNotCount) {
   EXPECT_EQ(checked.CountOf(Code::SameNames), 0u);
 }
 
+TEST(NamesTest, ANodeThatHasTheNameOfAParentThatDoesNotComeOver) {
+  const Checked checked(
+      kHead +
+      "createNode joint -n \"rig\";\ncreateNode transform -n \"shotCam\" -p \"rig\";\n"
+      "createNode camera -n \"shotCamShape\" -p \"shotCam\";\n"
+      "createNode transform -n \"group\";\ncreateNode transform -n \"rig\" -p \"group\";\n");
+  ASSERT_EQ(checked.cameOver().layers.size(), 3u);  // the camera came over under the other node
+  EXPECT_EQ(checked.MarkedBy(Code::SameNames), "rig");
+  EXPECT_EQ(checked.LineOf(Code::SameNames), 7u);
+}
+
 TEST(NamesTest, ANameThatIsTooLong) {
   const std::string scene = CameraScene("");
   EXPECT_EQ(Checked(scene + "createNode transform -n \"" + std::string(252, 'a') + "\";\n")

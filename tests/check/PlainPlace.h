@@ -63,6 +63,7 @@ inline PlainPlace TurnedInOrder(const Triple& degrees, const std::array<std::siz
 struct PlainParts {
   Triple translate{}, rotate{}, scale{1, 1, 1}, rotatePivot{}, scalePivot{};
   Triple rotateAxis{}, shear{}, rotatePivotTranslate{}, scalePivotTranslate{};
+  Triple offset{};        // in what stands above
   std::size_t order = 0;  // xyz, yzx, zxy, xzy, yxz, zyx
 };
 
@@ -73,10 +74,11 @@ inline PlainPlace PlaceOf(const PlainParts& parts) {
   shear.axes[0][1] = parts.shear[0];
   shear.axes[0][2] = parts.shear[1];
   shear.axes[1][2] = parts.shear[2];
-  return Moved(parts.translate) * Moved(parts.rotatePivotTranslate) * Moved(parts.rotatePivot) *
-         TurnedInOrder(parts.rotate, kOrders[parts.order % 6]) * TurnedInOrder(parts.rotateAxis, kOrders[0]) *
-         MovedBack(parts.rotatePivot) * Moved(parts.scalePivotTranslate) * Moved(parts.scalePivot) * shear *
-         Scaled(parts.scale) * MovedBack(parts.scalePivot);
+  return Moved(parts.offset) * Moved(parts.translate) * Moved(parts.rotatePivotTranslate) *
+         Moved(parts.rotatePivot) * TurnedInOrder(parts.rotate, kOrders[parts.order % 6]) *
+         TurnedInOrder(parts.rotateAxis, kOrders[0]) * MovedBack(parts.rotatePivot) *
+         Moved(parts.scalePivotTranslate) * Moved(parts.scalePivot) * shear * Scaled(parts.scale) *
+         MovedBack(parts.scalePivot);
 }
 
 // The farthest that the two are apart in one number, beside the size of what is compared.

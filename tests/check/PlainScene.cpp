@@ -149,24 +149,36 @@ void PlainScene::Create(const Command& command, Bytes place) {
   drivers_.emplace_back();
 }
 
+std::string PlainScene::LongName(const std::string& attribute) {
+  for (const Compound& compound : Compounds()) {
+    for (std::size_t i = 0; i < compound.longParts.size(); ++i) {
+      if (attribute == compound.parts[i]) return compound.longParts[i];
+    }
+  }
+  return attribute == "fl" ? "focalLength" : attribute;
+}
+
 void PlainScene::SetNumbers(std::string_view attribute, const std::vector<double>& numbers,
-                            PlainNode* node) const {
+                            std::map<std::string, double>* known) {
   for (const Compound& compound : Compounds()) {
     if (attribute != compound.shortName) continue;
     for (std::size_t i = 0; i < compound.parts.size() && i < numbers.size(); ++i)
-      node->numbers[compound.parts[i]] = numbers[i];
+      (*known)[compound.parts[i]] = numbers[i];
     return;
   }
-  if (attribute == "ktv") node->keys.insert(node->keys.end(), numbers.begin(), numbers.end());
-  if (!numbers.empty()) node->numbers[std::string(attribute)] = numbers[0];
+  constexpr std::size_t kMovesAlongX = 12;  // of the sixteen numbers of a matrix
+  if (attribute == "opm" && numbers.size() > kMovesAlongX) (*known)["opmx"] = numbers[kMovesAlongX];
+  if (!numbers.empty()) (*known)[std::string(attribute)] = numbers[0];
 }
 
 void PlainScene::Set(const Command& command, Bytes place) {
   std::string_view plug;
   std::vector<double> numbers;
+  bool usual = true;
   for (std::size_t i = 1; i < command.size(); ++i) {
     const Word& word = command[i];
     if (!word.quoted && IsOption(word.text)) {
+      usual &= !plug.empty();
       if (!StandsAlone(word.text)) ++i;
     } else if (plug.empty() && word.quoted) {
       plug = word.text;
@@ -188,7 +200,12 @@ void PlainScene::Set(const Command& command, Bytes place) {
   if (id == kNone) return;
   PlainNode& node = nodes_[static_cast<std::size_t>(id)];
   node.text.push_back(place);
-  SetNumbers(ShortName(attribute), numbers, &node);
+  const std::string shortName = ShortName(attribute);
+  SetNumbers(shortName, numbers, &node.numbers);
+  if (shortName == "ktv") node.keys.insert(node.keys.end(), numbers.begin(), numbers.end());
+  const bool whole = std::any_of(Compounds().begin(), Compounds().end(),
+                                 [&](const Compound& compound) { return shortName == compound.shortName; });
+  if (usual && dot == 0 && (whole || shortName == "fl")) SetNumbers(shortName, numbers, &node.whole);
 }
 
 void PlainScene::Connect(const Command& command, Bytes place) {
@@ -217,6 +234,8 @@ void PlainScene::Units(const Command& command) {
                                  Rate{"ntscf", 60.0}};
   for (std::size_t i = 1; i + 1 < command.size(); ++i) {
     const std::string word(command[i + 1].text);
+    if (command[i].text == "-l" || command[i].text == "-linear")
+      countsCentimeters_ = word == "cm" || word == "centimeter";
     if (command[i].text == "-a" || command[i].text == "-angle")
       degrees_ = word.starts_with("rad") ? 180.0 / std::numbers::pi : 1.0;
     if (command[i].text != "-t" && command[i].text != "-time") continue;
@@ -241,6 +260,11 @@ void PlainScene::Units(const Command& command) {
 double PlainScene::Number(int id, const std::string& attribute, double otherwise) const {
   const auto known = node(id).numbers.find(attribute);
   return known != node(id).numbers.end() ? known->second : otherwise;
+}
+
+double PlainScene::UsualNumber(int id, const std::string& attribute, double otherwise) const {
+  const auto known = node(id).whole.find(attribute);
+  return known != node(id).whole.end() ? known->second : otherwise;
 }
 
 const PlainDriver* PlainScene::DriverOf(int id, const std::string& attribute) const {

@@ -23,6 +23,7 @@ struct PlainNode {
   int parent = kNone;                          // kNone too where the file does not create it
   bool startup = false;                        // created with "-s"
   std::map<std::string, double> numbers = {};  // by short name, "tx" and the like
+  std::map<std::string, double> whole = {};    // those that a plain setAttr ".t" after its createNode sets
   std::vector<double> keys;                    // of a curve: time and value by turns
   std::vector<Bytes> text;                     // of its commands, and of the connections into it
 };
@@ -45,6 +46,12 @@ class PlainScene {
 
   double Number(int id, const std::string& attribute, double otherwise) const;
 
+  // The number that the file has in its usual form: without an option, a name or the axis alone.
+  double UsualNumber(int id, const std::string& attribute, double otherwise) const;
+
+  // "translateX" of "tx"; the same where it has none.
+  static std::string LongName(const std::string& attribute);
+
   // What drives an attribute, by its short name: by itself, or with the three that it is one of.
   const PlainDriver* DriverOf(int id, const std::string& attribute) const;
 
@@ -53,6 +60,7 @@ class PlainScene {
     return drivers_[static_cast<std::size_t>(id)];
   }
 
+  bool countsCentimeters() const { return countsCentimeters_; }
   double degrees() const { return degrees_; }  // in one unit of angle
   double framesPerSecond() const { return framesPerSecond_; }
   // Whether a scene's first key is the beginning of its time.
@@ -73,7 +81,8 @@ class PlainScene {
   void Set(const Command& command, Bytes place);
   void Connect(const Command& command, Bytes place);
   void Units(const Command& command);
-  void SetNumbers(std::string_view attribute, const std::vector<double>& numbers, PlainNode* node) const;
+  static void SetNumbers(std::string_view attribute, const std::vector<double>& numbers,
+                         std::map<std::string, double>* known);
   int Find(std::string_view path) const;
 
   std::vector<PlainNode> nodes_;
@@ -82,6 +91,7 @@ class PlainScene {
   std::map<std::string, double> resolution_;
   int current_ = kNone;
   bool resolutionIsCurrent_ = false;
+  bool countsCentimeters_ = true;
   double degrees_ = 1.0;
   double framesPerSecond_ = 24.0;
   bool countsFrames_ = true;
