@@ -3,6 +3,8 @@
 #include <algorithm>
 #include <array>
 #include <cstddef>
+#include <deque>
+#include <unordered_map>
 
 namespace check {
 namespace {
@@ -15,6 +17,12 @@ constexpr std::array<std::string_view, 4> kTransformTypes = {"transform", "stere
 constexpr std::size_t kQuotedName = 255;
 
 char Lower(char c) { return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c; }
+
+std::string Lowered(std::string_view name) {
+  std::string lowered(name);
+  std::transform(lowered.begin(), lowered.end(), lowered.begin(), Lower);
+  return lowered;
+}
 
 bool IsCamera(const scene::Node& node) {
   return node.origin == scene::Origin::Created &&
@@ -49,23 +57,31 @@ std::string_view ImportName(const scene::Scene& scene, const scene::Node& node) 
 }
 
 std::vector<Camera> FindCameras(const scene::Scene& scene, const CameOver& cameOver) {
-  // The import makes the layers of the cameras in the order of the file, each under the camera's name.
-  auto layer = cameOver.layers.begin();
-  const auto nextCamera = [&] {
-    layer = std::find_if(layer, cameOver.layers.end(),
-                         [](const CameOverLayer& one) { return one.kind == LayerKind::Camera; });
+  // The import makes the layers of the cameras in the order of the file, each under the camera's name. Of
+  // names that are one for it all layers can have the one.
+  std::unordered_map<std::string, std::deque<const CameOverLayer*>> layersOf;
+  for (const CameOverLayer& layer : cameOver.layers) {
+    if (layer.kind == LayerKind::Camera) layersOf[Lowered(layer.name)].push_back(&layer);
+  }
+  const auto takeLayer = [&](Camera* camera) {
+    const auto known = layersOf.find(Lowered(ImportName(scene, scene.node(camera->shape))));
+    if (known == layersOf.end() || known->second.empty()) return;
+    camera->layer = known->second.front();
+    known->second.pop_front();
   };
-  nextCamera();
   std::vector<Camera> cameras;
   for (scene::NodeId id = 0; id < scene.nodes().size(); ++id) {
     const scene::Node& node = scene.node(id);
     if (!IsCamera(node)) continue;
-    Camera camera{.shape = id, .transform = node.parent, .layer = nullptr, .taken = !IsSkipped(scene, id)};
-    if (camera.taken && layer != cameOver.layers.end() && layer->name == ImportName(scene, node)) {
-      camera.layer = &*layer++;
-      nextCamera();
-    }
-    cameras.push_back(camera);
+    cameras.push_back(
+        {.shape = id, .transform = node.parent, .layer = nullptr, .taken = !IsSkipped(scene, id)});
+    if (cameras.back().taken) takeLayer(&cameras.back());
+  }
+  // A camera that the file creates twice, with a value once, is for the import a second one without it.
+  for (Camera& camera : cameras) {
+    if (camera.taken) continue;
+    takeLayer(&camera);
+    camera.taken = camera.layer != nullptr;
   }
   return cameras;
 }

@@ -4,25 +4,38 @@
 
 #include "check/LookAts.h"
 #include "check/RulesInternal.h"
+#include "check/Tokens.h"
 #include "scene/SpecialNames.h"
 
 namespace check {
 
+// Reads the command again, from the nearest "createNode" that it can begin with: the word also stands in
+// strings.
 diag::Range WrittenParent(std::string_view text, const scene::Node& node) {
-  constexpr std::size_t kLongestCommand = 4000;
-  constexpr std::string_view kOptions[] = {"-p \"", "-parent \""};
-  const auto name = static_cast<std::size_t>(node.place.offset);
-  const std::size_t earliest = name > kLongestCommand ? name - kLongestCommand : 0;
-  const std::size_t begin = text.substr(earliest, name - earliest).rfind("createNode");
-  if (begin == std::string_view::npos) return {};
-  const std::string_view rest = text.substr(earliest + begin, 2 * kLongestCommand);
-  const std::string_view command = rest.substr(0, std::min(rest.find(';'), rest.size()));
-  for (const std::string_view option : kOptions) {
-    const std::size_t at = command.find(option);
-    if (at == std::string_view::npos) continue;
-    const std::size_t start = at + option.size();
-    const std::size_t end = std::min(command.find('"', start), command.size());
-    return {earliest + begin + start, end - start};
+  constexpr std::string_view kWord = "createNode";
+  constexpr std::size_t kLongestHead = 65'536;
+  constexpr std::size_t kMostTries = 8;
+  const auto place = static_cast<std::size_t>(node.place.offset);
+  const std::size_t earliest = place > kLongestHead ? place - kLongestHead : 0;
+  std::string_view before = text.substr(earliest, place - earliest);
+  for (std::size_t tries = 0; tries < kMostTries; ++tries) {
+    const std::size_t begin = before.rfind(kWord);
+    if (begin == std::string_view::npos) return {};
+    scene::Cursor cursor(text);
+    cursor.MoveTo(static_cast<std::uint32_t>(earliest + begin + kWord.size()));
+    diag::Range parent{};
+    std::string_view token;
+    bool quoted = false;
+    bool follows = false;  // an option of a parent came before
+    bool found = false;
+    while (TakeToken(&cursor, &token, &quoted)) {
+      const auto offset = static_cast<std::size_t>(token.data() - text.data());
+      if (follows) parent = {offset, token.size()};
+      found = found || offset == place;
+      follows = !quoted && (token == "-p" || token == "-parent");
+    }
+    if (found) return parent;
+    before = before.substr(0, begin);
   }
   return {};
 }

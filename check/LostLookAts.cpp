@@ -1,6 +1,7 @@
 // Look-ats of cameras that the importer does not recognise, or takes for something else.
-#include <algorithm>
-#include <string_view>
+#include <unordered_map>
+#include <unordered_set>
+#include <utility>
 #include <vector>
 
 #include "check/LookAts.h"
@@ -18,50 +19,73 @@ const scene::Connection* LastTarget(const scene::Scene& scene, NodeId lookAt) {
   return targets.empty() ? nullptr : targets.back();
 }
 
-// The camera does not turn as the look-at has it. That a bake finds no answer for the look-at either is then
-// no news.
-void Say(const Subject& subject, Code code, const diag::Range& place, NodeId lookAt, const Camera& camera) {
-  const scene::Scene& scene = subject.scene;
-  subject.diagnostics.Report(code, place, {scene.node(lookAt).name, scene.node(camera.shape).name});
-  if (subject.driversSaid == nullptr) return;
-  for (const scene::Connection* const connection : scene.ConnectionsInto(camera.transform)) {
-    if (connection->source.node == lookAt) subject.driversSaid->insert(connection->destinationPlace.offset);
+// What the import does not take of one transform's look-ats. A look-at that is reported needs no second
+// diagnostic that a bake finds no answer for it either.
+class TransformLookAts {
+ public:
+  TransformLookAts(const Subject& subject, NodeId transform) : subject_(subject), transform_(transform) {
+    std::unordered_set<NodeId> seen;
+    for (const scene::Connection* const connection : subject.scene.ConnectionsInto(transform)) {
+      const NodeId source = connection->source.node;
+      const bool turns = connection->destination.attribute.starts_with("rotate");
+      if (turns && IsLookAt(subject.scene.node(source).type) && seen.insert(source).second)
+        lookAts_.push_back({source, LastTarget(subject.scene, source)});
+    }
   }
-}
 
-void ReportLookAt(const Subject& subject, NodeId lookAt, const Camera& camera) {
-  const scene::Connection* const target = LastTarget(subject.scene, lookAt);
-  if (camera.layer != nullptr && camera.layer->aimed) {
-    if (target != nullptr && target->source.node == lookAt)
-      Say(subject, Code::LookAtWeightLast, target->destinationPlace, lookAt, camera);
-    return;
+  // Of several cameras under one transform, each is looked at with the first look-at, and one with all.
+  void Report(const Camera& camera) {
+    for (const auto& [lookAt, target] : lookAts_) {
+      ReportOne(lookAt, target, camera);
+      if (!first_) break;
+    }
+    first_ = false;
   }
-  const Code code = target == nullptr ? Code::LookAtShortNames : Code::LookAtNotTaken;
-  Say(subject, code, subject.scene.node(lookAt).place, lookAt, camera);
-}
 
-// The look-ats that turn the transform, each once.
-std::vector<NodeId> LookAtsOf(const scene::Scene& scene, NodeId transform) {
-  std::vector<NodeId> found;
-  for (const scene::Connection* const connection : scene.ConnectionsInto(transform)) {
-    const NodeId source = connection->source.node;
-    const std::string_view type = scene.node(source).type;
-    const bool turns = connection->destination.attribute.starts_with("rotate");
-    if (turns && IsLookAt(type) && std::find(found.begin(), found.end(), source) == found.end())
-      found.push_back(source);
+  void NoteDrivers() const {
+    if (subject_.driversSaid == nullptr || said_.empty()) return;
+    for (const scene::Connection* const connection : subject_.scene.ConnectionsInto(transform_)) {
+      if (said_.contains(connection->source.node))
+        subject_.driversSaid->insert(connection->destinationPlace.offset);
+    }
   }
-  return found;
-}
+
+ private:
+  void ReportOne(NodeId lookAt, const scene::Connection* target, const Camera& camera) {
+    const diag::Range place = subject_.scene.node(lookAt).place;
+    if (camera.layer == nullptr || !camera.layer->aimed) {
+      Say(target == nullptr ? Code::LookAtShortNames : Code::LookAtNotTaken, place, lookAt, camera);
+    } else if (target != nullptr && target->source.node == lookAt) {
+      Say(Code::LookAtWeightLast, target->destinationPlace, lookAt, camera);
+    }
+  }
+
+  void Say(Code code, const diag::Range& place, NodeId lookAt, const Camera& camera) {
+    const scene::Scene& scene = subject_.scene;
+    subject_.diagnostics.Report(code, place, {scene.node(lookAt).name, scene.node(camera.shape).name});
+    said_.insert(lookAt);
+  }
+
+  const Subject& subject_;
+  NodeId transform_;
+  std::vector<std::pair<NodeId, const scene::Connection*>> lookAts_;  // each once, with its target or null
+  std::unordered_set<NodeId> said_;
+  bool first_ = true;
+};
 
 }  // namespace
 
 void ReportLostLookAts(const Subject& subject) {
+  std::unordered_map<NodeId, TransformLookAts> lookAtsOf;
   for (const Camera& camera : subject.cameras) {
     const bool comes = camera.layer != nullptr || (camera.taken && subject.cameOver.stop != Stop::None);
     if (!comes || camera.transform == scene::kNoNode) continue;
-    for (const NodeId lookAt : LookAtsOf(subject.scene, camera.transform))
-      ReportLookAt(subject, lookAt, camera);
+    auto known = lookAtsOf.find(camera.transform);
+    if (known == lookAtsOf.end())
+      known = lookAtsOf.try_emplace(camera.transform, subject, camera.transform).first;
+    known->second.Report(camera);
   }
+  for (const auto& [transform, lookAts] : lookAtsOf) lookAts.NoteDrivers();
 }
 
 }  // namespace check

@@ -4,6 +4,7 @@
 #include <string>
 
 #include "check/Cameras.h"
+#include "check/Tokens.h"
 #include "scene/Cursor.h"
 #include "scene/Value.h"
 
@@ -33,17 +34,6 @@ constexpr ReadAttribute kCamera[] = {
 
 bool IsCameraType(std::string_view type) {
   return SameName(type, "camera") || SameName(type, "stereoRigCamera");
-}
-
-// Over a string or a word. False where neither stands.
-bool TakeToken(Cursor* cursor, std::string_view* token, bool* quoted) {
-  std::uint32_t openComment = Cursor::kNone;
-  cursor->SkipBlank(&openComment);
-  *quoted = cursor->Peek() == '"';
-  bool closed = true;
-  bool escaped = false;
-  *token = *quoted ? cursor->TakeString(&closed, &escaped) : cursor->TakeWord();
-  return closed && (*quoted || !token->empty());
 }
 
 bool IsOption(std::string_view token) {

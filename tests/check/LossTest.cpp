@@ -40,6 +40,20 @@ TEST(LossTest, AParentThatIsGivenAsAPath) {
   EXPECT_EQ(checked.MarkedBy(Code::ParentIsPath), "|rig|shotCam");
 }
 
+TEST(LossTest, AParentThatIsAPathIsFoundWhateverStandsBetween) {
+  for (const char* const option :
+       {"-n \"lens\" -p  \"|rig\"", "-n \"lens\" -p\t\"|rig\"", "-n \"lens\"\n -p\n\"|rig\"",
+        "-n \"lens\" -p /* \"rig\"; */ \"|rig\"", "-n \"lens\" -parent \"|rig\"", "-p \"|rig\" -n \"lens\"",
+        "-p \"|rig\" -ss -n \"lens\""}) {
+    const Checked checked(kHead + "createNode transform -n \"rig\";\ncreateNode camera " + option + ";\n" +
+                          kResolution);
+    EXPECT_EQ(checked.MarkedBy(Code::ParentIsPath), "|rig") << option;
+  }
+  const Checked named(
+      kHead + "createNode transform -n \"rig\";\ncreateNode camera -p \"|rig\" -n \"createNode x\";\n");
+  EXPECT_EQ(named.MarkedBy(Code::ParentIsPath), "|rig");
+}
+
 TEST(LossTest, AParentInAReferenceIsSaidWithItsFile) {
   const Checked checked(kHead +
                         "file -r -ns \"rig\" -rfn \"rigRN\" \"set/rig.ma\";\n"
@@ -203,6 +217,20 @@ TEST(LossTest, ALookAtThatComesOverIsNotComplainedOf) {
   EXPECT_EQ(checked.CountOf(Code::LookAtWeightLast) + checked.CountOf(Code::LookAtShortNames) +
                 checked.CountOf(Code::LookAtNotTaken) + checked.CountOf(Code::DrivenByNoCurve),
             0u);
+}
+
+TEST(LossTest, ManyCamerasAndLookAtsOfOneTransformAreNamedOnceEach) {
+  constexpr std::size_t kMany = 40;
+  std::string many;
+  for (std::size_t i = 1; i < kMany; ++i) {
+    const std::string number = std::to_string(i);
+    many += "createNode camera -n \"shape" + number + "\" -p \"shotCam\";\n" + kLens +
+            "createNode aimConstraint -n \"aim" + number + "\" -p \"shotCam\";\n" + "connectAttr \"aim" +
+            number + ".constraintRotate\" \"shotCam.rotate" + number + "\";\n";
+  }
+  const Checked checked(CameraScene("", "", LookAt("connectAttr \"point.t\" \"aim.tg[0].tt\";\n") + many),
+                        {.all = true, .only = {}});
+  EXPECT_EQ(checked.CountOf(Code::LookAtShortNames), 2 * kMany - 1);
 }
 
 TEST(LossTest, ALookAtWithoutAPlace) {
