@@ -42,16 +42,37 @@ diag::Range WrittenParent(std::string_view text, const scene::Node& node) {
 
 bool IsFosterParent(const scene::Node& node) { return node.type == "fosterParent"; }
 
+namespace {
+
+std::string_view TextOf(const scene::Scene& scene, const diag::Range& range) {
+  return scene.text().substr(static_cast<std::size_t>(range.offset), static_cast<std::size_t>(range.length));
+}
+
+// Whether a node that stands at the top was created under another one.
+bool WasMovedOut(const scene::Scene& scene, const scene::Node& node) {
+  if (node.origin != scene::Origin::Created || node.shared) return false;
+  const std::string_view written = TextOf(scene, WrittenParent(scene.text(), node));
+  if (written.empty()) return false;
+  const scene::NodeId parent = scene.Find(written);
+  // Of parents in a circle one is cut off.
+  for (scene::NodeId id = parent; id != scene::kNoNode; id = scene.node(id).parent) {
+    if (&scene.node(id) == &node) return false;
+  }
+  return parent != scene::kNoNode;
+}
+
+}  // namespace
+
 ParentLoss ParentLossOf(const scene::Scene& scene, const scene::Node& node) {
-  if (node.parent == scene::kNoNode) return ParentLoss::None;
+  if (node.parent == scene::kNoNode) return WasMovedOut(scene, node) ? ParentLoss::Command : ParentLoss::None;
   const diag::Range written = WrittenParent(scene.text(), node);
-  const auto begin = scene.text().begin() + static_cast<std::ptrdiff_t>(written.offset);
-  const bool path = std::find(begin, begin + static_cast<std::ptrdiff_t>(written.length), '|') !=
-                    begin + static_cast<std::ptrdiff_t>(written.length);
-  if (path) return ParentLoss::Path;
+  if (TextOf(scene, written).find('|') != std::string_view::npos) return ParentLoss::Path;
   const scene::Node& parent = scene.node(node.parent);
   if (parent.origin != scene::Origin::Created || IsFosterParent(parent)) return ParentLoss::Elsewhere;
-  return IsImportedTransform(parent.type) ? ParentLoss::None : ParentLoss::NotImported;
+  if (!IsImportedTransform(parent.type)) return ParentLoss::NotImported;
+  const std::string_view name = ImportName(scene, parent);
+  const bool asWritten = name.empty() || TextOf(scene, written) == name;
+  return asWritten ? ParentLoss::None : ParentLoss::Command;
 }
 
 std::vector<scene::NodeId> FindMarkedLocators(const scene::Scene& scene) {

@@ -26,6 +26,7 @@ enum class ParentLoss {
   Path,         // the file names the parent by a path
   Elsewhere,    // the file does not create it
   NotImported,  // it is no transform
+  Command,      // a parent command gives the node another one
 };
 
 ParentLoss ParentLossOf(const scene::Scene& scene, const scene::Node& node);

@@ -1,4 +1,7 @@
 // Look-ats of cameras that the importer does not recognise, or takes for something else.
+#include <algorithm>
+#include <cmath>
+#include <string_view>
 #include <unordered_map>
 #include <unordered_set>
 #include <utility>
@@ -57,6 +60,29 @@ class TransformLookAts {
       Say(target == nullptr ? Code::LookAtShortNames : Code::LookAtNotTaken, place, lookAt, camera);
     } else if (target != nullptr && target->source.node == lookAt) {
       Say(Code::LookAtWeightLast, target->destinationPlace, lookAt, camera);
+    } else {
+      ReportTurn(lookAt, camera);
+    }
+  }
+
+  // What turns the camera besides its aim along the axis that it looks along.
+  void ReportTurn(NodeId lookAt, const Camera& camera) const {
+    const auto numbers = [&](std::string_view attribute) {
+      const auto written = subject_.scene.Written(lookAt, attribute);
+      return std::pair(written, written ? written->Numbers(3) : std::vector<double>());
+    };
+    const auto say = [&](const diag::Range& place, std::string_view what) {
+      const scene::Scene& scene = subject_.scene;
+      subject_.diagnostics.Report(Code::LookAtTurnLost, place,
+                                  {scene.node(lookAt).name, scene.node(camera.shape).name, what});
+    };
+    const auto isOther = [](double one) { return std::fabs(one) > 1e-9; };
+    const auto [aimPlace, aim] = numbers("aimVector");
+    if (aim.size() == 3 && (isOther(aim[0]) || isOther(aim[1]) || aim[2] >= 0.0))
+      say(aimPlace->range(), "aim vector");
+    for (const std::string_view attribute : {"offset", "twist"}) {
+      const auto [place, angles] = numbers(attribute);
+      if (std::any_of(angles.begin(), angles.end(), isOther)) say(place->range(), attribute);
     }
   }
 

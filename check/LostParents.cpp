@@ -33,10 +33,14 @@ void ReportParent(const Subject& subject, const scene::Node& node) {
   const Range written = WrittenParent(scene.text(), node);
   const std::string_view path =
       scene.text().substr(static_cast<std::size_t>(written.offset), static_cast<std::size_t>(written.length));
+  if (node.parent == scene::kNoNode)
+    return subject.diagnostics.Report(Code::ParentByCommand, node.place, {node.name, "out of", path});
   const scene::Node& parent = scene.node(node.parent);
   const Range place = written == Range{} ? node.place : written;
   if (loss == ParentLoss::Path) {
     subject.diagnostics.Report(Code::ParentIsPath, place, {node.name, path});
+  } else if (loss == ParentLoss::Command) {
+    subject.diagnostics.Report(Code::ParentByCommand, node.place, {node.name, "under", parent.name});
   } else if (loss == ParentLoss::Elsewhere) {
     subject.diagnostics.Report(Code::ParentElsewhere, place,
                                {node.name, parent.name, WhereItIs(scene, parent)});

@@ -61,9 +61,11 @@ class NamesThatCount {
     }
     for (const Link& link : subject.links) addWithDrivers(link.node);
     const auto addLostParent = [&](NodeId id) {
-      if (ParentLossOf(subject.scene, subject.scene.node(id)) == ParentLoss::None) return;
-      add(subject.scene.node(id).parent);
-      lostParents_.insert(subject.scene.node(id).parent);
+      const NodeId parent = subject.scene.node(id).parent;
+      if (parent == scene::kNoNode || ParentLossOf(subject.scene, subject.scene.node(id)) == ParentLoss::None)
+        return;
+      add(parent);
+      lostParents_.insert(parent);
     };
     for (const Camera& camera : subject.cameras) {
       if (camera.taken) addLostParent(camera.shape);

@@ -123,6 +123,7 @@ enum class Code : std::uint16_t {
   LocatorsWithoutCamera = 821,
   NoCameraToImport = 822,
   TargetLosesItsChain = 823,
+  ParentByCommand = 824,
   // Where the picture differs: diag/PictureCodes.cpp
   PictureShifts = 901,
   KeysAreNoBake = 902,
@@ -151,6 +152,7 @@ enum class Code : std::uint16_t {
   RadiansLost = 925,
   KeysAtOneTime = 926,
   AimedPivotLost = 927,
+  LookAtTurnLost = 928,
   // What keeps a check from its end: diag/ProcessCodes.cpp
   CheckTimedOut = 1001,
   CheckBrokeOff = 1002,

@@ -227,6 +227,21 @@ constexpr Entry kLossCodes[] = {
          "connectAttr \"shotCam.translate\" \"look.constraintTranslate\";\n"
          "connectAttr \"aim.translate\" \"look.target[0].targetTranslate\";",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
+    {.code = Code::ParentByCommand,
+     .severity = Severity::Warning,
+     .symbol = "ParentByCommand",
+     .sentence =
+         "\"{0}\" stands elsewhere: a parent command moves it {1} \"{2}\", and the import does not read it",
+     .meaning =
+         "The importer takes a node's parent from its createNode. A parent command that comes later changes "
+         "it in the scene alone.",
+     .example =
+         "createNode transform -n \"rig\";\n  setAttr \".t\" -type \"double3\" 0 10 0 ;\n"
+         "createNode transform -n \"shotCam\";\ncreateNode camera -n \"shotCamShape\" -p \"shotCam\";\n"
+         "parent \"shotCam\" \"rig\";",
+     .help = "Open the scene in Maya and save it again, which writes the parent with the node. Or write the "
+             "scene "
+             "anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
 };
 
 }  // namespace

@@ -105,8 +105,8 @@ constexpr Entry kNodeCodes[] = {
      .symbol = "SameNames",
      .sentence = "this is a second node called \"{0}\" for the importer",
      .meaning = "The importer knows nodes by their names alone, wherever they stand. Of several transforms, "
-                "cameras, curves or locators of one name, the first gets the values and the curves of all of "
-                "them.",
+                "cameras, curves or locators of one name, the first gets the values, the curves and the "
+                "parent of all of them.",
      .example =
          "createNode transform -n \"shotCam\" -p \"rigA\";\ncreateNode transform -n \"shotCam\" -p \"rigB\";",
      .help = "Give the nodes different names, or write the scene anew: mayascene bake SCENE -o OUT."},
@@ -115,8 +115,8 @@ constexpr Entry kNodeCodes[] = {
      .symbol = "NamesDifferInCase",
      .sentence = "\"{0}\" and \"{1}\" are one name for the importer",
      .meaning =
-         "The importer does not distinguish upper and lower case. The first of the nodes gets the values and "
-         "the curves of both.",
+         "The importer does not distinguish upper and lower case. The first of the nodes gets the values, "
+         "the curves and the parent of both.",
      .example = "createNode transform -n \"shotCam\";\ncreateNode transform -n \"ShotCam\";",
      .help = "Give the nodes different names, or write the scene anew: mayascene bake SCENE -o OUT."},
     {.code = Code::NameTooLong,

@@ -312,6 +312,26 @@ constexpr Entry kPictureCodes[] = {
      .help =
          "Write the scene anew, with a key at every frame: mayascene bake SCENE -o OUT, or mayascene import "
          "--bake."},
+    {.code = Code::LookAtTurnLost,
+     .severity = Severity::Warning,
+     .symbol = "LookAtTurnLost",
+     .sentence = "the look-at \"{0}\" turns the camera \"{1}\" further: its {2} is lost",
+     .meaning =
+         "An aimed layer looks straight at its target, and upright. An offset or a twist of the look-at, or "
+         "an aim along another axis than the camera's own, turns the camera in the scene alone.",
+     .example = "createNode transform -n \"shotCam\";\n"
+                "createNode camera -n \"shotCamShape\" -p \"shotCam\";\n"
+                "createNode transform -n \"point\";\n"
+                "  setAttr \".t\" -type \"double3\" 20 0 -20 ;\n"
+                "createNode aimConstraint -n \"aim\" -p \"shotCam\";\n"
+                "  setAttr \".a\" -type \"double3\" 0 0 -1 ;\n"
+                "  setAttr \".o\" -type \"double3\" 0 15 0 ;\n"
+                "connectAttr \"aim.constraintRotate\" \"shotCam.rotate\";\n"
+                "connectAttr \"shotCam.translate\" \"aim.constraintTranslate\";\n"
+                "connectAttr \"point.translate\" \"aim.target[0].targetTranslate\";",
+     .help =
+         "Write the scene anew, with the rotation at every frame: mayascene bake SCENE -o OUT, or mayascene "
+         "import --bake."},
 };
 
 }  // namespace

@@ -16,10 +16,10 @@ std::string Transform(const std::string& name, const std::string& parent, const 
 }
 
 // "shotCam" looks at "aim", which the caller makes.
-std::string AimedScene(const std::string& aim) {
+std::string AimedScene(const std::string& aim,
+                       const std::string& look = "\tsetAttr \".a\" -type \"double3\" 0 0 -1 ;\n") {
   return CameraScene("\tsetAttr \".t\" -type \"double3\" 0 0 10 ;\n", "",
-                     aim +
-                         "createNode lookAt -n \"look\";\n\tsetAttr \".a\" -type \"double3\" 0 0 -1 ;\n"
+                     aim + "createNode lookAt -n \"look\";\n" + look +
                          "connectAttr \"look.constraintRotate\" \"shotCam.rotate\";\n"
                          "connectAttr \"shotCam.translate\" \"look.constraintTranslate\";\n"
                          "connectAttr \"aim.translate\" \"look.target[0].targetTranslate\";\n");
@@ -95,6 +95,34 @@ TEST(LinksTest, WhatStandsAboveALostParentIsLostWithItAndIsNotNamed) {
                         CurveOf("camX", "10 0 11 5", "shotCam.tx"));
   EXPECT_EQ(checked.CountOf(Code::ParentNotImported), 1u);
   EXPECT_EQ(checked.CountOf(Code::RotateOrderLost) + checked.CountOf(Code::KeysStartApart), 0u);
+}
+
+TEST(LinksTest, AParentCommandIsNotRead) {
+  const std::string rig = "createNode transform -n \"rig\";\n\tsetAttr \".t\" -type \"double3\" 1 2 3 ;\n";
+  const Checked under(CameraScene("", "", rig + "parent \"shotCam\" \"rig\";\n"));
+  EXPECT_THAT(under.SentenceOf(Code::ParentByCommand),
+              AllOf(HasSubstr("\"shotCam\""), HasSubstr("under \"rig\"")));
+  EXPECT_EQ(under.CountOf(Code::PictureShifts), 1u);
+  const std::string camera =
+      "createNode transform -n \"shotCam\" -p \"rig\";\ncreateNode camera -n \"shape\" -p \"shotCam\";\n";
+  const Checked outOf(kHead + kResolution + rig + camera + "parent -w \"shotCam\";\n");
+  EXPECT_THAT(outOf.SentenceOf(Code::ParentByCommand), HasSubstr("out of \"rig\""));
+  const Checked same(kHead + kResolution + rig + camera + "parent \"shotCam\" \"rig\";\n");
+  EXPECT_EQ(same.CountOf(Code::ParentByCommand), 0u);
+}
+
+TEST(LinksTest, WhatALookAtTurnsBesidesItsAimIsLost) {
+  const auto aimed = [](const std::string& values) {
+    return Checked(AimedScene(Transform("aim", "", "\tsetAttr \".t\" -type \"double3\" 5 0 -9 ;\n"), values));
+  };
+  const std::string own = "\tsetAttr \".a\" -type \"double3\" 0 0 -2 ;\n";
+  EXPECT_EQ(aimed(own).CountOf(Code::LookAtTurnLost), 0u);
+  EXPECT_THAT(aimed(own + "\tsetAttr \".o\" -type \"double3\" 0 15 0 ;\n").SentenceOf(Code::LookAtTurnLost),
+              HasSubstr("its offset is lost"));
+  EXPECT_THAT(aimed(own + "\tsetAttr \".tws\" 30;\n").SentenceOf(Code::LookAtTurnLost),
+              HasSubstr("its twist is lost"));
+  EXPECT_THAT(aimed("\tsetAttr \".a\" -type \"double3\" 1 0 0 ;\n").SentenceOf(Code::LookAtTurnLost),
+              HasSubstr("its aim vector is lost"));
 }
 
 TEST(LinksTest, LocatorsAndTargetsThatStartApartFromTheCameraAreNamed) {
