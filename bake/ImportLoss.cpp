@@ -1,5 +1,6 @@
 // Finds what an import did not bring, although it ended without an error.
 #include <cmath>
+#include <numbers>
 #include <string>
 #include <unordered_map>
 #include <utility>
@@ -9,28 +10,25 @@
 #include "bake/Loss.h"
 #include "bake/PlainForm.h"
 #include "bake/Selection.h"
-#include "diag/ShownText.h"
+#include "diag/Fill.h"
+#include "motion/BetweenKeys.h"
 #include "motion/Evaluator.h"
 #include "motion/KeptBelow.h"
 #include "motion/SceneCamera.h"
 #include "scene/Attributes.h"
+#include "scene/SpecialNames.h"
+#include "text/Numbers.h"
 
 namespace bake {
 namespace {
 
 using scene::NodeId;
+using text::RoundedNumber;
 
 constexpr double kTolerance = 1e-6;  // relative: scenes write values with limited digits
 
 bool Differ(double a, double b) {
   return std::fabs(a - b) > kTolerance * std::fmax(1.0, std::fmax(std::fabs(a), std::fabs(b)));
-}
-
-std::string Digits(double number) {
-  std::string text = std::to_string(number);
-  text.erase(text.find_last_not_of('0') + 1);
-  if (text.back() == '.') text.pop_back();
-  return text;
 }
 
 // Searches a scene, camera by camera, until it finds something that a bake would bring.
@@ -53,9 +51,9 @@ class LossSearch {
     for (NodeId id = 0; id < scene_.nodes().size() && !found_; ++id) {
       if (!IsSetUp(scene_, id)) continue;
       any = true;
-      auto& layers = byName[scene_.node(id).name];
+      auto& layers = byName[scene::ImportName(scene_, scene_.node(id))];
       if (layers.empty()) {
-        Lose(scene_.node(id).place, "the camera " + ShownNode(scene_, id) + " does not come over");
+        Lose(scene_.node(id).place, "the camera {0} does not come over", {ShownNode(scene_, id)});
         continue;
       }
       LookAtCamera(id, *layers.back());
@@ -67,13 +65,14 @@ class LossSearch {
   }
 
  private:
-  void Lose(std::optional<diag::Range> place, std::string sentence) {
-    if (!found_) found_ = Loss{.sentence = std::move(sentence), .place = place};
+  using Arguments = std::vector<std::string>;
+
+  void Lose(std::optional<diag::Range> place, std::string_view sentence, const Arguments& arguments) {
+    if (!found_) found_ = Loss{.sentence = diag::Fill(sentence, arguments), .place = place};
   }
-  void LoseForGood(std::optional<diag::Range> place, std::string sentence) {
-    if (!unmended_) {
-      unmended_ = Loss{.sentence = std::move(sentence), .place = place, .comesWithBake = false};
-    }
+  void LoseForGood(std::optional<diag::Range> place, std::string_view sentence, const Arguments& arguments) {
+    if (unmended_) return;
+    unmended_ = Loss{.sentence = diag::Fill(sentence, arguments), .place = place, .comesWithBake = false};
   }
 
   void LookAtCamera(NodeId camera, const CameOver::Camera& layer) {
@@ -82,19 +81,24 @@ class LossSearch {
     for (NodeId node = scene_.node(camera).parent; node != scene::kNoNode && !found_;
          node = scene_.node(node).parent, ++step) {
       const bool own = step == 0;
-      if (!own && (step > layer.above.size() || layer.above[step - 1].name != scene_.node(node).name)) {
-        return Lose(scene_.node(camera).place,
-                    "what stands above the camera " + ShownNode(scene_, camera) + " does not come over");
+      if (!own && (step > layer.above.size() || !IsNameOf(node, layer.above[step - 1].name))) {
+        return Lose(scene_.node(camera).place, "what stands above the camera {0} does not come over",
+                    {ShownNode(scene_, camera)});
       }
       if (scene_.node(node).origin != scene::Origin::Created) {
-        return LoseForGood(scene_.node(camera).place, "the camera " + ShownNode(scene_, camera) +
-                                                          " stands under " + ShownNode(scene_, node) +
-                                                          ", which is in another file");
+        return LoseForGood(scene_.node(camera).place,
+                           "the camera {0} stands under {1}, which is in another file",
+                           {ShownNode(scene_, camera), ShownNode(scene_, node)});
       }
       LookAtPlace(node, own ? layer.keys : layer.above[step - 1].keys, own && layer.aimed);
       LookAtForm(node);
     }
     LookAtLens(camera, layer);
+  }
+
+  // A layer above a camera has the name under which its child names it.
+  bool IsNameOf(NodeId node, std::string_view layer) const {
+    return layer == scene_.node(node).name || layer == scene::ImportName(scene_, scene_.node(node));
   }
 
   // Checks the nine channels of a node; `keys` is the number of keys that came over.
@@ -119,15 +123,24 @@ class LossSearch {
 
   void LookAtKeys(NodeId node, const KeyedChannel& channel, std::size_t came,
                   const std::optional<KeyedChannel>& first) {
-    const std::string name = ShownNode(scene_, node) + " on " + std::string(channel.attribute);
+    const std::string name = ShownNode(scene_, node);
+    const std::string attribute(channel.attribute);
     const diag::Range place = scene_.node(channel.node).place;
-    if (came == 0) return Lose(place, "no key of " + name + " comes over");
+    if (came == 0) return Lose(place, "no key of {0} on {1} comes over", {name, attribute});
     if (first && !SameTimes(first->curve, channel.curve)) {
-      return Lose(place, "the keys of " + name + " stand at other times than those on " +
-                             std::string(first->attribute) + ", and come over at theirs");
+      return Lose(place,
+                  "the keys of {0} on {1} stand at other times than those on {2}, and come over at theirs",
+                  {name, attribute, std::string(first->attribute)});
     }
-    if (IsCurvedBetweenFrames(channel.curve, measures_.framesPerSecond)) {
-      Lose(place, "the path between the keys of " + name + " does not come over");
+    const double rate = measures_.framesPerSecond / motion::UnitsPerFrame(scene_);
+    const double halfTurn = std::numbers::pi / measures_.radians;
+    if (motion::IsCurvedAtFrames(motion::Curve(channel.curve), rate)) {
+      Lose(place, "the path between the keys of {0} on {1} does not come over", {name, attribute});
+    } else if (attribute.starts_with("rotate") &&
+               motion::TurnsFarBetweenFrames(channel.curve, halfTurn, rate)) {
+      Lose(place,
+           "{0} turns by half a turn or more between two keys on {1}, and comes over turning the shorter way",
+           {name, attribute});
     }
   }
 
@@ -142,8 +155,8 @@ class LossSearch {
   void LookAtSingle(NodeId node, const KeyedChannel& channel) {
     const double stored = scene_.Number(node, channel.attribute).value_or(0.0);
     if (!Differ(channel.curve.keys.front().value, stored)) return;
-    Lose(scene_.node(channel.node).place, ShownNode(scene_, node) + " has a single key on " +
-                                              std::string(channel.attribute) + ", which does not come over");
+    Lose(scene_.node(channel.node).place, "{0} has a single key on {1}, which does not come over",
+         {ShownNode(scene_, node), std::string(channel.attribute)});
   }
 
   // Checks a channel that something other than a curve may drive.
@@ -155,16 +168,18 @@ class LossSearch {
     const bool lookAt = source.type == "lookAt" || source.type == "aimConstraint";
     if (lookAt && aimed) return;
     const diag::Range place = driver->connection->destinationPlace;
-    const std::string by = " the " + std::string(lookAt ? "look-at " : "node ") +
-                           ShownNode(scene_, driver->plug.node) + " makes of " + ShownNode(scene_, node) +
-                           " on " + std::string(attribute) + " does not come over";
+    const Arguments who = {lookAt ? "look-at" : "node", ShownNode(scene_, driver->plug.node),
+                           ShownNode(scene_, node), std::string(attribute)};
     const motion::NumberId number = evaluator_.Number(node, attribute);
     evaluator_.MoveTo(0.0);
     const double stored = scene_.Number(node, attribute).value_or(0.0);
     if (evaluator_.Moves(number) || Differ(evaluator_.Value(number), stored)) {
-      Lose(place, "what" + by);
+      Lose(place, "what the {0} {1} makes of {2} on {3} does not come over", who);
     } else if (!motion::KeptBelow(evaluator_).Of({number}, {}).empty()) {
-      LoseForGood(place, "what" + by + ", and a bake cannot evaluate it either");
+      LoseForGood(
+          place,
+          "what the {0} {1} makes of {2} on {3} does not come over, and a bake cannot evaluate it either",
+          who);
     }
   }
 
@@ -178,7 +193,7 @@ class LossSearch {
     if (found_) return;
     const scene::Node& transform = scene_.node(node);
     const auto lose = [&](const char* what) {
-      Lose(transform.place, std::string(what) + " of " + ShownNode(scene_, node) + " does not come over");
+      Lose(transform.place, "{0} of {1} does not come over", {what, ShownNode(scene_, node)});
     };
     if (!Inherits(scene_, node) && transform.parent != scene::kNoNode) {
       return lose("the independence from what stands above");
@@ -228,11 +243,11 @@ class LossSearch {
     const diag::Range place = scene_.node(camera).place;
     if (now.filmFit != motion::filmfit::kVertical &&
         motion::ResolvedFit(now, head_.picture) == motion::filmfit::kVertical) {
-      Lose(place, "the film fit of " + name + " comes over as horizontal, and is vertical");
+      Lose(place, "the film fit of {0} comes over as horizontal, and is vertical", {name});
     } else if (Differ(now.cameraScale, 1.0)) {
-      Lose(place, "the camera scale of " + name + " does not come over");
+      Lose(place, "the camera scale of {0} does not come over", {name});
     } else if (Differ(now.lensSqueeze, 1.0)) {
-      Lose(place, "the lens squeeze of " + name + " does not come over");
+      Lose(place, "the lens squeeze of {0} does not come over", {name});
     }
   }
 
@@ -249,9 +264,9 @@ class LossSearch {
     if (!firstKey_) {
       firstKey_ = seconds;
     } else if (Differ(*firstKey_, seconds)) {
-      Lose(scene_.node(node).place, "the keys of " + ShownNode(scene_, node) +
-                                        " begin at another frame than those below, and come over "
-                                        "at the same");
+      Lose(scene_.node(node).place,
+           "the keys of {0} begin at another frame than those below, and come over at the same",
+           {ShownNode(scene_, node)});
     }
   }
 
@@ -263,17 +278,19 @@ class LossSearch {
     constexpr double kNearlySame = 0.01;
     if (picture.width != import_.width || picture.height != import_.height ||
         std::fabs(motion::PixelAspect(picture) - import_.pixelAspect) > kNearlySame) {
-      return Lose(said, "the picture of " + Digits(picture.width) + " by " + Digits(picture.height) +
-                            ", pixel aspect " + Digits(motion::PixelAspect(picture)) + ", comes over as " +
-                            Digits(import_.width) + " by " + Digits(import_.height) + ", pixel aspect " +
-                            Digits(import_.pixelAspect));
+      return Lose(said,
+                  "the picture of {0} by {1}, pixel aspect {2}, comes over as {3} by {4}, pixel aspect {5}",
+                  {RoundedNumber(picture.width), RoundedNumber(picture.height),
+                   RoundedNumber(motion::PixelAspect(picture)), RoundedNumber(import_.width),
+                   RoundedNumber(import_.height), RoundedNumber(import_.pixelAspect)});
     }
     const double rate = scene::TimeUnitOf(head_.timeUnit)->perSecond();
     constexpr double kSameRate = 1e-4;
     if (std::fabs(rate - import_.framesPerSecond) <= kSameRate * rate) return;
     const scene::UnitWord& unit = scene_.timeUnit();
     Lose(unit.word.empty() ? std::nullopt : std::optional(unit.place),
-         "the rate of " + Digits(rate) + " frames a second comes over as " + Digits(import_.framesPerSecond));
+         "the rate of {0} frames a second comes over as {1}",
+         {RoundedNumber(rate), RoundedNumber(import_.framesPerSecond)});
   }
 
   // Checks the locators of a scene of which nothing at all comes over.
@@ -281,7 +298,7 @@ class LossSearch {
     for (NodeId id = 0; id < scene_.nodes().size(); ++id) {
       const scene::Node& node = scene_.node(id);
       if (node.type != "locator" || node.origin != scene::Origin::Created) continue;
-      Lose(node.place, "the locator " + ShownNode(scene_, id) + " has no \"null\" in its name");
+      Lose(node.place, "the locator {0} has no \"null\" in its name", {ShownNode(scene_, id)});
       found_->comesWithAllLocators = true;
       return;
     }

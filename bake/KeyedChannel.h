@@ -22,9 +22,6 @@ struct KeyedChannel {
 std::optional<KeyedChannel> FindKeys(const scene::Scene& scene, scene::NodeId node,
                                      std::string_view attribute, const motion::Measures& measures);
 
-// Whether the curve differs from straight lines between its keys, where these are more than a frame apart.
-bool IsCurvedBetweenFrames(const motion::CurveData& curve, double framesPerSecond);
-
 // The node's own name between quotes, harmless on a terminal; of a very long one the beginning.
 std::string ShownNode(const scene::Scene& scene, scene::NodeId node);
 

@@ -4,7 +4,9 @@
 
 #include "bake/KeyedChannel.h"
 #include "bake/Loss.h"
+#include "diag/Fill.h"
 #include "scene/Attributes.h"
+#include "scene/SpecialNames.h"
 
 namespace bake {
 namespace {
@@ -40,7 +42,7 @@ char StrangeByte(std::string_view line) {
 Loss Reading(const scene::Scene& scene, diag::Collector* diagnostics, std::uint32_t line) {
   const diag::Range place = LineRange(scene.text(), line);
   const auto loss = [&](const char* what) {
-    return Loss{.sentence = std::string(what) + " ends the import", .place = place};
+    return Loss{.sentence = diag::Fill("{0} ends the import", {what}), .place = place};
   };
   for (const diag::Diagnostic& one : diagnostics->kept()) {
     if (one.place.line != line) continue;
@@ -65,7 +67,7 @@ Loss End(const scene::Scene& scene, diag::Collector* diagnostics) {
     if (one.code == diag::Code::OpenString) what = "a string without its closing quote";
     if (one.code == diag::Code::OpenComment) what = "a comment without its end";
     if (one.code == diag::Code::CommandCutOff) what = "a command that the file cuts off";
-    if (what != nullptr) return {.sentence = std::string(what) + " ends the import", .place = one.range};
+    if (what != nullptr) return {.sentence = diag::Fill("{0} ends the import", {what}), .place = one.range};
   }
   const std::string_view text = scene.text();
   const std::size_t feed = text.find_last_of("\r\n");
@@ -80,7 +82,7 @@ Loss End(const scene::Scene& scene, diag::Collector* diagnostics) {
 NodeId TransformOf(const scene::Scene& scene, std::string_view layer) {
   for (NodeId id = 0; id < scene.nodes().size(); ++id) {
     const scene::Node& node = scene.node(id);
-    if (node.name != layer || node.origin != scene::Origin::Created) continue;
+    if (scene::ImportName(scene, node) != layer || node.origin != scene::Origin::Created) continue;
     return node.type.ends_with("amera") ? node.parent : id;
   }
   return scene::kNoNode;
@@ -95,12 +97,13 @@ std::optional<Loss> UnequalKeys(const scene::Scene& scene, NodeId node, const mo
     if (!first) {
       first = std::move(channel);
     } else if (channel->curve.keys.size() != first->curve.keys.size()) {
-      const auto keysOn = [](const KeyedChannel& one) {
-        return std::to_string(one.curve.keys.size()) + " keys on " + std::string(one.attribute);
-      };
-      return Loss{.sentence = ShownNode(scene, node) + " has " + keysOn(*first) + " and " + keysOn(*channel) +
-                              ": different numbers of keys end the import",
-                  .place = scene.node(channel->node).place};
+      return Loss{
+          .sentence = diag::Fill("{0} has {1} keys on {2} and {3} keys on {4}: different numbers of "
+                                 "keys end the import",
+                                 {ShownNode(scene, node), std::to_string(first->curve.keys.size()),
+                                  std::string(first->attribute), std::to_string(channel->curve.keys.size()),
+                                  std::string(channel->attribute)}),
+          .place = scene.node(channel->node).place};
     }
   }
   return std::nullopt;

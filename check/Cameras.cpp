@@ -13,9 +13,6 @@ namespace {
 constexpr std::array<std::string_view, 4> kTransformTypes = {"transform", "stereoRigTransform", "lookAt",
                                                              "aimConstraint"};
 
-// With its quotes a name has fewer bytes than this.
-constexpr std::size_t kQuotedName = 255;
-
 char Lower(char c) { return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c; }
 
 std::string Lowered(std::string_view name) {
@@ -46,14 +43,6 @@ bool SameName(std::string_view a, std::string_view b) {
 bool IsImportedTransform(std::string_view type) {
   return std::any_of(kTransformTypes.begin(), kTransformTypes.end(),
                      [type](std::string_view one) { return SameName(one, type); });
-}
-
-std::string_view ImportName(const scene::Scene& scene, const scene::Node& node) {
-  const std::string_view text = scene.text();
-  const auto [offset, length] = node.place;
-  if (node.origin != scene::Origin::Created || offset == 0 || offset + length >= text.size()) return {};
-  if (text[offset - 1] != '"' || text[offset + length] != '"' || length + 2 >= kQuotedName) return {};
-  return text.substr(offset, length);
 }
 
 std::vector<Camera> FindCameras(const scene::Scene& scene, const CameOver& cameOver) {

@@ -7,6 +7,7 @@
 
 #include "check/CameOver.h"
 #include "scene/Scene.h"
+#include "scene/SpecialNames.h"
 
 namespace check {
 
@@ -20,9 +21,7 @@ struct Camera {
 // Each camera that the file creates, in its order.
 std::vector<Camera> FindCameras(const scene::Scene& scene, const CameOver& cameOver);
 
-// The name by which the importer knows a node: as createNode has it, in quotes. Empty for any other node, and
-// for one whose name is too long for the importer.
-std::string_view ImportName(const scene::Scene& scene, const scene::Node& node);
+using scene::ImportName;
 
 // Whether the importer keeps nodes of the type as transforms.
 bool IsImportedTransform(std::string_view type);

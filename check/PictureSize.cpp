@@ -64,7 +64,8 @@ void ReportPicture(const Subject& subject) {
                                settings.centimetersPerUnit.place.value_or(diag::Range{}),
                                {subject.scene.linearUnit().word});
   }
-  if (!subject.cameOver.composition) return;
+  // A composition without a layer shows nothing that could look otherwise.
+  if (!subject.cameOver.composition || subject.cameOver.layers.empty()) return;
   const CameOverComposition& composition = *subject.cameOver.composition;
   CompareSize(subject, composition);
   CompareRate(subject, composition.framesPerSecond);

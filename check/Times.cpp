@@ -11,6 +11,7 @@
 #include "check/Curves.h"
 #include "check/RulesInternal.h"
 #include "check/Times.h"
+#include "motion/BetweenKeys.h"
 #include "motion/Curve.h"
 #include "motion/CurveReader.h"
 #include "scene/Attributes.h"
@@ -24,9 +25,6 @@ using scene::NodeId;
 
 // A time of a composition is a thousand times the frame, in 31 bits.
 constexpr double kLastFrame = 2147483.647;
-
-// More frames of one curve are not looked at.
-constexpr double kMostFrames = 100'000;
 
 // Units of time that count frames for the importer: the first key of a node lands at time 0.
 constexpr std::array<std::string_view, 6> kFrameUnits = {"film", "pal", "ntsc", "show", "palf", "ntscf"};
@@ -48,37 +46,13 @@ std::optional<NodeKeys> KeysOf(NodeId node, std::span<const KeyedChannel> channe
   return keys;
 }
 
-// Whether a straight way from key to key leaves the curve at some frame.
-bool IsCurved(const Subject& subject, const KeyedChannel& channel) {
+// Whether the import goes another way between the keys than the scene.
+bool LosesItsWay(const Subject& subject, const KeyedChannel& channel) {
   const motion::Curve curve(motion::ReadCurve(subject.scene, channel.curve, subject.measures));
-  const std::vector<motion::CurveKey>& keys = curve.Data().keys;
   const double rate = subject.measures.framesPerSecond / motion::UnitsPerFrame(subject.scene);
-  motion::CurveCursor cursor;
-  double looked = 0.0;
-  for (std::size_t i = 0; i + 1 < keys.size() && looked < kMostFrames; ++i) {
-    const motion::CurveKey& from = keys[i];
-    const motion::CurveKey& to = keys[i + 1];
-    const double tolerance = 1e-6 * (1.0 + std::fabs(from.value) + std::fabs(to.value));
-    for (double frame = std::floor(from.time * rate + 1e-6) + 1.0; frame < to.time * rate - 1e-6; ++frame) {
-      if (++looked > kMostFrames) break;
-      const double part = (frame / rate - from.time) / (to.time - from.time);
-      const double straight = from.value + part * (to.value - from.value);
-      if (std::fabs(curve.At(frame / rate, &cursor) - straight) > tolerance) return true;
-    }
-  }
-  return false;
-}
-
-// Whether the node turns by half a turn or more from one key to the next: the import takes the shorter way.
-bool TurnsFar(const Subject& subject, const KeyedChannel& channel) {
-  if (!channel.channel.starts_with("rotate")) return false;
-  const std::vector<motion::CurveKey> keys =
-      motion::ReadCurve(subject.scene, channel.curve, subject.measures).keys;
+  if (motion::IsCurvedAtFrames(curve, rate)) return true;
   const double halfTurn = std::numbers::pi / subject.measures.radians;
-  for (std::size_t i = 1; i < keys.size(); ++i) {
-    if (std::fabs(keys[i].value - keys[i - 1].value) >= halfTurn) return true;
-  }
-  return false;
+  return channel.channel.starts_with("rotate") && motion::TurnsFarBetweenFrames(curve.Data(), halfTurn, rate);
 }
 
 bool SameTimes(const Subject& subject, const KeyedChannel& a, const KeyedChannel& b) {
@@ -121,7 +95,7 @@ void ReportKeys(const Subject& subject, const NodeKeys& keys) {
     return found == keys.channels.end() ? nullptr : &*found;
   };
   const KeyedChannel* bad = first([&](const KeyedChannel& channel) {
-    return channel.keys > 1 && !channel.whole && (IsCurved(subject, channel) || TurnsFar(subject, channel));
+    return channel.keys > 1 && !channel.whole && LosesItsWay(subject, channel);
   });
   if (bad == nullptr) bad = TakesOtherTimes(subject, keys);
   if (bad != nullptr) {

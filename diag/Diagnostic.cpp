@@ -1,33 +1,32 @@
 #include "diag/Diagnostic.h"
 
-#include <fmt/args.h>
 #include <fmt/format.h>
 
 #include <algorithm>
 #include <cstddef>
 
+#include "diag/Fill.h"
 #include "diag/ShownText.h"
 
 namespace diag {
 namespace {
 
-// Puts the arguments in the places of {0}, {1} …; a missing one shows as nothing.
-std::string Fill(std::string_view text, const Diagnostic& diagnostic) {
-  const std::vector<std::string>& arguments = diagnostic.arguments;
-  fmt::dynamic_format_arg_store<fmt::format_context> shown;
-  const std::size_t count = std::max(arguments.size(), ArgumentCount(EntryOf(diagnostic.code)));
-  for (std::size_t i = 0; i < count; ++i)
-    shown.push_back(i < arguments.size() ? ShownText(arguments[i]) : "");
-  return fmt::vformat(text, shown);
+// A missing argument shows as nothing.
+std::string FilledBy(const Diagnostic& diagnostic, std::string_view text) {
+  std::vector<std::string> arguments = diagnostic.arguments;
+  arguments.resize(std::max(arguments.size(), ArgumentCount(EntryOf(diagnostic.code))));
+  return Fill(text, arguments);
 }
 
 }  // namespace
 
 std::string SentenceOf(const Diagnostic& diagnostic) {
-  return Fill(EntryOf(diagnostic.code).sentence, diagnostic);
+  return FilledBy(diagnostic, EntryOf(diagnostic.code).sentence);
 }
 
-std::string HelpOf(const Diagnostic& diagnostic) { return Fill(EntryOf(diagnostic.code).help, diagnostic); }
+std::string HelpOf(const Diagnostic& diagnostic) {
+  return FilledBy(diagnostic, EntryOf(diagnostic.code).help);
+}
 
 bool IsOfWholeFile(const Diagnostic& diagnostic) { return diagnostic.range == Range{}; }
 

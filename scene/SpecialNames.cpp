@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <array>
+#include <cstddef>
 
 namespace scene {
 
@@ -14,6 +15,16 @@ bool IsMarked(std::string_view name) {
   constexpr std::array<std::string_view, 3> kMarks = {"null", "NULL", "Null"};
   return std::any_of(kMarks.begin(), kMarks.end(),
                      [name](std::string_view mark) { return name.find(mark) != std::string_view::npos; });
+}
+
+std::string_view ImportName(const Scene& scene, const Node& node) {
+  // With its quotes a name has fewer bytes than this.
+  constexpr std::size_t kQuotedName = 255;
+  const std::string_view text = scene.text();
+  const auto [offset, length] = node.place;
+  if (node.origin != Origin::Created || offset == 0 || offset + length >= text.size()) return {};
+  if (text[offset - 1] != '"' || text[offset + length] != '"' || length + 2 >= kQuotedName) return {};
+  return text.substr(offset, length);
 }
 
 }  // namespace scene

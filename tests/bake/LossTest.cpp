@@ -86,6 +86,14 @@ TEST(LossTest, ThePathBetweenFewKeysWithCurvedTangentsIsLost) {
   EXPECT_TRUE(reading.loss().comesWithBake);
 }
 
+TEST(LossTest, HalfATurnBetweenTwoKeysComesOverTurningTheShorterWay) {
+  EXPECT_EQ(
+      Lost(Scene("", "", CurveOf("animCurveTA", "c", "1 0 11 180", "shotCam.ry")), Whole()),
+      "\"shotCam\" turns by half a turn or more between two keys on rotateY, and comes over turning the "
+      "shorter way");
+  EXPECT_EQ(Lost(Scene("", "", CurveOf("animCurveTA", "c", "1 0 11 179", "shotCam.ry")), Whole()), "");
+}
+
 TEST(LossTest, ASingleKeyIsLostUnlessItIsTheStoredValue) {
   const std::string key =
       "createNode animCurveTL -n \"c\";\n\tsetAttr \".ktv[0]\" 1 7;\nconnectAttr \"c.o\" \"shotCam.ty\";\n";
@@ -293,6 +301,12 @@ TEST(LossTest, NamesAreHarmlessAndShort) {
   const std::string name = "\x1b[31m" + std::string(300, 'x');
   const std::string sentence = Lost("createNode camera -n \"" + name + "\";\n", {});
   EXPECT_EQ(sentence, "the camera \"\\x1b[31m" + std::string(95, 'x') + "...\" does not come over");
+}
+
+TEST(LossTest, ALayerHasTheNameAsItIsWritten) {
+  bake::CameOver import = Whole(0);
+  import.cameras[0].name = "a\\\"b";
+  EXPECT_EQ(Lost("createNode camera -n \"a\\\"b\";\n" + std::string(kResolution), import), "");
 }
 
 TEST(LossTest, AByteThatEndsTheReadingIsExplainedByItsLine) {

@@ -3,10 +3,7 @@
 #include <algorithm>
 #include <cstdio>
 #include <new>
-#include <optional>
 
-#include "bake/Loss.h"
-#include "diag/Collector.h"
 #include "hostapi/ErrorCodes.h"
 #include "hostapi/LayerStreams.h"
 #include "scene/Scene.h"
@@ -85,16 +82,6 @@ std::string_view lastLayer(const refhost::Folder* folder) {
   return last == nullptr ? std::string_view() : std::string_view(last->name);
 }
 
-std::optional<bake::Loss> lossOf(const SceneReport& report, const scene::Scene& scene,
-                                 diag::Collector* collector) {
-  const refhost::CallbackResult& result = report.result;
-  if (const auto stop = stopOf(result)) {
-    return bake::FindStop(scene, collector, *stop, static_cast<std::uint32_t>(result.line),
-                          lastLayer(result.folder));
-  }
-  return bake::FindLoss(scene, result.folder == nullptr ? bake::CameOver() : cameOver(*result.folder));
-}
-
 std::string commandOf(const bake::Loss& loss, const std::string& path, const BakingCommand& command) {
   const char* locators = loss.comesWithAllLocators ? " --locators all " : " ";
   return command.before + locators + shellWord(path) + command.after;
@@ -107,7 +94,7 @@ bool say(const SceneReport& report, const BakingCommand& command, Diagnostics& d
   if (text == nullptr) return true;
   diag::Collector collector(text->text());
   const scene::Scene scene = scene::Read(text->text(), collector);
-  const auto loss = lossOf(report, scene, &collector);
+  const auto loss = lossOf(report.result, scene, &collector);
   if (!loss) return true;
   std::string line = loss->sentence;
   if (loss->place)
@@ -118,6 +105,15 @@ bool say(const SceneReport& report, const BakingCommand& command, Diagnostics& d
 }
 
 }  // namespace
+
+std::optional<bake::Loss> lossOf(const refhost::CallbackResult& result, const scene::Scene& scene,
+                                 diag::Collector* collector) {
+  if (const auto stop = stopOf(result)) {
+    return bake::FindStop(scene, collector, *stop, static_cast<std::uint32_t>(result.line),
+                          lastLayer(result.folder));
+  }
+  return bake::FindLoss(scene, result.folder == nullptr ? bake::CameOver() : cameOver(*result.folder));
+}
 
 bool closeWithLoss(const SceneReport& report, bool quiet, const BakingCommand& command,
                    Diagnostics& diagnostics) {

@@ -1,9 +1,14 @@
 // What an import or export says last about a scene: what did not come over, and the command to run.
 #pragma once
 
+#include <optional>
 #include <string>
 #include <string_view>
 
+#include "bake/Loss.h"
+#include "diag/Collector.h"
+#include "refhost/Host.h"
+#include "scene/Scene.h"
 #include "tools/mayascene/Diagnostics.h"
 #include "tools/mayascene/Report.h"
 
@@ -22,6 +27,11 @@ struct BakingCommand {
 // False where something did not come over, and where the memory is too small to know.
 bool closeWithLoss(const SceneReport& report, bool quiet, const BakingCommand& command,
                    Diagnostics& diagnostics);
+
+// The first thing of the scene that the import of this result did not bring; none where all came over. The
+// collector is that of the reading of the scene.
+std::optional<bake::Loss> lossOf(const refhost::CallbackResult& result, const scene::Scene& scene,
+                                 diag::Collector* collector);
 
 // A word of a command, as a shell takes it: what a terminal would act on, and bytes that are no text, are
 // escaped.
