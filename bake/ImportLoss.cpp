@@ -1,4 +1,6 @@
 // Finds what an import did not bring, although it ended without an error.
+#include <algorithm>
+#include <array>
 #include <cmath>
 #include <numbers>
 #include <string>
@@ -188,6 +190,27 @@ class LossSearch {
            scene_.Number(node, attribute).value_or(0.0) != 0.0;
   }
 
+  bool Turns(NodeId node, std::string_view attribute) {
+    const motion::NumberId number = evaluator_.Number(node, attribute);
+    evaluator_.MoveTo(0.0);
+    return evaluator_.Moves(number) || evaluator_.Value(number) != 0.0;
+  }
+
+  // Whether the node turns about two axes in another sequence than the import.
+  bool TurnsInOtherOrder(NodeId node) {
+    constexpr std::array<std::string_view, 6> kOrders = {"XYZ", "YZX", "ZXY", "XZY", "YXZ", "ZYX"};
+    if (!IsSet(node, "rotateOrder")) return false;
+    const double number = scene_.Number(node, "rotateOrder").value_or(0.0);
+    // A driven order may be any.
+    const std::string_view order =
+        number >= 1.0 && number < 6.0 ? kOrders[static_cast<std::size_t>(number)] : kOrders.back();
+    std::string turns;
+    for (const char axis : order) {
+      if (Turns(node, std::string("rotate") + axis)) turns += axis;
+    }
+    return !std::is_sorted(turns.begin(), turns.end());
+  }
+
   // Checks the parts of a transform that an import does not read.
   void LookAtForm(NodeId node) {
     if (found_) return;
@@ -198,8 +221,7 @@ class LossSearch {
     if (!Inherits(scene_, node) && transform.parent != scene::kNoNode) {
       return lose("the independence from what stands above");
     }
-    const int turning = IsSet(node, "rotateX") + IsSet(node, "rotateY") + IsSet(node, "rotateZ");
-    if (turning > 1 && IsSet(node, "rotateOrder")) return lose("the rotate order");
+    if (TurnsInOtherOrder(node)) return lose("the rotate order");
     struct Part {
       const char* shown;
       std::array<std::string_view, 3> attributes;

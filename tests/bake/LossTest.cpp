@@ -177,8 +177,10 @@ TEST(LossTest, AFocalLengthThatIsPassedOnIsLost) {
 TEST(LossTest, TheFormsOfATransformThatTheImportDoesNotLookAtAreLost) {
   const std::string turned = "\tsetAttr \".r\" -type \"double3\" 10 20 0 ;\n";
   const auto lost = [](const std::string& text) { return Lost(Scene(text), Whole(0)); };
-  EXPECT_EQ(lost(turned + "\tsetAttr \".ro\" 2;\n"), "the rotate order of \"shotCam\" does not come over");
+  EXPECT_EQ(lost(turned + "\tsetAttr \".ro\" 1;\n"), "the rotate order of \"shotCam\" does not come over");
+  EXPECT_EQ(lost(turned + "\tsetAttr \".ro\" 2;\n"), "");  // x before y there, too
   EXPECT_EQ(lost("\tsetAttr \".r\" -type \"double3\" 10 0 0 ;\n\tsetAttr \".ro\" 2;\n"), "");
+  EXPECT_EQ(lost("\tsetAttr \".r\" -type \"double3\" 10 0 20 ;\n\tsetAttr \".ro\" 3;\n"), "");
   EXPECT_EQ(lost("\tsetAttr \".ra\" -type \"double3\" 0 0 9 ;\n"),
             "the rotate axis of \"shotCam\" does not come over");
   EXPECT_EQ(lost("\tsetAttr \".rpt\" -type \"double3\" 0 0 9 ;\n"),
