@@ -49,10 +49,8 @@ class LossSearch {
     for (auto one = import_.cameras.rbegin(); one != import_.cameras.rend(); ++one) {
       byName[one->name].push_back(&*one);
     }
-    bool any = false;
     for (NodeId id = 0; id < scene_.nodes().size() && !found_; ++id) {
       if (!IsSetUp(scene_, id)) continue;
-      any = true;
       auto& layers = byName[scene::ImportName(scene_, scene_.node(id))];
       if (layers.empty()) {
         Lose(scene_.node(id).place, "the camera {0} does not come over", {ShownNode(scene_, id)});
@@ -61,7 +59,7 @@ class LossSearch {
       LookAtCamera(id, *layers.back());
       layers.pop_back();
     }
-    if (any && !found_) LookAtPicture();
+    if (import_.layers != 0 && !found_) LookAtPicture();
     if (!found_ && import_.layers == 0) LookAtLocators();
     return found_ ? found_ : unmended_;
   }
@@ -91,6 +89,10 @@ class LossSearch {
         return LoseForGood(scene_.node(camera).place,
                            "the camera {0} stands under {1}, which is in another file",
                            {ShownNode(scene_, camera), ShownNode(scene_, node)});
+      }
+      if (scene_.node(node).type == "joint") {
+        return Lose(scene_.node(node).place, "the place of {0} does not come over",
+                    {ShownNode(scene_, node)});
       }
       LookAtPlace(node, own ? layer.keys : layer.above[step - 1].keys, own && layer.aimed);
       LookAtForm(node);
@@ -240,7 +242,6 @@ class LossSearch {
       }
     }
     if (scene_.Written(node, "offsetParentMatrix")) return lose("the offset parent matrix");
-    if (transform.type == "joint") lose("the place");
   }
 
   void LookAtLens(NodeId camera, const CameOver::Camera& layer) {
@@ -281,8 +282,9 @@ class LossSearch {
     LookAtDriver(camera, attribute, false);
   }
 
-  // The first key of each node lands at time 0.
+  // In a unit that counts frames the first key of each node lands at time 0.
   void KeepFirstKey(NodeId node, double seconds) {
+    if (!scene::CountsFrames(scene_.timeUnit().word)) return;
     if (!firstKey_) {
       firstKey_ = seconds;
     } else if (Differ(*firstKey_, seconds)) {
@@ -320,8 +322,12 @@ class LossSearch {
     for (NodeId id = 0; id < scene_.nodes().size(); ++id) {
       const scene::Node& node = scene_.node(id);
       if (node.type != "locator" || node.origin != scene::Origin::Created) continue;
-      Lose(node.place, "the locator {0} has no \"null\" in its name", {ShownNode(scene_, id)});
-      found_->comesWithAllLocators = true;
+      const bool marked = scene::IsMarked(scene::ImportName(scene_, node));
+      Lose(node.place,
+           marked ? "the locator {0} does not come over without a camera"
+                  : "the locator {0} has no \"null\" in its name",
+           {ShownNode(scene_, id)});
+      found_->comesWithBake = false;  // without a camera an import takes nothing of a bake either
       return;
     }
   }

@@ -13,10 +13,9 @@
 namespace bake {
 
 struct Loss {
-  std::string sentence;               // without a full stop; harmless on a terminal
-  std::optional<diag::Range> place;   // none: it has no place in the file
-  bool comesWithBake = true;          // a bake of the scene brings it
-  bool comesWithAllLocators = false;  // only a bake with all locators brings it
+  std::string sentence;              // without a full stop; harmless on a terminal
+  std::optional<diag::Range> place;  // none: it has no place in the file
+  bool comesWithBake = true;         // a bake of the scene brings it
 };
 
 // The result of an import, as far as FindLoss needs it. The names are those of the layers, which must outlive

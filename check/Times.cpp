@@ -15,6 +15,7 @@
 #include "motion/Curve.h"
 #include "motion/CurveReader.h"
 #include "scene/Attributes.h"
+#include "scene/SpecialNames.h"
 #include "text/Numbers.h"
 
 namespace check {
@@ -25,9 +26,6 @@ using scene::NodeId;
 
 // A time of a composition is a thousand times the frame, in 31 bits.
 constexpr double kLastFrame = 2147483.647;
-
-// Units of time that count frames for the importer: the first key of a node lands at time 0.
-constexpr std::array<std::string_view, 6> kFrameUnits = {"film", "pal", "ntsc", "show", "palf", "ntscf"};
 
 // The keys of one node as the importer takes them.
 struct NodeKeys {
@@ -168,12 +166,7 @@ std::optional<motion::FrameEnds> PlayedFrames(const scene::Scene& scene, const s
   return motion::FrameEnds{played.first / unitsPerFrame, played.last / unitsPerFrame};
 }
 
-bool CountsFrames(const scene::Scene& scene) {
-  const std::string_view unit = scene.timeUnit().word;
-  if (!unit.empty() && unit.front() >= '0' && unit.front() <= '9') return true;
-  return std::any_of(kFrameUnits.begin(), kFrameUnits.end(),
-                     [unit](std::string_view one) { return SameName(one, unit); });
-}
+bool CountsFrames(const scene::Scene& scene) { return scene::CountsFrames(scene.timeUnit().word); }
 
 std::optional<double> FirstKey(const Subject& subject, const Camera& camera) {
   std::optional<double> first;

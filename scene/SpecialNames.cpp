@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <array>
 #include <cstddef>
+#include <string>
 
 namespace scene {
 
@@ -25,6 +26,14 @@ std::string_view ImportName(const Scene& scene, const Node& node) {
   if (node.origin != Origin::Created || offset == 0 || offset + length >= text.size()) return {};
   if (text[offset - 1] != '"' || text[offset + length] != '"' || length + 2 >= kQuotedName) return {};
   return text.substr(offset, length);
+}
+
+bool CountsFrames(std::string_view timeUnit) {
+  constexpr std::array<std::string_view, 6> kFrameUnits = {"film", "pal", "ntsc", "show", "palf", "ntscf"};
+  if (!timeUnit.empty() && timeUnit.front() >= '0' && timeUnit.front() <= '9') return true;
+  std::string lowered(timeUnit);
+  for (char& c : lowered) c = c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
+  return std::find(kFrameUnits.begin(), kFrameUnits.end(), lowered) != kFrameUnits.end();
 }
 
 }  // namespace scene

@@ -17,4 +17,8 @@ bool IsMarked(std::string_view name);
 // for one whose name is too long for the importer.
 std::string_view ImportName(const Scene& scene, const Node& node);
 
+// Whether the importer counts frames in a unit of time: the first key of each node then lands at time 0. In
+// any other unit, such as "sec" or "game", keys keep their times.
+bool CountsFrames(std::string_view timeUnit);
+
 }  // namespace scene

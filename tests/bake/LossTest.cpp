@@ -233,6 +233,10 @@ TEST(LossTest, NodesThatAreKeyedFromDifferentFramesAreLost) {
       Lost(Scene("", "", place + lens), Whole(2, 2)),
       "the keys of \"shotCamShape\" begin at another frame than those below, and come over at the same");
   EXPECT_EQ(Lost(Scene("", "", lens), Whole(0, 2)), "");
+  std::string clock = Scene("", "", place + lens);
+  clock.replace(clock.find("film"), 4, "game");
+  EXPECT_EQ(Lost(clock, Whole(2, 2)),
+            "the rate of 15 frames a second comes over as 24");  // keys keep their times
   EXPECT_EQ(Lost(Scene("", "", lens), Whole(0, 0)), "no key of \"shotCamShape\" on focalLength comes over");
 }
 
@@ -295,8 +299,10 @@ TEST(LossTest, LocatorsWithoutAMarkAreSaidWhereNothingElseComesOver) {
   const std::string locator = "createNode transform -n \"l\";\ncreateNode locator -n \"lShape\" -p \"l\";\n";
   Reading reading(locator);
   EXPECT_EQ(reading.Lost({}), "the locator \"lShape\" has no \"null\" in its name");
-  EXPECT_TRUE(reading.loss().comesWithAllLocators);
+  EXPECT_FALSE(reading.loss().comesWithBake);
   EXPECT_EQ(Lost(Scene("", "", locator), Whole(0)), "");
+  EXPECT_EQ(Lost("createNode locator -n \"a_null\";\n", {}),
+            "the locator \"a_null\" does not come over without a camera");
 }
 
 TEST(LossTest, NamesAreHarmlessAndShort) {

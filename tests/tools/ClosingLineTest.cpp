@@ -155,13 +155,13 @@ TEST_F(ClosingLine, NamesTheCameraWhoseKeysStopTheImport) {
                         "different numbers of keys end the import. To bring it over: "));
 }
 
-TEST_F(ClosingLine, LocatorsWithoutAMarkHaveACommandOfTheirOwn) {
+TEST_F(ClosingLine, LocatorsWithoutACameraHaveNoCommandForNoneBringsThem) {
   write("points.ma",
         sceneText("createNode transform -n \"p\";\ncreateNode locator -n \"pShape\" -p \"p\";\n"));
   const ToolResult result = run({"import", "points.ma"});
-  EXPECT_THAT(result.err, EndsWith("mayascene import --bake --locators all points.ma\n"));
-  EXPECT_THAT(run({"bake", "--locators", "all", "-q", "points.ma", "-o", "-"}).out,
-              HasSubstr("createNode locator"));
+  EXPECT_THAT(result.err, EndsWith("the locator \"pShape\" has no \"null\" in its name\n"));
+  EXPECT_THAT(run({"import", "--bake", "--locators", "all", "points.ma"}).out,
+              HasSubstr("nothing to import, the scene has no cameras"));
 }
 
 // What a user copies from the terminal is what runs: the shell gives back the name to the byte.

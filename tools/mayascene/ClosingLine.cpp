@@ -82,9 +82,8 @@ std::string_view lastLayer(const refhost::Folder* folder) {
   return last == nullptr ? std::string_view() : std::string_view(last->name);
 }
 
-std::string commandOf(const bake::Loss& loss, const std::string& path, const BakingCommand& command) {
-  const char* locators = loss.comesWithAllLocators ? " --locators all " : " ";
-  return command.before + locators + shellWord(path) + command.after;
+std::string commandOf(const std::string& path, const BakingCommand& command) {
+  return command.before + ' ' + shellWord(path) + command.after;
 }
 
 // Whether there was nothing to say.
@@ -99,7 +98,7 @@ bool say(const SceneReport& report, const BakingCommand& command, Diagnostics& d
   std::string line = loss->sentence;
   if (loss->place)
     line.insert(0, "line " + std::to_string(collector.lines().At(loss->place->offset).line) + ": ");
-  if (loss->comesWithBake) line += ". To bring it over: " + commandOf(*loss, report.path, command);
+  if (loss->comesWithBake) line += ". To bring it over: " + commandOf(report.path, command);
   diagnostics.close(report.path, line);
   return false;
 }
