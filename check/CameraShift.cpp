@@ -42,6 +42,10 @@ CameraShift::CameraShift(const Subject& subject, const Camera& camera, motion::E
       imported_(subject.cameOver, *camera.layer, UnitOf(subject)),
       start_(StartOf(subject, camera)) {}
 
+bool CameraShift::Moves() const {
+  return evaluator_.Moves(world_) || lens_.Moves() || interests_.Moves(interest_) || imported_.Moves();
+}
+
 // The points of the scene's picture at the frame, and where the import shows them.
 void CameraShift::TakeIn(double frame, double time) {
   const Matrix& place = evaluator_.Value(world_);

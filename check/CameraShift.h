@@ -20,6 +20,9 @@ class CameraShift {
 
   const Camera& camera() const { return camera_; }
 
+  // Whether its place, its lens or its layers can change from frame to frame.
+  bool Moves() const;
+
   // How many layers the import's picture depends on.
   std::size_t layers() const { return imported_.layers(); }
 

@@ -133,6 +133,7 @@ void RunRules(const CameOver& cameOver, const Options& options, const scene::Sce
       anyLayer ? FindMarkedLocators(scene) : std::vector<scene::NodeId>();
   const std::vector<Link> links = FindLinks(scene, cameras, locators);
   Channels channels(scene);
+  CurveShapes shapes(scene, measures);
   std::set<std::uint64_t> driversSaid;
   const Subject subject{.scene = scene,
                         .settings = settings,
@@ -142,6 +143,7 @@ void RunRules(const CameOver& cameOver, const Options& options, const scene::Sce
                         .locators = locators,
                         .links = links,
                         .channels = channels,
+                        .shapes = shapes,
                         .diagnostics = *collector,
                         .driversSaid = options.only.empty() ? &driversSaid : nullptr};
   ReportNodeNotes(subject, notes);

@@ -72,7 +72,16 @@ std::span<const KeyedChannel> Channels::LensOf(scene::NodeId camera) {
       ->second.keyed;
 }
 
-Channels::Found Channels::Find(scene::NodeId node, std::span<const std::string_view> channels) const {
+const KeyedChannel& Channels::KeysOf(scene::NodeId curve) {
+  const auto [known, isNew] = curves_.try_emplace(curve);
+  if (isNew) {
+    known->second.curve = curve;
+    ReadKeys(scene_, unitsPerFrame_, &known->second);
+  }
+  return known->second;
+}
+
+Channels::Found Channels::Find(scene::NodeId node, std::span<const std::string_view> channels) {
   const std::vector<const scene::Connection*> into = scene_.ConnectionsInto(node);
   // A channel can be driven by its own name, or by that of the whole: "rotateX" or "rotate".
   const auto isDriven = [&into](std::string_view channel) {
@@ -88,9 +97,8 @@ Channels::Found Channels::Find(scene::NodeId node, std::span<const std::string_v
     found.drivers.push_back({channel, *driver});
     if (!IsImportedCurve(scene_.node(driver->plug.node).type)) continue;
     if (IsPath(scene_, driver->connection->destinationPlace)) continue;
-    KeyedChannel keyed{.channel = channel, .curve = driver->plug.node, .place = {}};
-    ReadKeys(scene_, unitsPerFrame_, &keyed);
-    found.keyed.push_back(keyed);
+    found.keyed.push_back(KeysOf(driver->plug.node));
+    found.keyed.back().channel = channel;
   }
   return found;
 }

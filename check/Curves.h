@@ -52,12 +52,14 @@ class Channels {
   };
 
   const Found& Of(scene::NodeId node);
-  Found Find(scene::NodeId node, std::span<const std::string_view> channels) const;
+  Found Find(scene::NodeId node, std::span<const std::string_view> channels);
+  const KeyedChannel& KeysOf(scene::NodeId curve);
 
   const scene::Scene& scene_;
   double unitsPerFrame_;
   std::unordered_map<scene::NodeId, Found> places_;
   std::unordered_map<scene::NodeId, Found> lenses_;
+  std::unordered_map<scene::NodeId, KeyedChannel> curves_;  // of no channel
 };
 
 // Whether the importer makes a curve of the type.

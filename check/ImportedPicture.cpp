@@ -71,6 +71,15 @@ ImportedPicture::ImportedPicture(const CameOver& cameOver, const CameOverLayer& 
   }
 }
 
+bool ImportedPicture::Moves() const {
+  return std::any_of(chain_.begin(), chain_.end(), [](const CameOverLayer* layer) {
+    const auto streams = {&layer->position, &layer->scale,    &layer->rotateX, &layer->rotateY,
+                          &layer->rotateZ,  &layer->interest, &layer->zoom};
+    return std::any_of(streams.begin(), streams.end(),
+                       [](const CameOverStream* stream) { return stream->times.size() > 1; });
+  });
+}
+
 void ImportedPicture::MoveTo(double seconds) {
   Matrix world;
   for (const CameOverLayer* const layer : chain_) world = world * LocalOf(*layer, seconds, unit_);

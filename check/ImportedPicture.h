@@ -21,6 +21,9 @@ class ImportedPicture {
   // Where a point of the scene's world lands. False where it is not in front of the camera.
   bool Project(const motion::Vector& point, motion::PicturePoint* landed) const;
 
+  // Whether a property of a layer has keys.
+  bool Moves() const;
+
   // How many layers its place depends on.
   std::size_t layers() const { return chain_.size(); }
 

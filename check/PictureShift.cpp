@@ -17,7 +17,7 @@ namespace {
 
 // More frames of a scene, and more layers times frames of all cameras, are not looked at.
 constexpr double kMostFrames = 100'000;
-constexpr double kMostSteps = 4'000'000;
+constexpr double kMostSteps = 2'000'000;
 
 class Shifts {
  public:
@@ -83,9 +83,10 @@ class Shifts {
     frames_ = motion::FindFrameEnds(subject_.scene, PlayedFrames(subject_.scene, subject_.settings),
                                     evaluator_.computingNodes(), subject_.measures)
                   .value_or(motion::FrameEnds{});
-    const double count = frames_.last - frames_.first + 1.0;
+    const double all = frames_.last - frames_.first + 1.0;
     double steps = kMostSteps;
     for (CameraShift& camera : cameras_) {
+      const double count = camera.Moves() ? all : 1.0;
       const double cost = count * static_cast<double>(camera.layers());
       if (!(count <= kMostFrames)) {
         SayNotMeasured(camera.camera(), "the scene has more than 100000 frames");
@@ -115,7 +116,8 @@ class Shifts {
     }
   }
 
-  void MeasurePart(std::uint32_t part, const std::vector<std::size_t>& cameras) {
+  // Of what stands still one frame shows all.
+  void MeasurePart(std::uint32_t part, std::vector<std::size_t> cameras) {
     std::vector<double> frameOfInterest(interests_.partCount(), NAN);  // by part: where it stands
     for (double frame = frames_.first; frame <= frames_.last; ++frame) {
       const double time = frame * unitsPerFrame_;
@@ -126,6 +128,9 @@ class Shifts {
         frameOfInterest[interest] = frame;
         measured_[camera]->TakeIn(frame, time);
       }
+      if (frame != frames_.first) continue;
+      std::erase_if(cameras, [this](std::size_t camera) { return !measured_[camera]->Moves(); });
+      if (cameras.empty()) return;
     }
   }
 

@@ -10,6 +10,7 @@
 
 #include "check/CameOver.h"
 #include "check/Cameras.h"
+#include "check/CurveShapes.h"
 #include "check/Curves.h"
 #include "check/Links.h"
 #include "diag/Collector.h"
@@ -29,6 +30,7 @@ struct Subject {
   const std::vector<scene::NodeId>& locators;  // the marked ones, where any layer comes over
   const std::vector<Link>& links;
   Channels& channels;
+  CurveShapes& shapes;
   diag::Collector& diagnostics;
   // Where the connections stand of which a rule has said that the import does not follow the driver. Null:
   // what the evaluation says of the same connection is said, too.

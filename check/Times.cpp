@@ -2,7 +2,6 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
-#include <numbers>
 #include <optional>
 #include <span>
 #include <string>
@@ -11,8 +10,6 @@
 #include "check/Curves.h"
 #include "check/RulesInternal.h"
 #include "check/Times.h"
-#include "motion/BetweenKeys.h"
-#include "motion/Curve.h"
 #include "motion/CurveReader.h"
 #include "scene/Attributes.h"
 #include "scene/SpecialNames.h"
@@ -44,16 +41,8 @@ std::optional<NodeKeys> KeysOf(NodeId node, std::span<const KeyedChannel> channe
   return keys;
 }
 
-// Whether the import goes another way between the keys than the scene.
-bool LosesItsWay(const Subject& subject, const KeyedChannel& channel) {
-  const motion::Curve curve(motion::ReadCurve(subject.scene, channel.curve, subject.measures));
-  const double rate = subject.measures.framesPerSecond / motion::UnitsPerFrame(subject.scene);
-  if (motion::IsCurvedAtFrames(curve, rate)) return true;
-  const double halfTurn = std::numbers::pi / subject.measures.radians;
-  return channel.channel.starts_with("rotate") && motion::TurnsFarBetweenFrames(curve.Data(), halfTurn, rate);
-}
-
 bool SameTimes(const Subject& subject, const KeyedChannel& a, const KeyedChannel& b) {
+  if (a.curve == b.curve) return true;
   if (std::fabs(a.first - b.first) > 1e-3 || std::fabs(a.last - b.last) > 1e-3) return false;
   if (a.whole && b.whole) return true;
   const auto keysOf = [&](const KeyedChannel& channel) {
@@ -93,7 +82,9 @@ void ReportKeys(const Subject& subject, const NodeKeys& keys) {
     return found == keys.channels.end() ? nullptr : &*found;
   };
   const KeyedChannel* bad = first([&](const KeyedChannel& channel) {
-    return channel.keys > 1 && !channel.whole && LosesItsWay(subject, channel);
+    const bool turns = channel.channel.starts_with("rotate");
+    return channel.keys > 1 && !channel.whole &&
+           (subject.shapes.IsCurved(channel.curve) || (turns && subject.shapes.TurnsFar(channel.curve)));
   });
   if (bad == nullptr) bad = TakesOtherTimes(subject, keys);
   if (bad != nullptr) {

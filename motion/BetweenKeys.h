@@ -5,8 +5,7 @@
 
 namespace motion {
 
-// Whether the straight way from one key to the next leaves the curve at some whole frame. Only the first
-// 100,000 frames that lie between keys are looked at.
+// Whether the straight way from one key to the next leaves the curve at some whole frame.
 bool IsCurvedAtFrames(const Curve& curve, double framesPerSecond);
 
 // Whether the curve turns by half a turn or more from one key to the next, with a whole frame between them: a

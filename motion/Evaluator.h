@@ -84,8 +84,9 @@ class Evaluator {
   // Any frame after any other; ascending ones are fastest.
   void MoveTo(double frame);
 
-  // Divides what moves into parts that do not depend on each other. Returns, for each set of values, the part
-  // that computes it; kStill for a set that does not move. Valid until more values are asked for.
+  // Divides what the sets need and what moves into parts that do not depend on each other. Returns, for each
+  // set of values, the part that computes it; kStill for a set that does not move. Valid until more values
+  // are asked for.
   struct Wanted {
     std::vector<NumberId> numbers;
     std::vector<MatrixId> matrices;

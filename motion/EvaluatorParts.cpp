@@ -35,9 +35,11 @@ std::vector<std::uint32_t> Evaluator::Split(std::span<const Wanted> wanted) {
     }
   }
   std::vector<std::uint32_t> first(wanted.size(), kNone);  // by set: a step of it that moves
+  std::vector<bool> needed(steps_.size(), false);
   for (std::size_t set = 0; set < wanted.size(); ++set) {
     const auto take = [&](std::uint32_t step) {
       if (!moves(step)) return;
+      needed[step] = true;
       if (first[set] == kNone) first[set] = step;
       groups.Join(step, first[set]);
     };
@@ -56,9 +58,18 @@ std::vector<std::uint32_t> Evaluator::Split(std::span<const Wanted> wanted) {
     }
     parts[set] = part;
   }
+  // A step runs after those that it reads.
+  for (auto at = moving_.rbegin(); at != moving_.rend(); ++at) {
+    if (!needed[*at]) continue;
+    const Step& step = *steps_[*at];
+    for (std::size_t input = 0; input < step.numberInputs.size() + step.matrixInputs.size(); ++input) {
+      const std::uint32_t before = StepOfInput(step, input);
+      if (moves(before)) needed[before] = true;
+    }
+  }
   for (const std::uint32_t at : moving_) {
     const std::uint32_t part = partOfGroup[groups.Of(at)];
-    if (part != kStill) parts_[part].push_back(at);
+    if (part != kStill && needed[at]) parts_[part].push_back(at);
   }
   return parts;
 }

@@ -67,13 +67,20 @@ TEST(ShiftTest, KeysOfWhatDrivesTheCameraAreMeasured) {
 }
 
 TEST(ShiftTest, AllCamerasAreMeasuredOverTheSameFrames) {
-  // The second camera has no key; its picture stands still.
-  const std::string text = kHead + CameraOf("first") +
-                           CameraOf("second", "\tsetAttr \".rpt\" -type \"double3\" 3 0 0 ;\n") +
-                           kResolution + CurveOf("moveX", "1 0 2000000 5", "first.tx");
+  const std::string text = kHead + CameraOf("first") + CameraOf("second") + kResolution +
+                           CurveOf("moveX", "1 0 2000000 5", "first.tx") +
+                           CurveOf("secondX", "1 0 2 5", "second.tx");
   const Checked checked(text);
   EXPECT_EQ(checked.CountOf(Code::ShiftNotMeasured), 2u);
   EXPECT_EQ(checked.CountOf(Code::PictureShifts), 0u);
+}
+
+TEST(ShiftTest, ACameraThatStandsStillIsMeasuredAtOneFrame) {
+  const std::string moved = "\tsetAttr \".rpt\" -type \"double3\" 3 0 0 ;\n";
+  const Checked checked(kHead + CameraOf("still", moved) + kResolution + Playback(7, 2'000'000));
+  EXPECT_EQ(checked.CountOf(Code::ShiftNotMeasured), 0u);
+  const auto& arguments = checked.Only(Code::PictureShifts).diagnostic.arguments;
+  EXPECT_EQ(arguments[2], "7");
 }
 
 TEST(ShiftTest, TooManyFramesAreSaid) {
@@ -87,13 +94,14 @@ TEST(ShiftTest, TooManyFramesAreSaid) {
 }
 
 TEST(ShiftTest, TooManyFramesOfLayersAreSaidForTheCameraThatHasThem) {
-  // 41 layers above each other, at 100,000 frames. The other camera has one.
+  // 41 layers above each other, at 100,000 frames. The other camera has one layer.
   std::string text = kHead + "createNode transform -n \"rig0\";\n";
   for (int i = 1; i < 40; ++i) {
     text +=
         "createNode transform -n \"rig" + std::to_string(i) + "\" -p \"rig" + std::to_string(i - 1) + "\";\n";
   }
-  text += CameraOf("deep", "", "rig39") + CameraOf("flat") + kResolution + Playback(1, 100'000);
+  text += CameraOf("deep", "", "rig39") + CameraOf("flat") + kResolution + Playback(1, 100'000) +
+          CurveOf("deepX", "1 0 2 5", "deep.tx") + CurveOf("flatX", "1 0 2 5", "flat.tx");
   const Checked checked(text);
   EXPECT_EQ(checked.MarkedBy(Code::ShiftNotMeasured), "deepShape");
   EXPECT_THAT(checked.SentenceOf(Code::ShiftNotMeasured), HasSubstr("too many frames and layers"));
