@@ -48,6 +48,7 @@ bool CameraShift::Moves() const {
 
 // The points of the scene's picture at the frame, and where the import shows them.
 void CameraShift::TakeIn(double frame, double time) {
+  changed_ = changed_ || lens_.HasFurtherChanges(picture_);
   const Matrix& place = evaluator_.Value(world_);
   if (!motion::IsFinite(place)) return;
   Matrix toWorld = motion::RotationOf(place);
@@ -83,6 +84,7 @@ void CameraShift::Compare(double u, double v, const Vector& point, double frame)
 
 void CameraShift::Report() const {
   const scene::Node& node = subject_.scene.node(camera_.shape);
+  if (changed_) ReportPictureChange(subject_, camera_.shape);
   if (!seen_) {
     subject_.diagnostics.Report(
         diag::Code::ShiftNotMeasured, node.place,

@@ -51,6 +51,7 @@ class CameraShift {
   ImportedPicture imported_;
   double start_;  // the time of the scene that is time 0 of the composition
   bool seen_ = false;
+  bool changed_ = false;  // at some frame, by what no layer has
   double largest_ = 0.0;  // pixels
   double frame_ = 0.0;    // where it is the largest
 };

@@ -24,9 +24,19 @@ constexpr std::array kEffects = {Field{"postScale", 1.0}, Field{"preScale", 1.0}
                                  Field{"filmTranslateH", 0.0}, Field{"filmTranslateV", 0.0},
                                  Field{"filmRollValue", 0.0}};
 
+// These change the picture only together with other values of the camera.
+constexpr std::array kChanges = {Field{"filmFitOffset", 0.0}, Field{"filmRollControl", 0.0},
+                                 Field{"horizontalPan", 0.0}, Field{"verticalPan", 0.0}, Field{"zoom", 1.0}};
+
 class Lens {
  public:
   Lens(const Subject& subject, NodeId camera) : subject_(subject), camera_(camera) {}
+
+  void ReportChange() {
+    if (FirstThatDiffers(kEffects)) return;
+    const auto change = FirstThatDiffers(kChanges);
+    Say(Code::PictureEffectLost, change ? change->place : scene().node(camera_).place);
+  }
 
   void Report() {
     if (const auto offset = FirstThatDiffers(kOffsets)) Say(Code::FilmOffsetLost, offset->place);
@@ -104,5 +114,7 @@ void ReportLenses(const Subject& subject) {
     if (camera.taken) Lens(subject, camera.shape).Report();
   }
 }
+
+void ReportPictureChange(const Subject& subject, NodeId camera) { Lens(subject, camera).ReportChange(); }
 
 }  // namespace check

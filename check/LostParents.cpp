@@ -3,6 +3,7 @@
 #include <array>
 #include <string>
 #include <string_view>
+#include <unordered_map>
 
 #include "check/Difference.h"
 #include "check/RulesInternal.h"
@@ -15,18 +16,65 @@ using diag::Code;
 using diag::Range;
 using scene::NodeId;
 
-std::string WhereItIs(const scene::Scene& scene, const scene::Node& parent) {
-  for (const scene::Reference& reference : scene.references()) {
-    const std::string prefix = std::string(reference.nameSpace) + ':';
-    const bool fostered = IsFosterParent(parent) && parent.name.starts_with(reference.node);
-    if (fostered || (prefix.size() > 1 && parent.name.starts_with(prefix))) {
-      return ", but in \"" + std::string(reference.file.substr(0, 200)) + '"';
+// Finds the file of a name. Where several references have one, the first that is written counts.
+class References {
+ public:
+  explicit References(const scene::Scene& scene) {
+    for (const scene::Reference& reference : scene.references()) {
+      bySpace_.try_emplace(reference.nameSpace, &reference);
+      byNode_.try_emplace(reference.node, &reference);
     }
   }
-  return ", and in no file that is known";
-}
 
-void ReportParent(const Subject& subject, const scene::Node& node) {
+  std::string WhereItIs(const scene::Node& parent) const {
+    const scene::Reference* found = OfSpace(parent.name);
+    if (IsFosterParent(parent)) {
+      const scene::Reference* const other = OfNode(parent.name);
+      if (found == nullptr || (other != nullptr && other < found)) found = other;
+    }
+    if (found == nullptr) return ", and in no file that is known";
+    return ", but in \"" + std::string(found->file.substr(0, 200)) + '"';
+  }
+
+ private:
+  using Map = std::unordered_map<std::string_view, const scene::Reference*>;
+
+  // A name space may lie in others: "a:b:root" is of "a", and of "a:b".
+  const scene::Reference* OfSpace(std::string_view name) const {
+    const scene::Reference* found = nullptr;
+    std::size_t looked = 0;
+    for (std::size_t end = name.find(':'); end != std::string_view::npos && ++looked <= kMostSpaces;
+         end = name.find(':', end + 1)) {
+      if (end != 0) found = Earlier(found, bySpace_, name.substr(0, end));
+    }
+    return found;
+  }
+
+  // The name of a foster parent begins with that of the reference's node.
+  const scene::Reference* OfNode(std::string_view name) const {
+    const scene::Reference* found = nullptr;
+    name = name.substr(0, kLongestNode);
+    for (std::size_t length = 0; length <= name.size(); ++length)
+      found = Earlier(found, byNode_, name.substr(0, length));
+    return found;
+  }
+
+  static const scene::Reference* Earlier(const scene::Reference* found, const Map& map,
+                                         std::string_view name) {
+    const auto known = map.find(name);
+    if (known == map.end() || (found != nullptr && found < known->second)) return found;
+    return known->second;
+  }
+
+  // Of a longer name, what follows is not looked at: many parents may have long ones.
+  static constexpr std::size_t kMostSpaces = 64;
+  static constexpr std::size_t kLongestNode = 256;
+
+  Map bySpace_;
+  Map byNode_;
+};
+
+void ReportParent(const Subject& subject, const References& references, const scene::Node& node) {
   const scene::Scene& scene = subject.scene;
   const ParentLoss loss = ParentLossOf(scene, node);
   if (loss == ParentLoss::None) return;
@@ -43,7 +91,7 @@ void ReportParent(const Subject& subject, const scene::Node& node) {
     subject.diagnostics.Report(Code::ParentByCommand, node.place, {node.name, "under", parent.name});
   } else if (loss == ParentLoss::Elsewhere) {
     subject.diagnostics.Report(Code::ParentElsewhere, place,
-                               {node.name, parent.name, WhereItIs(scene, parent)});
+                               {node.name, parent.name, references.WhereItIs(parent)});
   } else {
     subject.diagnostics.Report(Code::ParentNotImported, place, {node.name, parent.name, parent.type});
   }
@@ -80,15 +128,17 @@ void ReportTarget(const Subject& subject, const Link& link) {
 }  // namespace
 
 void ReportLostParents(const Subject& subject) {
+  const References references(subject.scene);
   for (const Camera& camera : subject.cameras) {
-    if (camera.taken) ReportParent(subject, subject.scene.node(camera.shape));
+    if (camera.taken) ReportParent(subject, references, subject.scene.node(camera.shape));
   }
-  for (const NodeId locator : subject.locators) ReportParent(subject, subject.scene.node(locator));
+  for (const NodeId locator : subject.locators)
+    ReportParent(subject, references, subject.scene.node(locator));
   for (const Link& link : subject.links) {
     if (link.target) {
       ReportTarget(subject, link);
     } else {
-      ReportParent(subject, subject.scene.node(link.node));
+      ReportParent(subject, references, subject.scene.node(link.node));
     }
   }
 }

@@ -77,6 +77,10 @@ void ReportKeysAtOneTime(const Subject& subject);  // KeysAtOneTime.cpp
 void ReportPicture(const Subject& subject);        // PictureSize.cpp
 void ReportShifts(const Subject& subject);         // PictureShift.cpp
 
+// The camera's picture was seen to be changed in a way that comes over nowhere; of what changes it whatever
+// else the camera says ReportLenses has said so: Lenses.cpp.
+void ReportPictureChange(const Subject& subject, scene::NodeId camera);
+
 // Curves that go on outside their keys, within the frames: Infinities.cpp.
 void ReportInfinities(const Subject& subject, const motion::FrameEnds& frames);
 

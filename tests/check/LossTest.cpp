@@ -2,6 +2,7 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <chrono>
 #include "tests/check/CheckedText.h"
 
 namespace check_test {
@@ -255,6 +256,41 @@ TEST(LossTest, AnOrthographicCameraThatComesOverWithAPerspective) {
             "the orthographic camera \"shotCamShape\" comes over with a perspective");
   EXPECT_EQ(checked.CountOf(Code::AttributesWithoutPlace), 0u);
   EXPECT_EQ(Checked(CameraScene("", "\tsetAttr \".o\" off;\n")).All(), "");
+}
+
+// Cameras under parents of one of many references.
+std::string UnderReference(int references, int of, const std::string& end) {
+  std::string text = kHead;
+  for (int i = 0; i < references; ++i) {
+    const std::string space = "n" + std::to_string(i);
+    text += "file -r -ns \"" + space + "\" -rfn \"" + space + "RN\" \"" + space + ".ma\";\n";
+  }
+  for (int i = 0; i < references; ++i) {
+    const std::string name = "t" + std::to_string(i);
+    text += "createNode transform -n \"" + name + "\" -p \"n" + std::to_string(of) + end +
+            "\";\ncreateNode camera -n \"" + name + "Shape\" -p \"" + name + "\";\n";
+  }
+  return text;
+}
+
+TEST(LossTest, TheFileOfALostParentIsThatOfItsNameSpace) {
+  const Checked inner(UnderReference(1, 0, ":a:root"));
+  EXPECT_THAT(inner.SentenceOf(Code::ParentElsewhere), HasSubstr("but in \"n0.ma\""));
+  EXPECT_THAT(Checked(UnderReference(1, 0, "1:root")).SentenceOf(Code::ParentElsewhere),
+              HasSubstr("in no file that is known"));
+}
+
+TEST(LossTest, TheLastOfManyReferencesIsFoundAsFastAsTheFirst) {
+  constexpr int kReferences = 3000;
+  const auto seconds = [](int of) {
+    const std::string text = UnderReference(kReferences, of, ":root");
+    const Checked imported(text);
+    EXPECT_GT(imported.CountOf(Code::ParentElsewhere), 0u);
+    const auto begin = std::chrono::steady_clock::now();
+    check::Check(text, imported.cameOver(), {});
+    return std::chrono::duration<double>(std::chrono::steady_clock::now() - begin).count();
+  };
+  EXPECT_LT(seconds(kReferences - 1), 3.0 * seconds(0) + 0.02);
 }
 
 }  // namespace

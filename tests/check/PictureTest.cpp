@@ -186,6 +186,11 @@ TEST(PictureTest, WhatOfALensIsLost) {
   EXPECT_THAT(Checked(CameraScene("", "\tsetAttr \".cs\" 1.5;\n")).SentenceOf(Code::CameraScaleLost),
               HasSubstr("is lost: it is 1.5"));
   EXPECT_EQ(Checked(CameraScene("", "\tsetAttr \".ptsc\" 2;\n")).CountOf(Code::PictureEffectLost), 1u);
+  EXPECT_EQ(Checked(CameraScene("", "\tsetAttr \".ffo\" 0.2;\n")).MarkedBy(Code::PictureEffectLost), "0.2");
+  const std::string pan = "\tsetAttr \".pze\" yes;\n\tsetAttr \".hpn\" 0.25;\n";
+  EXPECT_EQ(Checked(CameraScene("", pan)).CountOf(Code::PictureEffectLost), 0u) << "only the view is panned";
+  EXPECT_EQ(Checked(CameraScene("", pan + "\tsetAttr \".rpz\" yes;\n")).MarkedBy(Code::PictureEffectLost),
+            "0.25");
 }
 
 TEST(PictureTest, AFilmOffsetShiftsByItsPartOfTheAperture) {
