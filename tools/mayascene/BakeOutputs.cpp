@@ -1,9 +1,11 @@
 #include "tools/mayascene/BakeOutputs.h"
 
 #include <filesystem>
+#include <map>
 #include <set>
 #include <system_error>
 
+#include "tools/mayascene/FileSet.h"
 #include "tools/mayascene/OutputFile.h"
 
 namespace mayascene {
@@ -18,15 +20,22 @@ std::string lowered(std::string text) {
   return text;
 }
 
-// The scene's own name, as a name that no other output of the run has.
-std::string freeName(const fs::path& scene, const std::string& suffix, std::set<std::string>* taken) {
-  const std::string stem = scene.stem().empty() ? "scene" : scene.stem().string();
-  std::string name = stem + suffix;
-  for (int number = 2; !taken->insert(lowered(name)).second; ++number) {
-    name = stem + "_" + std::to_string(number) + suffix;
+// Names that no other output of the run has.
+class FreeNames {
+ public:
+  // The scene's own name, with a number where it is taken.
+  std::string nameOf(const fs::path& scene, const std::string& suffix) {
+    const std::string stem = scene.stem().empty() ? "scene" : scene.stem().string();
+    std::string name = stem + suffix;
+    int& number = numbers_.try_emplace(lowered(stem), 1).first->second;
+    while (!taken_.insert(lowered(name)).second) name = stem + '_' + std::to_string(++number) + suffix;
+    return name;
   }
-  return name;
-}
+
+ private:
+  std::set<std::string> taken_;         // without regard to case
+  std::map<std::string, int> numbers_;  // by stem, the last one that was tried
+};
 
 // The folder `output`, made where it is not there.
 ExitStatus makeFolder(const std::string& output, std::string* failure) {
@@ -49,20 +58,7 @@ ExitStatus refuse(const std::string& place, const char* why, std::string* failur
   return ExitStatus::WrongUsage;
 }
 
-// From the root, with the links of its folders followed; what it names need not be there.
-fs::path wholeName(const fs::path& path) {
-  std::error_code error;
-  const fs::path absolute = fs::absolute(path, error);
-  const fs::path whole = fs::weakly_canonical(absolute, error);
-  return error ? absolute.lexically_normal() : whole;
-}
-
 }  // namespace
-
-bool isSameFile(const fs::path& a, const fs::path& b) {
-  std::error_code ignored;
-  return fs::equivalent(a, b, ignored) || wholeName(a) == wholeName(b);
-}
 
 ExitStatus placeOutputs(const std::vector<std::string>& scenes, const std::string& output,
                         const std::string& suffix, const std::string& report,
@@ -76,18 +72,18 @@ ExitStatus placeOutputs(const std::vector<std::string>& scenes, const std::strin
       const ExitStatus made = makeFolder(output, failure);
       if (made != ExitStatus::Done) return made;
     }
-    std::set<std::string> taken;
+    FreeNames names;
     for (const std::string& scene : scenes) {
-      places->push_back((fs::path(output) / freeName(scene, suffix, &taken)).string());
+      places->push_back((fs::path(output) / names.nameOf(scene, suffix)).string());
     }
   }
+  FileSet read, reported;
+  for (const std::string& scene : scenes) read.add(scene);
+  if (!report.empty()) reported.add(report);
   for (const std::string& place : *places) {
     if (place == kStandardOutput) continue;
-    for (const std::string& scene : scenes) {
-      if (isSameFile(place, scene))
-        return refuse(place, " is one of the scenes and would be overwritten", failure);
-    }
-    if (!report.empty() && isSameFile(place, report)) return refuse(place, " is the report, too", failure);
+    if (read.contains(place)) return refuse(place, " is one of the scenes and would be overwritten", failure);
+    if (reported.contains(place)) return refuse(place, " is the report, too", failure);
   }
   return ExitStatus::Done;
 }

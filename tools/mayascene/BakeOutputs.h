@@ -1,7 +1,6 @@
 // Where the outputs of a run go that has one for each scene.
 #pragma once
 
-#include <filesystem>
 #include <string>
 #include <vector>
 
@@ -18,8 +17,5 @@ namespace mayascene {
 ExitStatus placeOutputs(const std::vector<std::string>& scenes, const std::string& output,
                         const std::string& suffix, const std::string& report,
                         std::vector<std::string>* places, std::string* failure);
-
-// Whether both lead to one file, which need not be there.
-bool isSameFile(const std::filesystem::path& a, const std::filesystem::path& b);
 
 }  // namespace mayascene

@@ -40,9 +40,8 @@ class ExportRun {
  public:
   ExportRun(const ExportArguments& arguments, const interchange::Format& format, Diagnostics& diagnostics)
       : arguments_(arguments), format_(format), diagnostics_(diagnostics) {
-    taken_.untouchable = arguments.scenes;
-    if (arguments.bake && !arguments.bake->report.empty())
-      taken_.untouchable.push_back(arguments.bake->report);
+    for (const std::string& scene : arguments.scenes) taken_.untouchable.add(scene);
+    if (arguments.bake && !arguments.bake->report.empty()) taken_.untouchable.add(arguments.bake->report);
   }
 
   // The outputs that have their names already.

@@ -1,10 +1,8 @@
 #include "tools/mayascene/ExportOutputs.h"
 
-#include <algorithm>
 #include <filesystem>
 
 #include "export/SafeNames.h"
-#include "tools/mayascene/BakeOutputs.h"
 
 namespace mayascene {
 
@@ -30,8 +28,7 @@ std::ostream* ExportFiles::Beside(std::string_view part, std::string_view suffix
     place = folder / *name;
     if (taken_->outputs.insert(interchange::Lowered(place.lexically_normal().string())).second) break;
   }
-  const auto same = [&](const std::string& one) { return isSameFile(place, one); };
-  if (std::any_of(taken_->untouchable.begin(), taken_->untouchable.end(), same)) {
+  if (taken_->untouchable.contains(place.string())) {
     failure_ = place.string() + " is a scene or the report, and would be overwritten";
     return nullptr;
   }

@@ -9,6 +9,7 @@
 #include <vector>
 
 #include "export/Format.h"
+#include "tools/mayascene/FileSet.h"
 #include "tools/mayascene/OutputFile.h"
 
 namespace mayascene {
@@ -16,7 +17,7 @@ namespace mayascene {
 // What the files of a run keep off: scenes and a report are never written over, and no two outputs share a
 // file.
 struct TakenFiles {
-  std::vector<std::string> untouchable;
+  FileSet untouchable;
   std::set<std::string> outputs;  // without regard to case
 };
 
