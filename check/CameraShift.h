@@ -7,6 +7,7 @@
 #include "check/RulesInternal.h"
 #include "motion/Camera.h"
 #include "motion/Evaluator.h"
+#include "motion/KeptBelow.h"
 #include "motion/SceneCamera.h"
 
 namespace check {
@@ -33,6 +34,11 @@ class CameraShift {
   // Both evaluators stand at the frame, which has the time in the scene's unit. `frame` is what is said of
   // it.
   void TakeIn(double frame, double time);
+
+  // The channels below the picture of the scene that keep a stored value, although something drives them.
+  std::vector<motion::Kept> Unknown(const motion::KeptBelow& kept) const {
+    return kept.Of(lens_.Numbers(), {world_});
+  }
 
   // The largest shift of the frames that were taken in.
   void Report() const;

@@ -11,6 +11,7 @@
 #include "check/Times.h"
 #include "motion/Evaluator.h"
 #include "motion/FrameEnds.h"
+#include "motion/KeptBelow.h"
 
 namespace check {
 namespace {
@@ -35,13 +36,25 @@ class Shifts {
     Measure();
     ReportEvaluation();
     ReportInfinities(subject_, frames_);
-    for (const CameraShift* const camera : measured_) camera->Report();
+    const motion::KeptBelow kept(evaluator_);
+    for (const CameraShift* const camera : measured_) {
+      const std::vector<motion::Kept> unknown = camera->Unknown(kept);
+      if (unknown.empty()) {
+        camera->Report();
+      } else {
+        SayNotMeasured(camera->camera(), NameOf(unknown.front().plug) + " cannot be computed");
+      }
+    }
   }
 
  private:
   void SayNotMeasured(const Camera& camera, std::string_view why) const {
     const scene::Node& node = subject_.scene.node(camera.shape);
     subject_.diagnostics.Report(diag::Code::ShiftNotMeasured, node.place, {node.name, why});
+  }
+
+  std::string NameOf(const scene::Plug& plug) const {
+    return '"' + std::string(subject_.scene.node(plug.node).name) + '.' + std::string(plug.attribute) + '"';
   }
 
   // What the evaluation found; of a driver that the import does not follow that has been said.
@@ -73,8 +86,6 @@ class Shifts {
     if (!camera.taken) return;
     if (CameWhole(camera)) {
       cameras_.emplace_back(subject_, camera, &evaluator_, &interests_);
-    } else if (subject_.cameOver.stop != Stop::None) {
-      SayNotMeasured(camera, "the import stopped before the camera was whole");
     }
   }
 

@@ -150,8 +150,10 @@ constexpr Entry kPictureCodes[] = {
          "The importer takes distances as they stand in the file. A scene in another unit comes over in "
          "another size than the same scene in centimetres.",
      .example = "currentUnit -l meter -a degree -t film;",
-     .help = "Nothing has to be done, unless cameras from several scenes have to fit together: then set the "
-             "same unit in all of them, or import with --linear-units 1."},
+     .help =
+         "Nothing has to be done, unless cameras from several scenes have to fit together: then set the "
+         "same unit in all of them, or import with --linear-units 1. Not so for metres and kilometres, which "
+         "that option makes 100 and 2.54 times too large: set centimetres in the scene."},
     {.code = Code::BeyondCompositionTime,
      .severity = Severity::Warning,
      .symbol = "BeyondCompositionTime",
@@ -196,13 +198,16 @@ constexpr Entry kPictureCodes[] = {
      .symbol = "ShiftNotMeasured",
      .sentence = "how far the picture of \"{0}\" shifts is not measured: {1}",
      .meaning =
-         "At most 100000 frames of a scene are measured, and at most 4000000 frames of layers: each frame "
-         "counts once for the camera and once for each layer above it. A camera that the import "
-         "made before it stopped is measured; the one at which it stopped, and those after it, are not.",
+         "At most 100000 frames of a scene are measured, and at most 2000000 frames of layers: each frame "
+         "counts once for the camera and once for each layer above it. What depends on a driver that cannot "
+         "be "
+         "computed here is not measured either.",
      .example = "createNode animCurveTL -n \"moveX\";\n"
                 "  setAttr -s 2 \".ktv[0:1]\" 1 0 3000000 10;\n"
                 "connectAttr \"moveX.o\" \"shotCam.tx\";",
-     .help = "Write the shot alone: mayascene bake SCENE -o OUT --frames A:B."},
+     .help =
+         "Of too many frames write the shot alone: mayascene bake SCENE -o OUT --frames A:B. Bake a channel "
+         "that cannot be computed in Maya."},
     {.code = Code::ApertureMotionLost,
      .severity = Severity::Warning,
      .symbol = "ApertureMotionLost",

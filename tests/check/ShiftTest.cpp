@@ -115,7 +115,16 @@ TEST(ShiftTest, AfterAStopTheCamerasBeforeItAreMeasured) {
   const Checked checked(text);
   ASSERT_EQ(checked.cameOver().stop, check::Stop::UnequalKeys);
   EXPECT_EQ(checked.MarkedBy(Code::PictureShifts), "beforeShape");
-  EXPECT_EQ(checked.CountOf(Code::ShiftNotMeasured), 2u);
+  EXPECT_EQ(checked.CountOf(Code::ShiftNotMeasured), 0u);  // the stop says enough of the others
+}
+
+TEST(ShiftTest, WhatCannotBeComputedIsNotMeasured) {
+  const std::string driven =
+      "createNode expression -n \"shake\";\nconnectAttr \"shake.out[0]\" \"shotCam.tx\";\n";
+  const Checked checked(CameraScene("\tsetAttr \".rpt\" -type \"double3\" 3 0 0 ;\n", "", driven));
+  EXPECT_EQ(checked.CountOf(Code::PictureShifts), 0u);
+  EXPECT_THAT(checked.SentenceOf(Code::ShiftNotMeasured),
+              HasSubstr("\"shotCam.translateX\" cannot be computed"));
 }
 
 TEST(ShiftTest, ACameraWithoutAUsablePlaceIsSaid) {
