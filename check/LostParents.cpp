@@ -6,6 +6,7 @@
 #include <unordered_map>
 
 #include "check/Difference.h"
+#include "check/LookAts.h"
 #include "check/RulesInternal.h"
 #include "check/Times.h"
 
@@ -136,7 +137,8 @@ void ReportLostParents(const Subject& subject) {
     ReportParent(subject, references, subject.scene.node(locator));
   for (const Link& link : subject.links) {
     if (link.target) {
-      ReportTarget(subject, link);
+      // A camera that is aimed at a look-at is aimed there by mistake, of which LostLookAts.cpp speaks.
+      if (!IsLookAt(subject.scene.node(link.node).type)) ReportTarget(subject, link);
     } else {
       ReportParent(subject, references, subject.scene.node(link.node));
     }

@@ -5,6 +5,7 @@
 
 #include "check/ReadingEnd.h"
 #include "check/RulesInternal.h"
+#include "text/Utf8.h"
 
 namespace check {
 namespace {
@@ -28,14 +29,9 @@ std::string_view RestOfLine(std::string_view text, std::size_t at) {
   return text.substr(at, std::min(text.find_first_of("\r\n", at), text.size()) - at);
 }
 
-// The bytes of the character that begins the text; at least one.
+// The bytes of the character that begins the text; one where it begins with none.
 std::size_t CharacterLength(std::string_view text) {
-  std::size_t length = 1;
-  while (length < std::min<std::size_t>(4, text.size()) &&
-         (static_cast<unsigned char>(text[length]) & 0xc0) == 0x80) {
-    ++length;
-  }
-  return length;
+  return std::max<std::size_t>(1, text::CharacterAt(text, 0).length);
 }
 
 // How long a template field is that begins the line: "{{FPS}}", "${FPS}", "@FPS@", "%FPS%", "<FPS>". 0: none.

@@ -152,8 +152,8 @@ constexpr Entry kPictureCodes[] = {
      .example = "currentUnit -l meter -a degree -t film;",
      .help =
          "Nothing has to be done, unless cameras from several scenes have to fit together: then set the "
-         "same unit in all of them, or import with --linear-units 1. Not so for metres and kilometres, which "
-         "that option makes 100 and 2.54 times too large: set centimetres in the scene."},
+         "same unit in all of them, or import with --linear-units 1. Set centimetres in a scene in metres or "
+         "kilometres: with --linear-units 1 it comes over 100 or 2.54 times too large."},
     {.code = Code::BeyondCompositionTime,
      .severity = Severity::Warning,
      .symbol = "BeyondCompositionTime",

@@ -209,6 +209,8 @@ TEST(LossTest, ALookAtWhoseWeightComesLast) {
                          "connectAttr \"aim.pointW0\" \"aim.target[0].targetWeight\";\n")));
   ASSERT_TRUE(checked.cameOver().layers[0].aimed);
   EXPECT_EQ(checked.MarkedBy(Code::LookAtWeightLast), "aim.target[0].targetWeight");
+  // The look-at is no target that anybody chose, so nothing is said of what it stands under.
+  EXPECT_EQ(checked.CountOf(Code::TargetLosesItsChain), 0u);
 }
 
 TEST(LossTest, ALookAtThatComesOverIsNotComplainedOf) {

@@ -52,6 +52,8 @@ TEST(StopsTest, AnyOtherByteIsShownAsItIs) {
   EXPECT_EQ(Checked(kHead + "/ 3;\n").MarkedBy(Code::RefusedByte), "/");
   EXPECT_EQ(Checked(kHead + "a \xe2\x82\xac;\n").MarkedBy(Code::RefusedByte), "\xe2\x82\xac");
   EXPECT_THAT(Checked(kHead + "a \xff;\n").SentenceOf(Code::RefusedByte), HasSubstr("\\xff"));
+  EXPECT_EQ(Checked(kHead + "a \x81\x82\x83;\n").MarkedBy(Code::RefusedByte), "\x81");
+  EXPECT_EQ(Checked(kHead + "a \xe2\x82;\n").MarkedBy(Code::RefusedByte), "\xe2");
 }
 
 TEST(StopsTest, EveryByteIsRefusedWhereTheImportRefusesIt) {
