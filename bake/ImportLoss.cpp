@@ -33,6 +33,14 @@ bool Differ(double a, double b) {
   return std::fabs(a - b) > kTolerance * std::fmax(1.0, std::fmax(std::fabs(a), std::fabs(b)));
 }
 
+std::string Lowered(std::string_view name) {
+  std::string lowered(name);
+  for (char& c : lowered) {
+    if (c >= 'A' && c <= 'Z') c = static_cast<char>(c - 'A' + 'a');
+  }
+  return lowered;
+}
+
 // Searches a scene, camera by camera, until it finds something that a bake would bring.
 class LossSearch {
  public:
@@ -45,13 +53,15 @@ class LossSearch {
         measures_(evaluator_.measures()) {}
 
   std::optional<Loss> Run() {
-    std::unordered_map<std::string_view, std::vector<const CameOver::Camera*>> byName;
+    // Names that differ in case only are one for the importer, and all of its layers can have the last of
+    // them.
+    std::unordered_map<std::string, std::vector<const CameOver::Camera*>> byName;
     for (auto one = import_.cameras.rbegin(); one != import_.cameras.rend(); ++one) {
-      byName[one->name].push_back(&*one);
+      byName[Lowered(one->name)].push_back(&*one);
     }
     for (NodeId id = 0; id < scene_.nodes().size() && !found_; ++id) {
       if (!IsSetUp(scene_, id)) continue;
-      auto& layers = byName[scene::ImportName(scene_, scene_.node(id))];
+      auto& layers = byName[Lowered(scene::ImportName(scene_, scene_.node(id)))];
       if (layers.empty()) {
         Lose(scene_.node(id).place, "the camera {0} does not come over", {ShownNode(scene_, id)});
         continue;

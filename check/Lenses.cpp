@@ -20,6 +20,7 @@ struct Field {
 };
 
 constexpr std::array kOffsets = {Field{"horizontalFilmOffset", 0.0}, Field{"verticalFilmOffset", 0.0}};
+constexpr std::array kShakes = {Field{"horizontalShake", 0.0}, Field{"verticalShake", 0.0}};
 constexpr std::array kEffects = {Field{"postScale", 1.0}, Field{"preScale", 1.0},
                                  Field{"filmTranslateH", 0.0}, Field{"filmTranslateV", 0.0},
                                  Field{"filmRollValue", 0.0}};
@@ -39,7 +40,10 @@ class Lens {
   }
 
   void Report() {
-    if (const auto offset = FirstThatDiffers(kOffsets)) Say(Code::FilmOffsetLost, offset->place);
+    auto offset = FirstThatDiffers(kOffsets);
+    if (!offset && Number("shakeEnabled", 0.0) != 0.0) offset = FirstThatDiffers(kShakes);
+    if (offset) Say(Code::FilmOffsetLost, offset->place);
+    ReportShakeOverscan();
     if (const auto effect = FirstThatDiffers(kEffects)) Say(Code::PictureEffectLost, effect->place);
     ReportFactor("lensSqueezeRatio", Code::LensSqueezeLost);
     ReportFactor("cameraScale", Code::CameraScaleLost);
@@ -68,6 +72,11 @@ class Lens {
       if (auto difference = Differs(field)) return difference;
     }
     return std::nullopt;
+  }
+
+  void ReportShakeOverscan() {
+    if (Number("shakeOverscanEnabled", 0.0) == 0.0) return;
+    if (const auto overscan = Differs({"shakeOverscan", 1.0})) Say(Code::PictureEffectLost, overscan->place);
   }
 
   void ReportFactor(std::string_view attribute, Code code) {

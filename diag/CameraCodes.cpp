@@ -19,7 +19,8 @@ constexpr Entry kCameraCodes[] = {
      .severity = Severity::Warning,
      .symbol = "FilmOffsetLost",
      .sentence = "the film offset of \"{0}\" is lost: the picture is shifted",
-     .meaning = "The film back of the camera is moved off the centre of the lens. A camera of a composition "
+     .meaning = "The film back of the camera is moved off the centre of the lens, by an offset or a shake. A "
+                "camera of a composition "
                 "looks through the middle of the picture.",
      .example = "createNode camera -n \"shotCamShape\";\nsetAttr \".fio\" -type \"double2\" 0.1 0 ;",
      .help = "Shift the finished picture by the offset, as a part of the aperture."},

@@ -193,6 +193,16 @@ TEST(PictureTest, WhatOfALensIsLost) {
             "0.25");
 }
 
+TEST(PictureTest, AShakeOfTheFilmIsLostWhereItIsSwitchedOn) {
+  const std::string shake = "\tsetAttr \".hs\" 0.1;\n\tsetAttr \".sos\" 1.5;\n";
+  EXPECT_EQ(Checked(CameraScene("", shake)).All(), "");
+  const Checked shaken(CameraScene("", shake + "\tsetAttr \".se\" yes;\n"));
+  EXPECT_EQ(shaken.MarkedBy(Code::FilmOffsetLost), "0.1");
+  EXPECT_EQ(shaken.CountOf(Code::PictureShifts), 1u);
+  EXPECT_EQ(Checked(CameraScene("", shake + "\tsetAttr \".soe\" yes;\n")).MarkedBy(Code::PictureEffectLost),
+            "1.5");
+}
+
 TEST(PictureTest, AFilmOffsetShiftsByItsPartOfTheAperture) {
   const Checked checked(CameraScene("", "\tsetAttr \".fio\" -type \"double2\" 0.141732 0 ;\n"));
   EXPECT_NEAR(PixelsOf(checked), 96.0, 0.01);
