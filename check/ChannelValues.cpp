@@ -11,6 +11,7 @@
 
 #include "check/Curves.h"
 #include "check/RulesInternal.h"
+#include "check/SetCommands.h"
 #include "motion/CurveReader.h"
 #include "scene/Attributes.h"
 #include "text/Numbers.h"
@@ -28,14 +29,20 @@ struct Found {
   diag::Range place;
 };
 
+// Whether a stored value counts in place of which the import has another one.
+enum class Skipped { No, Yes };
+
 // The first value of the channel that the import takes and that `wanted` holds for: a key, or what is stored.
 std::optional<Found> FirstValue(const Subject& subject, NodeId node, std::string_view channel,
-                                const std::function<bool(double)>& wanted) {
+                                Skipped skipped, const std::function<bool(double)>& wanted) {
   const scene::Scene& scene = subject.scene;
   if (!scene.SourceOf(scene.PlugOf(node, channel))) {
     const auto written = scene.Written(node, channel);
     const auto stored = written ? written->Number() : std::nullopt;
-    if (stored && wanted(*stored)) return Found{*stored, written->range()};
+    const auto imported = stored ? ImportedNumber(scene, node, channel) : std::nullopt;
+    const bool asStored = imported && std::fabs(*imported - *stored) <= kSameNumber * std::fabs(*stored);
+    if (!imported || (!asStored && skipped == Skipped::No)) return std::nullopt;
+    if (wanted(*imported)) return Found{*imported, written->range()};
     return std::nullopt;
   }
   const std::span<const KeyedChannel> keyed = subject.channels.KeyedOf(node);
@@ -62,8 +69,8 @@ std::string Roughly(double number) {
 void ReportRadiansOf(const Subject& subject, NodeId node) {
   for (const std::string_view channel : scene::kPlaceChannels) {
     if (!channel.starts_with("rotate")) continue;
-    const auto angle =
-        FirstValue(subject, node, channel, [](double value) { return std::fabs(value) > kSameNumber; });
+    const auto angle = FirstValue(subject, node, channel, Skipped::Yes,
+                                  [](double value) { return std::fabs(value) > kSameNumber; });
     if (!angle) continue;
     return subject.diagnostics.Report(
         Code::RadiansLost, angle->place,
@@ -87,7 +94,7 @@ void ReportLimit(const Subject& subject, NodeId node, std::string_view bound, st
   const auto limit = scene.Number(node, name);
   if (!limit) return;
   const bool least = bound == "min";
-  const auto beyond = FirstValue(subject, node, channel, [&](double value) {
+  const auto beyond = FirstValue(subject, node, channel, Skipped::No, [&](double value) {
     return (least ? *limit - value : value - *limit) > kSameNumber * std::max(1.0, std::fabs(*limit));
   });
   if (!beyond) return;

@@ -39,6 +39,13 @@ bool IsTheStopAgain(const diag::Diagnostic& diagnostic, std::uint32_t stopLine) 
   return diagnostic.code <= diag::Code::UnexpectedByte && diagnostic.place.line == stopLine;
 }
 
+// Whether the reader of the whole scene cannot read a zero byte: the end of the text for the importer, which
+// has a diagnostic of its own where text follows.
+bool IsZeroByte(std::string_view text, const diag::Diagnostic& diagnostic) {
+  return diagnostic.code == diag::Code::UnexpectedByte && !diag::IsOfWholeFile(diagnostic) &&
+         text[static_cast<std::size_t>(diagnostic.range.offset)] == '\0';
+}
+
 // The lines of parents that the import does not have.
 std::set<std::uint32_t> LostParentLines(const diag::Collector& collector) {
   std::set<std::uint32_t> lines;
@@ -60,7 +67,7 @@ void Gather(std::string_view text, const Options& options, diag::Collector* coll
   if (IsWanted(diag::Code::ParentElsewhere, options)) lostParents = LostParentLines(*collector);
   for (const diag::Diagnostic& diagnostic : collector->kept()) {
     if (!IsWanted(diagnostic.code, options) || IsTheStopAgain(diagnostic, stopLine) ||
-        IsTheLostParentAgain(diagnostic, lostParents)) {
+        IsZeroByte(text, diagnostic) || IsTheLostParentAgain(diagnostic, lostParents)) {
       continue;
     }
     Finding finding{diagnostic, collector->lines().At(diagnostic.range.offset + diagnostic.range.length), {}};

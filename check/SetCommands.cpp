@@ -133,6 +133,16 @@ std::optional<SetCommand> CommandAround(const scene::Scene& scene, scene::NodeId
   return ReadSetAttr(&cursor, IsCameraType(type), ReadAttributesOf(type));
 }
 
+std::optional<double> ImportedNumber(const scene::Scene& scene, scene::NodeId node,
+                                     std::string_view channel) {
+  for (const ReadAttribute* const attribute : ReadAttributesOf(scene.node(node).type)) {
+    for (std::size_t i = 0; i < std::size(attribute->components); ++i) {
+      if (attribute->components[i] == channel) return NumberRead(CommandsAfter(scene, node), *attribute, i);
+    }
+  }
+  return std::nullopt;
+}
+
 double NumberRead(const std::vector<SetCommand>& commands, const ReadAttribute& attribute,
                   std::size_t component) {
   for (auto command = commands.rbegin(); command != commands.rend(); ++command) {

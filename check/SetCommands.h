@@ -43,4 +43,8 @@ std::optional<SetCommand> CommandAround(const scene::Scene& scene, scene::NodeId
 double NumberRead(const std::vector<SetCommand>& commands, const ReadAttribute& attribute,
                   std::size_t component);
 
+// What the importer has for a channel of a transform that nothing drives: another number than the scene's
+// where it does not read the command that sets that. None where it keeps no values of the node's type.
+std::optional<double> ImportedNumber(const scene::Scene& scene, scene::NodeId node, std::string_view channel);
+
 }  // namespace check

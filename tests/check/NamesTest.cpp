@@ -65,7 +65,8 @@ TEST(NamesTest, TextAfterAZeroByte) {
   const std::string zero(1, '\0');
   const Checked checked(CameraScene("") + zero + "\ncreateNode transform -n \"a\";\n");
   EXPECT_THAT(checked.SentenceOf(Code::TextAfterNul), HasSubstr("30 bytes"));
-  EXPECT_EQ(Checked(CameraScene("") + zero + zero + " \n").CountOf(Code::TextAfterNul), 0u);
+  EXPECT_EQ(checked.CountOf(Code::UnexpectedByte), 0u);
+  EXPECT_EQ(Checked(CameraScene("") + zero + zero + " \n").All(), "");
 }
 
 TEST(NamesTest, ParentsInACircleAndASecondUnitAreSaidByTheReader) {

@@ -101,6 +101,16 @@ TEST(StoredTest, ALimitThatHoldsAValueIsLost) {
             "");
 }
 
+TEST(StoredTest, AValueThatIsNotReadHasNeitherALimitNorRadians) {
+  const std::string limit = "\tsetAttr \".mxtx\" 20;\n\tsetAttr \".xtxe\" yes;\n";
+  const Checked limited(CameraScene("\tsetAttr \".tx\" 30;\n" + limit));
+  EXPECT_THAT(limited.SentenceOf(Code::StoredValueSkipped), HasSubstr("gets 0 for translateX, not 30"));
+  EXPECT_EQ(limited.CountOf(Code::LimitLost), 0u);
+  std::string text = CameraScene("\tsetAttr \".r\" -type \"double3\" 0 0 0.25 ;\n\tsetAttr \".rz\" 2;\n");
+  const Checked turned(text.replace(text.find("degree"), 6, "radian"));
+  EXPECT_THAT(turned.SentenceOf(Code::RadiansLost), HasSubstr("rotateZ is 0.25 in radians"));
+}
+
 TEST(StoredTest, AnglesInRadiansAreSaidWithWhatIsLeftOfThem) {
   const auto radians = [](std::string text) { return text.replace(text.find("degree"), 6, "radian"); };
   const Checked turned(radians(CameraScene("\tsetAttr \".r\" -type \"double3\" 0 0.5 0.25 ;\n")));
