@@ -50,6 +50,7 @@ void Builder::build(Handle folder, const std::string& name) {
   for (const Locator& locator : scene_.locators) {
     if (isMarked(locator.name)) makeLocator(comp, locator);
   }
+  suites_.host().failBetweenCalls();
 }
 
 // The composition that receives the layers.

@@ -116,6 +116,7 @@ void Builder::zoomKeys(Handle stream, Batch& batch, const Camera& camera, const 
     check(
         suites_.setBatchKeyframeValue(batch.number, index, stream, {convert_.zoom(camera, keys[key].value)}));
   }
+  suites_.host().failBetweenCalls();
 }
 
 void Builder::animateCamera(Handle layer, const Camera& camera) {

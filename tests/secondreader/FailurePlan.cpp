@@ -7,6 +7,7 @@ namespace secondreader {
 
 void FailurePlan::begin(refhost::Callback callback) {
   active_ = callback == options_.during;
+  failedBetweenCalls_ = false;
   calls_ = 0;
   counts_.clear();
 }
@@ -29,6 +30,16 @@ std::optional<refhost::Failure> FailurePlan::service(const std::string& name) {
   const std::int64_t count = ++counts_[name];
   for (const refhost::Failure& failure : options_.failures) {
     if (failure.operation == name && (failure.nth == 0 || failure.nth == count)) return failure;
+  }
+  return std::nullopt;
+}
+
+std::optional<refhost::Failure> FailurePlan::betweenCalls() {
+  if (!active_ || failedBetweenCalls_) return std::nullopt;
+  for (const refhost::Failure& failure : options_.failures) {
+    if (failure.operation != kBetweenCalls || failure.nth != calls_) continue;
+    failedBetweenCalls_ = true;
+    return failure;
   }
   return std::nullopt;
 }

@@ -11,6 +11,9 @@
 
 namespace secondreader {
 
+// In place of an operation's name: a failure after the nth suite call, outside of all calls.
+inline constexpr const char* kBetweenCalls = "(between calls)";
+
 class FailurePlan {
  public:
   // The options outlive the plan.
@@ -24,6 +27,9 @@ class FailurePlan {
   std::optional<refhost::Failure> suiteCall(const std::string& operation);
   std::optional<refhost::Failure> service(const std::string& name);
 
+  // What is planned for the time after the suite calls so far: once, in place of the next one.
+  std::optional<refhost::Failure> betweenCalls();
+
   bool refuses(std::string_view suite, std::int32_t version) const;
 
   // In the callback that runs or ran last.
@@ -33,6 +39,7 @@ class FailurePlan {
  private:
   const refhost::HostOptions& options_;
   bool active_ = false;
+  bool failedBetweenCalls_ = false;
   std::int64_t calls_ = 0;
   std::map<std::string, std::int64_t> counts_;
 };

@@ -242,7 +242,7 @@ TEST(SweptScenesTest, TogetherTheyReachEveryCallAndServiceAndEndWithEveryCodeOfT
     for (const auto& [service, count] : good.services) reached.insert(service);
     if (scene.during == Callback::Import) codes.insert(good.code);
   }
-  // The utility services, but for those of lists, which ServiceSweepTest has.
+  // The utility services, but for those of lists, which ListSweepTest has.
   std::set<std::string> expected = {"RegisterStringTable", "StringMake",   "StringCopy",     "StringFormat",
                                     "StripExtension",      "FileCreate",   "FileOpen",       "FileRead",
                                     "FileClose",           "FileSize",     "FileName",       "FileDispose",

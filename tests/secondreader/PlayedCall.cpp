@@ -59,7 +59,9 @@ PlayedLine& PlayedLine::handle(const char* key, const char* kind, Handle number)
 }
 
 PlayedCall::PlayedCall(PlayedHost& host, const char* operation, SuiteName suite)
-    : host_(host), operation_(operation), failure_(host.plan.suiteCall(operation)), line_(operation) {
+    : host_(host), operation_(operation), line_(operation) {
+  host_.failBetweenCalls();
+  failure_ = host_.plan.suiteCall(operation_);
   if (failure_ && failure_->kind == refhost::Failure::Kind::Code) error_ = failure_->code;
   line_.text("suite", suite.name).integer("version", suite.version);
 }

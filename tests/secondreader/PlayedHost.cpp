@@ -65,6 +65,13 @@ bool PlayedHost::serviceFails(const char* name, HostError* code) {
   return true;
 }
 
+void PlayedHost::failBetweenCalls() {
+  const auto failure = plan.betweenCalls();
+  if (!failure) return;
+  throwPlanned(*failure, "rehearsed failure");
+  throw int{failure->code};
+}
+
 std::string PlayedHost::localized(int id) const {
   if (!stringTable) return {};
   const LocalizedEntry& entry = kTable[static_cast<std::size_t>(id)];

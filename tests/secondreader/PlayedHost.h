@@ -94,6 +94,10 @@ class PlayedHost {
   // throw.
   bool serviceFails(const char* name, HostError* code);
 
+  // Throws what is planned for the time after the last suite call. Asked before each call, and at the end of
+  // a part of the work that ends otherwise where it fails.
+  void failBetweenCalls();
+
   // The text of the localised string of that number, "" without the table.
   std::string localized(int id) const;
 

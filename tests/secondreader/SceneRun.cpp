@@ -155,11 +155,11 @@ void compareEnd(std::ostringstream& words, const Prediction& prediction, const r
 
 }  // namespace
 
-RunReport SceneRunner::run(const refhost::HostOptions& options, const std::string& fileName,
-                           std::string_view scene, int imports) {
+RunReport SceneRunner::run(const refhost::HostOptions& options, const refhost::HostOptions& predicted,
+                           const std::string& fileName, std::string_view scene, int imports) {
   RunReport report;
   const std::string path = (folder_.path() / fileName).string();
-  report.prediction = predict(options, path, scene, imports);
+  report.prediction = predict(predicted, path, scene, imports);
   folder_.write(fileName, scene);
   std::ostringstream words;
   if (report.prediction.processEnds) {

@@ -22,7 +22,13 @@ struct RunReport {
 class SceneRunner {
  public:
   RunReport run(const refhost::HostOptions& options, const std::string& fileName, std::string_view scene,
-                int imports = 1);
+                int imports = 1) {
+    return run(options, options, fileName, scene, imports);
+  }
+
+  // The prediction is made with options of its own, which say otherwise what is to fail.
+  RunReport run(const refhost::HostOptions& options, const refhost::HostOptions& predicted,
+                const std::string& fileName, std::string_view scene, int imports = 1);
 
  private:
   testsupport::TemporaryFolder folder_;
