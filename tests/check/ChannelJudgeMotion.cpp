@@ -146,15 +146,16 @@ std::string ChannelJudge::JudgeMotion(int node, int shape, bool aimed, const Cam
   std::string wrong = ReadMotion(node, shape, aimed, &motion);
   if (!wrong.empty()) return wrong;
   compared_.channels += kChannels.size();
-  for (const CameOverStream* const stream :
-       {&layer.position, &layer.scale, &layer.rotateX, &layer.rotateY, &layer.rotateZ}) {
+  const std::array<const CameOverStream*, 5> streams = {&layer.position, &layer.scale, &layer.rotateX,
+                                                        &layer.rotateY, &layer.rotateZ};
+  for (const CameOverStream* const stream : streams) {
     if (stream->times.size() == motion.keys.size()) continue;
     return name + " has " + std::to_string(motion.keys.size()) + " keys, " +
            std::to_string(stream->times.size()) + " came over";
   }
   compared_.keys += motion.keys.size();
-  if (!motion.keys.empty()) {
-    wrong = JudgeTimes(node, motion, layer.position, start);
+  for (const CameOverStream* const stream : streams) {
+    wrong = motion.keys.empty() ? "" : JudgeTimes(node, motion, *stream, start);
     if (!wrong.empty()) return wrong;
   }
   for (std::size_t key = 0; key < std::max<std::size_t>(motion.keys.size(), 1); ++key) {

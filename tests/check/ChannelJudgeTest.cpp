@@ -58,6 +58,8 @@ TEST(ChannelJudgeTest, SeesEachNumberThatIsBent) {
   };
   const Bend bends[] = {
       {"a time", "shotCamShape", [](CameOverLayer* layer) { layer->position.times[1] += 0.01; }},
+      {"a scale's time", "shotCamShape", [](CameOverLayer* layer) { layer->scale.times[1] += 0.01; }},
+      {"an angle's time", "shotCamShape", [](CameOverLayer* layer) { layer->rotateZ.times[1] += 0.01; }},
       {"a key's place", "shotCamShape", [](CameOverLayer* layer) { layer->position.values[4] += 1e-4; }},
       {"a key's angle", "shotCamShape", [](CameOverLayer* layer) { layer->rotateY.values[2] += 1e-4; }},
       {"a zoom", "shotCamShape", [](CameOverLayer* layer) { layer->zoom.values[1] *= 1.002; }},
