@@ -1,5 +1,6 @@
 // Values that a scene stores and the importer does not read.
 #include <algorithm>
+#include <bitset>
 #include <cmath>
 #include <map>
 #include <optional>
@@ -38,10 +39,13 @@ class Values {
   // Of a target no more than the translation is taken.
   void Report(bool target) {
     const std::vector<const ReadAttribute*> known = ReadAttributesOf(scene().node(node_).type);
-    if (known.empty()) return;
+    FindTouched(known);
+    if (touched_.none()) return;
     commands_ = CommandsAfter(scene(), node_);
-    for (const ReadAttribute* const attribute : known) {
-      if (target && attribute->longName != ".translate") continue;
+    for (std::size_t which = 0; which < known.size(); ++which) {
+      const ReadAttribute* const attribute = known[which];
+      if (!touched_[which] || (target && attribute->longName != ".translate")) continue;
+      if (!inParts_[which] && IsRead(*attribute)) continue;
       for (std::size_t i = 0; i < std::size(attribute->components) && !attribute->components[i].empty();
            ++i) {
         Compare(*attribute, i);
@@ -57,6 +61,27 @@ class Values {
 
  private:
   const scene::Scene& scene() const { return subject_.scene; }
+
+  // Which of the attributes have a value, and which one that is of a component alone.
+  void FindTouched(const std::vector<const ReadAttribute*>& known) {
+    scene().ForEachTouched(node_, [&](std::string_view name) {
+      for (std::size_t which = 0; which < known.size(); ++which) {
+        const auto& components = known[which]->components;
+        const bool whole = known[which]->longName.substr(1) == name;
+        const bool part =
+            !whole && std::find(std::begin(components), std::end(components), name) != std::end(components);
+        if (whole || part) touched_.set(which);
+        if (part) inParts_.set(which);
+      }
+    });
+  }
+
+  // Whether the importer reads the command that sets the attribute as a whole.
+  bool IsRead(const ReadAttribute& attribute) const {
+    const auto written = scene().Written(node_, attribute.components[0]);
+    const SetCommand* const command = written ? CommandOf(written->range().offset) : nullptr;
+    return command != nullptr && command->attribute == &attribute;
+  }
 
   // The command after the createNode in which the value stands.
   const SetCommand* CommandOf(std::uint64_t value) const {
@@ -110,6 +135,8 @@ class Values {
 
   const Subject& subject_;
   NodeId node_;
+  std::bitset<8> touched_;  // of the known attributes
+  std::bitset<8> inParts_;
   std::vector<SetCommand> commands_;
   std::map<std::uint64_t, Skipped> skipped_;  // by the place of the value
 };
