@@ -77,26 +77,25 @@ void CameraShift::Compare(double u, double v, const Vector& point, double frame)
   if (imported_.Project(point, &landed)) {
     way = std::hypot((landed.u - u) * picture_.width, (landed.v - v) * picture_.height);
   }
-  if (!(way > largest_)) return;
-  largest_ = way;
-  frame_ = frame;
+  if (way > largest_.pixels) largest_ = {way, frame};
 }
 
-void CameraShift::Report() const {
+std::optional<LargestShift> CameraShift::Report() const {
   const scene::Node& node = subject_.scene.node(camera_.shape);
   if (changed_) ReportPictureChange(subject_, camera_.shape);
   if (!seen_) {
     subject_.diagnostics.Report(
         diag::Code::ShiftNotMeasured, node.place,
         {node.name, "its place, its lens or its centre of interest is no usable number"});
-    return;
+    return std::nullopt;
   }
-  if (largest_ < kSmallestShift) return;
+  if (largest_.pixels < kSmallestShift) return largest_;
   const double whole = std::hypot(picture_.width, picture_.height);
-  const std::string way =
-      largest_ > whole ? "more than the whole picture" : text::RoundedNumber(largest_) + " pixels";
+  const std::string way = largest_.pixels > whole ? "more than the whole picture"
+                                                  : text::RoundedNumber(largest_.pixels) + " pixels";
   subject_.diagnostics.Report(diag::Code::PictureShifts, node.place,
-                              {node.name, way, text::RoundedNumber(frame_)});
+                              {node.name, way, text::RoundedNumber(largest_.frame)});
+  return largest_;
 }
 
 }  // namespace check

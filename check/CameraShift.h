@@ -1,6 +1,7 @@
 // The picture of one camera: the scene's against that of the import.
 #pragma once
 
+#include <optional>
 #include <vector>
 
 #include "check/ImportedPicture.h"
@@ -40,8 +41,8 @@ class CameraShift {
     return kept.Of(lens_.Numbers(), {world_});
   }
 
-  // The largest shift of the frames that were taken in.
-  void Report() const;
+  // The largest shift of the frames that were taken in; none where no frame gives one.
+  std::optional<LargestShift> Report() const;
 
  private:
   void Compare(double u, double v, const motion::Vector& point, double frame);
@@ -58,8 +59,7 @@ class CameraShift {
   double start_;  // the time of the scene that is time 0 of the composition
   bool seen_ = false;
   bool changed_ = false;  // at some frame, by what no layer has
-  double largest_ = 0.0;  // pixels
-  double frame_ = 0.0;    // where it is the largest
+  LargestShift largest_;
 };
 
 }  // namespace check

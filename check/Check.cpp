@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <limits>
+#include <map>
 #include <set>
 #include <utility>
 
@@ -128,6 +129,15 @@ Reading::~Reading() = default;
 
 namespace {
 
+void AddShifts(const std::map<scene::NodeId, LargestShift>& shifts, const scene::Scene& scene, Head* head) {
+  std::map<std::uint64_t, LargestShift> byPlace;
+  for (const auto& [shape, shift] : shifts) byPlace[scene.node(shape).place.offset] = shift;
+  for (CameraHead& camera : head->cameras) {
+    const auto found = byPlace.find(camera.where.range.offset);
+    if (found != byPlace.end()) camera.shift = found->second;
+  }
+}
+
 void RunRules(const CameOver& cameOver, const Options& options, const scene::Scene& scene,
               const scene::Settings& settings, const std::vector<scene::NodeNote>& notes,
               diag::Collector* collector, Head* head) {
@@ -155,12 +165,12 @@ void RunRules(const CameOver& cameOver, const Options& options, const scene::Sce
                         .driversSaid = options.only.empty() ? &driversSaid : nullptr};
   ReportNodeNotes(subject, notes);
   if (cameOver.stop == Stop::UnequalKeys) ReportKeyCounts(subject);
-  for (const auto rule :
-       {ReportLostCameras, ReportLostParents, ReportLostChannels, ReportLostLookAts, ReportStoredValues,
-        ReportNames, ReportLenses, ReportTransforms, ReportChannelValues, ReportTimes, ReportKeysAtOneTime,
-        ReportPicture, ReportShifts}) {
+  for (const auto rule : {ReportLostCameras, ReportLostParents, ReportLostChannels, ReportLostLookAts,
+                          ReportStoredValues, ReportNames, ReportLenses, ReportTransforms,
+                          ReportChannelValues, ReportTimes, ReportKeysAtOneTime, ReportPicture}) {
     rule(subject);
   }
+  AddShifts(ReportShifts(subject), scene, head);
 }
 
 }  // namespace

@@ -21,7 +21,7 @@ Given<std::string> UnitGivenBy(const scene::UnitWord& unit, const char* otherwis
 }
 
 void AddRange(const char* what, const std::optional<scene::Said<scene::FrameRange>>& said, diag::Lines& lines,
-              std::vector<Range>* ranges) {
+              std::vector<NamedFrames>* ranges) {
   if (!said || !said->place) return;
   ranges->push_back({what, said->value.first, said->value.last, WhereIs(*said->place, lines)});
 }
@@ -71,6 +71,7 @@ Head ReadHead(const HeadSource& source) {
   DescribeLookAts(source, &head);
   head.camerasThatCame = CountOf(LayerKind::Camera, source.cameOver);
   head.nullsThatCame = CountOf(LayerKind::Null, source.cameOver);
+  head.composition = source.cameOver.composition;
   return head;
 }
 

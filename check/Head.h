@@ -69,6 +69,12 @@ struct LensOverFrames {
   std::optional<Span> angleOfView;  // none where any of the lens cannot be computed
 };
 
+// How far the import's picture is from the scene's, at most.
+struct LargestShift {
+  double pixels = 0.0;
+  double frame = 0.0;  // at which it is the largest
+};
+
 struct CameraHead : ShapeHead {
   Given<double> focalLength;         // millimetres; as it is stored, whether or not something drives it
   Given<double> horizontalAperture;  // inches, stored
@@ -79,6 +85,7 @@ struct CameraHead : ShapeHead {
   std::vector<Drive> drives;                       // of the lens
   std::optional<LensOverFrames> overFrames;        // of a lens that is driven
   std::size_t zoomKeys = 0;                        // of the layer
+  std::optional<LargestShift> shift;               // none: not measured
 };
 
 // A look-at, whatever it turns.
@@ -90,7 +97,7 @@ struct LookAtHead {
   std::string target;  // the node that this camera is aimed at
 };
 
-struct Range {
+struct NamedFrames {
   std::string what;  // "playback", "animation" or "render"
   double first = 0.0;
   double last = 0.0;
@@ -104,8 +111,8 @@ struct Head {
   Given<std::string> angularUnit{"degree"};
   Given<std::string> timeUnit{"film"};
   double framesPerSecond = 24.0;
-  std::vector<Range> ranges;  // those that the file says
-  Given<double> width;        // pixels
+  std::vector<NamedFrames> ranges;  // those that the file says
+  Given<double> width;              // pixels
   Given<double> height;
   Given<double> pixelAspect;
   std::vector<CameraHead> cameras;  // those that the file creates, in its order
@@ -116,6 +123,7 @@ struct Head {
   std::size_t lookAtsNotShown = 0;
   std::size_t nullsThatCame = 0;
   std::size_t camerasThatCame = 0;
+  std::optional<CameOverComposition> composition;  // that the import made
 
   static constexpr std::size_t kMostOfAKind = 100;  // where not all are asked for
   static constexpr std::size_t kMostLinks = 32;

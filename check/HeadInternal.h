@@ -2,6 +2,7 @@
 #pragma once
 
 #include <array>
+#include <string>
 #include <string_view>
 #include <vector>
 
@@ -42,6 +43,9 @@ void DescribeShape(const HeadSource& source, scene::NodeId shape, const CameOver
 // What drives the attribute; added to the list where anything does.
 void AddDrive(const HeadSource& source, scene::NodeId node, std::string_view attribute,
               std::vector<Drive>* drives);
+
+// The name, with "..." for what is beyond its first bytes.
+std::string ShownName(std::string_view name);
 
 Where WhereIs(const diag::Range& range, diag::Lines& lines);
 

@@ -9,11 +9,11 @@ void DescribeLookAts(const HeadSource& source, Head* head) {
   for (const LookAt& one : FindLookAts(scene, source.cameras)) {
     AddOrCount(source, &head->lookAts, &head->lookAtsNotShown, [&] {
       const scene::Node& node = scene.node(one.node);
-      LookAtHead lookAt{std::string(node.name), WhereIs(node.place, source.lines), {}, {}, {}};
-      if (one.turned != scene::kNoNode) lookAt.turns = scene.node(one.turned).name;
+      LookAtHead lookAt{ShownName(node.name), WhereIs(node.place, source.lines), {}, {}, {}};
+      if (one.turned != scene::kNoNode) lookAt.turns = ShownName(scene.node(one.turned).name);
       if (one.target == scene::kNoNode) return lookAt;
-      lookAt.camera = scene.node(one.camera->shape).name;
-      lookAt.target = scene.node(one.target).name;
+      lookAt.camera = ShownName(scene.node(one.camera->shape).name);
+      lookAt.target = ShownName(scene.node(one.target).name);
       return lookAt;
     });
   }

@@ -9,6 +9,9 @@ namespace {
 // A chain can be as long as its file, and each of its shapes says its path.
 constexpr std::size_t kLongestPath = 1000;
 
+// The bytes of a name that are kept: names can be as long as the file, too, and stand above many shapes.
+constexpr std::size_t kLongestName = 200;
+
 std::size_t KeysOf(const scene::Scene& scene, scene::NodeId curve) {
   std::size_t keys = 0;
   for (const scene::Piece& piece : scene.Pieces(curve, "keyTimeValue")) {
@@ -26,7 +29,7 @@ void DescribeChain(const HeadSource& source, scene::NodeId transform, ShapeHead*
       return;
     }
     ChainLink& link = head->chain.emplace_back();
-    link.name = scene.node(id).name;
+    link.name = ShownName(scene.node(id).name);
     for (const std::string_view channel : scene::kPlaceChannels) AddDrive(source, id, channel, &link.drives);
   }
 }
@@ -42,6 +45,11 @@ void DescribeLayer(const CameOver& cameOver, const CameOverLayer& layer, ShapeHe
 
 }  // namespace
 
+std::string ShownName(std::string_view name) {
+  if (name.size() <= kLongestName) return std::string(name);
+  return std::string(name.substr(0, kLongestName)) + "...";
+}
+
 void AddDrive(const HeadSource& source, scene::NodeId node, std::string_view attribute,
               std::vector<Drive>* drives) {
   const scene::Scene& scene = source.scene;
@@ -49,8 +57,8 @@ void AddDrive(const HeadSource& source, scene::NodeId node, std::string_view att
   if (!driver) return;
   const scene::Node& by = scene.node(driver->plug.node);
   Drive drive{.channel = std::string(attribute),
-              .node = std::string(by.name),
-              .type = std::string(by.type),
+              .node = ShownName(by.name),
+              .type = ShownName(by.type),
               .keys = std::nullopt,
               .where = WhereIs(driver->connection->destinationPlace, source.lines)};
   if (by.type.starts_with("animCurve")) drive.keys = KeysOf(scene, driver->plug.node);

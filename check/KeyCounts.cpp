@@ -27,22 +27,30 @@ std::vector<Counted> CountKeys(const Subject& subject, NodeId node) {
   return counted;
 }
 
-// Reports each curve whose number of keys is another than the first one's. False where there is none.
+// "3 on rotateY (\"turnY\")"
+std::string KeysOn(const Subject& subject, const Counted& one) {
+  return std::to_string(one.keys) + " on " + std::string(one.channel) + " (\"" +
+         std::string(subject.scene.node(one.curve).name) + "\")";
+}
+
+// Reports the curves whose number of keys is another than the first one's, at the first of them. False where
+// there is none.
 bool ReportUnequal(const Subject& subject, const std::vector<Counted>& counted) {
   const Counted* first = nullptr;
-  bool reported = false;
+  const Counted* odd = nullptr;
+  std::string others;
   for (const Counted& one : counted) {
     if (one.keys < 2) continue;
     if (first == nullptr) first = &one;
     if (one.keys == first->keys) continue;
-    reported = true;
-    subject.diagnostics.Report(
-        diag::Code::UnequalKeys, one.place,
-        {subject.scene.node(one.node).name, std::to_string(first->keys), std::string(first->channel),
-         subject.scene.node(first->curve).name, std::to_string(one.keys), std::string(one.channel),
-         subject.scene.node(one.curve).name});
+    if (odd == nullptr) odd = &one;
+    others += (others.empty() ? "" : ", ") + KeysOn(subject, one);
   }
-  return reported;
+  if (odd == nullptr) return false;
+  subject.diagnostics.Report(diag::Code::UnequalKeys, odd->place,
+                             {subject.scene.node(odd->node).name, std::to_string(first->keys),
+                              std::string(first->channel), subject.scene.node(first->curve).name, others});
+  return true;
 }
 
 std::vector<NodeId> NamedLike(const Subject& subject, NodeId node) {

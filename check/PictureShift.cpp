@@ -3,6 +3,8 @@
 #include <cmath>
 #include <deque>
 #include <limits>
+#include <map>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -30,21 +32,23 @@ class Shifts {
         interests_(subject.scene, &unreported_),
         unitsPerFrame_(motion::UnitsPerFrame(subject.scene)) {}
 
-  void Report() {
+  std::map<scene::NodeId, LargestShift> Report() {
     for (const Camera& camera : subject_.cameras) Ask(camera);
     FindFrames();
     Measure();
     ReportEvaluation();
     ReportInfinities(subject_, frames_);
     const motion::KeptBelow kept(evaluator_);
+    std::map<scene::NodeId, LargestShift> shifts;
     for (const CameraShift* const camera : measured_) {
       const std::vector<motion::Kept> unknown = camera->Unknown(kept);
-      if (unknown.empty()) {
-        camera->Report();
-      } else {
+      if (!unknown.empty()) {
         SayNotMeasured(camera->camera(), NameOf(unknown.front().plug) + " cannot be computed");
+      } else if (const std::optional<LargestShift> shift = camera->Report()) {
+        shifts[camera->camera().shape] = *shift;
       }
     }
+    return shifts;
   }
 
  private:
@@ -159,8 +163,9 @@ class Shifts {
 
 }  // namespace
 
-void ReportShifts(const Subject& subject) {
-  if (subject.cameOver.composition) Shifts(subject).Report();
+std::map<scene::NodeId, LargestShift> ReportShifts(const Subject& subject) {
+  if (!subject.cameOver.composition) return {};
+  return Shifts(subject).Report();
 }
 
 }  // namespace check

@@ -3,6 +3,7 @@
 
 #include <cstdint>
 #include <initializer_list>
+#include <map>
 #include <set>
 #include <span>
 #include <string_view>
@@ -12,6 +13,7 @@
 #include "check/Cameras.h"
 #include "check/CurveShapes.h"
 #include "check/Curves.h"
+#include "check/Head.h"
 #include "check/Links.h"
 #include "diag/Collector.h"
 #include "motion/FrameEnds.h"
@@ -75,7 +77,9 @@ void ReportChannelValues(const Subject& subject);  // ChannelValues.cpp
 void ReportTimes(const Subject& subject);          // Times.cpp
 void ReportKeysAtOneTime(const Subject& subject);  // KeysAtOneTime.cpp
 void ReportPicture(const Subject& subject);        // PictureSize.cpp
-void ReportShifts(const Subject& subject);         // PictureShift.cpp
+
+// The cameras whose shift is measured, with it: PictureShift.cpp.
+std::map<scene::NodeId, LargestShift> ReportShifts(const Subject& subject);
 
 // The camera's picture was seen to be changed in a way that comes over nowhere; of what changes it whatever
 // else the camera says ReportLenses has said so: Lenses.cpp.

@@ -5,6 +5,7 @@
 
 #include "check/ReadingEnd.h"
 #include "check/RulesInternal.h"
+#include "scene/TemplateField.h"
 #include "text/Utf8.h"
 
 namespace check {
@@ -34,23 +35,6 @@ std::size_t CharacterLength(std::string_view text) {
   return std::max<std::size_t>(1, text::CharacterAt(text, 0).length);
 }
 
-// How long a template field is that begins the line: "{{FPS}}", "${FPS}", "@FPS@", "%FPS%", "<FPS>". 0: none.
-std::size_t FieldLength(std::string_view line) {
-  struct Form {
-    std::string_view open, close;
-  };
-  constexpr Form kForms[] = {{"{{", "}}"}, {"${", "}"}, {"@", "@"}, {"%", "%"}, {"<", ">"}};
-  for (const Form& form : kForms) {
-    if (!line.starts_with(form.open)) continue;
-    const std::size_t close = line.find(form.close, form.open.size());
-    if (close == std::string_view::npos || close == form.open.size()) continue;
-    const std::string_view inside = line.substr(form.open.size(), close - form.open.size());
-    if (inside.find_first_of("<>{}@%\"; ") == std::string_view::npos || form.open == "{{")
-      return close + form.close.size();
-  }
-  return 0;
-}
-
 bool IsConflictMark(std::string_view text, std::size_t at) {
   if (at != 0 && text[at - 1] != '\n' && text[at - 1] != '\r') return false;
   const std::string_view start = text.substr(at, 7);
@@ -61,7 +45,7 @@ void ReportRefusedByte(std::string_view text, const ReadingEnd& end, diag::Colle
   const std::size_t at = end.offset;
   const std::string_view line = RestOfLine(text, at);
   if (IsConflictMark(text, at)) return diagnostics->Report(Code::ConflictMarkStops, {at, line.size()});
-  if (const std::size_t length = FieldLength(line); length != 0) {
+  if (const std::size_t length = scene::TemplateFieldLength(line); length != 0) {
     return diagnostics->Report(Code::TemplateFieldStops, {at, length}, {line.substr(0, length)});
   }
   if (line[0] == '|') {

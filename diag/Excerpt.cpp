@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <cstddef>
 
+#include "diag/Columns.h"
 #include "diag/ShownText.h"
 
 namespace diag {
@@ -15,12 +16,6 @@ constexpr std::size_t kMost = 100;
 constexpr std::string_view kCut = "...";
 
 bool IsInsideCharacter(char c) { return (static_cast<unsigned char>(c) & 0xc0) == 0x80; }
-
-// How many columns of a terminal a harmless text takes, nearly: one for each character.
-std::size_t ColumnsOf(std::string_view shown) {
-  return static_cast<std::size_t>(
-      std::count_if(shown.begin(), shown.end(), [](char c) { return !IsInsideCharacter(c); }));
-}
 
 // Tabs are shown as single blanks, so that the mark stands under its text everywhere.
 std::string Shown(std::string_view bytes) {

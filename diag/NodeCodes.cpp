@@ -125,7 +125,7 @@ constexpr Entry kNodeCodes[] = {
      .sentence = "the importer does not take this name of {0} bytes",
      .meaning =
          "A name of more than 252 bytes is empty for the importer. The node gets no values and no curves.",
-     .example = "",
+     .example = "$ printf '//Maya ASCII 2018 scene;\\ncreateNode camera -n \"%0300d\";\\n' 0 > shot.ma",
      .help = "Give the node a shorter name, or write the scene anew: mayascene bake SCENE -o OUT."},
     {.code = Code::NodeWithoutName,
      .severity = Severity::Warning,
@@ -142,7 +142,8 @@ constexpr Entry kNodeCodes[] = {
      .meaning =
          "A byte of value 0 ends the text for the importer, and text follows it. The file is damaged, or was "
          "put together from several.",
-     .example = "",
+     .example =
+         "$ printf '//Maya ASCII 2018 scene;\\n\\000createNode camera -n \"shotCamShape\";\\n' > shot.ma",
      .help = "Copy or export the file again. A bake reads on after the byte: mayascene bake SCENE -o OUT."},
 };
 

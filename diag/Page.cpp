@@ -49,7 +49,8 @@ help: Close the string, or export the scene again.
 
 At most 20 diagnostics of one code are shown in full. The rest are counted.
 
-In the sentences below, {0}, {1} and so on stand for what the file says.
+In the sentences below, {0}, {1} and so on stand for what the file says. An example is a part of a scene, a part of a
+composition as JSON, or what is typed in a shell: it then begins with `$`.
 )";
 
 constexpr std::size_t kLineLength = 120;

@@ -84,7 +84,7 @@ constexpr Entry kReadingCodes[] = {
     {.code = Code::UnreadableValue,
      .severity = Severity::Warning,
      .symbol = "UnreadableValue",
-     .sentence = "\"{0}\" is no value that {1} can have",
+     .sentence = "\"{0}\" is not a value that {1} can have",
      .meaning = "The value is not a number where one is needed, or it is too large. The default is used in "
                 "its place.",
      .example = "select -ne :time1;\n  setAttr \".o\" 1e999;",
@@ -94,7 +94,7 @@ constexpr Entry kReadingCodes[] = {
      .symbol = "TextTooLong",
      .sentence = "the file has {0} bytes, which is more than can be read",
      .meaning = "Files of up to 4,294,967,294 bytes are read. Of a longer one nothing is read.",
-     .example = "",
+     .example = "$ truncate -s 5G everything.ma",
      .help = "Export only the cameras, with what is above them."},
 };
 

@@ -17,7 +17,7 @@ constexpr Entry kStopCodes[] = {
     {.code = Code::NotMayaAscii,
      .severity = Severity::Error,
      .symbol = "NotMayaAscii",
-     .sentence = "this is no Maya ASCII scene",
+     .sentence = "this is not a Maya ASCII scene",
      .meaning =
          "A Maya ASCII scene is a text that begins with \"//Maya\". This file begins differently, so the "
          "importer does not read it.",
@@ -28,22 +28,22 @@ constexpr Entry kStopCodes[] = {
      .symbol = "MayaBinary",
      .sentence = "this is a Maya Binary scene under another name",
      .meaning = "The file has the form of a Maya Binary scene (.mb). The importer reads only Maya ASCII.",
-     .example = "",
+     .example = "$ printf 'FOR8\\000\\000\\000\\000\\000\\000\\000\\100Maya' > shot.ma",
      .help = "Open the scene in Maya and save it as Maya ASCII (.ma). To rename the file is not enough."},
     {.code = Code::CompressedFile,
      .severity = Severity::Error,
      .symbol = "CompressedFile",
      .sentence = "this file is compressed ({0})",
      .meaning = "The file begins like a compressed file. There may be a scene in it.",
-     .example = "",
+     .example = "$ printf '\\037\\213\\010' > shot.ma",
      .help = "Unpack the file, and give the scene that comes out of it."},
     {.code = Code::EmptyFile,
      .severity = Severity::Error,
      .symbol = "EmptyFile",
-     .sentence = "the file is empty",
+     .sentence = "the file has no text",
      .meaning =
          "The file has no bytes, or none but white space or zeros. It was probably never written to its end.",
-     .example = "",
+     .example = "$ printf '' > shot.ma",
      .help = "Copy or export the file again."},
     {.code = Code::MarkBeforeHeader,
      .severity = Severity::Error,
@@ -51,7 +51,7 @@ constexpr Entry kStopCodes[] = {
      .sentence = "the file begins with a byte order mark ({0})",
      .meaning = "A text editor wrote a mark before the first line, or wrote every letter in two bytes. The "
                 "importer looks for \"//Maya\" at the very beginning of the file.",
-     .example = "",
+     .example = "$ printf '\\357\\273\\277//Maya ASCII 2018 scene;\\n' > shot.ma",
      .help = "Save the file as UTF-8 without a byte order mark, or write the scene anew from the original."},
     {.code = Code::UnquotedPath,
      .severity = Severity::Error,
@@ -144,7 +144,7 @@ constexpr Entry kStopCodes[] = {
     {.code = Code::UnequalKeys,
      .severity = Severity::Error,
      .symbol = "UnequalKeys",
-     .sentence = "the import stops at \"{0}\": {1} keys on {2} (\"{3}\"), but {4} on {5} (\"{6}\")",
+     .sentence = "the import stops at \"{0}\": {1} keys on {2} (\"{3}\"), but {4}",
      .meaning =
          "The importer takes the first keys of all channels of a node together, then the second ones, and so "
          "on. All curves of a node that have two keys or more need the same number of keys. What was made "

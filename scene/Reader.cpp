@@ -7,6 +7,7 @@
 #include <string>
 
 #include "scene/ByteClasses.h"
+#include "scene/TemplateField.h"
 #include "scene/Text.h"
 
 namespace scene {
@@ -16,30 +17,6 @@ using diag::Code;
 
 // No more arguments of one command are kept: no command that is read in this way has more.
 constexpr std::size_t kMostArguments = 10000;
-
-// The bytes of a template field that are shown, at most.
-constexpr std::size_t kLongestField = 60;
-
-// The length of the template field at the front of the text; 0 where none stands there.
-std::size_t FieldLength(std::string_view text) {
-  const auto closed = [text](std::size_t open, std::string_view close) -> std::size_t {
-    const std::size_t end = text.find(close, open);
-    if (end == std::string_view::npos || end == open) return 0;
-    const std::string_view inside = text.substr(open, end - open);
-    const bool plain =
-        std::all_of(inside.begin(), inside.end(), [](char c) { return IsByte(c, kWordByte) || c == ' '; });
-    return plain ? end + close.size() : 0;
-  };
-  text = text.substr(0, kLongestField);
-  if (text.substr(0, 2) == "{{") return closed(2, "}}");
-  if (text.substr(0, 2) == "${") return closed(2, "}");
-  if (text[0] == '<') return closed(1, ">");
-  if (text[0] == '%' || text[0] == '@') return closed(1, text.substr(0, 1));
-  if (text[0] != '$' || text.size() < 2 || !IsByte(text[1], kLetterByte)) return 0;
-  std::size_t end = 1;
-  while (end < text.size() && IsByte(text[end], kLetterByte | kDigitByte)) ++end;
-  return end;
-}
 
 // The length in bytes of the character at the front of the text, which need not be valid UTF-8.
 std::size_t CharacterLength(std::string_view text) {
@@ -121,7 +98,7 @@ Reader::Token Reader::Broken(Code code, std::uint32_t offset, std::uint32_t end)
 
 Reader::Token Reader::StrangeByte() {
   const std::string_view rest = cursor_.rest();
-  const std::size_t field = FieldLength(rest);
+  const std::size_t field = TemplateFieldLength(rest);
   const std::size_t length = field != 0 ? field : CharacterLength(rest);
   const Code code = field != 0 ? Code::TemplateField : Code::UnexpectedByte;
   diagnostics_->Report(code, {cursor_.offset(), length}, {rest.substr(0, length)});

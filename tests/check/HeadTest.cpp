@@ -26,6 +26,26 @@ void ExpectSpan(const std::optional<check::Span>& span, double least, double lar
   EXPECT_NEAR(span->largest, largest, 1e-9);
 }
 
+TEST(HeadTest, TheCompositionIsThatOfTheImport) {
+  const Checked checked(CameraScene("", "", kPlayed + CurveOf("moveX", "3 0 7 5", "shotCam.tx")));
+  const auto& made = checked.report().head.composition;
+  ASSERT_TRUE(made.has_value());
+  EXPECT_EQ(made->framesPerSecond, 24.0);
+  EXPECT_EQ(made->seconds, checked.cameOver().composition->seconds);
+  EXPECT_LT(made->seconds * 24.0, 10.0);  // played are 10 frames
+  EXPECT_FALSE(Checked("#usda 1.0").report().head.composition.has_value());
+}
+
+TEST(HeadTest, ALongNameIsCut) {
+  const std::string name(5000, 'n');
+  const CameraHead camera = CameraOf(CameraScene(
+      "", "",
+      "createNode transform -n \"" + name + "\";\nparent -s -nc -r -add \"shotCam\" \"" + name + "\";\n"));
+  std::size_t longest = camera.path.size();
+  for (const check::ChainLink& link : camera.chain) longest = std::max(longest, link.name.size());
+  EXPECT_LE(longest, 1003u);
+}
+
 TEST(HeadTest, ADrivenLensTakesValuesOverTheFrames) {
   const CameraHead camera =
       CameraOf(CameraScene("", "\tsetAttr \".fl\" 18;\n",

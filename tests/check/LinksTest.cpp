@@ -79,7 +79,7 @@ TEST(LinksTest, WithoutACameraNothingComesOverAndOneDiagnosticSaysSo) {
   EXPECT_EQ(marked.CountOf(Code::ParentNotImported), 0u);
   const Checked empty(kHead + kResolution + Transform("a", "", ""));
   EXPECT_EQ(empty.CountOf(Code::NoCameraToImport), 1u);
-  EXPECT_EQ(empty.report().warnings, 0u);
+  EXPECT_EQ(empty.report().warnings, 1u);
   const Checked some(CameraScene("", "", locators));
   EXPECT_EQ(some.CountOf(Code::LocatorsWithoutCamera) + some.CountOf(Code::NoCameraToImport), 0u);
 }

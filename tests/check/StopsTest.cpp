@@ -101,6 +101,18 @@ TEST(StopsTest, UnequalKeyCountsNameTheNodeTheCurvesAndTheirKeys) {
   EXPECT_EQ(checked.MarkedBy(Code::UnequalKeys), "1 0 3 90");
 }
 
+TEST(StopsTest, AllOddCurvesOfTheNodeStandInOneDiagnostic) {
+  const Checked checked(CameraScene("", "",
+                                    CurveOf("moveX", "1 0 2 5 3 9", "shotCam.tx") +
+                                        CurveOf("turnY", "1 0 3 90", "shotCam.ry", "animCurveTA") +
+                                        CurveOf("growZ", "1 1 3 2 5 6 7 4", "shotCam.sz", "animCurveTU") +
+                                        CurveOf("moveY", "1 7 2 8 4 6", "shotCam.ty")));
+  EXPECT_EQ(checked.SentenceOf(Code::UnequalKeys),
+            "the import stops at \"shotCam\": 3 keys on translateX (\"moveX\"), but 2 on rotateY "
+            "(\"turnY\"), 4 on scaleZ (\"growZ\")");
+  EXPECT_EQ(checked.report().errors, 1u);
+}
+
 TEST(StopsTest, UnequalKeyCountsAreFoundAmongCurvesOfOneName) {
   const std::string twins = "createNode transform -n \"shotCam\";\n" +
                             CurveOf("turnY", "1 0 3 90 7 2 8 4", "shotCam.ry", "animCurveTA");

@@ -24,6 +24,13 @@ TEST(ExcerptTest, AMarkEndsWithItsLine) {
   EXPECT_EQ(Excerpt("one\r\ntwo\r\n", {0, 8}), "one\n^~~\n");
 }
 
+TEST(ExcerptTest, WideCharactersTakeTwoColumnsAndMarksOverOthersNone) {
+  // Two ideographs, then "e" with an acute accent of its own.
+  EXPECT_EQ(Excerpt("\u30ab\u30e1e\u0301 = \u6620;", {11, 5}),
+            "\u30ab\u30e1e\u0301 = \u6620;\n"
+            "       ^~~~\n");
+}
+
 TEST(ExcerptTest, ALongLineIsCutAroundTheMark) {
   const std::string line = std::string(300, 'a') + "here" + std::string(300, 'b');
   const std::string excerpt = Excerpt(line, {300, 4});

@@ -48,11 +48,12 @@ TEST(TableTest, EveryCodeHasARowUnderItsOwnName) {
   }
 }
 
-TEST(TableTest, EveryRowSaysWhatItMeansAndWhatToDo) {
+TEST(TableTest, EveryRowSaysWhatItMeansAndWhatToDoAndHasAnExample) {
   for (const Entry& entry : Table()) {
     SCOPED_TRACE(std::string(entry.symbol));
     EXPECT_GE(static_cast<int>(entry.code), 100);
     EXPECT_FALSE(entry.sentence.empty());
+    EXPECT_FALSE(entry.example.empty());
     EXPECT_NE(entry.sentence.back(), '.');
     for (const std::string_view text : {entry.meaning, entry.help}) {
       ASSERT_FALSE(text.empty());

@@ -10,8 +10,8 @@ class ExamplesOfCodes : public SceneTest {};
 TEST_F(ExamplesOfCodes, EachGivesItsCode) {
   int looked = 0;
   for (const diag::Entry& entry : diag::Table()) {
-    // Later codes are those of values, bakes and checks.
-    if (entry.code > diag::Code::ReferenceNotRead || entry.example.empty()) continue;
+    // Later codes are those of values, bakes and checks; a text that is too long has gigabytes.
+    if (entry.code > diag::Code::ReferenceNotRead || entry.code == diag::Code::TextTooLong) continue;
     SCOPED_TRACE(std::string(entry.symbol));
     Read(std::string(entry.example) + (entry.code == diag::Code::CommandCutOff ? "" : "\n"));
     (void)ReadSettings(scene_, collector());

@@ -112,7 +112,7 @@ TEST_F(HeadTest, RangesInLongOptionsAndUnreadableOnes) {
   ASSERT_TRUE(settings.playback);
   EXPECT_EQ(settings.playback->value, (FrameRange{1, 2}));
   EXPECT_FALSE(settings.animation);
-  EXPECT_THAT(Diagnostics(), ElementsAre("1:81: \"x\" is no value that animationEndTime can have [MA0109]"));
+  EXPECT_THAT(Diagnostics(), ElementsAre("1:81: \"x\" is not a value that animationEndTime can have [MA0109]"));
 }
 
 TEST_F(HeadTest, AScriptOfAnotherNameMaySetTheRange) {
@@ -172,8 +172,8 @@ TEST_F(HeadTest, AResolutionThatCannotBeReadIsReported) {
   EXPECT_EQ(settings.width.value, 960.0);
   EXPECT_EQ(settings.pixelAspect(), 1.0);
   EXPECT_EQ(settings.height.value, 540.0);
-  EXPECT_THAT(Diagnostics(), ElementsAre("2:15: \"1e999\" is no value that width can have [MA0109]",
-                                         "2:34: \"0\" is no value that height can have [MA0109]"));
+  EXPECT_THAT(Diagnostics(), ElementsAre("2:15: \"1e999\" is not a value that width can have [MA0109]",
+                                         "2:34: \"0\" is not a value that height can have [MA0109]"));
 }
 
 }  // namespace

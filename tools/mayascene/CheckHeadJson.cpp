@@ -79,6 +79,16 @@ void writeLayer(text::JsonWriter& json, const check::ShapeHead& shape, const std
   json.endObject();
 }
 
+// Null where the picture was not measured.
+void writeShift(text::JsonWriter& json, const std::optional<check::LargestShift>& shift) {
+  json.key("shift");
+  if (!shift) return json.null();
+  json.beginObject();
+  writeNumber(json, "pixels", shift->pixels);
+  writeNumber(json, "frame", shift->frame);
+  json.endObject();
+}
+
 void writeSpan(text::JsonWriter& json, std::string_view key, const std::optional<check::Span>& span) {
   if (!span) return;
   json.key(key);
@@ -122,6 +132,7 @@ void writeCamera(text::JsonWriter& json, const check::CameraHead& camera) {
   writeOverFrames(json, camera.overFrames);
   writeChain(json, camera);
   writeLayer(json, camera, &camera.zoomKeys);
+  writeShift(json, camera.shift);
   json.endObject();
 }
 
@@ -159,10 +170,23 @@ void writeList(text::JsonWriter& json, std::string_view key, const std::vector<T
   writeCount(json, std::string(key) + "NotShown", notShown);
 }
 
+// Null where the import made none.
+void writeComposition(text::JsonWriter& json, const std::optional<check::CameOverComposition>& made) {
+  json.key("composition");
+  if (!made) return json.null();
+  json.beginObject();
+  writeNumber(json, "width", made->width);
+  writeNumber(json, "height", made->height);
+  writeNumber(json, "pixelAspect", made->pixelAspect);
+  writeNumber(json, "framesPerSecond", made->framesPerSecond);
+  writeNumber(json, "seconds", made->seconds);
+  json.endObject();
+}
+
 void writeRanges(text::JsonWriter& json, const check::Head& head) {
   json.key("ranges");
   json.beginArray();
-  for (const check::Range& range : head.ranges) {
+  for (const check::NamedFrames& range : head.ranges) {
     json.beginObject();
     writeText(json, "what", range.what);
     writeNumber(json, "first", range.first);
@@ -202,6 +226,7 @@ void writeHead(text::JsonWriter& json, const check::Head& head) {
   writeGiven(json, "pixelAspect", head.pixelAspect);
   writeCount(json, "camerasThatCame", head.camerasThatCame);
   writeCount(json, "nullsThatCame", head.nullsThatCame);
+  writeComposition(json, head.composition);
   writeList(json, "cameras", head.cameras, writeCamera, head.camerasNotShown);
   writeList(json, "locators", head.locators, writeLocator, head.locatorsNotShown);
   writeList(json, "lookAts", head.lookAts, writeLookAt, head.lookAtsNotShown);

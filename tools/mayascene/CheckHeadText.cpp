@@ -93,7 +93,7 @@ void HeadPrinter::scene(const check::Head& head) {
   row("angles", diag::ShownText(head.angularUnit.value) + said(head.angularUnit.where));
   row("frame rate", fmt::format("{}, {}{}", numberText(head.framesPerSecond),
                                 diag::ShownText(head.timeUnit.value), said(head.timeUnit.where)));
-  for (const check::Range& range : head.ranges) {
+  for (const check::NamedFrames& range : head.ranges) {
     row(range.what,
         fmt::format("{} to {}{}", numberText(range.first), numberText(range.last), lineOf(range.where)));
   }
@@ -101,8 +101,15 @@ void HeadPrinter::scene(const check::Head& head) {
   row("width", numberText(head.width.value) + said(head.width.where));
   row("height", numberText(head.height.value) + said(head.height.where));
   row("pixel aspect", numberText(head.pixelAspect.value) + said(head.pixelAspect.where));
-  row("came over", fmt::format("{}, {}", countText(head.camerasThatCame, "camera"),
-                               countText(head.nullsThatCame, "null")));
+  std::string came =
+      fmt::format("{}, {}", countText(head.camerasThatCame, "camera"), countText(head.nullsThatCame, "null"));
+  if (head.composition) {
+    const check::CameOverComposition& made = *head.composition;
+    came += fmt::format("; {} s ({} frames) of {} x {} pixels", numberText(made.seconds),
+                        numberText(made.seconds * made.framesPerSecond), numberText(made.width),
+                        numberText(made.height));
+  }
+  row("came over", came);
 }
 
 const check::Drive* driveOf(const check::CameraHead& camera, std::string_view channel) {
