@@ -113,12 +113,13 @@ constexpr Entry kPictureCodes[] = {
      .symbol = "ChainScaled",
      .sentence = "\"{0}\" scales the camera \"{1}\" below it",
      .meaning =
-         "A scale above a camera moves it. An uneven one also bends its axes, which no layer can show.",
+         "A scale above a camera moves it. An uneven one also bends its axes, and a negative one mirrors the "
+         "picture: no layer can show that, and the largest shift of MA0901 leaves it out.",
      .example = "createNode transform -n \"rig\";\n"
                 "  setAttr \".s\" -type \"double3\" 2 2 2 ;\n"
                 "createNode transform -n \"shotCam\" -p \"rig\";",
-     .help = "Take the scale out of the rig, or write the camera in world space: mayascene bake SCENE -o OUT "
-             "--world."},
+     .help = "Take the scale out of the rig. An even, positive one comes over where the camera is written in "
+             "world space: mayascene bake SCENE -o OUT --world."},
     {.code = Code::PictureSizeAssumed,
      .severity = Severity::Warning,
      .symbol = "PictureSizeAssumed",
