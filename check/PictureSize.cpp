@@ -58,14 +58,14 @@ void CompareRate(const Subject& subject, double made) {
 }  // namespace
 
 void ReportPicture(const Subject& subject) {
+  // Without a layer nothing is shown that could look otherwise.
+  if (!subject.cameOver.composition || subject.cameOver.layers.empty()) return;
   const scene::Settings& settings = subject.settings;
   if (settings.centimetersPerUnit.value != 1.0 && !subject.cameOver.distancesConverted) {
     subject.diagnostics.Report(Code::OtherLengthUnit,
                                settings.centimetersPerUnit.place.value_or(diag::Range{}),
                                {subject.scene.linearUnit().word});
   }
-  // A composition without a layer shows nothing that could look otherwise.
-  if (!subject.cameOver.composition || subject.cameOver.layers.empty()) return;
   const CameOverComposition& composition = *subject.cameOver.composition;
   CompareSize(subject, composition);
   CompareRate(subject, composition.framesPerSecond);

@@ -46,7 +46,7 @@ std::string ChannelJudge::Run() {
     const std::string wrong = (this->*judge)();
     if (!wrong.empty()) return wrong;
   }
-  const bool scaled = !scene_.countsCentimeters();
+  const bool scaled = !cameOver_.layers.empty() && !scene_.countsCentimeters();
   if (scaled != SaysAnywhere({Code::OtherLengthUnit})) return "of the unit of length the wrong is said";
   return JudgeLeftOver();
 }
