@@ -32,8 +32,7 @@ class CameraShift {
   motion::Evaluator::Wanted Wanted() const { return {lens_.Numbers(), {world_}}; }
   motion::Evaluator::Wanted WantedOfInterest() const { return {{interest_}, {}}; }
 
-  // Both evaluators stand at the frame, which has the time in the scene's unit. `frame` is what is said of
-  // it.
+  // Both evaluators stand at the frame. `time` is the frame in the scene's unit of time.
   void TakeIn(double frame, double time);
 
   // The channels below the picture of the scene that keep a stored value, although something drives them.

@@ -46,8 +46,8 @@ bool IsImportedTransform(std::string_view type) {
 }
 
 std::vector<Camera> FindCameras(const scene::Scene& scene, const CameOver& cameOver) {
-  // The import makes the layers of the cameras in the order of the file, each under the camera's name. Of
-  // names that are one for it all layers can have the one.
+  // The import makes the layers of the cameras in the order of the file, each under the camera's name. Where
+  // names differ in case alone, all their layers can have the same one.
   std::unordered_map<std::string, std::deque<const CameOverLayer*>> layersOf;
   for (const CameOverLayer& layer : cameOver.layers) {
     if (layer.kind == LayerKind::Camera) layersOf[Lowered(layer.name)].push_back(&layer);
@@ -66,7 +66,7 @@ std::vector<Camera> FindCameras(const scene::Scene& scene, const CameOver& cameO
         {.shape = id, .transform = node.parent, .layer = nullptr, .taken = !IsSkipped(scene, id)});
     if (cameras.back().taken) takeLayer(&cameras.back());
   }
-  // A camera that the file creates twice, with a value once, is for the import a second one without it.
+  // Where the file creates a camera twice, the import has two. Only one of them has the values.
   for (Camera& camera : cameras) {
     if (camera.taken) continue;
     takeLayer(&camera);

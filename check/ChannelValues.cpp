@@ -29,7 +29,7 @@ struct Found {
   diag::Range place;
 };
 
-// Whether a stored value counts in place of which the import has another one.
+// Whether to look at a stored value that the import does not have: it has another one in its place.
 enum class Skipped { No, Yes };
 
 // The first value of the channel that the import takes and that `wanted` holds for: a key, or what is stored.

@@ -64,7 +64,7 @@ class OutsideFrames {
     return std::fabs(curve_.At(frame / rate_, &cursor_) - value) > ToleranceAt(value);
   }
 
-  // The keys once more: all frames of the turn, or of a longer one some between each two keys.
+  // One repetition of the keys: all of its frames, or, where it is long, some between each two keys.
   bool LeaveInOneTurn() {
     const std::vector<CurveKey>& keys = curve_.Data().keys;
     const double turn = std::ceil((keys.back().time - keys.front().time) * rate_) + 1.0;
@@ -135,7 +135,7 @@ bool CurveShapes::GoesOn(scene::NodeId curve, CurveEnd end, const motion::FrameE
   Known& known = Of(curve);
   std::optional<bool>& goesOn = known.goesOn[static_cast<std::size_t>(end)];
   if (!goesOn) {
-    // Of one key no curve is made of anything else.
+    // A curve of one key has its value everywhere.
     goesOn = known.curve.Data().keys.size() > 1 &&
              OutsideFrames(known.curve, end, frames, FramesPerSecond()).Leave();
   }

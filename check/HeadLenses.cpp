@@ -51,7 +51,7 @@ class DrivenLens {
     TakeIn(AngleOfView(lens_.Now(), picture_), &values_.angleOfView);
   }
 
-  // After all frames. What is not what drives it is none.
+  // Call after all frames. A value that does not come from its driver is left empty.
   void Finish(const motion::FrameEnds& frames, const motion::KeptBelow& kept) {
     values_.first = frames.first;
     values_.last = frames.last;

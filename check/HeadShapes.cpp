@@ -23,7 +23,7 @@ std::size_t KeysOf(const scene::Scene& scene, scene::NodeId curve) {
 void DescribeChain(const HeadSource& source, scene::NodeId transform, ShapeHead* head) {
   const scene::Scene& scene = source.scene;
   for (scene::NodeId id = transform; id != scene::kNoNode; id = scene.node(id).parent) {
-    // A longer chain is counted only so far, that reports do not grow faster than their scenes.
+    // A longer chain ends here, so that reports do not grow faster than their scenes.
     if (head->chain.size() == Head::kMostLinks) {
       head->chainGoesOn = true;
       return;

@@ -95,8 +95,8 @@ void ReportPairs(const Subject& subject, NodeId node, const KeyedChannel& channe
   }
 }
 
-// All keys of a node have the times of its first channel with `fewest` keys, but for the first key: that of
-// the first channel with any begins the node's time.
+// All keys of a node have the times of its first channel with `fewest` keys or more. Its time begins with the
+// first key of the first channel with any.
 void ReportNode(const Subject& subject, NodeId node, std::span<const KeyedChannel> channels,
                 std::size_t fewest) {
   const auto with = [&](std::size_t keys) {

@@ -9,8 +9,8 @@
 
 namespace check {
 
-// Reads the command again, from the nearest "createNode" that it can begin with: the word also stands in
-// strings.
+// Reads the command again. It tries the nearest words "createNode" before the node, because one can stand in
+// a string.
 diag::Range WrittenParent(std::string_view text, const scene::Node& node) {
   constexpr std::string_view kWord = "createNode";
   constexpr std::size_t kLongestHead = 65'536;

@@ -40,7 +40,7 @@ scene::NodeId TargetOf(const scene::Scene& scene, scene::NodeId lookAt) {
   return target;
 }
 
-// By transform, the first camera under it that came over; without any, the first.
+// By transform: the first camera below it that came over, or the first one where none did.
 std::unordered_map<scene::NodeId, const Camera*> CamerasByTransform(const std::vector<Camera>& cameras) {
   std::unordered_map<scene::NodeId, const Camera*> cameraOf;
   for (const Camera& camera : cameras) {

@@ -21,7 +21,7 @@ std::string_view WrittenAt(const scene::Scene& scene, const diag::Range& range) 
   return scene.text().substr(static_cast<std::size_t>(range.offset), static_cast<std::size_t>(range.length));
 }
 
-// Has a place in the scene: what such a node computes comes from more than its curves.
+// Whether the node has a place in the scene: what it computes then comes from more than its curves.
 bool IsPlaced(const scene::Scene& scene, NodeId node) {
   const scene::Node& one = scene.node(node);
   return one.parent != scene::kNoNode || one.firstChild != scene::kNoNode || one.type == "transform";
@@ -60,7 +60,7 @@ void KeepAsSaid(const Subject& subject, const scene::Driver& driver) {
   if (subject.driversSaid != nullptr) subject.driversSaid->insert(driver.connection->destinationPlace.offset);
 }
 
-// What else than curves drives the node, a diagnostic for each driver.
+// Reports the drivers of the node that are not curves, a diagnostic for each.
 void ReportDrivers(const Subject& subject, const Link& link) {
   const scene::Scene& scene = subject.scene;
   std::map<NodeId, Driven> drivers;

@@ -22,8 +22,8 @@ const scene::Connection* LastTarget(const scene::Scene& scene, NodeId lookAt) {
   return targets.empty() ? nullptr : targets.back();
 }
 
-// What the import does not take of one transform's look-ats. A look-at that is reported needs no second
-// diagnostic that a bake finds no answer for it either.
+// What the import does not take of one transform's look-ats. A look-at that is reported here is not reported
+// a second time as one that a bake cannot compute.
 class TransformLookAts {
  public:
   TransformLookAts(const Subject& subject, NodeId transform) : subject_(subject), transform_(transform) {
@@ -36,7 +36,8 @@ class TransformLookAts {
     }
   }
 
-  // Of several cameras under one transform, each is looked at with the first look-at, and one with all.
+  // Of several cameras under one transform, the first is checked with all look-ats, the others with the
+  // first.
   void Report(const Camera& camera) {
     for (const auto& [lookAt, target] : lookAts_) {
       ReportOne(lookAt, target, camera);
@@ -65,7 +66,7 @@ class TransformLookAts {
     }
   }
 
-  // What turns the camera besides its aim along the axis that it looks along.
+  // What turns the camera about the axis that it looks along.
   void ReportTurn(NodeId lookAt, const Camera& camera) const {
     const auto numbers = [&](std::string_view attribute) {
       const auto written = subject_.scene.Written(lookAt, attribute);

@@ -40,7 +40,7 @@ class References {
  private:
   using Map = std::unordered_map<std::string_view, const scene::Reference*>;
 
-  // A name space may lie in others: "a:b:root" is of "a", and of "a:b".
+  // Name spaces can be nested: "a:b:root" belongs to "a" and to "a:b".
   const scene::Reference* OfSpace(std::string_view name) const {
     const scene::Reference* found = nullptr;
     std::size_t looked = 0;
@@ -67,7 +67,7 @@ class References {
     return known->second;
   }
 
-  // Of a longer name, what follows is not looked at: many parents may have long ones.
+  // The rest of a longer name is not looked at: many parents may have long names.
   static constexpr std::size_t kMostSpaces = 64;
   static constexpr std::size_t kLongestNode = 256;
 

@@ -78,8 +78,8 @@ class NamesThatCount {
   // node's.
   bool IsLostParent(NodeId id) const { return lostParents_.contains(id); }
 
-  // Takes in a node of the list. The name of the one that had the name before it; empty where none had, and
-  // where the name does not count.
+  // Adds a node of the list. Gives the name of the earlier node of the same name; empty where there is none,
+  // and where the name does not count.
   std::string_view Meet(List list, std::string_view name) {
     const std::uint32_t* const number = numbers_.Find(0, Lowered(name));
     if (number == nullptr) return {};
@@ -92,8 +92,7 @@ class NamesThatCount {
  private:
   static constexpr std::size_t kLists = 5;
 
-  // The name without case. Until the next call: every node of a scene is looked at, and none needs memory of
-  // its own.
+  // The name without case. It lasts until the next call, so that no node needs memory of its own.
   std::string_view Lowered(std::string_view name) {
     lowered_.assign(name);
     for (char& c : lowered_) c = c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;

@@ -34,8 +34,8 @@ struct Subject {
   Channels& channels;
   CurveShapes& shapes;
   diag::Collector& diagnostics;
-  // Where the connections stand of which a rule has said that the import does not follow the driver. Null:
-  // what the evaluation says of the same connection is said, too.
+  // The places of the connections whose drivers a rule has reported as not followed by the import. The
+  // evaluation's diagnostics of these connections are left out. Null: none are left out.
   std::set<std::uint64_t>* driversSaid;
 };
 
@@ -81,8 +81,8 @@ void ReportPicture(const Subject& subject);        // PictureSize.cpp
 // The cameras whose shift is measured, with it: PictureShift.cpp.
 std::map<scene::NodeId, LargestShift> ReportShifts(const Subject& subject);
 
-// The camera's picture was seen to be changed in a way that comes over nowhere; of what changes it whatever
-// else the camera says ReportLenses has said so: Lenses.cpp.
+// Reports what changes the finished picture of the camera and comes over nowhere, where a measurement has
+// shown that it does. ReportLenses reports what always does: Lenses.cpp.
 void ReportPictureChange(const Subject& subject, scene::NodeId camera);
 
 // Curves that go on outside their keys, within the frames: Infinities.cpp.

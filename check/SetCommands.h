@@ -36,15 +36,16 @@ std::vector<const ReadAttribute*> ReadAttributesOf(std::string_view type);
 // no others are for the importer.
 std::vector<SetCommand> CommandsAfter(const scene::Scene& scene, scene::NodeId node);
 
-// The command in which a value stands that is set elsewhere.
+// The command that sets a value outside of those commands; `value` is an offset in it.
 std::optional<SetCommand> CommandAround(const scene::Scene& scene, scene::NodeId node, std::uint64_t value);
 
 // What the importer has for the component after the commands.
 double NumberRead(const std::vector<SetCommand>& commands, const ReadAttribute& attribute,
                   std::size_t component);
 
-// What the importer has for a channel of a transform that nothing drives: another number than the scene's
-// where it does not read the command that sets that. None where it keeps no values of the node's type.
+// The number that the importer has for a channel of a transform that nothing drives. It differs from the
+// scene's where the importer does not read the command that sets it. None where the importer keeps no values
+// of the node's type.
 std::optional<double> ImportedNumber(const scene::Scene& scene, scene::NodeId node, std::string_view channel);
 
 }  // namespace check

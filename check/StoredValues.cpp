@@ -62,7 +62,7 @@ class Values {
  private:
   const scene::Scene& scene() const { return subject_.scene; }
 
-  // Which of the attributes have a value, and which one that is of a component alone.
+  // Notes which attributes have a value, and which have one for a single component.
   void FindTouched(const std::vector<const ReadAttribute*>& known) {
     scene().ForEachTouched(node_, [&](std::string_view name) {
       for (std::size_t which = 0; which < known.size(); ++which) {
@@ -120,8 +120,8 @@ class Values {
     return std::fabs(stored - imported) <= same * std::max(1.0, std::fabs(stored));
   }
 
-  // Of what is driven other rules say what comes over. They do not where the value that is stored is that of
-  // the only key.
+  // Other rules report what comes over of a driven channel, but not where the stored value is that of the
+  // only key.
   bool Counts(std::string_view name, double stored) const {
     if (!scene().SourceOf(scene().PlugOf(node_, name))) return true;
     bool counts = false;

@@ -55,8 +55,8 @@ bool SameTimes(const Subject& subject, const KeyedChannel& a, const KeyedChannel
       [](const motion::CurveKey& x, const motion::CurveKey& y) { return std::fabs(x.time - y.time) < 1e-6; });
 }
 
-// The channel whose keys the import puts at the times of another one's: a node has one list of times, that of
-// its first channel of several keys, and its first key is that of the first channel with any. Null: none.
+// The channel whose keys the import puts at the times of another channel. A node has one list of times: that
+// of its first channel of several keys. Its first key is that of the first channel with any. Null: none.
 const KeyedChannel* TakesOtherTimes(const Subject& subject, const NodeKeys& keys) {
   const KeyedChannel* lead = nullptr;
   for (const KeyedChannel& channel : keys.channels) {
@@ -100,7 +100,7 @@ void ReportKeys(const Subject& subject, const NodeKeys& keys) {
   if (bad != nullptr) say(Code::BeyondCompositionTime, *bad, bad->last);
 }
 
-// Everything that is keyed above the shape, and its lens; or of that only what comes over.
+// The keys of the lens and of the nodes above the shape. `whole`: also of those that do not come over.
 std::vector<NodeKeys> ChainKeys(const Subject& subject, const Camera& camera, bool whole) {
   std::vector<NodeKeys> chain;
   if (auto lens = KeysOf(camera.shape, subject.channels.LensOf(camera.shape), 1)) chain.push_back(*lens);
@@ -127,8 +127,9 @@ void ReportStart(const Subject& subject, const NodeKeys& one, const NodeKeys& ot
                               subject.scene.node(other.node).name, text::RoundedNumber(other.first)});
 }
 
-// Each node of a camera's chain begins with the earliest of them. What stands above locators, and what a
-// camera looks at, begins with the first camera that is keyed; without one with the first of themselves.
+// Reports the nodes whose first key differs from the one that they are compared with. A node above a camera
+// is compared with the earliest of its chain. Nodes above locators, and targets, are compared with the first
+// camera that is keyed; without one with the first of themselves.
 void ReportStarts(const Subject& subject) {
   std::optional<NodeKeys> lead;
   for (const Camera& camera : subject.cameras) {

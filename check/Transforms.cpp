@@ -47,7 +47,7 @@ class TransformRules {
   const scene::Scene& scene() const { return subject_.scene; }
   std::string_view name() const { return scene().node(link_.node).name; }
 
-  // What the file says anything of. Of most nodes that is little, and a look costs less than the rules.
+  // The attributes that the file mentions. Most nodes have few, and this look is cheaper than the rules.
   struct Touched {
     bool order = false;
     bool rotateAxis = false;
@@ -93,7 +93,7 @@ class TransformRules {
     if (const auto place = FirstOf(attributes, neutral)) subject_.diagnostics.Report(code, *place, {name()});
   }
 
-  // An order matters where it turns about two axes in another sequence.
+  // An order matters only where two of the axes that turn come in another sequence.
   void ReportOrder() {
     const auto written = scene().Written(link_.node, "rotateOrder");
     const auto number = written ? written->Number() : std::nullopt;
