@@ -22,14 +22,14 @@ struct Compared {
   std::size_t layers = 0;
   std::size_t channels = 0;  // of layers: the nine of a place, the zoom, the point of interest
   std::size_t keys = 0;
-  std::size_t ambiguous = 0;  // layers of nodes that a diagnostic calls ambiguous: looked at no further
+  std::size_t ambiguous = 0;  // layers of nodes that a diagnostic calls ambiguous: not judged
   std::size_t stops = 0;
 };
 
 // Sines and cosines of two computations agree to this, of numbers near 1.
 inline constexpr double kSamePlace = 1e-9;
 
-// The numbers of a stream at a key, or those that it stands still at.
+// The numbers of a stream at a key; without a key, those of a stream that stands still.
 inline Triple StreamAt(const check::CameOverStream& stream, std::optional<std::size_t> key,
                        std::size_t count) {
   Triple value{};
@@ -55,8 +55,8 @@ class ChannelJudge {
   };
   static const std::array<Channel, 9> kChannels;
 
-  // Where the time of a layer begins, in the scene's unit: infinite where nothing has keys, and nothing where
-  // a node that counts is ambiguous.
+  // Where the time of a layer begins, in the scene's unit. Infinite where nothing has keys; no value where
+  // one of its nodes is ambiguous.
   using Start = std::optional<double>;
 
   // What one channel of a transform, or a focal length, comes from.

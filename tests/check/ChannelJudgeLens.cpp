@@ -68,7 +68,7 @@ int ChannelJudge::LookAtOf(int transform) const {
   return kNone;
 }
 
-// What the look-at's target is connected to, as a whole or by its components.
+// The node that the target of the look-at comes from, as a whole or by its components.
 int ChannelJudge::TargetOf(int lookAt) const {
   int target = kNone;
   for (const auto& [attribute, driver] : scene_.DriversOf(lookAt)) {
@@ -83,7 +83,7 @@ std::string ChannelJudge::JudgeInterest(int transform, int shape, const CameOver
   const std::string& name = scene_.node(shape).name;
   const int lookAt = LookAtOf(transform);
   if (lookAt == kNone) return layer.aimed ? name + " is aimed, and the scene has no look-at" : "";
-  if (!layer.aimed) return "";  // that it is said, the motion of the transform looks after
+  if (!layer.aimed) return "";  // whether the report says so is judged with the motion of the transform
   if (SaysWith({Code::LookAtWeightLast}, {scene_.node(lookAt).name, name})) return "";
   const int target = TargetOf(lookAt);
   if (target == kNone) return name + " is aimed, and its look-at has no target";

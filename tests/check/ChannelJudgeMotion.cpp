@@ -76,7 +76,7 @@ ChannelJudge::Source ChannelJudge::SourceOf(int node, const std::string& attribu
                        !SaysAt({Code::ConnectionToPath}, driver->text);
   if (byCurve) source.curve = &scene_.node(driver->node);
   source.lost = driven && !byCurve;
-  // What a channel stands still at whose driver is lost, the report does not say.
+  // The report does not say at which value a channel stands still whose driver is lost.
   source.stored =
       driven ? scene_.UsualNumber(node, attribute, neutral) : scene_.Number(node, attribute, neutral);
   if (const auto instead = NumberInstead(node, attribute)) {
@@ -86,8 +86,9 @@ ChannelJudge::Source ChannelJudge::SourceOf(int node, const std::string& attribu
   return source;
 }
 
-// The keys of its first curve with several, in time: the first of them lies at that of the node's first
-// curve. Of keys that land on one thousandth of a frame the last one stays, where that is said.
+// Takes the keys of the node's first curve that has several, in the order of time. The first of them lies at
+// the first key of the node's first curve. Of keys that land on one thousandth of a frame the last one stays,
+// where the report says so.
 void ChannelJudge::TakeKeys(int node, double first, const Source& lead, Motion* motion) const {
   constexpr double kParts = 1000.0;
   const double begin = scene_.countsFrames() ? first : 0.0;
@@ -106,8 +107,8 @@ void ChannelJudge::TakeKeys(int node, double first, const Source& lead, Motion* 
   }
 }
 
-// Empty where all that drives the node comes over, or is said not to. Of a target, which has no shape, the
-// translation alone is looked at, and the rest gives it keys.
+// Empty where each driver of the node comes over or is reported. Of a target, which has no shape, only the
+// drivers of its translation are judged; all of its channels give it keys.
 std::string ChannelJudge::ReadMotion(int node, int shape, bool aimed, Motion* motion) const {
   std::optional<double> first;
   for (const Channel& channel : kChannels) {
@@ -124,7 +125,7 @@ std::string ChannelJudge::ReadMotion(int node, int shape, bool aimed, Motion* mo
   return "";
 }
 
-// Of what drives a channel and is no curve of the import.
+// Judges a driver that is not a curve of the import.
 std::string ChannelJudge::JudgeDriver(int node, int shape, bool aimed, const Channel& channel) const {
   const PlainDriver* const driver = scene_.DriverOf(node, channel.name);
   if (driver == nullptr || SaysAt({Code::ConnectionToPath}, driver->text)) return "";
@@ -170,7 +171,7 @@ std::string ChannelJudge::JudgeMotion(int node, int shape, bool aimed, const Cam
   return aimed ? JudgeAim(node, shape, motion) : "";
 }
 
-// What an aimed layer keeps of its own rotation and pivot the scene does not show.
+// An aimed layer keeps its own rotation and pivot, which the scene does not show.
 std::string ChannelJudge::JudgeAim(int node, int shape, const Motion& motion) const {
   const std::string& name = scene_.node(node).name;
   const bool turned = std::any_of(motion.channels.begin() + 3, motion.channels.begin() + 6,
@@ -185,13 +186,13 @@ std::string ChannelJudge::JudgeAim(int node, int shape, const Motion& motion) co
   return "";
 }
 
-// Of what a diagnostic says to be lost nothing is left.
+// The parts of the transform, without what a diagnostic says to be lost.
 PlainParts ChannelJudge::PartsAt(int node, const Motion& motion, std::optional<std::size_t> key) const {
   const auto channel = [&](std::size_t which) {
     const Source& source = motion.channels[which];
     if (source.keys() == 0) return source.stored;
     if (source.keys() > 1) return source.value(motion.keys[*key]);
-    // One key alone: of a node that stands still it is lost where that is said.
+    // A single key is lost where the node stands still and the report says so.
     const bool lost = !key && (source.skipped || Says({Code::ChannelsOfOneKey}, node));
     return lost ? source.stored : source.value(0);
   };
@@ -229,7 +230,7 @@ PlainParts ChannelJudge::PartsAt(int node, const Motion& motion, std::optional<s
   return parts;
 }
 
-// Time 0 of the composition is the start; a node that begins elsewhere, which is said, begins there too.
+// Time 0 of the composition is the start. A node that begins elsewhere is reported, and begins there too.
 std::string ChannelJudge::JudgeTimes(int node, const Motion& motion, const CameOverStream& stream,
                                      Start start) const {
   const std::string& name = scene_.node(node).name;
@@ -243,9 +244,9 @@ std::string ChannelJudge::JudgeTimes(int node, const Motion& motion, const CameO
   if (std::fabs(rate - meant) > 1e-3 * meant && !SaysAnywhere({Code::RateDiffers}))
     return "the rate differs, and nothing is said of it";
   if (!start) return "";
-  // A key that is alone holds for all times.
+  // A single key holds for all times.
   if (motion.times.size() == 1 && stream.times[0] == 0.0) return "";
-  // A scene that says no rate has its keys a second apart, which its rate says, too.
+  // A scene that gives no rate has its keys a second apart, and a report of its rate.
   const double unit = !scene_.saysRate() ? 1.0 : scene_.countsFrames() ? rate : meant;
   const bool begins = scene_.countsFrames() && (std::isinf(*start) || Says({Code::KeysStartApart}, node));
   const double zero = begins ? motion.times[0] : *start;
@@ -258,7 +259,7 @@ std::string ChannelJudge::JudgeTimes(int node, const Motion& motion, const CameO
   return "";
 }
 
-// Of an animated node, the first key of its first curve.
+// The time of the first key of the first curve of an animated node.
 std::optional<double> ChannelJudge::FirstKeyOf(int node) const {
   std::optional<double> first;
   bool animated = false;

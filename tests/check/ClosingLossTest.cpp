@@ -1,5 +1,5 @@
-// What an import says last about a scene against the report of the check on the same import: neither says
-// that something is lost where the other one says nothing of it.
+// The closing line of an import, against the report of a check on the same import: what one of them says to
+// be lost, the other one reports too.
 #include <gtest/gtest.h>
 
 #include <algorithm>
@@ -93,7 +93,7 @@ class Both {
     EXPECT_TRUE(host_.load(&loaded, &failure)) << failure;
   }
 
-  // What one says and the other does not; empty where they agree.
+  // What only one of them says; empty where they agree.
   std::string DisagreeOver(const std::string& text) {
     const fs::path path = folder_.path() / "shot.ma";
     std::ofstream(path, std::ios::binary | std::ios::trunc) << text;

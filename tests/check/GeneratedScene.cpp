@@ -141,8 +141,8 @@ class Generator {
     if (Chance(2)) Drive(aim + "_point", '|' + aim + "_point");
   }
 
-  // Transforms above each other; hands out the lowest, and *path to it. Now and then the importer finds one
-  // of them not: a joint, or one that is given as a path.
+  // Makes transforms above each other; hands out the lowest, and its path. Now and then the importer does not
+  // find one of them: a joint, or one that is given as a path.
   std::string Chain(const std::string& prefix, std::size_t depth, std::string* path) {
     std::string above;
     for (std::size_t i = 0; i < depth; ++i) {

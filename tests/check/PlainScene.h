@@ -1,5 +1,5 @@
-// A scene as its author wrote it, read a second time for the tests alone: it shares no code with what it is
-// held against. For scenes that are well formed.
+// A scene as its author wrote it, read by a reader of the tests that shares no code with the product. For
+// scenes that are well formed.
 #pragma once
 
 #include <cstddef>
@@ -41,7 +41,7 @@ class PlainScene {
   const std::vector<PlainNode>& nodes() const { return nodes_; }
   const PlainNode& node(int id) const { return nodes_[static_cast<std::size_t>(id)]; }
 
-  // Where the command begins that the text ends in.
+  // Where the last command of the text begins.
   std::optional<std::size_t> openCommand() const { return openCommand_; }
 
   double Number(int id, const std::string& attribute, double otherwise) const;

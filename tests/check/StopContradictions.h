@@ -1,4 +1,4 @@
-// Whether the report of a check says another thing of where the import stopped than the import.
+// Whether the report of a check and the import disagree on where the import stopped, and why.
 #pragma once
 
 #include <string>
@@ -7,8 +7,8 @@
 
 namespace check_test {
 
-// What is contradicted, in words; empty where nothing is. Of a scene that is not `wellFormed`, a report may
-// give the import's own code alone.
+// The contradiction in words; empty where there is none. The report of a scene that is not `wellFormed` may
+// give no more than the import's own code.
 std::string StopContradictionIn(const check::CameOver& cameOver, const check::Report& report,
                                 bool wellFormed);
 
