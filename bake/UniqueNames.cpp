@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+#include "text/Letters.h"
+
 namespace bake {
 namespace {
 
@@ -14,14 +16,6 @@ constexpr std::string_view kDropped = "perspshape";
 bool MayStand(char c) {
   return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') || (c >= '0' && c <= '9') || c == '_' || c == ':' ||
          static_cast<unsigned char>(c) >= 0x80;
-}
-
-std::string Lowered(std::string_view name) {
-  std::string lowered(name);
-  for (char& c : lowered) {
-    if (c >= 'A' && c <= 'Z') c = static_cast<char>(c - 'A' + 'a');
-  }
-  return lowered;
 }
 
 // Cuts a name so that no character of several bytes is cut in two.
@@ -42,14 +36,14 @@ std::string UniqueNames::Take(std::string_view wanted) {
       base.begin(), base.end(), [](char c) { return !MayStand(c); }, '_');
   if (base.empty()) base = "node";
   base = CutTo(base, kLongest);
-  if (taken_.insert(Lowered(base)).second) return base;
+  if (taken_.insert(text::Lowered(base)).second) return base;
   // Long names with the same beginning share a counter: each alone would try all numbers of the others.
   const std::string stem(CutTo(base, kLongest - kSuffixRoom));
-  std::uint64_t& number = next_.try_emplace(Lowered(stem), 2).first->second;
+  std::uint64_t& number = next_.try_emplace(text::Lowered(stem), 2).first->second;
   std::string name;
   do {
     name = stem + "_" + std::to_string(number++);
-  } while (!taken_.insert(Lowered(name)).second);
+  } while (!taken_.insert(text::Lowered(name)).second);
   return name;
 }
 

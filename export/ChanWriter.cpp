@@ -24,7 +24,7 @@ using diag::Code;
 struct CameraFile {
   std::size_t layer;
   std::ostream* stream;
-  Vector angles;  // those of the frame before
+  Vector angles;  // of the previous frame
 };
 
 void WriteLine(CameraFile& camera, Matrix view, const Composition& composition, std::size_t frame) {
@@ -46,7 +46,7 @@ void WriteLine(CameraFile& camera, Matrix view, const Composition& composition, 
   camera.stream->write(line.data(), static_cast<std::streamsize>(line.size()));
 }
 
-// None, or the camera with a place that is no number.
+// None, or the camera whose place is not finite.
 std::optional<std::size_t> WriteFrames(std::vector<CameraFile>& cameras, const Composition& composition) {
   Worlds worlds(composition, true);
   for (std::size_t frame = 0; frame < composition.frames; ++frame) {
@@ -87,7 +87,7 @@ bool WriteChan(const Composition& composition, const WriteOptions& /*options*/, 
     const Layer& layer = composition.layers[i];
     if (layer.kind != LayerKind::Camera) continue;
     std::string name;
-    // One camera has the output that was named; of several each has its name after it.
+    // A single camera goes to the output that the user named; with several, each file has its camera's name.
     std::ostream* const stream =
         count == 1 ? files.Main() : files.Beside('.' + SafeName(layer.name, "camera"), ".chan", &name);
     if (stream == nullptr) return false;

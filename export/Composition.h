@@ -12,8 +12,8 @@
 
 namespace interchange {
 
-// A value that stays, or one that moves: with a value for each frame, or at keys, straight between them and
-// level outside. It holds the values of its frames or keys and no more, and copies share them.
+// A value that stays, or one that moves: by a value for each frame, or by keys, with straight lines between
+// them and level outside. Copies share the values.
 class Channel {
  public:
   // The places of keys: rising, counted from the composition's first frame; may be fractions and below 0.
@@ -35,7 +35,7 @@ class Channel {
     return places_ ? AtKeys(static_cast<double>(frame)) : (*values_)[frame];
   }
 
-  // Whether it has what at() needs for so many frames, all of it finite.
+  // Whether at() gives a finite value for each of so many frames.
   bool IsSound(std::size_t frames) const;
 
  private:
@@ -54,7 +54,7 @@ enum class Axes {
 
 enum class LayerKind { Camera, Null };
 
-// What a camera's picture needs. A point at (x, y, z) in the camera's own axes of the scene (z below 0) lands
+// The lens of a camera. A point at (x, y, z) in the camera's own axes of the scene (z below 0) lands
 // at (x, y)·zoom/-z pixels to the right of the middle and above it.
 struct Lens {
   Channel zoom = 1.0;                 // pixels of the composition's width and height
@@ -65,7 +65,8 @@ struct Lens {
   std::optional<double> squeeze;  // of the scene's lens, where known
 };
 
-// The keys of one stream as the composition has them, for lists of keys. Units and axes of the description.
+// The keys of one stream as the composition has them, for lists of keys, in units and axes of the
+// description.
 struct StreamKeys {
   std::string_view stream;     // "position", …; a literal
   std::size_t components = 1;  // 1 or 3 values a key
@@ -86,7 +87,7 @@ struct Layer {
   std::vector<StreamKeys> keys;        // only where a list of keys was asked for
 };
 
-// Numbers are as they come: a writer is given only compositions that IsWritable() takes (export/Format.h).
+// Numbers are not checked. Writers get only compositions that IsWritable() accepts (export/Format.h).
 struct Composition {
   std::string name;          // any bytes
   double width = 1.0;        // pixels, square

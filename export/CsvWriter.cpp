@@ -21,7 +21,7 @@ constexpr std::string_view kFrameHead =
     "layer,frame,seconds,tx,ty,tz,rx,ry,rz,sx,sy,sz,wx,wy,wz,zoom,focal,fov,number,parent\r\n";
 constexpr std::string_view kKeyHead = "layer,stream,frame,seconds,x,y,z,number\r\n";
 
-// Without the spaces in front. Those that show no width, and controls, are escaped in a name.
+// Without the spaces in front. Spaces without a width, and controls, are escaped in a name already.
 std::string_view WithoutSpaces(std::string_view cell) {
   while (!cell.empty()) {
     const text::Character character = text::CharacterAt(cell, 0);
@@ -35,7 +35,7 @@ std::string_view WithoutSpaces(std::string_view cell) {
   return cell;
 }
 
-// Whether a spreadsheet takes the text for a formula: by its first sign, in full width too.
+// Whether a spreadsheet takes the text for a formula, by its first sign. Full-width signs count too.
 bool IsFormula(std::string_view text) {
   constexpr std::array<std::string_view, 8> kSigns = {
       "=", "+", "-", "@", "\xef\xbc\x9d", "\xef\xbc\x8b", "\xef\xbc\x8d", "\xef\xbc\xa0"};
@@ -44,8 +44,8 @@ bool IsFormula(std::string_view text) {
                      [&](std::string_view sign) { return text.starts_with(sign); });
 }
 
-// A name as a cell: an apostrophe in front of a formula keeps it text, and where a semicolon ends cells, one
-// within quotes does not.
+// A name as a cell. An apostrophe in front of a formula keeps it text. Names with a semicolon are quoted for
+// programs that separate cells by semicolons.
 std::string Cell(std::string_view name) {
   std::string text = diag::ShownText(name);
   if (IsFormula(text)) text.insert(0, 1, '\'');
@@ -79,7 +79,7 @@ class Frames {
     for (const Layer& layer : composition.layers) names_.push_back(Cell(layer.name));
   }
 
-  // None, or the layer with a place that is no number.
+  // None, or the layer whose place is not finite.
   std::optional<std::size_t> Write() {
     for (std::size_t frame = 0; frame < composition_.frames; ++frame) {
       worlds_.GoTo(frame);
@@ -96,9 +96,9 @@ class Frames {
     const Layer& layer = composition_.layers[index];
     const double number = composition_.FrameNumber(frame);
     out_ << names_[index] << ',' << number << ',' << number / composition_.framesPerSecond;
-    WriteVector(out_, At(layer.position, frame));
+    WriteVector(out_, VectorAt(layer.position, frame));
     WriteVector(out_, AnglesAt(index, frame));
-    WriteVector(out_, At(layer.scale, frame));
+    WriteVector(out_, VectorAt(layer.scale, frame));
     WriteVector(out_, worlds_.Of(index).Column(3));
     WriteLens(out_, composition_, layer, frame);
     out_ << ',' << index + 1 << ',';
@@ -106,16 +106,12 @@ class Frames {
     out_ << "\r\n";
   }
 
-  // Those of an aimed camera lie near those of the frame before.
+  // The angles of an aimed camera are those nearest to the angles of the previous frame.
   Vector AnglesAt(std::size_t index, std::size_t frame) {
     const Layer& layer = composition_.layers[index];
-    if (!layer.aimed) return At(layer.rotation, frame);
+    if (!layer.aimed) return VectorAt(layer.rotation, frame);
     const Matrix rotation = LocalRotationAt(composition_, layer, frame);
     return angles_[index] = AnglesOf(rotation, RotationOrder::XYZ, angles_[index]);
-  }
-
-  static Vector At(const Channel (&channels)[3], std::size_t frame) {
-    return {channels[0].at(frame), channels[1].at(frame), channels[2].at(frame)};
   }
 
   const Composition& composition_;

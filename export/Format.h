@@ -11,15 +11,15 @@
 
 namespace interchange {
 
-// Where the outputs of a writer go. All of them appear when the writing is over, or none does.
+// The outputs of a writer. All of them appear when the writing ends, or none does.
 //
-// Streams live as long as the object. Null where an output cannot be made: the object keeps the reason, and
-// the writer stops.
+// Streams live as long as the object. A stream is null where its output cannot be made: the object keeps the
+// reason, and the writer stops.
 class Files {
  public:
   virtual ~Files() = default;
 
-  // The output that the user named. Once.
+  // The output that the user named. Called once.
   virtual std::ostream* Main() = 0;
 
   // A further output beside it. It has the name of the main output with part + suffix in place of the suffix,
@@ -40,7 +40,7 @@ struct Format {
   bool severalFiles = false;  // a composition that moves is never one file
   bool listsKeys = false;     // takes WriteOptions::keys
 
-  // Writes a composition that IsWritable() takes. What the format cannot say is reported. False after an
+  // Writes a composition that IsWritable() accepts, and reports what the format cannot hold. False after an
   // error, which is reported, or which the files keep.
   bool (*write)(const Composition& composition, const WriteOptions& options, Files& files,
                 diag::Collector* diagnostics) = nullptr;
@@ -49,25 +49,25 @@ struct Format {
 // All formats, in the order of help. Lives as long as the program.
 std::span<const Format> Formats();
 
-// Null where there is none: by its name, or by the end of a path, in capitals or not.
+// The format of a name, and that of the suffix of a path, without regard to case. Null where there is none.
 const Format* FindFormat(std::string_view name);
 const Format* FormatOfPath(std::string_view path);
 
-// Picture, pixel aspect, rate, unit, film and zoom of a composition that can be written lie between these.
+// The bounds of picture, pixel aspect, rate, unit, film and zoom in a composition that can be written.
 inline constexpr double kSmallestMeasure = 1e-9;
 inline constexpr double kLargestMeasure = 1e12;
 
-// No frame of such a composition has a larger number, with or without its sign. Up to it a double holds every
-// whole number.
+// No frame of such a composition has a number of a larger magnitude. Up to it a double holds every whole
+// number.
 inline constexpr double kLargestFrame = 0x1p53;
 
-// Whether a writer can be given it; an error is reported for each thing that keeps it from that. Then every
+// Whether a writer can write it. Reports an error for each reason against it. In a writable composition every
 // number is finite; the measures and frames are within their bounds; a channel that moves has a value for
-// each frame; every camera has a lens; no parents go in a circle. Places, rotations and scales may still be
-// as large as a double is.
+// each frame; every camera has a lens; no parents form a circle. Places, rotations and scales may still be as
+// large as a double can be.
 bool IsWritable(const Composition& composition, diag::Collector* diagnostics);
 
-// Writes it in the format, where it is writable.
+// Writes it in the format. False where it is not writable, and where the writer fails.
 bool Write(const Format& format, const Composition& composition, const WriteOptions& options, Files& files,
            diag::Collector* diagnostics);
 

@@ -3,8 +3,8 @@
 #include <array>
 
 #include "export/Format.h"
-#include "export/SafeNames.h"
 #include "export/Writers.h"
+#include "text/Letters.h"
 
 namespace interchange {
 namespace {
@@ -45,7 +45,7 @@ const Format* FindFormat(std::string_view name) {
 }
 
 const Format* FormatOfPath(std::string_view path) {
-  const std::string lowered = Lowered(path);
+  const std::string lowered = text::Lowered(path);
   const auto found = std::find_if(kFormats.begin(), kFormats.end(),
                                   [&](const Format& format) { return lowered.ends_with(format.suffix); });
   return found == kFormats.end() ? nullptr : &*found;

@@ -10,7 +10,7 @@
 namespace interchange {
 namespace {
 
-// Gathers floats into large pieces, and knows whether each of them was one.
+// Gathers floats into large pieces, and remembers whether each number fitted a float.
 class FloatStream {
  public:
   explicit FloatStream(std::ostream& out) : out_(out) {}
@@ -43,8 +43,8 @@ void PutThree(FloatStream& out, const Channel (&channels)[3], std::size_t frames
   }
 }
 
-// Each rotation has the sign that lies nearer to the one before, so that what a program shows between two
-// frames takes the short way.
+// Each rotation has the sign that is nearer to the previous one, so that a program turns the short way
+// between two frames.
 void PutRotations(FloatStream& out, const Composition& composition, const Layer& layer) {
   Quaternion before;
   for (std::size_t frame = 0; frame < composition.frames; ++frame) {
@@ -78,7 +78,7 @@ bool AreFloats(const Channel (&channels)[3], double factor) {
   return true;
 }
 
-// Above 0 and below half a turn, as a float too.
+// Above 0 and below half a turn, also when it is rounded to a float.
 bool IsAngle(double radians) {
   return static_cast<float>(radians) >= std::numeric_limits<float>::min() &&
          static_cast<double>(static_cast<float>(radians)) < std::numbers::pi;

@@ -35,11 +35,11 @@ class GltfPlan {
   const Composition& composition() const { return composition_; }
   const std::vector<GltfTrack>& tracks() const { return tracks_; }
 
-  // Seconds; the frame's own number over the rate where that can be said, or counted from the first frame.
+  // Seconds: from frame 0 where the format can hold such times, else from the first frame.
   double SecondsAt(std::size_t frame) const;
   bool CountsFromFirstFrame() const { return start_ != composition_.firstFrame; }
 
-  // Whether each frame's time is a later float than that of the frame before, and so on up to the last.
+  // Whether the times of the frames, as floats, are finite and strictly ascending.
   bool TimesRise() const;
 
   // Bytes of the times, of a track, of everything.
@@ -53,21 +53,18 @@ class GltfPlan {
   double start_;
 };
 
-// Whether it is still finite as a float.
+// Whether the value is finite as a float.
 inline bool FitsFloat(double value) {
   return value <= std::numeric_limits<float>::max() && value >= -std::numeric_limits<float>::max();
 }
 
-// The angle of the picture from its lower to its upper edge, in radians.
-double VerticalRadians(const Composition& composition, double zoom);
-
-// Whether every value that is said once is one that the format takes; what is not is reported.
+// Whether the format takes every value that does not change. Reports those that it does not take.
 bool GltfTakesStill(const Composition& composition, diag::Collector* diagnostics);
 
 // The whole JSON. `dataUri` refers to the file with the data; empty where they follow in the same file.
 void WriteGltfJson(const GltfPlan& plan, std::string_view dataUri, std::ostream& out);
 
-// The data. False where a value is none that the format takes, which is reported.
+// The data. False, with a report, where the format does not take a value.
 bool WriteGltfData(const GltfPlan& plan, std::ostream& out, diag::Collector* diagnostics);
 
 }  // namespace interchange

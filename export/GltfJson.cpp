@@ -12,7 +12,7 @@ namespace {
 using text::JsonWriter;
 
 constexpr std::string_view kPointer = "KHR_animation_pointer";
-// Of a unit of the scene. Nothing that a camera sees stands nearer, and the picture does not depend on it.
+// In units of the scene. Where points land in the picture does not depend on it.
 constexpr double kNear = 0.1;
 constexpr int kFloat = 5126;  // componentType
 
@@ -62,7 +62,7 @@ bool HasZoom(const GltfPlan& plan) {
   return false;
 }
 
-// What glTF has no place for, and what a reader needs to count frames as the scene does.
+// Values that glTF has no place for, and those that a reader needs to count frames as the scene does.
 void PutSceneExtras(JsonWriter& json, const GltfPlan& plan) {
   const Composition& composition = plan.composition();
   json.key("extras");
@@ -90,7 +90,7 @@ void PutScene(JsonWriter& json, const GltfPlan& plan, const LayerTree& tree) {
   json.endArray();
 }
 
-// A node has its values of the first frame; an animation replaces those that change.
+// A node has the values of the first frame. The animation replaces those that change.
 void PutNode(JsonWriter& json, const Composition& composition, const LayerTree& tree, std::size_t index,
              std::size_t camera) {
   const Layer& layer = composition.layers[index];
@@ -222,7 +222,7 @@ void BeginAccessor(JsonWriter& json, const GltfPlan& plan, std::uint64_t offset,
   Put(json, "type", type);
 }
 
-// The ends of the times have to be the very floats of the data.
+// The first and the last time must be exactly the floats of the data.
 void PutEnd(JsonWriter& json, std::string_view key, double seconds) {
   json.key(key);
   json.beginRow();

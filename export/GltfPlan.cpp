@@ -1,17 +1,15 @@
-// Which values of a composition go into a glTF file for each frame, and when the frames are.
-#include <cmath>
-
+// Which values of a composition go into a glTF file for each frame, and at which times.
 #include "export/GltfInternal.h"
 #include "export/Variation.h"
 
 namespace interchange {
 namespace {
 
-// A program that looks at a frame between two rounded times sees the picture this part of a frame too early
-// or too late, at most.
+// Times are rounded to floats. A program shows a frame too early or too late by at most this part of a frame.
 constexpr double kMostOfAFrame = 1e-3;
 
-// Where the times begin: no time may be below 0, and times far from 0 are rounded too much.
+// The number of the first frame in the file. Times may not be below 0, and far from 0 they are rounded too
+// much: such a file counts from its first frame.
 double StartOf(const Composition& composition) {
   const double last = composition.FrameNumber(composition.frames - 1);
   constexpr double kRounding = 0.5 * std::numeric_limits<float>::epsilon();
@@ -67,10 +65,6 @@ std::uint64_t GltfPlan::DataSize() const {
   std::uint64_t size = TimesSize();
   for (const GltfTrack& track : tracks_) size += SizeOf(track);
   return size;
-}
-
-double VerticalRadians(const Composition& composition, double zoom) {
-  return 2.0 * std::atan2(composition.height * 0.5, zoom);
 }
 
 }  // namespace interchange

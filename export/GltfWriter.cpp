@@ -40,7 +40,7 @@ std::uint64_t JsonSize(const GltfPlan& plan) {
   return counted.count();
 }
 
-// Whether it can be written at all, with what is lost reported.
+// Whether it can be written. Reports what is lost.
 bool IsTaken(const GltfPlan& plan, diag::Collector* diagnostics) {
   const Composition& composition = plan.composition();
   if (!GltfTakesStill(composition, diagnostics)) return false;
@@ -66,7 +66,7 @@ void PutWord(std::ostream& out, std::uint64_t word) {
 
 std::uint64_t RoundedUp(std::uint64_t size) { return (size + 3) / 4 * 4; }
 
-// The name of a file in the same folder as a reference to it: what a URI gives a meaning stands as %3A.
+// A reference to a file in the same folder. Signs with a meaning in a URI are escaped, as in %3A.
 std::string UriOf(std::string_view name) {
   constexpr std::string_view kPlain = "abcdefghijklmnopqrstuvwxyzABCDEFGHIJKLMNOPQRSTUVWXYZ0123456789-._~";
   constexpr std::string_view kDigits = "0123456789ABCDEF";
@@ -105,7 +105,7 @@ bool WriteGltf(const Composition& composition, const WriteOptions& /*options*/, 
   return true;
 }
 
-// The sizes stand in front of what they measure, so the JSON is written twice: once to be counted.
+// The size of the JSON comes before it in the file, so it is written twice: first only to be counted.
 bool WriteGlb(const Composition& composition, const WriteOptions& /*options*/, Files& files,
               diag::Collector* diagnostics) {
   const GltfPlan plan(composition);

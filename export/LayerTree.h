@@ -1,4 +1,4 @@
-// The layers from their parents down: the other way round than a description has them.
+// The layers as a tree, from the top down. A description has only the way up, from a layer to its parent.
 #pragma once
 
 #include <cstddef>
@@ -17,7 +17,7 @@ class LayerTree {
   // Of a writable composition.
   explicit LayerTree(const Composition& composition);
 
-  // kNone where there is none, or none further.
+  // kNone where there is no such layer.
   std::size_t FirstRoot() const { return firstRoot_; }
   std::size_t FirstChild(std::size_t layer) const { return firstChild_[layer]; }
   std::size_t NextSibling(std::size_t layer) const { return nextSibling_[layer]; }

@@ -8,7 +8,7 @@ namespace interchange {
 namespace {
 
 constexpr double kRadians = std::numbers::pi / 180.0;
-// The sine and cosine of right angles come out exact.
+// The sines and cosines of right angles are exact.
 constexpr double kQuarters[] = {0.0, 1.0, 0.0, -1.0};
 
 struct SineAndCosine {
@@ -78,7 +78,7 @@ Vector FromOrder(const Order& order, const std::array<double, 3>& angles) {
   return {byAxis[0], byAxis[1], byAxis[2]};
 }
 
-// Moved by whole turns to where it lies nearest.
+// The angle, shifted by whole turns so that it is nearest to `near`.
 double NearestTurn(double degrees, double near) {
   const double turns = std::nearbyint((near - degrees) / 360.0);
   return std::isfinite(turns) ? degrees + turns * 360.0 : degrees;
@@ -99,7 +99,7 @@ double Length(const Vector& a) { return std::hypot(a.x, a.y, a.z); }
 Vector Normalised(const Vector& a) {
   const double length = Length(a);
   if (!(length > 0.0) || !std::isfinite(length)) return {};
-  // Numbers this small have few digits left, and the length fewer still: they are made larger first.
+  // Numbers as small as these have lost digits, and so has their length: they are scaled up first.
   if (length < 0x1p-900) return Normalised(a * 0x1p500);
   return {a.x / length, a.y / length, a.z / length};
 }
@@ -186,7 +186,7 @@ Matrix RigidOf(const Matrix& matrix) {
 
 Quaternion QuaternionOf(const Matrix& rotation) {
   const auto& m = rotation.cell;
-  // The largest of the four parts is found first, so that nothing is divided by a small one.
+  // Starts from the largest of the four parts, so that nothing is divided by a small one.
   const std::array<double, 4> squares = {1 + m[0][0] - m[1][1] - m[2][2], 1 - m[0][0] + m[1][1] - m[2][2],
                                          1 - m[0][0] - m[1][1] + m[2][2], 1 + m[0][0] + m[1][1] + m[2][2]};
   std::size_t largest = 3;

@@ -24,10 +24,10 @@ inline Vector Cross(const Vector& a, const Vector& b) {
   return {a.y * b.z - a.z * b.y, a.z * b.x - a.x * b.z, a.x * b.y - a.y * b.x};
 }
 double Length(const Vector& a);      // no overflow and no underflow on the way
-Vector Normalised(const Vector& a);  // of length 1; of what has no length, or no finite one, no length
+Vector Normalised(const Vector& a);  // of length 1; (0, 0, 0) where the length is 0 or not finite
 bool IsFinite(const Vector& a);
 
-// A rotation: of length 1, x, y, z and then the real part.
+// A rotation: x, y, z and the real part, of length 1.
 struct Quaternion {
   double x = 0.0;
   double y = 0.0;
@@ -57,22 +57,22 @@ Matrix RotationMatrix(const Vector& degrees);
 Matrix RotationMatrix(const Quaternion& rotation);
 Matrix Scaling(const Vector& by);
 
-// The place, and the axes turned square to each other: the first keeps its direction and the second its
-// plane, all of length 1 and right-handed. An axis of no length takes what the others leave.
+// The place, and axes of length 1 that are square to each other and right-handed. The first axis keeps its
+// direction and the second its plane. An axis of length 0 follows from the others.
 Matrix RigidOf(const Matrix& matrix);
 
 // Of a matrix whose linear part is a rotation; the real part is not negative.
 Quaternion QuaternionOf(const Matrix& rotation);
 
-// The same rotation, with the sign that lies nearer to another one, so that what is between them is short.
+// The same rotation with the sign that is nearer to `to`, so that the way between the two is the short one.
 Quaternion Nearest(const Quaternion& rotation, const Quaternion& to);
 
-// The order in which the axes take their turn: XYZ turns about x first, and is Rz·Ry·Rx.
+// The order of the turns: XYZ turns about x first, and is Rz·Ry·Rx.
 enum class RotationOrder { XYZ, XZY, YXZ, YZX, ZXY, ZYX };
 
-// The angles of a rotation in degrees, about x, y and z whatever the order: of all that give it, those that
-// lie nearest to `near`. Where the middle axis stands at 90° only a sum or a difference of the others is
-// fixed: the one that comes last is then that of `near`.
+// The angles of a rotation in degrees, about x, y and z whatever the order: of all angles that give it, those
+// nearest to `near`. Where the second angle of the order is 90° only the sum or the difference of the others
+// is fixed: the last one is then that of `near`.
 Vector AnglesOf(const Matrix& rotation, RotationOrder order, const Vector& near);
 
 }  // namespace interchange

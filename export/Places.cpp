@@ -10,15 +10,11 @@
 namespace interchange {
 namespace {
 
-Vector At(const Channel (&channels)[3], std::size_t frame) {
-  return {channels[0].at(frame), channels[1].at(frame), channels[2].at(frame)};
-}
-
-// Between the axes of the scene and those of the host y and z point the other way.
+// Converts between the axes of the scene and those of the host: y and z point the other way.
 Vector Turned(const Vector& a) { return {a.x, -a.y, -a.z}; }
 
-// The camera that looks from the origin along the direction, without a roll: its x is level. Straight up and
-// down x stays the scene's.
+// The camera that looks from the origin along the direction, without a roll: its x is level. Where it looks
+// straight up or down, its x is that of the scene.
 Matrix TowardsInScene(const Vector& direction) {
   const Vector z = Normalised(direction) * -1.0;
   Vector x = Normalised(Cross({0.0, 1.0, 0.0}, z));
@@ -38,26 +34,30 @@ Matrix Towards(const Composition& composition, const Vector& direction) {
 
 }  // namespace
 
+Vector VectorAt(const Channel (&channels)[3], std::size_t frame) {
+  return {channels[0].at(frame), channels[1].at(frame), channels[2].at(frame)};
+}
+
 Matrix LocalRotationAt(const Composition& composition, const Layer& layer, std::size_t frame) {
-  const Matrix rotation = RotationMatrix(At(layer.rotation, frame));
+  const Matrix rotation = RotationMatrix(VectorAt(layer.rotation, frame));
   if (!layer.aimed) return rotation;
-  // Halves, so that two far places have a finite direction.
-  const Vector direction = At(layer.interest, frame) * 0.5 - At(layer.position, frame) * 0.5;
+  // Halves, so that the direction between two far places is finite.
+  const Vector direction = VectorAt(layer.interest, frame) * 0.5 - VectorAt(layer.position, frame) * 0.5;
   const double length = Length(direction);
   if (!(length > 0.0)) return rotation;
-  // A length beyond what a double holds.
+  // The length is larger than a double can be.
   if (!std::isfinite(length)) return Towards(composition, direction * 0.25) * rotation;
   return Towards(composition, direction) * rotation;
 }
 
 Place LocalPlaceAt(const Composition& composition, const Layer& layer, std::size_t frame) {
-  return {At(layer.position, frame), QuaternionOf(LocalRotationAt(composition, layer, frame)),
-          At(layer.scale, frame)};
+  return {VectorAt(layer.position, frame), QuaternionOf(LocalRotationAt(composition, layer, frame)),
+          VectorAt(layer.scale, frame)};
 }
 
 Matrix LocalAt(const Composition& composition, const Layer& layer, std::size_t frame) {
-  Matrix local = LocalRotationAt(composition, layer, frame) * Scaling(At(layer.scale, frame));
-  local.SetColumn(3, At(layer.position, frame));
+  Matrix local = LocalRotationAt(composition, layer, frame) * Scaling(VectorAt(layer.scale, frame));
+  local.SetColumn(3, VectorAt(layer.position, frame));
   return local;
 }
 
@@ -84,8 +84,12 @@ void Worlds::GoTo(std::size_t frame) {
   }
 }
 
+double VerticalRadians(const Composition& composition, double zoom) {
+  return 2.0 * std::atan2(composition.height * 0.5, zoom);
+}
+
 double VerticalAngleAt(const Composition& composition, const Lens& lens, std::size_t frame) {
-  return 2.0 * std::atan2(composition.height * 0.5, lens.zoom.at(frame)) * 180.0 / std::numbers::pi;
+  return VerticalRadians(composition, lens.zoom.at(frame)) * 180.0 / std::numbers::pi;
 }
 
 }  // namespace interchange

@@ -1,6 +1,6 @@
-// Where the layers of a composition stand at a frame. All is worked out when it is asked for.
+// Where the layers of a composition stand at a frame. Each call computes its result anew.
 //
-// Frames count from 0 and are below the composition's. Aimed cameras have their resulting rotation.
+// Frames count from 0 and are below the composition's. The rotation of an aimed camera includes its aim.
 #pragma once
 
 #include <cstddef>
@@ -10,6 +10,9 @@
 #include "export/Matrix.h"
 
 namespace interchange {
+
+// The values of three channels at a frame.
+Vector VectorAt(const Channel (&channels)[3], std::size_t frame);
 
 // A layer against its parent: scale, then rotation, then position.
 struct Place {
@@ -26,20 +29,20 @@ Matrix LocalRotationAt(const Composition& composition, const Layer& layer, std::
 // Against its parent.
 Matrix LocalAt(const Composition& composition, const Layer& layer, std::size_t frame);
 
-// The layers against the world, frame after frame: each is its parent's matrix, which is there already, and
-// its own place, so that however deep layers are nested, each is worked out once a frame.
+// The layers against the world, frame after frame. Parents are computed before their children, so each layer
+// is computed once a frame, however deep the layers are nested.
 class Worlds {
  public:
-  // Of a writable composition, which outlives the object. With `camerasAlone` only cameras and what they hang
-  // on are worked out.
+  // Of a writable composition, which outlives the object. With `camerasAlone` only cameras and the layers
+  // above them are computed.
   explicit Worlds(const Composition& composition, bool camerasAlone = false);
 
-  // Before the first call all stand at the origin.
+  // Before the first call all layers stand at the origin.
   void GoTo(std::size_t frame);
 
   const Matrix& Of(std::size_t layer) const { return matrices_[layer]; }
 
-  // Place and rotation of a camera, without scale: what its picture depends on, with the lens.
+  // Place and rotation of a camera, without scale. Its picture depends on these and on the lens.
   Matrix ViewOf(std::size_t layer) const { return RigidOf(matrices_[layer]); }
 
  private:
@@ -48,7 +51,9 @@ class Worlds {
   std::vector<Matrix> matrices_;
 };
 
-// The angle between the upper and the lower edge of the picture, in degrees.
+// The angle between the upper and the lower edge of the picture: in radians, for a zoom; and in degrees, for
+// a lens at a frame.
+double VerticalRadians(const Composition& composition, double zoom);
 double VerticalAngleAt(const Composition& composition, const Lens& lens, std::size_t frame);
 
 }  // namespace interchange

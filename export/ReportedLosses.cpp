@@ -8,8 +8,7 @@
 namespace interchange {
 namespace {
 
-// Whether the layer or one above it is scaled unevenly. Layers are looked at once: `known` holds what was
-// found.
+// Whether the layer or one above it is scaled unevenly. Each layer is examined once.
 class UnevenScale {
  public:
   explicit UnevenScale(const Composition& composition)

@@ -1,4 +1,4 @@
-// What more than one format cannot say, reported.
+// Reports of losses that several formats have in common.
 #pragma once
 
 #include <string_view>
@@ -8,15 +8,15 @@
 
 namespace interchange {
 
-// Names with bytes that are no valid UTF-8, and cameras under scale that programs do not read alike. `format`
-// is the name that the user knows.
+// Reports names that are not valid UTF-8, and cameras under uneven scale, which programs read in different
+// ways. `format` is the name that the user knows.
 void ReportCommonLosses(const Composition& composition, std::string_view format,
                         diag::Collector* diagnostics);
 
-// Cameras under uneven scale, for a format that has no place for scale.
+// Reports cameras under uneven scale, for a format that has no place for scale.
 void ReportLostScales(const Composition& composition, diag::Collector* diagnostics);
 
-// Pixel aspect, film offsets and squeezes, for a format that has a place for none of them.
+// Reports pixel aspect, film offsets and squeezes, for a format that has no place for them.
 void ReportLostExtras(const Composition& composition, diag::Collector* diagnostics);
 
 }  // namespace interchange

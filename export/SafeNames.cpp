@@ -3,6 +3,8 @@
 #include <algorithm>
 #include <array>
 
+#include "text/Letters.h"
+
 namespace interchange {
 namespace {
 
@@ -11,24 +13,16 @@ bool IsSafe(char c) {
          c == '.';
 }
 
-// Some systems take these for devices, with a suffix too.
+// Some systems take these names for devices, also with a suffix.
 bool IsDevice(std::string_view name) {
   constexpr std::array<std::string_view, 4> kDevices = {"con", "prn", "aux", "nul"};
-  const std::string first = Lowered(name.substr(0, name.find('.')));
+  const std::string first = text::Lowered(name.substr(0, name.find('.')));
   if (std::find(kDevices.begin(), kDevices.end(), first) != kDevices.end()) return true;
   return first.size() == 4 && (first.starts_with("com") || first.starts_with("lpt")) && first[3] >= '0' &&
          first[3] <= '9';
 }
 
 }  // namespace
-
-std::string Lowered(std::string_view text) {
-  std::string lowered(text);
-  for (char& c : lowered) {
-    if (c >= 'A' && c <= 'Z') c = static_cast<char>(c - 'A' + 'a');
-  }
-  return lowered;
-}
 
 std::string SafeName(std::string_view name, std::string_view otherwise) {
   std::string safe(name.substr(0, kLongestSafeName));
@@ -42,13 +36,13 @@ std::string SafeName(std::string_view name, std::string_view otherwise) {
 }
 
 std::string UniqueNames::Take(std::string_view name) {
-  const auto [own, isFree] = taken_.try_emplace(Lowered(name), 1);
+  const auto [own, isFree] = taken_.try_emplace(text::Lowered(name), 1);
   if (isFree) return std::string(name);
   std::string free;
-  // Of many of one name each begins where the one before ended.
+  // Of many equal names each continues with the number after the last one.
   do {
     free = std::string(name) + '_' + std::to_string(++own->second);
-  } while (!taken_.try_emplace(Lowered(free), 1).second);
+  } while (!taken_.try_emplace(text::Lowered(free), 1).second);
   return free;
 }
 

@@ -1,5 +1,5 @@
-// Names of layers made into names of files: no folder, nothing that a system or a shell takes for something
-// else, no name twice.
+// Names of files, from names of layers: without folders, without signs that have a meaning for a system or a
+// shell, and each name once.
 #pragma once
 
 #include <cstddef>
@@ -12,21 +12,19 @@ namespace interchange {
 // The longest safe name, in bytes.
 inline constexpr std::size_t kLongestSafeName = 120;
 
-// Letters, digits, "-", "_" and "." of the name, everything else "_"; never empty, never with a dot or a dash
-// in front or a dot at the end, never a device's name; `otherwise` where nothing is left of it.
+// Keeps letters, digits, "-", "_" and "." of the name; every other byte becomes "_". The result is never
+// empty, has no dot or dash in front and no dot at the end, and is never a device's name. `otherwise` where
+// nothing is left of the name.
 std::string SafeName(std::string_view name, std::string_view otherwise);
-
-// Lower case of ASCII letters.
-std::string Lowered(std::string_view text);
 
 // Names of which no two are the same, without regard to case.
 class UniqueNames {
  public:
-  // The name, or with _2, _3 … after it where it is taken.
+  // The name, with _2, _3 … after it where it is taken.
   std::string Take(std::string_view name);
 
  private:
-  std::map<std::string, std::size_t> taken_;  // lowered, and the number that it got last
+  std::map<std::string, std::size_t> taken_;  // in lower case, with the last number that was tried
 };
 
 }  // namespace interchange

@@ -13,7 +13,7 @@ constexpr double kLargestWhole = 0x1p53;
 
 void AppendNumber(std::string* text, double number) {
   char digits[32];
-  // Readers of frame numbers, and people, take 100000 for a whole number and 1e+05 for none.
+  // Whole numbers have no exponent: readers of frame numbers accept 100000, and not 1e+05.
   const bool whole = std::fabs(number) < kLargestWhole && number == std::trunc(number);
   const std::to_chars_result end =
       whole ? std::to_chars(digits, digits + sizeof digits, static_cast<std::int64_t>(number))

@@ -1,5 +1,5 @@
-// Text on its way to a stream, gathered into large pieces. Numbers are the shortest that give the same double
-// back, whatever the locale.
+// Gathers text into large pieces on its way to a stream. A number has the fewest digits that give the same
+// double back, in any locale.
 #pragma once
 
 #include <cstddef>

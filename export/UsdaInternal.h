@@ -10,15 +10,15 @@
 
 namespace interchange {
 
-// The names of prims: letters, digits and underscores, no digit in front, no name twice in the file. A name
-// that is one already stays.
+// The names of prims: letters, digits and underscores, no digit in front, each name once in the file. A name
+// that is valid and free stays as it is.
 class PrimNames {
  public:
   explicit PrimNames(const Composition& composition);
 
   const std::string& root() const { return root_; }
   const std::string& layer(std::size_t index) const { return layers_[index]; }
-  // Of the camera below a camera's layer.
+  // The prim of the lens, below that of the camera's layer.
   const std::string& lens(std::size_t index) const { return lenses_[index]; }
 
  private:
@@ -35,7 +35,7 @@ double HorizontalAperture(const Composition& composition, const Lens& lens);
 double VerticalAperture(const Composition& composition, const Lens& lens);
 double FocalLength(const Composition& composition, const Lens& lens, std::size_t frame);
 
-// USD keeps a lens in numbers of 32 bits: whether they are above 0 and finite there.
+// Whether the numbers of the lens are above 0 and finite as floats: USD keeps a lens in numbers of 32 bits.
 bool IsLensOfFloats(const Composition& composition, const Lens& lens);
 
 }  // namespace interchange

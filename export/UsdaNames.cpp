@@ -1,4 +1,4 @@
-// What USD asks of names and of lenses.
+// The rules of USD for names and lenses.
 #include <algorithm>
 #include <cstdint>
 #include <limits>

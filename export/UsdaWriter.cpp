@@ -1,8 +1,8 @@
 // USD as text: a prim for each layer, nested as the layers are, with a time sample for each frame.
 //
 // Numbers are the doubles of the description. Times are the scene's own frame numbers. A camera is a prim of
-// its own below that of its layer: there are readers that animate transforms alone. It looks along -z here;
-// in the host's axes it is turned about x for that.
+// its own below that of its layer, because some readers animate only transforms. It looks along -z; in the
+// host's axes it is turned about x to do so.
 #include <algorithm>
 #include <string>
 #include <string_view>
@@ -41,7 +41,7 @@ class Usda {
   }
 
  private:
-  // Parents before their children, without a call for each level.
+  // Parents before their children, without recursion.
   void WriteLayers() {
     std::vector<std::size_t> open;
     std::size_t layer = tree_.FirstRoot();
@@ -69,7 +69,7 @@ class Usda {
          << "\n    timeCodesPerSecond = " << composition_.framesPerSecond << "\n    upAxis = \"Y\"\n)\n";
   }
 
-  // Deep ones are not moved in further: the text would grow with the square of the depth.
+  // Deep prims are not indented further: the text would grow with the square of the depth.
   TextWriter& Line() {
     constexpr std::size_t kDeepest = 16;
     for (std::size_t level = std::min(depth_, kDeepest); level > 0; --level) out_ << "    ";
@@ -115,7 +115,7 @@ class Usda {
     EndPrim();
   }
 
-  // One value, which is the first frame's, and samples where it changes. `value` writes that of a frame.
+  // The value of the first frame, and samples where it changes. `value` writes the value of a frame.
   template <typename Value>
   void WriteAttribute(std::string_view declaration, bool varies, const Value& value) {
     Line() << declaration << " = ";
@@ -142,15 +142,14 @@ class Usda {
   }
 
   void WriteThree(std::string_view declaration, const Channel (&channels)[3]) {
-    WriteAttribute(declaration, Varies(channels, composition_.frames), [&](std::size_t frame) {
-      WriteVector({channels[0].at(frame), channels[1].at(frame), channels[2].at(frame)});
-    });
+    WriteAttribute(declaration, Varies(channels, composition_.frames),
+                   [&](std::size_t frame) { WriteVector(VectorAt(channels, frame)); });
   }
 
   void WriteTransform(const Layer& layer) {
     WriteThree("double3 xformOp:translate", layer.position);
     if (layer.aimed) {
-      // Each turn lies near the one before, so that nothing spins between two frames.
+      // Each rotation has the angles nearest to the previous ones, so that nothing spins between two frames.
       Vector angles;
       WriteAttribute(
           "double3 xformOp:rotateXYZ", RotationVaries(layer, composition_.frames), [&](std::size_t frame) {

@@ -7,7 +7,7 @@
 namespace interchange {
 namespace {
 
-// A matrix that was taken apart has a scale that rounding makes uneven.
+// A scale that comes from a matrix is slightly uneven by rounding.
 bool IsClose(double a, double b) {
   constexpr double kRounding = 1e-9;
   return std::fabs(a - b) <= kRounding * std::fabs(b);

@@ -1,4 +1,4 @@
-// Which values of a layer are written for each frame: those that change, not those that have keys.
+// Which values of a layer are written for each frame: those that change, with keys or not.
 #pragma once
 
 #include <cstddef>
@@ -7,14 +7,14 @@
 
 namespace interchange {
 
-// Whether the value is another at any of the frames than at the first.
+// Whether the value at any frame differs from that at the first.
 bool Varies(const Channel& channel, std::size_t frames);
 bool Varies(const Channel (&channels)[3], std::size_t frames);
 
-// The resulting rotation: of an aimed camera also by where it is and where it looks.
+// Whether the resulting rotation changes. That of an aimed camera also follows its place and its interest.
 bool RotationVaries(const Layer& layer, std::size_t frames);
 
-// Whether the layer is scaled by other than the same on all axes, or mirrored, at any of the frames.
+// Whether, at any of the frames, the layer is mirrored or its scale differs between axes.
 bool IsScaledUnevenly(const Layer& layer, std::size_t frames);
 
 }  // namespace interchange

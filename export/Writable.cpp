@@ -1,4 +1,4 @@
-// What no format can say.
+// The checks that hold for every format.
 #include <algorithm>
 #include <cmath>
 #include <cstdint>
@@ -12,7 +12,7 @@ namespace {
 
 using diag::Code;
 
-// Sizes, rates and lenses beyond these are none, and what is computed of them would not be finite.
+// Sizes, rates and lenses outside these bounds are errors. What is computed from them might not be finite.
 bool IsMeasure(double number) { return number >= kSmallestMeasure && number <= kLargestMeasure; }
 
 bool AreSound(const Channel (&channels)[3], std::size_t frames) {
@@ -28,7 +28,7 @@ bool AreSound(const std::vector<StreamKeys>& keys) {
   });
 }
 
-// The first of a layer's values that is no number, in words; empty where all are sound.
+// The name of the first value of a layer that is not sound; empty where all are.
 std::string_view UnsoundPart(const Layer& layer, std::size_t frames) {
   if (!AreSound(layer.position, frames)) return "position";
   if (!AreSound(layer.rotation, frames)) return "rotation";

@@ -9,11 +9,11 @@
 
 #include "check/Check.h"
 #include "fuzz/Bytes.h"
+#include "fuzz/LoadedModule.h"
 #include "fuzz/MemoryFile.h"
 #include "fuzz/Require.h"
 #include "fuzz/Target.h"
 #include "refhost/Host.h"
-#include "refhost/ModuleLoader.h"
 #include "tests/check/StopContradictions.h"
 #include "tests/support/GuardedMemory.h"
 #include "text/JsonWriter.h"
@@ -31,23 +31,13 @@ constexpr std::size_t kLongestFinding = 8000;
 // The head grows with the cameras and their chains, which are bounded by the text.
 constexpr std::size_t kShortestReport = 20'000;
 
-HostPluginEntry LoadModule() {
-  // Never unloaded: the fuzzer reads its coverage counters until the end.
-  static auto* const loader = new refhost::ModuleLoader;
-  std::string failure;
-  const HostPluginEntry entry = loader->load(MAYASCENE_MODULE, &failure);
-  Require(entry != nullptr, failure.c_str());
-  return entry;
-}
-
 check::CameOver Import(const std::filesystem::path& path) {
-  static const HostPluginEntry entry = LoadModule();
   refhost::HostOptions options;
   options.linearUnits = 0;
   options.mostLayers = 10'000;
   refhost::Host host(std::move(options));
   refhost::CallbackResult loaded;
-  Require(host.load(entry, &loaded) && loaded.code == 0, "the module can be loaded");
+  Require(host.load(fuzz::LoadedModule(), &loaded) && loaded.code == 0, "the module can be loaded");
   const refhost::CallbackResult result = host.importScene(path);
   return mayascene::whatCameOver(mayascene::lookAtScene(path), result, false);
 }

@@ -12,12 +12,12 @@
 
 #include "fuzz/Bytes.h"
 #include "fuzz/GuardedEntry.h"
+#include "fuzz/LoadedModule.h"
 #include "fuzz/MemoryFile.h"
 #include "fuzz/Require.h"
 #include "fuzz/Target.h"
 #include "hostutil/HostSetup.h"
 #include "refhost/Host.h"
-#include "refhost/ModuleLoader.h"
 #include "refhost/Operations.h"
 
 namespace {
@@ -144,23 +144,13 @@ void CheckResult(const refhost::CallbackResult& result, const Behaviour& behavio
           "a code is a documented one");
 }
 
-HostPluginEntry LoadModule() {
-  // Never unloaded: the fuzzer reads its coverage counters until the end.
-  static auto* const loader = new refhost::ModuleLoader;
-  std::string failure;
-  const HostPluginEntry entry = loader->load(MAYASCENE_MODULE, &failure);
-  Require(entry != nullptr, failure.c_str());
-  return entry;
-}
-
 }  // namespace
 
 int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   static fuzz::MemoryFile file;
-  static const HostPluginEntry entry = LoadModule();
   static TraceSink sink;
   static std::ostream trace(&sink);
-  fuzz::SetModuleEntry(entry);
+  fuzz::SetModuleEntry(fuzz::LoadedModule());
   const std::string_view scene = fuzz::TextOf(data, size);
   const Behaviour behaviour = BehaviourOf(scene);
   file.Write(scene);

@@ -114,7 +114,7 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     Read(text, where, nullptr, &plain);
     for (const scan::TextSkipper& skipper : scan::TextSkippers()) {
       Read(text, where, where == Where::InCommand ? skipper.inCommand : skipper.betweenCommands, &skipped);
-      Require(skipped == plain, "passing over harmless text changes nothing of what is found");
+      Require(skipped == plain, "skipping text without an effect changes nothing that is found");
     }
   }
   return 0;

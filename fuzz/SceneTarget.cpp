@@ -48,7 +48,7 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   const std::string longer = std::string(text) + std::string(kLastCommand);
   diag::Collector others(longer);
   const scene::Scene again = scene::Read(longer, others);
-  Require(HasLastNode(again), "nothing costs the commands after it");
+  Require(HasLastNode(again), "no text keeps the commands after it from being read");
   Require(diagnostics.count() <= 2 * size, "there are no more diagnostics than bytes, nearly");
   return 0;
 }

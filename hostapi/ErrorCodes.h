@@ -15,12 +15,12 @@
   ENTRY(MAYA_UNEXPECTED_END, 1289986, "the scene ends inside a string, a comment, a word or a command")     \
   ENTRY(MAYA_KEY_COUNTS,     1289987, "the animated channels of a node have different numbers of keys; bake the scene first") \
   /* The host's utility services. */                                                                        \
-  ENTRY(NUMBER_SYNTAX,          2001, "a text that should be a number is none")                             \
+  ENTRY(NUMBER_SYNTAX,          2001, "a text that should be a number is not one")                          \
   ENTRY(NUMBER_RANGE,           2002, "a number is too large to be held")                                   \
   ENTRY(LIST_MEMORY,            2011, "a list could not grow: the memory is exhausted")                     \
   ENTRY(LIST_INDEX,             2012, "a list was asked for a record that it does not hold")                \
   ENTRY(LIST_LOCKED,            2013, "a list was asked to grow while one of its records is locked")        \
-  ENTRY(FILE_OPEN,              2021, "the file cannot be opened, or is no regular file")                   \
+  ENTRY(FILE_OPEN,              2021, "the file cannot be opened, or is not a regular file")                \
   ENTRY(FILE_SHORT_READ,        2022, "the file ended, or could not be read, before all bytes were there")  \
   ENTRY(FILE_SIZE,              2023, "the file's size is not known, or is 2 GiB or more")                  \
   ENTRY(FILE_CLOSE,             2024, "the file could not be closed")                                       \
@@ -42,9 +42,9 @@
   ENTRY(BAD_VALUE,              3014, "a value is not finite")                                              \
   ENTRY(BAD_FILM_SIZE,          3015, "a film size is not positive")                                        \
   ENTRY(BAD_DIRECTION,          3016, "a film size is measured neither horizontally nor vertically")        \
-  ENTRY(NOT_A_FOLDER,           3021, "an item is no folder")                                               \
-  ENTRY(NOT_A_COMP,             3022, "an item is no composition, or would contain itself")                 \
-  ENTRY(NOT_A_CAMERA,           3023, "a layer is no camera layer")                                         \
+  ENTRY(NOT_A_FOLDER,           3021, "an item is not a folder")                                            \
+  ENTRY(NOT_A_COMP,             3022, "an item is not a composition, or would contain itself")              \
+  ENTRY(NOT_A_CAMERA,           3023, "a layer is not a camera layer")                                      \
   ENTRY(NO_SUCH_STREAM,         3024, "a layer has no stream of that kind")                                 \
   ENTRY(WRONG_COMP,             3025, "two layers are not of one composition")                              \
   ENTRY(PARENT_CIRCLE,          3026, "a parent would make a circle")                                       \

@@ -27,7 +27,7 @@ HostPluginEntry ModuleLoader::load(const std::filesystem::path& file, std::strin
   std::error_code unknown;
   const std::filesystem::file_status status = std::filesystem::status(place, unknown);
   if (std::filesystem::exists(status) && !std::filesystem::is_regular_file(status)) {
-    *failure = "the module cannot be loaded: " + shownText(place.native()) + ": it is no regular file";
+    *failure = "the module cannot be loaded: " + shownText(place.native()) + ": it is not a regular file";
     return nullptr;
   }
   library_ = dlopen(place.c_str(), RTLD_NOW | RTLD_LOCAL);

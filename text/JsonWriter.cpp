@@ -34,7 +34,7 @@ void AppendCharacter(std::string* text, char32_t point) {
   }
 }
 
-// Writes ASCII only, all else as \uXXXX: a name then cannot control a terminal that shows the JSON.
+// Writes ASCII only, and everything else as \uXXXX: so a name cannot control a terminal that shows the JSON.
 std::string Quoted(std::string_view bytes) {
   constexpr char32_t kReplacement = 0xfffd;
   std::string text = "\"";

@@ -9,7 +9,7 @@
 namespace text {
 
 // The caller keeps begin and end in pairs, and gives a key before each value of an object. Objects and arrays
-// are spread over lines, but for those begun with beginRow() and all within them.
+// are spread over lines, except those that begin with beginRow() and all within them.
 class JsonWriter {
  public:
   explicit JsonWriter(std::ostream& out) : out_(out) {}  // the stream outlives the writer
@@ -22,13 +22,13 @@ class JsonWriter {
 
   void key(std::string_view name);
 
-  void text(std::string_view bytes);  // what is no valid UTF-8 is replaced by U+FFFD
+  void text(std::string_view bytes);  // bytes that are not valid UTF-8 become U+FFFD
   void number(double value);  // the shortest digits that give the same bits; as texts "inf", "-inf", "nan"
   void integer(std::int64_t value);
   void boolean(bool value);
   void null();
 
-  // A value that another writer wrote as a document of its own. Its lines are indented to this level.
+  // A whole document of another writer, as a value. Its lines are indented to this level.
   void written(std::string_view value);
 
  private:

@@ -7,19 +7,19 @@
 
 namespace text {
 
-// A code point and its length in bytes; a length of 0 where the bytes are no valid UTF-8.
+// A code point and its length in bytes; a length of 0 where the bytes are not valid UTF-8.
 struct Character {
   std::size_t length = 0;
   char32_t point = 0;
 };
 
-// The character that begins at the index, which is below the size. Shorter forms than needed, surrogates and
-// what lies beyond U+10FFFF are not valid.
+// The character that begins at the index, which is below the size. Overlong forms, surrogates and code points
+// beyond U+10FFFF are not valid.
 Character CharacterAt(std::string_view bytes, std::size_t at);
 
 bool IsUtf8(std::string_view bytes);
 
-// The bytes with each one that is no part of valid UTF-8 replaced by U+FFFD.
+// The bytes, with U+FFFD for each byte that is not part of valid UTF-8.
 std::string ValidUtf8(std::string_view bytes);
 
 }  // namespace text

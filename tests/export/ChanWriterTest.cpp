@@ -171,7 +171,7 @@ TEST(ChanWriter, HostAxesComeOutAsThoseOfTheScene) {
   for (std::size_t i = 0; i < 8; ++i) EXPECT_NEAR((*a)[1][i], (*b)[1][i], 1e-12) << i;
 }
 
-// The least time of the processor, in seconds, for cameras of which each hangs on the one before.
+// The least processor time, in seconds, for cameras each of which is a child of the previous one.
 double SecondsFor(std::size_t cameras) {
   Composition composition;
   composition.frames = 20;

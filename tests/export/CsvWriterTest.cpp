@@ -127,7 +127,7 @@ TEST(CsvWriter, AnAimedCameraHasItsResultingAngles) {
   EXPECT_THAT((Row(rows[2].begin() + 6, rows[2].begin() + 9)), ElementsAre("0", "90", "0"));
 }
 
-TEST(CsvWriter, ACameraThatIsAimedAtWhatIsAsGoodAsNowhereHasItsAngles) {
+TEST(CsvWriter, ACameraThatIsAimedAtAPointAlmostAtItsOwnPlaceHasItsAngles) {
   for (const double way : {5e-324, 1e-320, 1e-310}) {
     Composition composition = OneCamera();
     Layer& camera = composition.layers[1];

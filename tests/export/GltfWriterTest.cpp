@@ -30,7 +30,7 @@ class GltfWriterTest : public testing::TestWithParam<const char*> {
 INSTANTIATE_TEST_SUITE_P(Forms, GltfWriterTest, testing::Values("gltf", "glb"),
                          [](const auto& form) { return std::string(form.param); });
 
-// The largest part of any place or axis on the way up, which bounds what rounding to 32 bits can move.
+// The largest part of any place or axis up to the root. It bounds the effect of rounding to 32 bits.
 double Extent(const Composition& composition) {
   double extent = 1;
   for (std::size_t layer = 0; layer < composition.layers.size(); ++layer) {
@@ -109,7 +109,7 @@ TEST_P(GltfWriterTest, RotationsTakeTheShortWayFromFrameToFrame) {
   }
 }
 
-TEST_P(GltfWriterTest, AnAnimatedZoomIsAnExtensionThatNobodyNeeds) {
+TEST_P(GltfWriterTest, AnAnimatedZoomIsAnExtensionThatIsNotRequired) {
   const Composition composition = RigShot();
   const Written written = Write(composition);
   const nlohmann::json document = GltfJsonOf(written.file);

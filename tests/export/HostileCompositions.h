@@ -22,7 +22,7 @@ inline constexpr std::uint64_t kHostileCompositions = 1000;
 // formulas, markup, paths; numbers huge, tiny, and in some of them not finite; one frame and many, values
 // that stay, that move at every frame, and that have keys here and there; no layers, no camera; parents after
 // their children, deep chains, and circles in some; lenses and pictures of all sizes, and
-// of none; first frames that no number of 64 bits counts on from.
+// of none; first frames so large that the next frame has the same number in 64 bits.
 interchange::Composition HostileComposition(std::uint64_t seed);
 
 // Outputs in memory.

@@ -61,9 +61,9 @@ TEST(Places, LayersStandWhereTheirPositionsTurnsAndScalesPutThem) {
   }
 }
 
-// Worked out on paper: a boom 7 above the ground, a quarter turn about y and twice as wide; the camera 2.5 to
+// Computed by hand: a boom 7 above the ground, a quarter turn about y and twice as wide; the camera 2.5 to
 // its side, 30 degrees down.
-TEST(Places, ACameraOnABoomStandsWherePaperSays) {
+TEST(Places, ACameraOnABoomStandsWhereTheCalculationByHandPutsIt) {
   Composition shot = StillShot();
   Layer& camera = shot.layers[0];
   Layer& boom = shot.layers[1];

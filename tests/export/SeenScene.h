@@ -1,4 +1,4 @@
-// What a reader of the tests' own sees in an exported file, whatever its format.
+// The scene that a reader of the tests' own finds in an exported file, whatever its format.
 #pragma once
 
 #include <array>

@@ -33,8 +33,8 @@ Rows Scaled(const Rows& rows, const Point& scale);
 // Where the layer stands in the world, by the description's own words.
 Seat WorldSeat(const interchange::Composition& composition, std::size_t layer, std::size_t frame);
 
-// From the middle of the picture to the right and up, in pixels; nothing for what is not before the camera.
-// The camera looks along -z of its axes; its scale takes part.
+// From the middle of the picture to the right and up, in pixels; none where the point is not in front of the
+// camera. The camera looks along -z of its axes. Its scale counts.
 std::optional<std::array<double, 2>> PixelOf(const Seat& camera, double zoom, const Point& point);
 
 double Distance(const Point& a, const Point& b);

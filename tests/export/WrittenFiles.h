@@ -1,4 +1,4 @@
-// What a writer makes of a composition: its files, and what it reports.
+// The result of a writer for a composition: its files, and its reports.
 #pragma once
 
 #include <cstdint>

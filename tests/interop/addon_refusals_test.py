@@ -15,7 +15,7 @@ _CASES = {
     "a start-up camera alone": (
         _HEAD + 'createNode camera -n "perspShape";\n', False,
         "the scene has no cameras to import"),
-    "no scene": ("just some notes\n", True, "this is no Maya ASCII scene"),
+    "no scene": ("just some notes\n", True, "this is not a Maya ASCII scene"),
     "no file": (None, True, "the file cannot be read"),
     "no tool": (_HEAD, True, "no_tool cannot be started"),
 }

@@ -49,7 +49,7 @@ TEST(ModuleLoader, FifoAndFolderAreNoModulesAndAreNotWaitedFor) {
     CallbackResult result;
     std::string failure;
     EXPECT_FALSE(host.load(&result, &failure));
-    EXPECT_EQ(failure, "the module cannot be loaded: " + place.string() + ": it is no regular file");
+    EXPECT_EQ(failure, "the module cannot be loaded: " + place.string() + ": it is not a regular file");
   }
 }
 

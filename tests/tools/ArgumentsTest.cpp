@@ -243,7 +243,7 @@ TEST(Arguments, HelpBeginsWithTwoExamplesAndHelpAllHasTheDevelopersOptionsToo) {
   EXPECT_NE(parsed({"prefs", "set", "--help"}).out.find("Usage: mayascene prefs set "), std::string::npos);
 }
 
-TEST(Arguments, HelpShowsNothingOfWhatTheToolSaysToItself) {
+TEST(Arguments, HelpShowsNoOptionOfTheChildProcesses) {
   const std::string all = parsed({"check", "--help-all"}).out;
   EXPECT_EQ(all.find("--child"), std::string::npos);
   EXPECT_EQ(all.find("--colour"), std::string::npos);

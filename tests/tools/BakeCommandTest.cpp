@@ -57,7 +57,7 @@ TEST_F(BakeCommand, NamesTheSceneAndTheOptionsInItsFirstComment) {
   EXPECT_THAT(read("baked.ma"), HasSubstr(" from shot.ma with --frames 1001:1003 --world\n"));
 }
 
-TEST_F(BakeCommand, ImportsABakeUnderTheScenesOwnNameAndTakesItAwayAgain) {
+TEST_F(BakeCommand, ImportsABakeUnderTheScenesOwnNameAndRemovesIt) {
   write("shot.ma", unbakedScene());
   const ToolResult imported = run({"import", "--bake", "shot.ma"});
   EXPECT_EQ(imported.status, 0) << imported.err;
@@ -73,7 +73,7 @@ TEST_F(BakeCommand, TheTraceHasThePathThatWasPassed) {
   EXPECT_THAT(read("trace"), HasSubstr("\"name\":\"shot\""));
 }
 
-TEST_F(BakeCommand, ASignalTakesTheTemporaryBakeAway) {
+TEST_F(BakeCommand, ASignalRemovesTheTemporaryBake) {
   write("shot.ma", unbakedScene());
   for (const int signal : {SIGINT, SIGTERM, SIGHUP}) {
     // Long enough that the signal comes while the bake is there.
@@ -206,7 +206,7 @@ TEST_F(BakeCommand, SeveralScenesNeedAFolder) {
   EXPECT_EQ(run({"bake", "a.ma", "b.ma", "-o", "-"}).status, 2);
   const ToolResult result = run({"bake", "a.ma", "b.ma", "-o", "file"});
   EXPECT_EQ(result.status, 2);
-  EXPECT_THAT(result.err, HasSubstr("file is no folder: the outputs of several scenes need one"));
+  EXPECT_THAT(result.err, HasSubstr("file is not a folder: the outputs of several scenes need one"));
   EXPECT_FALSE(std::filesystem::exists(path("-")));
 }
 
@@ -294,7 +294,7 @@ TEST_F(BakeCommand, OptionsOfABakeAreWrongUsageWithoutOne) {
                              "--locators=all", "--report=r.json"}) {
     const ToolResult result = run({"import", option, "shot.ma"});
     EXPECT_EQ(result.status, 2) << option;
-    EXPECT_THAT(result.err, HasSubstr("goes with --bake")) << option;
+    EXPECT_THAT(result.err, HasSubstr("needs --bake")) << option;
   }
 }
 
@@ -311,7 +311,7 @@ TEST_F(BakeCommand, AFileThatIsNoSceneIsRefused) {
   write("shot.ma", "hello\n");
   const ToolResult result = run({"bake", "shot.ma", "-o", "baked.ma"});
   EXPECT_EQ(result.status, 1);
-  EXPECT_THAT(result.err, HasSubstr("refused: it is no Maya ASCII scene"));
+  EXPECT_THAT(result.err, HasSubstr("refused: it is not a Maya ASCII scene"));
   EXPECT_FALSE(std::filesystem::exists(path("baked.ma")));
   EXPECT_EQ(run({"import", "--bake", "shot.ma"}).status, 1);
 }

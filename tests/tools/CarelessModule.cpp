@@ -1,7 +1,7 @@
-// An import module that breaks its promises, for the tests of what the tool says about one that does.
+// An import module that breaks its promises, for the tests of the tool's complaints.
 //
-// Importing a file leaves a block of memory behind, shows a message and passes a null handle; its name says
-// the rest: one that ends in "throws" lets an exception out.
+// Importing a file leaves a block of memory behind, shows a message and passes a null handle. For a file
+// whose name ends in "throws", an exception leaves the module.
 #include <cstdint>
 #include <stdexcept>
 

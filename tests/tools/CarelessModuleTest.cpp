@@ -1,4 +1,4 @@
-// What the tool says about a module that leaves things behind and breaks its promises to the host.
+// The tool's complaints about a module that leaves things behind and breaks its promises to the host.
 #include <gtest/gtest.h>
 
 #include <nlohmann/json.hpp>

@@ -30,7 +30,7 @@ TEST_F(CheckCommand, ReportsWhatCameOver) {
   EXPECT_THAT(check.err, IsEmpty());
 }
 
-// With a processor free for it the scene is read while it is imported; what is no scene is not read at all.
+// With a free processor the scene is read while it is imported; a file that is not a scene is not read.
 TEST_F(CheckCommand, TheReportIsTheSameWithOneProcessorAndWithMore) {
   write("crane.ma", sceneText(craneCamera()));
   write("cut.ma", sceneText(std::string(craneCamera()) + "setAttr \".t"));
@@ -189,7 +189,7 @@ TEST_F(CheckCommand, ColourGoesToATerminalAlone) {
   EXPECT_THAT(runOnTerminal({"check", "refused.ma"}).out, Not(HasSubstr("\x1b[")));
 }
 
-TEST_F(CheckCommand, HostileNamesAreHarmless) {
+TEST_F(CheckCommand, HostileNamesAreEscaped) {
   write("shot.ma", sceneText("createNode transform -n \"bad\x1b]0;name\";\n"
                              "createNode camera -n \"worse\xff\" -p \"bad\x1b]0;name\";\n"));
   const std::string out = run({"check", "shot.ma"}).out;

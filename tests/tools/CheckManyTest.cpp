@@ -115,7 +115,7 @@ TEST_F(CheckMany, AnUnusableNumberOfJobsOrSecondsIsWrongUsage) {
   }
 }
 
-TEST_F(CheckMany, WhatTheToolSaysToItselfIsInNoHelp) {
+TEST_F(CheckMany, OptionsOfTheChildProcessesAreInNoHelp) {
   EXPECT_THAT(run({"check", "--help"}).out, Not(HasSubstr("child")));
 }
 

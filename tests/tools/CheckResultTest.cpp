@@ -1,4 +1,4 @@
-// How a child's result reaches its parent, and what stands for one that never came.
+// How a child's result reaches its parent, and what replaces one that never came.
 #include "tools/mayascene/CheckResult.h"
 
 #include <gmock/gmock.h>
@@ -106,7 +106,7 @@ TEST_F(UnfinishedCheck, HasOneDiagnosticThatSaysWhatHappened) {
             "MA1005: the check could not be started: Resource temporarily unavailable");
 }
 
-TEST_F(UnfinishedCheck, IsAnErrorOfTheSceneAndWantOfMeansOneOfTheRun) {
+TEST_F(UnfinishedCheck, IsAnErrorOfTheSceneAndALackOfResourcesOneOfTheRun) {
   for (const Kind kind : {Kind::TimedOut, Kind::Signalled, Kind::Exited, Kind::TooMuchOutput}) {
     EXPECT_EQ(unfinished(kind).status, ExitStatus::Refused);
     EXPECT_EQ(unfinished(kind).report.errors, 1u);
@@ -127,7 +127,7 @@ TEST_F(UnfinishedCheck, IsShownWithoutAHead) {
   EXPECT_THAT(mayascene::resultOf(unfinished(Kind::TimedOut), CheckArguments{}).json, IsEmpty());
 }
 
-// What the tool says to itself means what was said to it.
+// The options of a child have the meaning of those of the run.
 TEST(ChildWords, GiveTheChildTheArgumentsOfTheRun) {
   CheckArguments asked;
   asked.twoThreads = true;
@@ -161,7 +161,7 @@ TEST(ChildWords, GiveTheChildTheArgumentsOfTheRun) {
   EXPECT_FALSE(child.colourComplaints);
 }
 
-TEST(ChildWords, SayNothingThatWasNotAsked) {
+TEST(ChildWords, HoldNoOptionThatWasNotGiven) {
   EXPECT_THAT(mayascene::childWords({}, "shot.ma"),
               ElementsAre("/proc/self/exe", "check", "--child", "--", "shot.ma"));
 }

@@ -114,7 +114,7 @@ TEST_F(ClosingLine, AStrictExportEndsWithOneWhereItIsSaid) {
     const ToolResult result =
         run({"export", "--strict", "curved.ma", "-o", "x.csv", quiet ? "-q" : "--keys"});
     EXPECT_EQ(result.status, 1);
-    EXPECT_EQ(lines(result), 1u);  // the reason of the status is no news that --quiet hides
+    EXPECT_EQ(lines(result), 1u);  // --quiet does not hide the reason of the status
   }
   EXPECT_EQ(run({"export", "--strict", "--bake", "curved.ma", "-o", "x.csv"}).status, 0);
   EXPECT_EQ(run({"export", "curved.ma", "-o", "x.csv"}).status, 0);
@@ -155,7 +155,7 @@ TEST_F(ClosingLine, NamesTheCameraWhoseKeysStopTheImport) {
                         "different numbers of keys end the import. To bring it over: "));
 }
 
-TEST_F(ClosingLine, LocatorsWithoutACameraHaveNoCommandForNoneBringsThem) {
+TEST_F(ClosingLine, LocatorsWithoutACameraHaveNoCommandBecauseNoneBringsThemOver) {
   write("points.ma",
         sceneText("createNode transform -n \"p\";\ncreateNode locator -n \"pShape\" -p \"p\";\n"));
   const ToolResult result = run({"import", "points.ma"});
@@ -164,8 +164,8 @@ TEST_F(ClosingLine, LocatorsWithoutACameraHaveNoCommandForNoneBringsThem) {
               HasSubstr("nothing to import, the scene has no cameras"));
 }
 
-// What a user copies from the terminal is what runs: the shell gives back the name to the byte.
-TEST_F(ClosingLine, TheNameInTheCommandIsHarmlessAndTheShellReadsItToTheByte) {
+// A user can copy the command from the terminal: the shell restores the name byte by byte.
+TEST_F(ClosingLine, TheNameInTheCommandIsEscapedAndTheShellRestoresItsBytes) {
   for (const std::string name :
        {"a b.ma", "it's.ma", "$(touch x).ma", "\x1b[31mred.ma", "new\nline.ma", "\xff\xfe.ma",
         "caf\xc3\xa9.ma", "back\\slash.ma", "-q.ma", "\xe2\x80\xae.ma", "~.ma", "a;b.ma", "*.ma"}) {

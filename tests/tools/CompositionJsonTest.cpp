@@ -120,7 +120,7 @@ TEST(CompositionJson, WhatCameOfACallbackIsReportedInFull) {
   const json document = documentOf(run);
   EXPECT_EQ(document["scenes"][0], json::parse(R"({"path": "a\ufffd.ma", "outcome": "failed", "status": 1,
       "error": {"code": 2021, "name": "FILE_OPEN",
-                "meaning": "the file cannot be opened, or is no regular file", "line": 12},
+                "meaning": "the file cannot be opened, or is not a regular file", "line": 12},
       "messages": ["first", "second"], "refusals": ["CreateComp: a width of 0"],
       "leftovers": [{"description": "stream:3", "keptByDesign": false},
                     {"description": "file:1", "keptByDesign": true}],

@@ -96,8 +96,8 @@ TEST_F(ExitStatusTest, AModuleThatIsAFifoIsFourAndNotWaitedFor) {
   ASSERT_EQ(::mkfifo(path("fifo").c_str(), 0600), 0);
   const ToolResult result = run({"import", "good.ma", "--module", "fifo"});
   EXPECT_EQ(result.status, 4);
-  EXPECT_EQ(result.err,
-            "mayascene: the module cannot be loaded: " + path("fifo").string() + ": it is no regular file\n");
+  EXPECT_EQ(result.err, "mayascene: the module cannot be loaded: " + path("fifo").string() +
+                            ": it is not a regular file\n");
 }
 
 TEST_F(ExitStatusTest, ALibraryWithoutTheEntryIsFour) {
@@ -112,7 +112,7 @@ TEST_F(ExitStatusTest, AnEntryThatReturnsACodeIsFour) {
       run({"import", "good.ma", "--during", "entry", "--fail", "RegisterImporterName:1=77"});
   EXPECT_EQ(result.status, 4);
   EXPECT_EQ(result.out, "");
-  EXPECT_EQ(result.err, "mayascene: the module's entry: error 77: a code of no known meaning\n");
+  EXPECT_EQ(result.err, "mayascene: the module's entry: error 77: an unknown code\n");
 }
 
 TEST_F(ExitStatusTest, TranslationsThatCannotBeReadAreThree) {

@@ -1,4 +1,4 @@
-// Names from strangers on their way to a terminal and into JSON.
+// Untrusted names on a terminal and in JSON.
 #include <gtest/gtest.h>
 
 #include <nlohmann/json.hpp>
@@ -53,7 +53,7 @@ TEST_F(HostileNames, TheJsonItselfHoldsNoControlCharacters) {
   for (const char letter : text) EXPECT_TRUE(letter == '\n' || (letter >= ' ' && letter < '\x7f'));
 }
 
-TEST_F(HostileNames, AFileNameIsAsHarmlessAsANode) {
+TEST_F(HostileNames, AFileNameIsEscapedLikeTheNameOfANode) {
   const std::string name = "a\n\x1b[31m\xff.ma";
   write(name, sceneText("createNode camera -n \"cam\";\n"));
   const ToolResult result = run({"import", name});

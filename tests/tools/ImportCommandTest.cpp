@@ -124,7 +124,7 @@ TEST_F(ImportCommand, WhatIsNoMayaAsciiIsRefusedWithTheImportersMessage) {
   EXPECT_EQ(result.status, 1);
   EXPECT_EQ(result.out,
             "notes.txt: nothing was imported\n\nmessages\n  Only Baked Maya Ascii files are supported.\n");
-  EXPECT_EQ(result.err, "mayascene: notes.txt: refused: it is no Maya ASCII scene\n");
+  EXPECT_EQ(result.err, "mayascene: notes.txt: refused: it is not a Maya ASCII scene\n");
 }
 
 TEST_F(ImportCommand, ACodeIsReportedWithNameAndMeaningAndWhatWasMadeStays) {
@@ -186,7 +186,7 @@ TEST_F(ImportCommand, QuietPrintsNothingButErrors) {
   EXPECT_EQ(bad.out, "");
   EXPECT_EQ(bad.err,
             "mayascene: notes.txt: message: Only Baked Maya Ascii files are supported.\n"
-            "mayascene: notes.txt: refused: it is no Maya ASCII scene\n");
+            "mayascene: notes.txt: refused: it is not a Maya ASCII scene\n");
 }
 
 TEST_F(ImportCommand, ItRunsFromAnyFolder) {

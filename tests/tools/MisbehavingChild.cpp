@@ -4,7 +4,7 @@
 //   fill N CHAR       writes N times CHAR on standard output
 //   end N             says "N" on standard error and ends with status N
 //   signal N          ends by the signal N
-//   hang              waits for ever, deaf to every signal that can be ignored
+//   hang              waits for ever, and ignores every signal that can be ignored
 //   close             closes its streams and waits for ever
 //   flood out|err     writes on the stream without end
 //   eat               takes a gigabyte of memory; ends with status 5 when there is none left
@@ -14,7 +14,7 @@
 //   read              says how many bytes standard input has
 //   process FILE      writes its process id into the file
 //
-// Several of them are done one after the other.
+// Several of these are carried out in their order.
 #include <fcntl.h>
 #include <signal.h>
 #include <sys/resource.h>

@@ -91,7 +91,7 @@ TEST_F(PoolInterruption, ChildrenEndWithARunnerThatIsKilled) {
   ::kill(runner, SIGKILL);
   ASSERT_EQ(::waitpid(runner, nullptr, 0), runner);
   for (const pid_t process : processes) {
-    // An orphan that nobody waits for may stay as a number: what counts is that it no longer runs.
+    // An orphan without a waiting parent may keep its process id. It must not run any more.
     const std::string file = "/proc/" + std::to_string(process) + "/stat";
     const auto over = [&] {
       std::ifstream in(file);
@@ -127,7 +127,7 @@ TEST_F(PoolInterruption, ASignalAtAnyMomentLeavesNoChild) {
     int status = 0;
     ASSERT_EQ(::waitpid(runner, &status, 0), runner);
     EXPECT_EQ(WEXITSTATUS(status), 128 + SIGTERM);
-    // The children are in its group, where nobody is left.
+    // The children are in its process group, which is empty now.
     EXPECT_TRUE(gone(-runner));
   }
 }

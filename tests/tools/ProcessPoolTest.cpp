@@ -132,7 +132,7 @@ TEST_F(Pool, AChildThatHangsIsEndedAndKeepsWhatItSaid) {
   EXPECT_GE(ends[0].seconds.count(), 0.3);
   EXPECT_EQ(ends[1].kind, Kind::Exited);
   EXPECT_EQ(ends[1].out, "next");
-  // It is waited for: its number is no process's any more.
+  // The pool waited for it, so no process has its number any more.
   const pid_t process = std::stoi(folder_.read("id"));
   EXPECT_EQ(::kill(process, 0), -1);
   EXPECT_EQ(errno, ESRCH);

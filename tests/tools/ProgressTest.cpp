@@ -1,4 +1,4 @@
-// What a long run shows of itself.
+// The progress of a long run on a terminal.
 #include "tools/mayascene/Progress.h"
 
 #include <gtest/gtest.h>

@@ -38,7 +38,7 @@ TEST_F(SceneFile, ADirectoryIsNotReadable) {
 TEST_F(SceneFile, AFifoIsNotWaitedFor) {
   ASSERT_EQ(::mkfifo(path("fifo").c_str(), 0600), 0);
   EXPECT_FALSE(lookAtScene(path("fifo")).readable);
-  EXPECT_EQ(lookAtScene(path("fifo")).failure, "is no regular file");
+  EXPECT_EQ(lookAtScene(path("fifo")).failure, "is not a regular file");
 }
 
 TEST_F(SceneFile, ADeviceIsNotReadable) { EXPECT_FALSE(lookAtScene("/dev/zero").readable); }

@@ -20,8 +20,8 @@ struct ToolResult {
   std::string err;  // standard error
 };
 
-// A test with a folder of its own, in which the tool runs. The user's configuration lies in it too, so that
-// no run reads or writes that of the person who tests.
+// A test with a folder of its own, in which the tool runs. The user's configuration is in it too, so that no
+// run reads or writes the tester's own.
 class ToolTest : public ::testing::Test {
  protected:
   // Runs the tool with these arguments and waits for its end.

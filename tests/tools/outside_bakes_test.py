@@ -1,11 +1,11 @@
 #!/usr/bin/env python3
-"""What a bake gives of scenes of others, which lie in folders beside the source folder where somebody has them.
+"""Bakes scenes from outside the project, where folders beside the source folder hold them.
 
 usage: outside_bakes_test.py TOOL ROOT
 
-Each row has been held against the scene's own text: its cameras but for the startup and orthographic ones; what its
-playback range and the keys of those cameras' channels come to; and why a camera that comes by its place in the world
-cannot come with its parents.
+Each row was checked against the scene's text: its cameras, without the startup and the orthographic ones; the frames of
+its playback range and of the keys of those cameras; and, for a camera in world space, why it cannot come with its
+parents.
 """
 
 import json

@@ -37,7 +37,7 @@ update="apt-get $options update"
 expect 'nothing is missing and nothing is done' 0 '' 0 old-compiler old-library
 expect 'only what is missing is installed' 0 "$update
 $install new-library new-tool" 0 old-compiler new-library new-tool
-expect 'who is not root asks sudo, which asks nobody' 0 "sudo -n
+expect 'a user who is not root gets sudo without questions' 0 "sudo -n
 $update
 sudo -n
 $install new-library" 1000 new-library

@@ -33,7 +33,7 @@ CLI::Validator timeoutWord() {
     double seconds = 0.0;
     const bool taken =
         CLI::detail::lexical_cast(word, seconds) && seconds >= kLeastTimeout && seconds <= kMostTimeout;
-    return taken ? "" : word + " is no time between a thousandth of a second and a million seconds";
+    return taken ? "" : word + " is not a number of seconds between 0.001 and 1000000";
   };
   return CLI::Validator(check, "");
 }
@@ -46,8 +46,8 @@ const diag::Entry* entryOf(const std::string& word) {
   return nullptr;
 }
 
-// One that says all codes by its description, as the library's own set of words does, and none by its
-// complaint.
+// Takes the codes. Its description lists all of them, as that of the library's own set of words does; its
+// complaint lists none.
 CLI::Validator codeWord() {
   std::string all;
   for (const diag::Entry& entry : diag::Table()) all += (all.empty() ? "{" : ",") + diag::NameOf(entry.code);
@@ -91,7 +91,7 @@ void checkOutputs(const std::vector<NamedOutput>& outputs, const std::vector<std
   }
 }
 
-// A file name can be empty nowhere but where the option is left out.
+// No option takes an empty value.
 void refuseEmptyValues(const CLI::App& verb) {
   for (const CLI::Option* option : verb.get_options()) {
     for (const std::string& value : option->results()) {
@@ -112,7 +112,7 @@ std::vector<std::string> wordsOf(int argc, const char* const* argv) {
 
 // The whole command line, and where its parts go.
 struct CommandLine {
-  CLI::App app{"Imports baked Maya ASCII scenes into a project in memory and shows what came of it.",
+  CLI::App app{"Imports the cameras of Maya ASCII scenes; shows, bakes, checks and exports them.",
                "mayascene"};
   ImportArguments import;
   VerifyArguments verify;
@@ -181,7 +181,7 @@ struct CommandLine {
   }
 
   void addCheck() {
-    checkVerb = app.add_subcommand("check", "say what an import makes of scenes, what it does not, and why");
+    checkVerb = app.add_subcommand("check", "report what comes over from scenes, what does not, and why");
     addScenes(checkVerb, &check.scenes,
               "a Maya ASCII scene, in whatever state, or a folder\nthat is searched for *.ma");
     checkVerb->add_option("--json", check.json, "write the reports; - is standard output")
@@ -205,7 +205,7 @@ struct CommandLine {
     addChildOptions();
   }
 
-  // What the tool says to itself: no help shows it.
+  // Options that the tool gives to its own child processes. No help shows them.
   void addChildOptions() {
     checkVerb->add_flag("--child", check.child)->group("");
     checkVerb->add_flag("--two-threads", check.twoThreads)->group("");
@@ -214,7 +214,7 @@ struct CommandLine {
   }
 
   void addVerify() {
-    verifyVerb = app.add_subcommand("verify", "answer for each file whether the importer takes it");
+    verifyVerb = app.add_subcommand("verify", "show for each file whether the importer takes it");
     addScenes(verifyVerb, &verify.scenes, "a file, such as a Maya ASCII scene");
     verifyVerb->add_flag("-q,--quiet", verify.quiet, "print nothing but errors");
     addHostOptions(verifyVerb, &verify.host, &verifyHostWords);
@@ -240,7 +240,7 @@ struct CommandLine {
   void translateImportBake() {
     const std::vector<std::string> given = givenBakeOptions(*importVerb);
     if (!importBakes && !given.empty()) {
-      throw CLI::ValidationError(given.front(), "goes with --bake");
+      throw CLI::ValidationError(given.front(), "needs --bake");
     }
     if (importBakes) translateBakeWords(importBakeWords, &import.bake.emplace());
   }
@@ -256,7 +256,7 @@ struct CommandLine {
     return tableOf(*verb, command);
   }
 
-  // What is wrong with the words, in plain ones.
+  // What is wrong with the command line, in plain words.
   std::string complaint(const CLI::ParseError& wrong) const {
     const bool mismatch = dynamic_cast<const CLI::ArgumentMismatch*>(&wrong) != nullptr;
     for (const CLI::App* verb = &app; mismatch; verb = verb->get_subcommands().back()) {

@@ -18,7 +18,7 @@ namespace mayascene {
 
 // What `import` and `verify` ask of the embedded host.
 struct HostArguments {
-  std::string module;        // empty: the one that lies with the tool
+  std::string module;        // empty: the one that is installed or built with the tool
   std::string preferences;   // empty: the user's own store
   std::string translations;  // empty: none
   std::string trace;         // empty: none; "-": standard output
@@ -26,7 +26,7 @@ struct HostArguments {
   std::optional<std::int32_t> linearUnits;  // none: what the preference store holds
   std::int32_t zoomKeys = 0;
   bool permissive = false;
-  std::optional<std::int32_t> mostLayers;  // none: what the host takes by itself; the same for the next two
+  std::optional<std::int32_t> mostLayers;  // none: the host's own limit; the same for the next two
   std::optional<std::int32_t> mostKeys;
   std::optional<std::int64_t> mostMemory;
   std::vector<refhost::Failure> failures;
@@ -59,7 +59,7 @@ struct CheckArguments {
   bool verbose = false;
   std::optional<std::size_t> jobs;  // scenes at a time; none: as many as there are processors
   double timeout = 60.0;            // seconds for each scene
-  // Of a run that is the child of another one, and checks a single scene for it.
+  // For a child process that checks a single scene for its parent.
   bool child = false;
   bool twoThreads = false;    // a processor is free: the scene is read while it is imported
   bool colourReport = false;  // the parent shows them on a terminal
@@ -78,7 +78,7 @@ struct ExportArguments {
   bool keys = false;
   bool strict = false;
   bool quiet = false;
-  std::string words;  // what was asked for, but the output and what goes with a bake: " -f csv --scale 2"
+  std::string words;  // the options as given, except the output and those of a bake: " -f csv --scale 2"
 };
 
 struct PrefsArguments {
@@ -86,7 +86,7 @@ struct PrefsArguments {
   std::optional<std::int32_t> linearUnits;  // the value to set; none: show
 };
 
-// Exactly one of the six is there, or none and the run is over: help was shown, or usage was wrong.
+// Exactly one of the six is set; or none, and the run is over: help was shown, or usage was wrong.
 struct Arguments {
   std::optional<ImportArguments> import;
   std::optional<VerifyArguments> verify;

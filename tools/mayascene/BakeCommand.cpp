@@ -33,14 +33,6 @@ BakedScene bakeTo(const std::string& path, const std::string& place, const BakeA
   return baked;
 }
 
-ExitStatus writeReport(OutputFile* report, const std::vector<BakedScene>& scenes, Diagnostics& diagnostics) {
-  std::string failure;
-  writeBakeReport(report->stream(), scenes);
-  if (report->commit(&failure)) return ExitStatus::Done;
-  diagnostics.complain("", failure);
-  return ExitStatus::CannotWrite;
-}
-
 }  // namespace
 
 ExitStatus runBake(const BakeArguments& arguments, Diagnostics& diagnostics) {
@@ -68,7 +60,7 @@ ExitStatus runBake(const BakeArguments& arguments, Diagnostics& diagnostics) {
     status = worse(status, scene.status);
     scenes.push_back(std::move(scene));
   }
-  return report ? worse(status, writeReport(report.get(), scenes, diagnostics)) : status;
+  return report ? worse(status, commitBakeReport(report.get(), scenes, diagnostics)) : status;
 }
 
 }  // namespace mayascene

@@ -5,6 +5,7 @@
 #include <set>
 #include <system_error>
 
+#include "text/Letters.h"
 #include "tools/mayascene/FileSet.h"
 #include "tools/mayascene/OutputFile.h"
 
@@ -13,13 +14,6 @@ namespace {
 
 namespace fs = std::filesystem;
 
-std::string lowered(std::string text) {
-  for (char& c : text) {
-    if (c >= 'A' && c <= 'Z') c = static_cast<char>(c - 'A' + 'a');
-  }
-  return text;
-}
-
 // Names that no other output of the run has.
 class FreeNames {
  public:
@@ -27,8 +21,8 @@ class FreeNames {
   std::string nameOf(const fs::path& scene, const std::string& suffix) {
     const std::string stem = scene.stem().empty() ? "scene" : scene.stem().string();
     std::string name = stem + suffix;
-    int& number = numbers_.try_emplace(lowered(stem), 1).first->second;
-    while (!taken_.insert(lowered(name)).second) name = stem + '_' + std::to_string(++number) + suffix;
+    int& number = numbers_.try_emplace(text::Lowered(stem), 1).first->second;
+    while (!taken_.insert(text::Lowered(name)).second) name = stem + '_' + std::to_string(++number) + suffix;
     return name;
   }
 
@@ -45,7 +39,7 @@ ExitStatus makeFolder(const std::string& output, std::string* failure) {
     return ExitStatus::WrongUsage;
   }
   if (fs::exists(output, error)) {
-    *failure = output + " is no folder: the outputs of several scenes need one";
+    *failure = output + " is not a folder: the outputs of several scenes need one";
     return ExitStatus::WrongUsage;
   }
   if (fs::create_directories(output, error) || fs::is_directory(output)) return ExitStatus::Done;

@@ -1,4 +1,4 @@
-// Where the outputs of a run go that has one for each scene.
+// Where the outputs of a run go, one for each scene.
 #pragma once
 
 #include <string>
@@ -8,9 +8,10 @@
 
 namespace mayascene {
 
-// A file for each scene, and Done. `suffix` is ".ma" for bakes. One scene's is `output`, unless that is a
-// folder, or ends with a "/"; those of several lie in the folder `output`, under the scenes' own names, with
-// _2, _3 … where two are the same without regard to case. The folder is made where it is not there.
+// Gives a file for each scene, and Done. `suffix` is ".ma" for bakes. The output of a single scene is
+// `output`, unless that is a folder, or ends with a "/". Those of several scenes lie in the folder `output`,
+// under the scenes' own names, with _2, _3 … where two are the same without regard to case. The folder is
+// made where it is missing.
 //
 // WrongUsage, with a sentence in *failure, where an output would be written over one of the scenes or over
 // `report`, and where several have no folder to go to. CannotWrite where the folder cannot be made.

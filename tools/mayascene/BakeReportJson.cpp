@@ -80,4 +80,13 @@ void writeBakeReport(std::ostream& out, const std::vector<BakedScene>& scenes) {
   out << '\n';
 }
 
+ExitStatus commitBakeReport(OutputFile* output, const std::vector<BakedScene>& scenes,
+                            Diagnostics& diagnostics) {
+  std::string failure;
+  writeBakeReport(output->stream(), scenes);
+  if (output->commit(&failure)) return ExitStatus::Done;
+  diagnostics.complain("", failure);
+  return ExitStatus::CannotWrite;
+}
+
 }  // namespace mayascene

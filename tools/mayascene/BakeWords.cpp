@@ -51,10 +51,10 @@ void addBakeOptions(CLI::App* verb, BakeWords* words, const std::string& group) 
   grouped(verb->add_option("--step", words->step, "frames from one key to the next (1); 0.25 for motion blur")
               ->option_text("S"));
   grouped(verb->add_option("--camera", words->cameras,
-                           "only this camera: the name or the path of it or of\nits transform")
+                           "only this camera: its name or path, or those of its\ntransform")
               ->allow_extra_args(false)
               ->option_text("NAME ..."));
-  grouped(verb->add_flag("--world", words->world, "no parents: each camera by its place in the world"));
+  grouped(verb->add_flag("--world", words->world, "no parents: each camera with its place in the world"));
   grouped(verb->add_option("--locators", words->locators, "marked (with \"null\" in the name), all or none")
               ->option_text("WHICH")
               ->check(CLI::IsMember({"marked", "all", "none"})));

@@ -11,7 +11,7 @@ std::string joined(const std::vector<std::string>& words, std::string_view betwe
   return text;
 }
 
-// The values of the options that take one. Of a value that is neither word nor file nothing is proposed.
+// The values of the options that take one. Nothing is proposed for a value that is neither a word nor a file.
 std::string valueCases(const CommandTable& table) {
   std::string text;
   for (const OptionGroup& group : table.groups) {

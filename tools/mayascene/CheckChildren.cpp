@@ -14,7 +14,7 @@ namespace {
 
 constexpr const char* kOwnProgram = "/proc/self/exe";
 
-// The sanitizers take terabytes of address space, most of which they never use.
+// No limit under the sanitizers, which reserve terabytes of address space.
 #if defined(__SANITIZE_ADDRESS__)
 constexpr std::uint64_t kMemory = 0;
 #elif defined(__has_feature)
@@ -27,7 +27,7 @@ constexpr std::uint64_t kMemory = std::uint64_t{8} << 30;
 constexpr std::uint64_t kMemory = std::uint64_t{8} << 30;
 #endif
 
-// Whether a child came to its end in good order; *result is what it handed over then.
+// Whether a child ended as it should; *result is then what it handed over.
 bool finished(const ChildEnd& end, CheckResult* result) {
   return end.kind == ChildEnd::Kind::Exited && handedOver(end.out, result) &&
          static_cast<int>(result->status) == end.number;

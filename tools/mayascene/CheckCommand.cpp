@@ -48,7 +48,7 @@ struct Outputs {
   }
 };
 
-// Shows the results of a run as they come, and how far it is.
+// Shows the results of a run as they come, and its progress.
 class Showing {
  public:
   Showing(const CheckArguments& arguments, std::size_t scenes, Outputs& outputs, Diagnostics& diagnostics)
@@ -95,7 +95,7 @@ class Showing {
   Clock::time_point drawn_;
 };
 
-// The scenes to check. A folder that cannot be searched makes the run end with Unreadable.
+// The scenes to check. *status is Unreadable where a folder cannot be searched.
 std::vector<std::string> scenesOf(const CheckArguments& arguments, Diagnostics& diagnostics,
                                   ExitStatus* status) {
   FoundScenes found = findScenes(arguments.scenes);
@@ -107,7 +107,7 @@ std::vector<std::string> scenesOf(const CheckArguments& arguments, Diagnostics& 
   return std::move(found.scenes);
 }
 
-// Whether the JSON would take the place of a scene that was found in a folder.
+// Whether the JSON would overwrite a scene that was found in a folder.
 bool overwritesScene(const std::string& json, const std::vector<std::string>& scenes) {
   std::error_code failure;
   if (json.empty() || json == kStandardOutput || !std::filesystem::is_regular_file(json, failure))

@@ -1,4 +1,4 @@
-// mayascene check: says what an import makes of scenes, and why.
+// mayascene check: reports what comes over from scenes, what does not, and why.
 #pragma once
 
 #include "tools/mayascene/Arguments.h"

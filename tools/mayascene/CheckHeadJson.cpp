@@ -26,7 +26,7 @@ void writeWhere(text::JsonWriter& json, const check::Where& where) {
 void writeValue(text::JsonWriter& json, double value) { json.number(value); }
 void writeValue(text::JsonWriter& json, const std::string& value) { json.text(value); }
 
-// A value and where the file says it; null where it does not.
+// A value and its place in the file; a null place where the file does not set the value.
 template <typename T>
 void writeGiven(text::JsonWriter& json, std::string_view key, const check::Given<T>& given) {
   json.key(key);
@@ -68,7 +68,7 @@ void writeChain(text::JsonWriter& json, const check::ShapeHead& shape) {
   writeTruth(json, "chainGoesOn", shape.chainGoesOn);
 }
 
-// The keys of the zoom are null of a locator.
+// `zoomKeys` is null for a locator.
 void writeLayer(text::JsonWriter& json, const check::ShapeHead& shape, const std::size_t* zoomKeys) {
   json.key("layer");
   if (!shape.cameOver) return json.null();
@@ -98,7 +98,7 @@ void writeSpan(text::JsonWriter& json, std::string_view key, const std::optional
   json.endObject();
 }
 
-// Without what is not driven, and without what cannot be computed.
+// Leaves out values that are not driven, and values that cannot be computed.
 void writeOverFrames(text::JsonWriter& json, const std::optional<check::LensOverFrames>& over) {
   if (!over) return;
   json.key("overFrames");
@@ -159,7 +159,7 @@ void writeLookAt(text::JsonWriter& json, const check::LookAtHead& lookAt) {
   json.endObject();
 }
 
-// An array, and how many more there are.
+// An array, and the number of those that it does not show.
 template <typename T>
 void writeList(text::JsonWriter& json, std::string_view key, const std::vector<T>& things,
                void (*write)(text::JsonWriter&, const T&), std::size_t notShown) {

@@ -6,10 +6,10 @@
 
 namespace mayascene {
 
-// Null where the file is no scene.
+// Null where the file is not a scene.
 void writeHead(text::JsonWriter& json, const check::Head& head);
 
-// Bytes, and lines and columns of the first byte and after the last one.
+// The range in bytes; line and column of its first byte, and of the byte after its last one.
 void writeRange(text::JsonWriter& json, const diag::Range& range, const diag::LineAndColumn& begin,
                 const diag::LineAndColumn& end);
 

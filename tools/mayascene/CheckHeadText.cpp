@@ -16,10 +16,10 @@ namespace {
 
 constexpr std::size_t kNameColumn = 16;
 
-// Of longer lists these are shown; the document has more of them.
+// The most rows of a list that are shown. The JSON document has more of them.
 constexpr std::size_t kShownOfAKind = 8;
 constexpr std::size_t kShownLinks = 8;     // above one camera
-constexpr std::size_t kShownChannels = 9;  // of one camera and what is above it
+constexpr std::size_t kShownChannels = 9;  // of one camera and the transforms above it
 
 constexpr std::size_t kUnderScene = 2;  // spaces before a row
 constexpr std::size_t kUnderShape = 4;
@@ -63,7 +63,7 @@ class HeadPrinter {
   void locator(const check::ShapeHead& locator);
   void lookAt(const check::LookAtHead& lookAt);
 
-  // The first ones, then how many more there are. `notInList` are counted with them.
+  // The first rows, then how many more there are, with those that are not in the list.
   template <typename T, typename Show>
   void list(const std::vector<T>& things, std::size_t notInList, std::string_view name, Show show) {
     const std::size_t shown = all_ ? things.size() : std::min(things.size(), kShownOfAKind);
@@ -122,7 +122,7 @@ void HeadPrinter::stored(std::string_view name, const check::Given<double>& give
   row(name, fmt::format("{}{}{}", numberText(given.value), unit, said(given.where)), kUnderShape);
 }
 
-// The stored value, or of one that is driven the values that it takes.
+// The stored value; for a driven one, its values over the frames.
 void HeadPrinter::number(const check::CameraHead& camera, std::string_view channel, std::string_view name,
                          const check::Given<double>& given, std::string_view unit,
                          std::optional<check::Span> check::LensOverFrames::*span) {
@@ -168,7 +168,7 @@ void HeadPrinter::angle(const check::CameraHead& camera) {
   }
 }
 
-// Of a long chain, and of many driven channels, the lowest ones and a count.
+// The transforms above the camera and their driven channels. Of many, the lowest ones and a count.
 void HeadPrinter::chain(const check::CameraHead& camera) {
   std::size_t links = 0;
   std::size_t channels = 0;
@@ -200,7 +200,7 @@ void HeadPrinter::camera(const check::CameraHead& camera, const std::string& uni
     number(camera, "orthographicWidth", "orthographic", *camera.orthographicWidth,
            fmt::format(" {} across the picture", unit), &check::LensOverFrames::orthographicWidth);
   }
-  // The import takes some orthographic cameras for others, with their lens.
+  // The import takes some orthographic cameras for perspective ones; their lens then counts.
   if (!camera.orthographicWidth || camera.cameOver) lens(camera);
   chain(camera);
   std::string came = "no layer";

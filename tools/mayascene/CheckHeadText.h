@@ -8,8 +8,8 @@
 
 namespace mayascene {
 
-// A few lines, and an empty one; long lists are cut and counted unless all is asked for. What comes out of
-// the scene is made harmless.
+// A few lines, and an empty one. Long lists are cut and counted, unless `all`. Text from the scene is
+// escaped.
 void printHead(std::ostream& out, const CheckedScene& scene, bool all, const Style& style);
 
 }  // namespace mayascene

@@ -57,7 +57,7 @@ diag::Diagnostic diagnosticOf(const ChildEnd& end, const PoolLimits& limits) {
     default:
       break;
   }
-  // A child writes to nothing but its parent: for want of anything else the status means memory.
+  // A child writes only to its parent, so here the status means that the memory is exhausted.
   const bool noMemory =
       end.kind == ChildEnd::Kind::Exited && end.number == static_cast<int>(ExitStatus::CannotWrite);
   if (noMemory) return {.code = diag::Code::CheckOutOfMemory};

@@ -1,4 +1,4 @@
-// What came of the check of one scene, as the process that made it hands it to the one that shows it.
+// The result of the check of one scene, which a child process hands to its parent.
 #pragma once
 
 #include <ostream>
@@ -13,7 +13,8 @@ namespace mayascene {
 
 struct CheckResult {
   ExitStatus status = ExitStatus::Unreadable;
-  std::string totals;  // "2 errors, 1 warning, no notes"; empty of a file that cannot be read, as is the next
+  std::string
+      totals;  // "2 errors, 1 warning, no notes"; this and the report are empty for an unreadable file
   std::string report;  // for a person
   std::string json;    // the scene's object; empty where no JSON is asked for
 };
@@ -21,13 +22,13 @@ struct CheckResult {
 // Puts a checked scene into words.
 CheckResult resultOf(const CheckedScene& scene, const CheckArguments& arguments);
 
-// What a child writes on its standard output, and what its parent reads there. False where the bytes are not
-// one whole result; *result then says nothing.
+// A child writes the result to its standard output, and its parent reads it there. False where the bytes are
+// not one whole result; *result is then unspecified.
 void handOver(std::ostream& out, const CheckResult& result);
 bool handedOver(std::string_view bytes, CheckResult* result);
 
-// Of a child that handed no result over: a scene whose one diagnostic says why. The limits are those that the
-// child ran in.
+// For a child that handed over no result: a scene with one diagnostic, which names the reason. The limits are
+// those of the child.
 CheckedScene unfinishedCheck(const std::string& path, const ChildEnd& end, const PoolLimits& limits);
 
 }  // namespace mayascene

@@ -14,7 +14,7 @@ struct ReportShape {
 };
 
 // The head, the diagnostics in the form that compilers use, and a last line with totals. Nothing for a file
-// that could not be read. What comes out of the scene is made harmless.
+// that could not be read. Text from the scene is escaped.
 void printCheck(std::ostream& out, const CheckedScene& scene, const ReportShape& shape, const Style& style);
 
 // "2 errors, 1 warning, no notes"

@@ -38,7 +38,7 @@ struct Pipe {
   int takeReading() { return std::exchange(ends[0], -1); }
 };
 
-// What the child needs, made before it is there: between fork and exec nothing may take memory.
+// What the child needs, made before the fork: between fork and exec nothing may allocate memory.
 struct Preparation {
   std::vector<char*> words;
   int out = -1, err = -1, failure = -1;  // ends of pipes to write to
@@ -62,11 +62,11 @@ bool redirect(const Preparation& prepared) {
 }
 
 [[noreturn]] void runChild(const Preparation& prepared, const HeldSignals& held) {
-  // A signal must not find the parent's handler here: it would take the parent's files away.
+  // The parent's signal handler must not run here: it would remove the parent's files.
   held.defaultInChild();
   const bool ready =
       ::prctl(PR_SET_PDEATHSIG, SIGKILL) == 0 && redirect(prepared) && limitMemory(prepared.memory);
-  // Whose parent ended before it could be notified.
+  // The parent may have ended before the child asked for the signal.
   if (::getppid() != prepared.parent) ::_exit(kNotRun);
   if (ready) ::execv(prepared.words.front(), prepared.words.data());
   const int failure = errno;
@@ -145,7 +145,7 @@ void ChildProcess::kill() {
 
 std::optional<int> ChildProcess::ended() {
   if (status_) return status_;
-  // Once it is waited for, its number may be another process's: no handler may kill that.
+  // After the wait its number may belong to another process, which no handler may kill.
   const HeldSignals held;
   int status = 0;
   if (::waitpid(process_, &status, WNOHANG) == process_) {

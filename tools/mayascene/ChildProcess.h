@@ -20,10 +20,10 @@ class ChildProcess {
     std::string text;
   };
 
-  // Runs the program command[0], a path, with the words. It reads nothing, may take so many bytes of address
-  // space (0: as many as this process), and ends when this process does, however that ends. The three
-  // standard descriptors of this process are open. Null with an errno in *failure when there can be no child.
-  // Whether it can run the program is not waited for: that shows at its end.
+  // Runs the program command[0], a path, with the words. The child reads nothing, may take so many bytes of
+  // address space (0: as many as this process), and ends when this process ends, in whatever way. The three
+  // standard descriptors of this process must be open. Null with an errno in *failure when no child can be
+  // made. Does not wait until the program runs: notRun() reports a program that could not be run.
   static std::unique_ptr<ChildProcess> start(const std::vector<std::string>& command, std::uint64_t memory,
                                              int* failure);
 
@@ -38,7 +38,7 @@ class ChildProcess {
   // Takes what has come, at most some hundred kilobytes of each stream. Never waits.
   void read();
 
-  void kill();  // what cannot be refused; ended() still has to see the end
+  void kill();  // by SIGKILL; the end is then seen by ended()
 
   // How it ended, in the form of waitpid; nothing while it runs.
   std::optional<int> ended();

@@ -122,7 +122,7 @@ bool closeWithLoss(const SceneReport& report, bool quiet, const BakingCommand& c
   try {
     return say(report, command, diagnostics);
   } catch (const std::bad_alloc&) {
-    // The import is over and keeps its status: the line alone is missing.
+    // The import is over and keeps its status. Only this line is missing.
     return false;
   }
 }

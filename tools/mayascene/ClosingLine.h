@@ -20,21 +20,21 @@ struct BakingCommand {
   std::string after;
 };
 
-// Reads the scene again and says the first thing of it that the import did not bring, in one line, with the
-// command that brings it. Says nothing where all came over, where the scene is none, and where its file can
-// no longer be read. `quiet`: only after an import that stopped.
+// Reads the scene again and shows, in one line, the first thing that did not come over, with the command that
+// brings it over. Shows nothing where all came over, where the file is not a scene, and where it can no
+// longer be read. `quiet`: only after an import that stopped.
 //
-// False where something did not come over, and where the memory is too small to know.
+// False where something did not come over, and where the memory is exhausted.
 bool closeWithLoss(const SceneReport& report, bool quiet, const BakingCommand& command,
                    Diagnostics& diagnostics);
 
-// The first thing of the scene that the import of this result did not bring; none where all came over. The
-// collector is that of the reading of the scene.
+// The first thing of the scene that did not come over; none where all did. The collector is that with which
+// the scene was read.
 std::optional<bake::Loss> lossOf(const refhost::CallbackResult& result, const scene::Scene& scene,
                                  diag::Collector* collector);
 
-// A word of a command, as a shell takes it: what a terminal would act on, and bytes that are no text, are
-// escaped.
+// A word of a command, as a shell takes it. Signs that a terminal would act on, and bytes that are not text,
+// are escaped.
 std::string shellWord(std::string_view bytes);
 
 }  // namespace mayascene

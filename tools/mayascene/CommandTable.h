@@ -1,4 +1,4 @@
-// The verbs and options of the tool as plain rows: help, man pages and completions are made of them.
+// The verbs and options of the tool as plain rows. Help, man pages and completions are made from them.
 #pragma once
 
 #include <string>

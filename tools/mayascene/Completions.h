@@ -1,4 +1,4 @@
-// What shells propose when a command is half typed.
+// The completions that shells propose while a command is typed.
 #pragma once
 
 #include <string>

@@ -5,12 +5,12 @@
 namespace mayascene {
 namespace {
 
-// "error 2021 (FILE_OPEN): the file cannot be opened, or is no regular file"; after it ", line 7" where the
-// line of the scene is known.
+// "error 2024 (FILE_CLOSE): the file could not be closed", and ", line 7" where the line of the scene is
+// known.
 std::string describeFailure(const refhost::CallbackResult& result) {
   const std::string_view name = refhost::errorName(result.code);
   const std::string line = result.line == 0 ? "" : fmt::format(", line {}", result.line);
-  if (name.empty()) return fmt::format("error {}: a code of no known meaning{}", result.code, line);
+  if (name.empty()) return fmt::format("error {}: an unknown code{}", result.code, line);
   return fmt::format("error {} ({}): {}{}", result.code, name, refhost::errorSentence(result.code), line);
 }
 

@@ -1,4 +1,4 @@
-// What the tool has to say on standard error, one line each.
+// The lines that the tool writes to standard error.
 #pragma once
 
 #include <ostream>
@@ -34,9 +34,9 @@ class Diagnostics {
   // quiet, errors only.
   void show(std::string_view file, const diag::Diagnostic& diagnostic);
 
-  // What was wrong with a callback: the code that it returned, what the host refused, what it left behind.
-  // The file object that every import keeps is no news, and shown when verbose alone. Refused where the code
-  // is not 0 or the ledger is not clean.
+  // Shows what was wrong with a callback: the code that it returned, what the host refused, what it left
+  // behind. The file object that every import keeps is shown only when verbose. Refused where the code is not
+  // 0 or the ledger is not clean.
   ExitStatus judge(std::string_view subject, const refhost::CallbackResult& result);
 
   // The messages that the host showed, for runs that print no outline.

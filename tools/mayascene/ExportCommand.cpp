@@ -8,7 +8,7 @@
 #include <utility>
 #include <vector>
 
-#include "export/SafeNames.h"
+#include "text/Letters.h"
 #include "tools/mayascene/BakeOutputs.h"
 #include "tools/mayascene/BakeReportJson.h"
 #include "tools/mayascene/ClosingLine.h"
@@ -24,7 +24,7 @@ namespace fs = std::filesystem;
 
 constexpr int kShownPerCode = 3;
 
-// The first few of each code; of the rest how many there are.
+// The first few of each code, and the number of the rest.
 void show(const std::string& path, const diag::Collector& collector, Diagnostics& diagnostics) {
   std::map<diag::Code, int> shown;
   std::uint64_t left = collector.count();
@@ -47,7 +47,7 @@ class ExportRun {
   // The outputs that have their names already.
   void take(const std::vector<std::string>& places) {
     for (const std::string& place : places) {
-      taken_.outputs.insert(interchange::Lowered(fs::path(place).lexically_normal().string()));
+      taken_.outputs.insert(text::Lowered(fs::path(place).lexically_normal().string()));
     }
   }
 
@@ -67,7 +67,7 @@ class ExportRun {
     }
     status = worse(status, judgeScene(report, false, diagnostics_));
     const bool imported = report.outcome == Outcome::Imported;
-    // A composition without layers is made of a default camera alone.
+    // An import makes a composition without layers where a default camera is the only one.
     if (imported && !report.result.folder->compositions.front()->layers.empty()) {
       status = worse(status, writeImported(report, baked, place, session.host().linearUnits()));
     } else if (imported || report.outcome == Outcome::Nothing) {
@@ -76,7 +76,7 @@ class ExportRun {
     }
     status = worse(status, session.finish());
     if (baked != nullptr) return status;
-    // What did not come over counts as a warning does.
+    // Something that did not come over counts as a warning.
     const bool whole =
         closeWithLoss(report, arguments_.quiet && !arguments_.strict, bakingCommand(place), diagnostics_);
     return arguments_.strict && !whole ? worse(status, ExitStatus::Refused) : status;
@@ -133,14 +133,6 @@ class ExportRun {
   std::vector<BakedScene> bakes_;
 };
 
-ExitStatus writeReport(OutputFile* report, const std::vector<BakedScene>& bakes, Diagnostics& diagnostics) {
-  std::string failure;
-  writeBakeReport(report->stream(), bakes);
-  if (report->commit(&failure)) return ExitStatus::Done;
-  diagnostics.complain("", failure);
-  return ExitStatus::CannotWrite;
-}
-
 }  // namespace
 
 ExitStatus runExport(const ExportArguments& arguments, Diagnostics& diagnostics) {
@@ -171,7 +163,7 @@ ExitStatus runExport(const ExportArguments& arguments, Diagnostics& diagnostics)
     status = worse(status, one);
     if (one == ExitStatus::NoModule) return status;
   }
-  return report ? worse(status, writeReport(report.get(), run.bakes(), diagnostics)) : status;
+  return report ? worse(status, commitBakeReport(report.get(), run.bakes(), diagnostics)) : status;
 }
 
 }  // namespace mayascene

@@ -2,7 +2,7 @@
 
 #include <filesystem>
 
-#include "export/SafeNames.h"
+#include "text/Letters.h"
 
 namespace mayascene {
 
@@ -26,7 +26,7 @@ std::ostream* ExportFiles::Beside(std::string_view part, std::string_view suffix
   for (int number = 1;; ++number) {
     *name = stem + (number == 1 ? "" : '_' + std::to_string(number)) + std::string(suffix);
     place = folder / *name;
-    if (taken_->outputs.insert(interchange::Lowered(place.lexically_normal().string())).second) break;
+    if (taken_->outputs.insert(text::Lowered(place.lexically_normal().string())).second) break;
   }
   if (taken_->untouchable.contains(place.string())) {
     failure_ = place.string() + " is a scene or the report, and would be overwritten";

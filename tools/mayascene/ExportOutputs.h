@@ -14,8 +14,7 @@
 
 namespace mayascene {
 
-// What the files of a run keep off: scenes and a report are never written over, and no two outputs share a
-// file.
+// The files that an output of the run must not be: scenes, the report, and other outputs.
 struct TakenFiles {
   FileSet untouchable;
   std::set<std::string> outputs;  // without regard to case
@@ -29,7 +28,7 @@ class ExportFiles : public interchange::Files {
   std::ostream* Main() override;
   std::ostream* Beside(std::string_view part, std::string_view suffix, std::string* name) override;
 
-  // Puts all of them where they belong, the main one last. What is not committed leaves nothing.
+  // Puts all of them where they belong, the main one last. Outputs that are not committed leave no file.
   bool commit();
 
   const std::string& failure() const { return failure_; }  // why an output cannot be made or committed

@@ -30,7 +30,7 @@ double quotientOf(const HostRatio& ratio) {
   return static_cast<double>(ratio.numerator) / static_cast<double>(ratio.denominator);
 }
 
-// Whether all of so many values, of which there is one at least, are the same.
+// Whether all of the values are the same. `count` is at least 1.
 bool isOne(std::size_t count, const auto& value) {
   const double first = value(0);
   for (std::size_t i = 1; i < count; ++i) {
@@ -46,7 +46,7 @@ std::vector<double> listOf(std::size_t count, const auto& value) {
   return list;
 }
 
-// One composition on its way into a description.
+// Makes the description of one composition.
 class Describer {
  public:
   Describer(const refhost::Composition& inner, const LensExtrasByCamera& extras,
@@ -102,7 +102,7 @@ class Describer {
     }
   }
 
-  // A per cent is divided: a hundred of them come out as 1.
+  // Percents are divided, not multiplied, so that 100 becomes exactly 1.
   double converted(std::int32_t stream, std::size_t component, double value) const {
     return stream == HOST_STREAM_SCALE ? value / 100.0 : value * factor(stream, component);
   }
@@ -147,7 +147,7 @@ class Describer {
     return Channel(places, std::move(values));
   }
 
-  // Keys outside the frames that were chosen are not lost: nobody asked for them.
+  // Keys outside the chosen frames are not lost: the user left them out.
   void countBetween(const std::vector<double>& places) {
     const auto between = std::count_if(places.begin(), places.end(), [this](double place) {
       return place > 0.0 && place <= span_ && place != std::nearbyint(place);
@@ -175,7 +175,7 @@ class Describer {
     const auto extras = extras_.find(layer.name);
     if (extras == extras_.end()) return lens;
     lens.squeeze = extras->second.squeeze;
-    // Of a film whose size is not known an offset shifts nobody knows how much.
+    // Without a film size an offset has no known effect.
     if (layer.filmDirection != HOST_FILM_HORIZONTAL && layer.filmDirection != HOST_FILM_VERTICAL) return lens;
     lens.filmOffsetX = extras->second.filmOffsetX;
     lens.filmOffsetY = extras->second.filmOffsetY;

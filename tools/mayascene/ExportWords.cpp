@@ -8,7 +8,7 @@
 #include <vector>
 
 #include "export/Format.h"
-#include "export/SafeNames.h"
+#include "text/Letters.h"
 #include "tools/mayascene/HostWords.h"
 #include "tools/mayascene/OutputFile.h"
 
@@ -44,19 +44,21 @@ double scaleOf(const std::string& text) {
   return scale;
 }
 
-// An output whose end names something else than what is written to it. Folders are called as they like.
+// Refuses an output whose suffix names another format than the one that is written. Folders may have any
+// name.
 void checkEnding(const ExportArguments& arguments) {
   const std::string& output = arguments.output;
   std::error_code ignored;
   if (arguments.scenes.size() > 1 || std::filesystem::is_directory(output, ignored)) return;
-  const std::string lowered = interchange::Lowered(output);
+  const std::string lowered = text::Lowered(output);
   if (lowered.ends_with(".ma") || lowered.ends_with(".mb")) {
-    throw CLI::ValidationError("--output", output + " ends as a scene does, and an export is none");
+    throw CLI::ValidationError("--output",
+                               output + " has the suffix of a scene, and an export is not a scene");
   }
   const interchange::Format* const ending = interchange::FormatOfPath(output);
   if (ending == nullptr || arguments.format == nullptr || ending == arguments.format) return;
-  throw CLI::ValidationError("--format", output + " ends as " + std::string(ending->name) +
-                                             " does, and -f says " + std::string(arguments.format->name));
+  throw CLI::ValidationError("--format", output + " has the suffix of " + std::string(ending->name) +
+                                             ", and -f says " + std::string(arguments.format->name));
 }
 
 // The options of the command, as they are typed again; their values are words or numbers.
@@ -76,24 +78,24 @@ std::string wordsOf(const ExportWords& words, const ExportArguments& arguments) 
   return all;
 }
 
-// What a format does not take. Of no format: the output has no suffix that names one.
+// Refuses options that the format does not take, and an output without a format.
 void checkFormat(const ExportArguments& arguments) {
   const interchange::Format* format = arguments.format;
   if (format == nullptr) format = interchange::FormatOfPath(arguments.output);
   if (format == nullptr) {
     throw CLI::ValidationError("--format",
-                               arguments.output + " ends as none of the formats does; name one with -f");
+                               arguments.output + " has the suffix of no format; name a format with -f");
   }
   const std::string name(format->name);
   if (arguments.output == kStandardOutput && format->severalFiles) {
     throw CLI::ValidationError("--output",
-                               name + " is several files, and standard output takes one: take glb");
+                               name + " is several files, and standard output takes one: use glb");
   }
   if (format->ownAxes && arguments.axes == interchange::Axes::Host) {
-    throw CLI::ValidationError("--axes", name + " has axes of its own, which are those of the scene");
+    throw CLI::ValidationError("--axes", name + " always has the axes of the scene");
   }
   if (!format->listsKeys && arguments.keys) {
-    throw CLI::ValidationError("--keys", name + " has values at frames; a list of keys is for csv");
+    throw CLI::ValidationError("--keys", name + " cannot hold a list of keys; csv can");
   }
 }
 
@@ -127,7 +129,7 @@ void addExportOptions(CLI::App* verb, ExportWords* words, ExportArguments* argum
 void translateExportWords(const CLI::App& verb, const ExportWords& words, ExportArguments* arguments) {
   if (!words.bakes) {
     for (const std::string& given : givenBakeOptions(verb)) {
-      if (given != "--frames" && given != "--strict") throw CLI::ValidationError(given, "goes with --bake");
+      if (given != "--frames" && given != "--strict") throw CLI::ValidationError(given, "needs --bake");
     }
   }
   if (!words.format.empty()) arguments->format = interchange::FindFormat(words.format);

@@ -1,4 +1,4 @@
-// A set of files, by what their paths lead to.
+// A set of files, whatever paths lead to them.
 #pragma once
 
 #include <set>
@@ -9,8 +9,8 @@
 
 namespace mayascene {
 
-// The files need not be there: a file that is there counts under every path that leads to it, and any other
-// under its own path, from the root and with the links of its folders followed.
+// A file that exists is found under every path that leads to it. One that does not exist is found under its
+// whole path, with the links of its folders followed.
 class FileSet {
  public:
   void add(const std::string& path);

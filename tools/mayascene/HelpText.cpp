@@ -11,7 +11,7 @@ namespace {
 constexpr std::size_t kColumn = 36;
 constexpr std::size_t kWidth = 100;
 
-// A text in lines of at most kWidth, all but the first after `indent` blanks.
+// The text in lines of at most kWidth. All lines but the first begin with `indent` blanks.
 std::string wrapped(std::string_view text, std::size_t indent) {
   std::string lines;
   while (indent + text.size() > kWidth) {

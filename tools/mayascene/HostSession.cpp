@@ -12,7 +12,7 @@ namespace {
 
 constexpr const char* kModuleBesideTool = "../lib/MayaImport.so";
 
-// The tool finds the module from where it lies itself, so that a build can be moved and run from any folder.
+// The module is found relative to the tool, so that a build can be moved and run from any folder.
 std::filesystem::path moduleBesideTool() {
   std::error_code failed;
   const std::filesystem::path self = std::filesystem::read_symlink("/proc/self/exe", failed);

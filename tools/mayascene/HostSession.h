@@ -14,8 +14,8 @@ namespace mayascene {
 
 class HostSession {
  public:
-  // `own` is the callback that a rehearsal is for unless the user names another. The trace may be null; it
-  // and the diagnostics outlive the session.
+  // `own` is the callback of a rehearsal, unless the user names another. The trace may be null; it and the
+  // diagnostics outlive the session.
   HostSession(const HostArguments& arguments, refhost::Callback own, std::ostream* trace,
               Diagnostics& diagnostics);
 

@@ -20,7 +20,7 @@ void addPreferences(CLI::App* verb, std::string* file);
 // The linear units and the preference store.
 void addUnits(CLI::App* verb, HostArguments* host);
 
-// The units, and all else but the limits.
+// All options of the host except the limits.
 void addHostOptions(CLI::App* verb, HostArguments* host, HostWords* words);
 
 void addLimits(CLI::App* verb, HostArguments* host);

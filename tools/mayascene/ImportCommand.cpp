@@ -50,7 +50,7 @@ struct Outputs {
   }
 };
 
-// The scene is read once more for them, so only for who asked for JSON; a bake has read it already.
+// A plain import has to read the scene once more for them. A bake has read it already.
 std::optional<SceneNumbers> numbersOf(const SceneReport& report, const BakedScene* baked) {
   const refhost::Folder* const folder = report.result.folder;
   if (folder == nullptr || folder->compositions.empty()) return std::nullopt;
@@ -106,14 +106,14 @@ ExitStatus runImport(const ImportArguments& arguments, Diagnostics& diagnostics)
     status = worse(status, session.finish());
     run.deathHook = session.deathHook();
   }
-  if (!loaded) {  // what lay there stays
+  if (!loaded) {  // existing files stay
     outputs.json.reset();
     outputs.report.reset();
   }
   if (outputs.json) writeCompositionJson(outputs.json->stream(), run);
   if (outputs.report) writeBakeReport(outputs.report->stream(), run.bakes);
   status = worse(status, outputs.commit(diagnostics));
-  // Last, when what was asked for is there.
+  // Last, after all outputs are written.
   if (arguments.bake) return status;
   for (const SceneReport& scene : run.scenes) (void)closeWithLoss(scene, arguments.quiet, {}, diagnostics);
   return status;

@@ -11,7 +11,7 @@
 namespace mayascene {
 namespace {
 
-// Several codes are one kind of stop.
+// The kind of stop for a code. Several codes are one kind.
 check::Stop stopOf(const SceneLook& look, const refhost::CallbackResult& result) {
   const bool made = result.folder != nullptr && !result.folder->compositions.empty();
   // A file that is shorter than the header fails to be read.
@@ -36,7 +36,7 @@ check::Stop stopOf(const SceneLook& look, const refhost::CallbackResult& result)
 
 std::string sentenceOf(const refhost::CallbackResult& result) {
   std::string sentence(refhost::errorSentence(result.code));
-  if (sentence.empty()) sentence = "a code of no known meaning";
+  if (sentence.empty()) sentence = "an unknown code";
   for (const std::string& refusal : result.refusals) sentence += "; the host refused: " + refusal;
   return sentence;
 }

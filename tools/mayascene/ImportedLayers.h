@@ -1,4 +1,4 @@
-// What an import made, in the plain form that the rules of a check take.
+// The result of an import, in the plain form that the rules of a check take.
 #pragma once
 
 #include "check/CameOver.h"

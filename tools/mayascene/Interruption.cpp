@@ -18,7 +18,7 @@ namespace {
 
 constexpr std::array kSignals = {SIGINT, SIGTERM, SIGHUP, SIGPIPE};
 
-// As many as a process may usually have open: an export can have a file for each camera.
+// As many files as a process may usually have open: an export can have a file for each camera.
 std::array<std::atomic<const char*>, 1024> unfinished{};
 static_assert(std::atomic<const char*>::is_always_lock_free, "a signal handler reads them");
 
@@ -27,7 +27,7 @@ static_assert(std::atomic<pid_t>::is_always_lock_free, "a signal handler reads t
 
 std::streambuf* terminationLog = nullptr;
 
-// All first, so that they end at the same time.
+// Kills all before it waits for one, so that they end at the same time.
 void endChildren() noexcept {
   for (const std::atomic<pid_t>& slot : children) {
     if (slot.load() > 0) ::kill(slot.load(), SIGKILL);
@@ -78,7 +78,7 @@ void handleInterruptions() {
   for (const int signal : kSignals) sigaddset(&action.sa_mask, signal);
   for (const int signal : kSignals) {
     struct sigaction before {};
-    // A signal that was to be ignored (nohup) stays ignored.
+    // A signal that is ignored (nohup) stays ignored.
     if (::sigaction(signal, nullptr, &before) == 0 && before.sa_handler == SIG_IGN) continue;
     ::sigaction(signal, &action, nullptr);
   }

@@ -1,4 +1,4 @@
-// What becomes of half-written files and of child processes when the run is interrupted.
+// Removes unfinished files and ends child processes when the run is interrupted.
 #pragma once
 
 #include <signal.h>
@@ -9,9 +9,9 @@
 
 namespace mayascene {
 
-// From here on a run that a signal ends (SIGINT, SIGTERM, SIGHUP, SIGPIPE) ends its children, takes its
-// unfinished files away and ends with 128 and the signal's number; one that std::terminate ends says so
-// first.
+// From here on, a run that a signal ends (SIGINT, SIGTERM, SIGHUP, SIGPIPE) ends its children, removes its
+// unfinished files and ends with 128 and the signal's number. A run that std::terminate ends does the same,
+// says so on standard error, and aborts.
 void handleInterruptions();
 
 // Remembers a file that is not finished yet, or the folder of one. The name stays the caller's, unchanged,
@@ -27,8 +27,8 @@ class HeldSignals {
   HeldSignals(const HeldSignals&) = delete;
   HeldSignals& operator=(const HeldSignals&) = delete;
 
-  // In a child that was forked meanwhile: the signals do what they do by default, and no longer wait. Those
-  // that were to be ignored stay ignored.
+  // For a child that was forked meanwhile: the signals have their default effect, and no longer wait. Signals
+  // that are ignored stay ignored.
   void defaultInChild() const;
 
  private:
@@ -38,13 +38,13 @@ class HeldSignals {
 // As many children as can be remembered at a time.
 inline constexpr std::size_t kMostChildren = 256;
 
-// Remembers a child that is killed, and waited for, when the run is interrupted. Signals are held from before
-// it is there until it is remembered, and from before it is waited for until it is forgotten.
+// Remembers a child, which is killed and waited for when the run is interrupted. The caller holds the signals
+// from before the fork until the child is remembered, and from before the wait until it is forgotten.
 void rememberChild(pid_t child);
 void forgetChild(pid_t child);
 
-// The log that goes out to its end when std::terminate ends the run; it lives until another one, or null,
-// takes its place. A signal does not wait for it.
+// Flushes the log when std::terminate ends the run; a signal does not. The log lives until another one, or
+// null, replaces it.
 void flushWhenTerminated(std::streambuf* log);
 
 }  // namespace mayascene

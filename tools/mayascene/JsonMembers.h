@@ -1,4 +1,5 @@
-// What the reports in JSON have in common: members of an object, and how a report and a diagnostic begin.
+// The parts that all reports in JSON share: members of an object, the beginning of a report and of a
+// diagnostic.
 #pragma once
 
 #include <cstdint>

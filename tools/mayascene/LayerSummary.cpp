@@ -30,7 +30,7 @@ double focalLengthPerZoom(const Layer& camera) {
   return std::isfinite(factor) ? factor : 0.0;
 }
 
-// Tenths of a millimetre are what a person names a lens by.
+// People name lenses in tenths of a millimetre.
 std::string millimetresText(double value) { return numberText(std::round(value * 10.0) / 10.0); }
 
 std::string rangeText(double least, double most, std::string (*text)(double)) {
@@ -38,7 +38,7 @@ std::string rangeText(double least, double most, std::string (*text)(double)) {
   return first == last ? first : fmt::format("{} to {}", first, last);
 }
 
-// Where keys stand over the value, it is not seen.
+// Keys replace the static value.
 std::string lensText(const Layer& camera) {
   const Stream* const zoom = camera.findStream(HOST_STREAM_ZOOM);
   if (zoom == nullptr) return "";

@@ -1,4 +1,4 @@
-// A layer in one line: its lens, and what of it moves when.
+// A layer in one line: its lens, what moves, and over which frames.
 #pragma once
 
 #include <string>
@@ -7,8 +7,8 @@
 
 namespace mayascene {
 
-// Of a camera "lens 21 to 35 mm   zoom, position animated, frames 0 to 92"; "still" where nothing is
-// animated. Keys that all hold one value animate nothing. The layer belongs to a composition.
+// For a camera "lens 21 to 35 mm   zoom, position animated, frames 0 to 92"; "still" where nothing is
+// animated. Keys of one value do not count as animation. The layer belongs to a composition.
 std::string layerSummary(const refhost::Layer& layer);
 
 }  // namespace mayascene

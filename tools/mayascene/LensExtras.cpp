@@ -8,10 +8,10 @@
 namespace mayascene {
 namespace {
 
-// As long as a bake's report shows them.
+// The same length as in a bake's report.
 constexpr std::size_t kLongestPath = 1000;
 
-// None where something drives it, or where it is no number.
+// None where something drives it, or where it is not finite.
 std::optional<double> stillNumber(const scene::Scene& scene, scene::NodeId camera, const char* attribute,
                                   double otherwise) {
   if (scene.SourceOf(scene.PlugOf(camera, attribute))) return std::nullopt;

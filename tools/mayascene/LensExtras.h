@@ -1,4 +1,4 @@
-// What a scene says about its lenses beyond what a composition shows.
+// Values of a scene's lenses that a composition cannot hold.
 #pragma once
 
 #include <cstddef>
@@ -10,9 +10,9 @@
 
 namespace mayascene {
 
-// Only what stays at all times, and what is other than usual: no offset, a squeeze of 1.
+// Only values that stay at all times and differ from the defaults: no offset, a squeeze of 1.
 struct LensExtras {
-  std::optional<double> filmOffsetX;  // inches, to the right; both are there or none
+  std::optional<double> filmOffsetX;  // inches, to the right; both offsets are set, or none
   std::optional<double> filmOffsetY;  // inches, upwards
   std::optional<double> squeeze;
 };
@@ -20,7 +20,7 @@ struct LensExtras {
 // By names of cameras, or by their paths.
 using LensExtrasByCamera = std::map<std::string, LensExtras>;
 
-// Where two cameras have one name, nothing is known of either.
+// Adds a camera's extras. Where two cameras have the same name, both have none.
 void addLens(const std::string& camera, const LensExtras& extras, LensExtrasByCamera* all);
 
 // Of the cameras that an import or a bake may take.

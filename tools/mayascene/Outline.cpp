@@ -23,16 +23,17 @@ using refhost::Layer;
 using refhost::LayerKind;
 using refhost::Stream;
 
-constexpr std::size_t kStep = 2;          // blanks by which a child layer stands further in than its parent
-constexpr std::size_t kPropertyStep = 4;  // and a property than its layer
-constexpr std::size_t kDeepest = 24;      // from here on depth is a number: the page ends somewhere
+constexpr std::size_t kStep = 2;          // the indentation of a child layer under its parent
+constexpr std::size_t kPropertyStep = 4;  // that of a property under its layer
+constexpr std::size_t kDeepest =
+    24;  // deeper layers show their depth as a number, and are not indented further
 constexpr std::size_t kLabelWidth = 19;
 constexpr double kPointsPerInch = 72.0;
 constexpr double kMillimetresPerInch = 25.4;
 
 struct Row {
   std::string_view label;
-  std::string value;  // the static value; in parentheses where keys stand over it
+  std::string value;  // the static value; in parentheses where keys replace it
   std::string keys;
 };
 
@@ -106,8 +107,8 @@ void printLayer(std::ostream& out, const Layer& layer, std::size_t depth, Detail
   if (detail == Detail::Properties) printProperties(out, layer, indent, style);
 }
 
-// Parents before their children, and what stands on one level in the order in which it was made. Written
-// without recursion: a chain of parents can be longer than the stack is deep.
+// Parents before their children, and siblings in the order in which they were made. Without recursion: a
+// chain of parents can be longer than the stack is deep.
 void printLayers(std::ostream& out, const Composition& composition, Detail detail, const Style& style) {
   std::unordered_map<const Layer*, std::vector<const Layer*>> children;
   for (const Layer* layer : composition.layers) children[layer->parent].push_back(layer);

@@ -1,4 +1,4 @@
-// What an import made, for a person to read.
+// The result of an import, for a person to read.
 #pragma once
 
 #include <ostream>

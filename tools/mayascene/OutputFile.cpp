@@ -19,24 +19,24 @@
 namespace mayascene {
 namespace {
 
-constexpr mode_t kNewFileMode = 0666;  // less what the user's mask takes away
+constexpr mode_t kNewFileMode = 0666;  // reduced by the user's mask
 constexpr mode_t kPermissionBits = 07777;
-constexpr int kMostLinks = 40;  // that one name leads through; the system follows no more either
+constexpr int kMostLinks = 40;  // the most symbolic links in a row, as in the system
 
 std::string cannotWrite(const std::string& target, int number) {
   const std::string name = target == kStandardOutput ? "standard output" : target;
   return name + " cannot be written: " + std::strerror(number);
 }
 
-// A name in the same folder that nobody else uses.
+// A name in the same folder that is not in use.
 std::string nameBeside(const std::filesystem::path& place) {
   static int serial = 0;
   const std::string name = ".mayascene-" + std::to_string(::getpid()) + '-' + std::to_string(++serial);
   return (place.parent_path() / name).string();
 }
 
-// Where a file belongs: symbolic links are followed, so that they stay links; what the last one names need
-// not exist. Empty where they lead in a circle.
+// Where a file belongs. Symbolic links are followed, so that they stay links; the target of the last one need
+// not exist. Empty where they form a circle.
 std::filesystem::path placeOf(const std::string& target) {
   std::filesystem::path place = target;
   for (int links = 0; links < kMostLinks; ++links) {
@@ -89,8 +89,8 @@ struct OutputFile::State {
     return existing == nullptr || ::fchmod(opened, existing->st_mode & kPermissionBits) == 0;
   }
 
-  // Gives a file that lies at the place a second name. It keeps the first one where the file system has hard
-  // links, so that there is a whole file at any moment. What is no file stays: placing says what is wrong.
+  // Gives a file at the place a second name. It keeps the first one where the file system has hard links, so
+  // that there is a whole file at any moment. Anything but a regular file stays, and place() reports it.
   bool keep() {
     struct stat existing {};
     if (beside.empty() || ::lstat(place.c_str(), &existing) != 0 || !S_ISREG(existing.st_mode)) return true;
@@ -105,13 +105,13 @@ struct OutputFile::State {
     if (!kept.empty()) ::unlink(kept.c_str());
   }
 
-  // Makes it as it was before keep(). Where the file that was kept cannot take its place again it stays under
-  // its second name, which is reported.
+  // Restores the state before keep(). A kept file that cannot take its place again stays under its second
+  // name, which is reported.
   void putBack(std::string* failure) {
     if (kept.empty()) {
       if (beside.empty() && !place.empty()) ::unlink(place.c_str());
     } else if (std::rename(kept.c_str(), place.c_str()) == 0) {
-      // Of two names of one file rename takes neither away.
+      // rename keeps both names where they belong to the same file.
       ::unlink(kept.c_str());
     } else {
       *failure += "; what was in " + target + " is in " + kept;
@@ -120,8 +120,8 @@ struct OutputFile::State {
 
   std::string target;  // as the user named it
   std::string place;   // where the file belongs
-  std::string beside;  // where it is written until it is whole; empty: written as it is, or whole already
-  std::string kept;    // what lay at the place, until all outputs have theirs; empty: nothing did
+  std::string beside;  // where it is written until it is whole; empty: written in place, or already placed
+  std::string kept;    // the file that was at the place, until all outputs have theirs; empty: there was none
   int descriptor = -1;
   bool log = false;
   std::optional<DescriptorBuffer> buffer;

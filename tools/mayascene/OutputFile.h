@@ -1,5 +1,4 @@
-// Where one output of the tool goes: a file that appears under its name whole or not at all, a log, or
-// standard output.
+// One output of the tool: a file that appears under its name whole or not at all, a log, or standard output.
 #pragma once
 
 #include <memory>
@@ -15,17 +14,16 @@ inline constexpr const char* kStandardOutput = "-";
 class OutputFile {
  public:
   // Opens an output for writing. A regular file is written beside its place and takes the place on commit();
-  // until then what lay there stays. A device or a FIFO is written as it is. Null with a sentence in *failure
-  // when it cannot be written.
+  // until then an existing file stays. A device or a FIFO is written in place. Null with a sentence in
+  // *failure when it cannot be written.
   static std::unique_ptr<OutputFile> open(const std::string& target, std::string* failure);
 
-  // Opens an output that shows how a run went and is wanted most where the run is cut short: it is written
-  // under its own name from the start, over what lay there, and may end anywhere. What is written last goes
-  // out when the process is terminated, too. One at a time. Null with a sentence in *failure when it cannot
-  // be written.
+  // Opens a log, which is wanted most when a run is cut short: it is written under its own name from the
+  // start, over an existing file, and may end anywhere. It is flushed when std::terminate ends the process.
+  // One at a time. Null with a sentence in *failure when it cannot be written.
   static std::unique_ptr<OutputFile> openLog(const std::string& target, std::string* failure);
 
-  // What was not committed is taken away again; of a log, what went out stays.
+  // Removes an output that was not committed. A log stays.
   ~OutputFile();
   OutputFile(const OutputFile&) = delete;
   OutputFile& operator=(const OutputFile&) = delete;
@@ -37,8 +35,8 @@ class OutputFile {
   // when a write has failed or the file cannot take its place.
   bool commit(std::string* failure) { return finish(failure) && place(failure); }
 
-  // The same for several outputs, all or none: where one cannot take its place, those before it are taken
-  // away again and what lay there is back. Signals that end the run wait meanwhile.
+  // The same for several outputs, all or none: where one cannot take its place, those before it are removed
+  // and the files that were there are back. Signals that end the run wait meanwhile.
   static bool commitAll(const std::vector<OutputFile*>& outputs, std::string* failure);
 
  private:

@@ -7,7 +7,7 @@
 
 namespace mayascene {
 
-// Sets the preference if a value is given, and prints it and where it is kept. Showing writes nothing.
+// Sets the preference if a value is given. Prints it and where it is stored. Writes nothing without a value.
 ExitStatus runPrefs(const PrefsArguments& arguments, Diagnostics& diagnostics);
 
 }  // namespace mayascene

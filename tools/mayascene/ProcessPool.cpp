@@ -60,8 +60,8 @@ class Run {
   }
 
  private:
-  // The child whose result is handed out next runs, or has ended: children start in order. So it is no harm
-  // to start none while results wait for it.
+  // Children start in order, so the child whose result is handed out next runs or has ended. It does not need
+  // another child to start, so none has to start while too many results wait.
   void startMore() {
     while (next_ < count_ && running_.size() < limits_.jobs && waitingBytes_ <= limits_.waiting &&
            !outOfMeans_) {
@@ -89,7 +89,7 @@ class Run {
     return true;
   }
 
-  // Until a child has written something or has closed its streams, or it is time to look.
+  // Waits until a child has written something or has closed its streams, or until it is time to look.
   void wait() {
     std::vector<pollfd> polled;
     Seconds longest = kLook;
@@ -111,7 +111,7 @@ class Run {
 
   void look() {
     for (Running& one : running_) {
-      // What it wrote last can be read after its end.
+      // Its last output can be read after its end.
       const bool hasEnded = one.child->ended().has_value();
       one.child->read();
       if (hasEnded) {
@@ -149,7 +149,7 @@ class Run {
       end.kind = ChildEnd::Kind::NotStarted;
       end.number = failure;
     }
-    // It may have come to its end just before it was killed: then that counts.
+    // A child that ended just before the kill keeps its own end.
     if (one->killedAs && WIFSIGNALED(status)) end.kind = *one->killedAs;
     end.out = std::move(one->child->out().text);
     end.err = std::move(one->child->err().text);
@@ -163,7 +163,7 @@ class Run {
     keep(one->number, std::move(end));
   }
 
-  // A process that the child started may outlive it and hold the streams open: what is there counts, no more.
+  // Takes what can be read now. A process that the child started may outlive it and hold the streams open.
   void readToEnd(ChildProcess* child) const {
     for (std::size_t before = ~std::size_t{0}; !tooMuch(*child);) {
       const std::size_t size = child->out().text.size() + child->err().text.size();
@@ -198,8 +198,7 @@ class Run {
 }  // namespace
 
 void ProcessPool::run(std::size_t count, const Command& command, const Take& take, const Watch& watch) {
-  // Where the ends of children are ignored, as what started this process may have asked, there is nothing to
-  // wait for.
+  // The process may have been started with SIGCHLD ignored. No child could then be waited for.
   ::signal(SIGCHLD, SIG_DFL);
   Run(limits_, count, command, take, watch).all();
 }

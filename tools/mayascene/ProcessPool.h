@@ -15,12 +15,12 @@ struct PoolLimits {
   std::chrono::duration<double> timeout{60.0};  // for each child
   std::uint64_t memory = 0;                     // bytes of address space for each child; 0: no limit
   std::size_t output = std::size_t{64} << 20;   // bytes of each of a child's two streams
-  // Bytes of results that wait for an earlier one: beyond these, no further child is started. A pool never
-  // holds more than these and the outputs of the children that run.
+  // Bytes of results that wait for an earlier one. Beyond these no further child is started. A pool never
+  // holds more than these and the outputs of the running children.
   std::size_t waiting = std::size_t{256} << 20;
 };
 
-// How a child ended. What it wrote until then is there in any case.
+// How a child ended, and what it wrote until then.
 struct ChildEnd {
   enum class Kind {
     Exited,         // number: its exit status
@@ -37,7 +37,7 @@ struct ChildEnd {
 
 struct PoolState {
   std::size_t ended = 0;   // all that have a result, handed out or not
-  std::size_t failed = 0;  // of these, the ones that are no exit with status 0
+  std::size_t failed = 0;  // of these, the ones that did not exit with status 0
   std::size_t running = 0;
 };
 
@@ -52,12 +52,12 @@ class ProcessPool {
 
   explicit ProcessPool(const PoolLimits& limits) : limits_(limits) {}
 
-  // Runs `count` children and comes back when each has a result. No end of a child keeps the others from
-  // running. One that cannot be started for want of means is tried again when another one has ended; it is
-  // NotStarted only when none is left to wait for. An exception from one of the functions ends all children.
+  // Runs `count` children and returns when each has a result. However a child ends, the others run. A child
+  // that cannot be started for lack of resources is tried again when another one has ended; it is NotStarted
+  // only when no other child runs. An exception from one of the functions ends all children.
   //
-  // Time counts while the pool looks at its children: not while the process is stopped, nor while a function
-  // waits for a reader.
+  // Timeouts count only the time in which the pool waits for its children: not the time in which the process
+  // is stopped, or in which one of the functions runs.
   void run(std::size_t count, const Command& command, const Take& take, const Watch& watch);
 
  private:

@@ -1,4 +1,4 @@
-// How far a long run is, on one line of a terminal.
+// The progress of a long run, on one line of a terminal.
 #pragma once
 
 #include <chrono>
@@ -22,7 +22,7 @@ std::string progressText(const ProgressState& state, std::size_t width);
 // "59 s", "2 min 5 s", "3 h 20 min"
 std::string durationText(std::chrono::duration<double> duration);
 
-// The line is drawn over itself. Whatever else goes to the terminal goes there while the line is taken away.
+// The line is drawn over itself. Clear it before anything else is written to the terminal.
 class Progress {
  public:
   // The stream goes to a terminal of so many columns, and outlives the object.
@@ -37,10 +37,10 @@ class Progress {
  private:
   std::ostream& terminal_;
   std::size_t width_;
-  std::string drawn_;  // what is on the terminal now
+  std::string drawn_;  // the line that is on the terminal now
 };
 
-// The columns of a terminal that can draw a line over itself; 0: the descriptor leads to none.
+// The columns of a terminal that can draw a line over itself; 0 where the descriptor is not such a terminal.
 std::size_t terminalWidth(int descriptor);
 
 }  // namespace mayascene

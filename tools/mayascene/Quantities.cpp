@@ -13,8 +13,8 @@ namespace mayascene {
 namespace {
 
 constexpr int kDecimals = 3;
-constexpr double kSmallestFixed = 0.0005;  // what three decimals would show as 0
-constexpr double kNoise = 1e-9;            // below this a value is what rounding left of 0
+constexpr double kSmallestFixed = 0.0005;  // three decimals would show smaller values as 0
+constexpr double kNoise = 1e-9;            // smaller values are 0 with rounding errors
 constexpr double kLargestFixed = 1e15;
 constexpr int kGeneralDigits = 6;
 
@@ -55,7 +55,7 @@ std::string secondsSpan(const T_Time& first, const T_Time& last) {
   return fmt::format("{} to {}", secondsText(first), secondsText(last));
 }
 
-// Whether the keys, of which there are several, hold one value but for rounding noise.
+// Whether there are several keys, and all have the same value but for rounding noise.
 bool isConstant(const refhost::Stream& stream) {
   const std::vector<double>& values = stream.keys->values;
   const auto dimension = static_cast<std::size_t>(stream.dimension);

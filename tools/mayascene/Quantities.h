@@ -9,8 +9,8 @@
 
 namespace mayascene {
 
-// At most three decimals, no trailing zeros: "2057.386", "-12.5", "0". What is smaller and not just rounding
-// noise keeps three digits: "0.00012".
+// At most three decimals, no trailing zeros: "2057.386", "-12.5", "0". A smaller value that is more than
+// rounding noise keeps three digits: "0.00012".
 std::string numberText(double value);
 
 // "1 key", "12 keys"

@@ -1,4 +1,4 @@
-// What came of a run, as the outline and the JSON show it.
+// The results of a run, as the outline and the JSON show them.
 #pragma once
 
 #include <cstdint>
@@ -16,16 +16,16 @@ namespace mayascene {
 enum class Outcome {
   Imported,    // a composition was made
   Nothing,     // a Maya ASCII scene without a camera: nothing was made, and nothing is wrong
-  Refused,     // no Maya ASCII scene: the importer made nothing and returned no code
+  Refused,     // not a Maya ASCII scene: the importer made nothing and returned no code
   Failed,      // the importer returned a code; what was made before stays
-  Unreadable,  // the file cannot be opened, or is no regular file; the importer was not called
+  Unreadable,  // the file cannot be opened, or is not a regular file; the importer was not called
 };
 
 struct SceneReport {
   std::string path;  // as the user named it; bytes
   Outcome outcome = Outcome::Unreadable;
   ExitStatus status = ExitStatus::Unreadable;
-  bool explained = false;               // why nothing was imported was said already
+  bool explained = false;               // the reason why nothing was imported is already shown
   refhost::CallbackResult result;       // its folder lives as long as the host
   std::optional<SceneNumbers> numbers;  // where JSON was asked for and the scene could be read
 };

@@ -59,7 +59,7 @@ BakedScene bakeScene(const std::string& path, const BakeArguments& arguments, Di
     return baked;
   }
   if (!beginsAsScene(text->text())) {
-    diagnostics.complain(path, "refused: it is no Maya ASCII scene");
+    diagnostics.complain(path, "refused: it is not a Maya ASCII scene");
     baked.status = ExitStatus::Refused;
     return baked;
   }

@@ -1,4 +1,4 @@
-// One scene's bake: read, evaluated, written, and what is said about it.
+// The bake of one scene: reads, evaluates, writes, and shows the result.
 #pragma once
 
 #include <cstdint>
@@ -15,7 +15,7 @@
 
 namespace mayascene {
 
-// What came of one scene, for the report.
+// The result of one scene, for the report.
 struct BakedScene {
   std::string path;    // as the user named it; bytes
   std::string output;  // the bake's, empty where there is none
@@ -29,17 +29,17 @@ struct BakedScene {
   std::uint64_t notes = 0;
 };
 
-// Reads the scene and writes its bake. A file that cannot be read, or that is no Maya ASCII scene, is said at
-// once, and nothing is written: Unreadable, Refused. Else Done, or Refused where something that was asked for
-// could not be written, and where there are warnings and they count.
+// Reads the scene and writes its bake. A file that cannot be read (Unreadable), or that is not a Maya ASCII
+// scene (Refused), is reported at once, and nothing is written. Else Done, or Refused where something that
+// was asked for could not be written, and where there are warnings and --strict counts them.
 BakedScene bakeScene(const std::string& path, const BakeArguments& arguments, Diagnostics& diagnostics,
                      std::ostream& out);
 
-// Whether the bake holds what was asked for: it has frames, and one of the cameras where some are named.
+// Whether the bake has frames and, where cameras are named, one of them.
 bool isWorthKeeping(const BakedScene& scene, const bake::Options& options);
 
-// On standard error: a line a camera, errors and warnings, and how many notes there are. `report` is the file
-// that holds them all, empty where there is none.
+// Writes to standard error: a line for each camera, errors and warnings, and the number of notes. `report` is
+// the file that holds them all, empty where there is none.
 void showBake(const BakedScene& scene, const std::string& report, Diagnostics& diagnostics);
 
 }  // namespace mayascene

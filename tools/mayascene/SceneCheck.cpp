@@ -18,7 +18,7 @@ bool leftSomething(const refhost::CallbackResult& result, const std::string& pat
   return !result.ledgerClean();
 }
 
-// Not valid where no thread can be had for it, and where the text begins as no scene does.
+// Not valid where no thread is available, and where the text does not begin as a scene.
 std::future<check::Reading> readingOf(std::string_view text, const CheckArguments& arguments) {
   if (!arguments.twoThreads || !beginsAsScene(text)) return {};
   try {
@@ -35,7 +35,7 @@ CheckedScene checkScene(const std::string& path, const CheckArguments& arguments
                         Diagnostics& diagnostics) {
   CheckedScene checked;
   checked.path = path;
-  // The process is the scene's own.
+  // Mapped, because this process works for this file alone.
   const auto text = SceneText::map(path, &checked.failure);
   if (text == nullptr) {
     diagnostics.complain(path, checked.failure);

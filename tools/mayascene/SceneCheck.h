@@ -1,4 +1,4 @@
-// One scene's check: imported, read, explained.
+// The check of one scene: imports it, reads it, and explains the result.
 #pragma once
 
 #include <string>
@@ -16,10 +16,10 @@ struct CheckedScene {
   ExitStatus status = ExitStatus::Unreadable;
   std::string failure;      // why the file cannot be read; empty: it could
   check::Report report;     // of a file that could be read
-  bool unfinished = false;  // the check did not come to its end: the report has no head, and says why
+  bool unfinished = false;  // the check was cut short: the report has no head, and says why
 };
 
-// Imports the scene and reports what became of it. Complains of a file that cannot be read, and of what the
+// Imports the scene and reports what came over. Complains of a file that cannot be read, and of what the
 // import left behind.
 CheckedScene checkScene(const std::string& path, const CheckArguments& arguments, HostSession& session,
                         Diagnostics& diagnostics);

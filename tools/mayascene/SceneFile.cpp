@@ -30,7 +30,7 @@ class Descriptor {
   int value_;
 };
 
-// A read that fails counts as another header: the importer reads for itself and says what is wrong.
+// False where the read fails: the importer reads the file itself and reports the failure.
 bool hasMayaHeader(int descriptor) {
   std::array<char, kHeader.size()> head{};
   std::size_t filled = 0;
@@ -62,11 +62,11 @@ SceneLook lookAtScene(const std::filesystem::path& path) {
   }
   struct stat status {};
   if (::fstat(file.value(), &status) != 0) {
-    look.failure = std::string("cannot be looked at: ") + std::strerror(errno);
+    look.failure = std::string("cannot be examined: ") + std::strerror(errno);
     return look;
   }
   if (!S_ISREG(status.st_mode)) {
-    look.failure = S_ISDIR(status.st_mode) ? "is a directory, not a file" : "is no regular file";
+    look.failure = S_ISDIR(status.st_mode) ? "is a directory, not a file" : "is not a regular file";
     return look;
   }
   look.readable = true;

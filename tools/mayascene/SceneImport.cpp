@@ -8,16 +8,17 @@
 namespace mayascene {
 namespace {
 
-// The importer answers a file that is no Maya ASCII scene with a message and code 0, having made nothing. Two
-// signs distinguish it from a scene without cameras, of which nothing is made either: the file does not begin
-// as one, or the host showed a message (a file that changed, or could not be read, after the look).
+// For a file that is not a Maya ASCII scene the importer shows a message, makes nothing and returns 0. It
+// makes nothing of a scene without cameras either. Two signs distinguish them: the file does not begin as a
+// scene, or the host showed a message (the file changed, or could not be read, after the look).
 Outcome outcomeOf(const SceneLook& look, const refhost::CallbackResult& result) {
   if (result.code != 0) return Outcome::Failed;
   if (result.folder != nullptr && !result.folder->compositions.empty()) return Outcome::Imported;
   return look.mayaHeader && result.messages.empty() ? Outcome::Nothing : Outcome::Refused;
 }
 
-// The host knows the bake's path alone; what it says is shown with the scene's. Both have one file name.
+// Replaces the bake's path by the scene's in texts of the host, which knows only the bake. Both have the same
+// file name.
 void nameScene(const std::filesystem::path& bake, const std::string& scene, refhost::CallbackResult* result) {
   const std::string bakeFolder = bake.parent_path().string() + '/';
   const std::string sceneFolder = scene.substr(0, scene.rfind('/') + 1);
@@ -52,7 +53,7 @@ SceneReport importBaked(const std::string& path, const BakeArguments& arguments,
   SceneReport report;
   report.path = path;
   baked->path = path;
-  // A path that leads to no file need not have a name that a bake could have.
+  // Comes first: a path that leads to no file may have no name that a bake could take.
   const SceneLook look = lookAtScene(path);
   if (!look.readable) {
     diagnostics.complain(path, look.failure);
@@ -86,7 +87,7 @@ ExitStatus judgeScene(const SceneReport& report, bool outlinePrinted, Diagnostic
   if (!outlinePrinted) diagnostics.messages(report.path, report.result);
   const ExitStatus status = diagnostics.judge(report.path, report.result);
   if (report.outcome != Outcome::Refused) return status;
-  diagnostics.complain(report.path, "refused: it is no Maya ASCII scene");
+  diagnostics.complain(report.path, "refused: it is not a Maya ASCII scene");
   return ExitStatus::Refused;
 }
 

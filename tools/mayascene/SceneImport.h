@@ -1,4 +1,4 @@
-// One scene's import, as it is or by way of a bake.
+// The import of one scene, as it is or through a bake.
 #pragma once
 
 #include <string>
@@ -10,14 +10,14 @@
 
 namespace mayascene {
 
-// A file that cannot be opened is said at once.
+// Reports a file that cannot be opened at once.
 SceneReport importOne(const std::string& path, HostSession& session, Diagnostics& diagnostics);
 
-// Bakes the scene and imports the bake; what is said names the scene.
+// Bakes the scene and imports the bake. Messages name the scene.
 SceneReport importBaked(const std::string& path, const BakeArguments& arguments, HostSession& session,
                         Diagnostics& diagnostics, BakedScene* baked);
 
-// What goes to standard error about one scene, and its status.
+// Writes the messages about one scene to standard error, and returns its status.
 ExitStatus judgeScene(const SceneReport& report, bool outlinePrinted, Diagnostics& diagnostics);
 
 }  // namespace mayascene

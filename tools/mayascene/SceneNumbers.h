@@ -16,18 +16,18 @@ struct SceneNumbers {
   std::optional<double> firstFrame;
   std::optional<double> lastFrame;
   LensExtrasByCamera lenses{};  // by the names of the layers
-  std::string linearUnit;       // "cm", "meter", …: as the scene says it, "cm" where it says none
+  std::string linearUnit;       // "cm", "meter", …: as linearUnitOf
 };
 
-// A known unit of length; "cm" where the scene says none, or one that is not known.
+// The scene's word for its unit of length; "cm" where it sets none, or one that is not known.
 std::string linearUnitOf(const scene::Scene& scene);
 
 // The smallest first key among what an import takes of the scene: its cameras, its marked locators, and the
 // transforms above them. None where none of them has keys; 0 where the scene's time counts no frames.
 std::optional<double> firstKeyOf(const scene::Scene& scene);
 
-// Of a plain import. None where the file can no longer be read, or the memory does not hold the scene beside
-// the project.
+// Of a plain import. None where the file can no longer be read, or where the memory is too small for the
+// scene and the project.
 std::optional<SceneNumbers> numbersOf(const std::string& path, const refhost::Composition& composition);
 
 // Of an import of the bake.

@@ -91,7 +91,7 @@ class Search {
   void open(const std::string& folder) {
     std::vector<std::string> names;
     if (!readNames(folder, &names)) found_->unread.push_back({folder, sentence(errno)});
-    // The first name comes last: it is taken from the top.
+    // The first name is pushed last, because the last one is taken first.
     for (auto name = names.rbegin(); name != names.rend(); ++name) {
       waiting_.push_back(joined(folder, *name));
     }
@@ -104,7 +104,8 @@ class Search {
   FoundScenes* found_;
   std::vector<std::string> waiting_;
   std::set<std::pair<dev_t, ino_t>> searched_;
-  bool searchedBefore_ = false;  // whether something of the argument had been searched for another one
+  bool searchedBefore_ =
+      false;  // whether a folder of this argument was already searched for another argument
 };
 
 }  // namespace

@@ -1,4 +1,4 @@
-// The scenes that are meant where folders are given, too.
+// Finds the scenes that the arguments name, in folders too.
 #pragma once
 
 #include <string>
@@ -22,8 +22,8 @@ struct FoundScenes {
 // or not. Every other argument is a scene as it stands, whatever its name, and whether it exists or not.
 //
 // The order is that of the arguments; in a folder that of the names, byte by byte. Names that begin with "."
-// are passed over. Links are followed, and each folder is searched once, where it is met first: a circle of
-// links ends. A folder that cannot be read costs its own scenes alone.
+// are passed over. Links are followed, and each folder is searched once, where it is met first, so circles of
+// links end. Where a folder cannot be read, only its own scenes are missing.
 FoundScenes findScenes(const std::vector<std::string>& arguments);
 
 }  // namespace mayascene

@@ -12,13 +12,13 @@ namespace mayascene {
 // A regular file in memory.
 class SceneText {
  public:
-  // Reads the file. One that another program cuts off meanwhile is shorter, and nothing worse. Null with a
-  // sentence in *failure when it cannot be read.
+  // Reads the file. If another program shortens it meanwhile, the text is shorter. Null with a sentence in
+  // *failure when it cannot be read.
   static std::unique_ptr<SceneText> open(const std::filesystem::path& path, std::string* failure);
 
-  // Maps the file, which takes neither the time to copy it nor the memory. One that another program cuts off
-  // meanwhile ends the process with SIGBUS: for a process that works for this file alone, and that another
-  // one watches. Else as open().
+  // Maps the file, which saves the time and the memory of a copy. If another program shortens it meanwhile,
+  // SIGBUS ends the process: only for a process that works for this file alone, under a parent that watches
+  // it. Else as open().
   static std::unique_ptr<SceneText> map(const std::filesystem::path& path, std::string* failure);
 
   ~SceneText();

@@ -1,4 +1,4 @@
-// What the streams of a layer are called, in the outline and in the JSON document.
+// The names of a layer's streams, in the outline and in the JSON document.
 #pragma once
 
 #include <cstdint>
@@ -18,7 +18,7 @@ struct StreamWords {
   std::string_view unit;         // in the document
 };
 
-// In the order in which a person asks for them.
+// In the order of the outline.
 inline constexpr StreamWords kStreamWords[] = {
     {HOST_STREAM_ZOOM, "zoom", "zoom", " px", "zoom", "zoom", "pixels"},
     {HOST_STREAM_POSITION, "position", "position", " pt", "position", "position", "points"},

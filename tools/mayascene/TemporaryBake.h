@@ -1,4 +1,4 @@
-// A bake that lives as long as an import needs it.
+// A bake that exists only for an import.
 #pragma once
 
 #include <memory>
@@ -7,8 +7,8 @@
 
 namespace mayascene {
 
-// A file of its own in a folder that only this user can enter. Both are taken away again at the end, and when
-// a signal ends the run.
+// A file in a folder of its own that only this user can enter. Both are removed at the end, and when a signal
+// ends the run.
 class TemporaryBake {
  public:
   // Opens the file `name`, which has no folder. Null with a sentence in *failure when it cannot be made.

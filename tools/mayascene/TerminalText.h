@@ -1,4 +1,4 @@
-// Text from strangers, made harmless for a terminal; and the tool's own modest colours.
+// Untrusted text, escaped for a terminal; and the tool's own colours.
 #pragma once
 
 #include <string>
@@ -6,9 +6,9 @@
 
 namespace mayascene {
 
-// For one line of a terminal: what would move the cursor, change colours, break the line or turn the writing
-// direction is escaped (\n, \t, \x1b, \u202e); each byte that is not part of valid UTF-8 becomes U+FFFD.
-// Everything else is as it was.
+// For one line of a terminal. Characters that would move the cursor, change colours, break the line or turn
+// the writing direction are escaped (\n, \t, \x1b, \u202e); each byte that is not part of valid UTF-8 becomes
+// U+FFFD. Everything else stays.
 std::string terminalText(std::string_view bytes);
 
 // The same between double quotes, so that an empty name and blanks at the ends can be seen.

@@ -1,5 +1,5 @@
-// command-pages FOLDER: writes the manual pages and the completions of the tool into the folder, as they lie
-// in a "share" folder once installed.
+// command-pages FOLDER: writes the manual pages and the completions of the tool into the folder, with the
+// layout of an installed "share" folder.
 #include <exception>
 #include <filesystem>
 #include <fstream>

@@ -45,13 +45,12 @@ ExitStatus run(int argc, const char* const* argv) {
   return arguments.over;
 }
 
-// A standard stream that is closed leaves its number to the first file that the run opens, and that file
-// would then take the stream's text in. Its place is held read-only, so that writing to the stream still
-// fails.
+// A closed standard stream leaves its number to the first file that the run opens, and text for the stream
+// would go into that file. So the number is taken, read-only: writing to the stream still fails.
 void holdStandardDescriptors() {
   for (const int descriptor : {STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO}) {
     const bool closed = ::fcntl(descriptor, F_GETFD) < 0 && errno == EBADF;
-    // The lowest free number is this one: those below it are held already.
+    // The lowest free number is this one: those below it are taken.
     if (closed && ::open("/dev/null", O_RDONLY) < 0) return;
   }
 }

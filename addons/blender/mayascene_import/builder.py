@@ -1,8 +1,8 @@
-"""Objects of a picture: made anew, or found again and updated.
+"""Makes the objects of a picture, or finds and updates them.
 
 Maya's Y is up, Blender's Z. One root empty turns by a right angle about X;
 all layers stand under it with the channels that they have in the scene. The
-root's place is the user's: it is set when the root is made, and never again.
+root's place belongs to the user: it is set only when the root is made.
 """
 
 import math
@@ -95,7 +95,7 @@ class Builder:
         return item
 
     def _reach(self):
-        """How far from its parent a layer gets, in Blender's units."""
+        """The largest distance from layer to parent, in Blender's units."""
         return self.factor * max(
             math.hypot(*value) for layer in self.picture.layers
             for value in layer.streams["position"].values)

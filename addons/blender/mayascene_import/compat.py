@@ -1,7 +1,7 @@
 """What differs between versions of Blender.
 
 Made for 3.4 and tested there. Since 4.4 an action holds its curves in
-slots, layers and strips, and 5.0 has no other way to them.
+slots, layers and strips, and from 5.0 on only there.
 """
 
 import bpy

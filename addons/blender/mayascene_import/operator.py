@@ -15,7 +15,7 @@ _KINDS = {"error": 'ERROR', "warning": 'WARNING', "note": 'INFO'}
 
 _OUTCOMES = {
     "nothing": "the scene has no cameras to import",
-    "refused": "this is no Maya ASCII scene",
+    "refused": "this is not a Maya ASCII scene",
     "failed": "the import failed",
     "unreadable": "the file cannot be read",
 }
@@ -110,8 +110,8 @@ class ImportMayaScene(bpy.types.Operator, ImportHelper):
                               f"{builder.updated} updated")
 
     def _say(self, remarks):
-        """A report ends where an error is: those of a scene that did come
-        over are warnings."""
+        """An error would end the import, so the errors of a scene that came
+        over are shown as warnings."""
         for kind, text in remarks[:_SHOWN]:
             level = 'WARNING' if kind == "error" else _KINDS.get(kind, 'INFO')
             self.report({level}, text)

@@ -1,4 +1,4 @@
-"""What Blender animates, of a layer: tracks of location, rotation, scale.
+"""The tracks of a layer for Blender: location, rotation, scale.
 
 A point (x, y, z) of the composition is (x, -y, -z) in the scene's axes. A
 rotation about X keeps its sign, one about Y or Z changes it.
@@ -13,8 +13,8 @@ from . import matrices
 # one value.
 Track = namedtuple("Track", "path index frames values")
 
-# How far the axes of a camera may differ from those of a rotation before it
-# is shown by its place in the world.
+# How far the axes of a camera may differ from those of a rotation. Beyond it
+# the camera is shown by its place in the world.
 _STRAIGHT = 1e-6
 
 
@@ -41,7 +41,7 @@ def _own_rotation(layer, frame):
 
 
 def rotation_at(layer, frame):
-    """The rotation under the parent, with the look at the interest."""
+    """The rotation under the parent, with that towards the interest."""
     own = _own_rotation(layer, frame)
     if not layer.aimed:
         return own

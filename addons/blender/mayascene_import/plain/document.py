@@ -14,7 +14,7 @@ MILLIMETRES_PER_POINT = 25.4 / 72.0
 
 
 class NotAComposition(ValueError):
-    """The text is no composition, or one of another version."""
+    """The text is not a composition, or one of another version."""
 
 
 class Stream:
@@ -64,7 +64,7 @@ class Layer:
 
 
 class Picture:
-    """A composition that holds cameras and nulls, as it is to be shown.
+    """A composition that holds cameras and nulls, with its picture size.
 
     Of two nested compositions the layers are those of the inner one, which
     has square pixels; size and pixel aspect are those of the outer one.
@@ -183,8 +183,8 @@ def _scene(scene):
 
 
 def reasons(complaints, remarks):
-    """Why a scene does not come over: what the document says, and errors
-    that say something else."""
+    """Why a scene does not come over: the complaints of the document, and
+    errors that are not among them."""
     said = [text for kind, text in remarks if kind == "error"
             and not any(complaint in text for complaint in complaints)]
     return complaints + said
@@ -193,7 +193,7 @@ def reasons(complaints, remarks):
 def read(document):
     """The scenes of a document that json.loads() gave."""
     if not isinstance(document, dict) or document.get("format") != FORMAT:
-        raise NotAComposition(f"this is no {FORMAT}")
+        raise NotAComposition(f"this is not a {FORMAT}")
     if document.get("version") != VERSION:
         raise NotAComposition(
             f"this is {FORMAT} of version {document.get('version')}; "

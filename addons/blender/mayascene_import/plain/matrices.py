@@ -28,7 +28,7 @@ def cross(a, b):
 
 
 def unit(vector):
-    """The direction of a vector, or None of one without length."""
+    """The direction of a vector; None where its length is 0 or infinite."""
     length = math.hypot(*vector)
     if not length > 0.0 or math.isinf(length):
         return None
@@ -61,8 +61,8 @@ def towards(direction):
 def upright(matrix):
     """The rotation that a camera has under a matrix.
 
-    Its X axis keeps its direction, Y what of it is square to X, and Z is
-    square to both. None where that has no answer.
+    X keeps its direction, Y keeps its plane with X, and Z is square to
+    both. None where X or Y has no direction.
     """
     x, y, _ = zip(*matrix)
     x = unit(x)

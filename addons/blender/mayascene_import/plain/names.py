@@ -1,4 +1,4 @@
-"""How a second import knows what the first one made."""
+"""The keys by which a second import finds what the first one made."""
 
 
 def keys_of(layers):

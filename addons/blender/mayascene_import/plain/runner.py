@@ -66,8 +66,8 @@ def _remark(item):
 
 
 def _said(text, diagnostics, kind):
-    """The tool's own lines, without those that the diagnostics repeat and
-    the help below each of these."""
+    """The tool's own lines, without those that are among the diagnostics,
+    and without the help below each of these."""
     known = [f": {item['sentence']} [{item['code']}]" for item in diagnostics]
     lines, repeated = [], False
     for line in map(str.strip, text.splitlines()):
@@ -102,7 +102,7 @@ def run(tool, scene, bake):
         raise ToolFailed(said.strip() or f"{tool} gave no composition, "
                          + _ending(done.returncode)) from problem
     remarks = [_remark(item) for item in diagnostics or []]
-    # After a bake that ended well the lines say what was baked.
+    # After a bake that ended well the lines only name what was baked.
     if not bake or done.returncode != 0 or diagnostics is None:
         kind = "warning" if done.returncode == 0 else "error"
         remarks = _said(said, diagnostics or [], kind) + remarks

@@ -15,13 +15,13 @@ METRES = {"mm": 0.001, "millimeter": 0.001, "cm": 0.01, "centimeter": 0.01,
 
 
 def metres_per_unit(linear_unit):
-    """None for a unit of no known length."""
+    """None for an unknown unit."""
     return METRES.get(linear_unit)
 
 
 def settings_of(picture):
-    """Blender holds a rate as a whole number over a base, and of a pixel
-    no side below 1."""
+    """Blender holds a rate as a whole number over a base, and no side of a
+    pixel below 1."""
     rate = float(picture.rate)
     fps = min(max(math.ceil(rate - 1e-9), 1), _MOST_FPS)
     aspect = float(picture.pixel_aspect)

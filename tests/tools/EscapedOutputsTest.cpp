@@ -1,5 +1,5 @@
-// All that the tool writes about a scene whose names are made to do harm: each output, for every byte that a
-// name can hold, for texts that try to leave their quotes, and for names that look like paths.
+// Each output of the tool for a scene with hostile names: names of every byte that a name can hold, texts
+// that try to leave their quotes, and names that look like paths.
 #include <gtest/gtest.h>
 
 #include <algorithm>
@@ -23,9 +23,9 @@ bool contains(const std::string& text, const std::string& part) {
 }
 
 // Valid UTF-8 in lines, without a control character of either set.
-void expectHarmless(const std::string& text, const std::string& from) {
+void expectEscaped(const std::string& text, const std::string& from) {
   EXPECT_FALSE(text.empty()) << from;
-  // Strict: it throws where a byte is no UTF-8.
+  // Strict: it throws where a byte is not valid UTF-8.
   EXPECT_NO_THROW(json(text).dump()) << from;
   for (std::size_t i = 0; i < text.size(); ++i) {
     const auto byte = static_cast<unsigned char>(text[i]);
@@ -45,9 +45,9 @@ std::string everyByte() {
   return bytes;
 }
 
-class HarmlessOutputs : public ToolTest {
+class EscapedOutputs : public ToolTest {
  protected:
-  HarmlessOutputs() { environment["NO_COLOR"] = "1"; }
+  EscapedOutputs() { environment["NO_COLOR"] = "1"; }
 
   // A camera, its parent and a marked locator of the name, which is also that of a missing parent.
   void writeScene(const std::string& name) {
@@ -60,35 +60,35 @@ class HarmlessOutputs : public ToolTest {
                                 name + "null\" -p \"" + name + "\";\n"));
   }
 
-  void expectHarmlessOutputs(const std::vector<std::string>& further, const std::string& from) {
+  void expectEscapedOutputs(const std::vector<std::string>& further, const std::string& from) {
     std::vector<std::string> arguments = {"import", "named.ma"};
     arguments.insert(arguments.end(), further.begin(), further.end());
     const ToolResult result = runOnTerminal(arguments);
     EXPECT_EQ(result.status, 0) << result.out;
-    expectHarmless(result.out, from);
+    expectEscaped(result.out, from);
   }
 };
 
-TEST_F(HarmlessOutputs, NoByteOfANameIsAControlCharacterInAnyOutput) {
+TEST_F(EscapedOutputs, NoByteOfANameIsAControlCharacterInAnyOutput) {
   const std::string bytes = everyByte();
   for (std::size_t from = 0; from < bytes.size(); from += kBytesOfAName / 2) {
     writeScene("name" + bytes.substr(from, kBytesOfAName / 2) + "end");
-    expectHarmlessOutputs({}, "outline");
-    expectHarmlessOutputs({"--json", "-"}, "JSON");
-    expectHarmlessOutputs({"--quiet", "--trace", "-"}, "trace");
+    expectEscapedOutputs({}, "outline");
+    expectEscapedOutputs({"--json", "-"}, "JSON");
+    expectEscapedOutputs({"--quiet", "--trace", "-"}, "trace");
   }
 }
 
-TEST_F(HarmlessOutputs, ControlsOfTheSecondSetAndMisusedUtf8AreHarmlessInAnyOutput) {
+TEST_F(EscapedOutputs, ControlsOfTheSecondSetAndMisusedUtf8AreEscapedInAnyOutput) {
   writeScene(
       "\xc2\x9b"
       "31m\xc2\x85|\xed\xa0\x80|\xf4\x90\x80\x80|\xe0\x80\x8a|\xc0\x9b|\xe2\x80\xae|\xf0\x9f");
-  expectHarmlessOutputs({}, "outline");
-  expectHarmlessOutputs({"--json", "-"}, "JSON");
-  expectHarmlessOutputs({"--quiet", "--trace", "-"}, "trace");
+  expectEscapedOutputs({}, "outline");
+  expectEscapedOutputs({"--json", "-"}, "JSON");
+  expectEscapedOutputs({"--quiet", "--trace", "-"}, "trace");
 }
 
-TEST_F(HarmlessOutputs, TheWritingDirectionOfTheOutlineCannotBeTurned) {
+TEST_F(EscapedOutputs, TheWritingDirectionOfTheOutlineCannotBeTurned) {
   writeScene(
       "cam\xe2\x80\xae"
       "am.exe\xe2\x81\xa9");
@@ -97,14 +97,14 @@ TEST_F(HarmlessOutputs, TheWritingDirectionOfTheOutlineCannotBeTurned) {
   EXPECT_FALSE(contains(outline, "\xe2\x80\xae"));
 }
 
-TEST_F(HarmlessOutputs, AnEscapeAtTheEndOfANameDoesNotEatTheColourAfterIt) {
+TEST_F(EscapedOutputs, AnEscapeAtTheEndOfANameLeavesTheColourAfterItWhole) {
   environment.clear();
   writeScene("cam\x1b");
   const std::string outline = runOnTerminal({"import", "named.ma"}).out;
   EXPECT_TRUE(contains(outline, "\x1b[1m\"cam\\x1b\"\x1b[0m")) << outline;
 }
 
-TEST_F(HarmlessOutputs, ANameCannotLeaveItsQuotesInJsonAndTraces) {
+TEST_F(EscapedOutputs, ANameCannotLeaveItsQuotesInJsonAndTraces) {
   writeScene("x\\\",\\\"owned\\\":true,\\\"y\\\":[\\\\z");
   const ToolResult result = run({"import", "named.ma", "--json", "-", "--trace", "trace"});
   ASSERT_EQ(result.status, 0) << result.err;
@@ -122,7 +122,7 @@ TEST_F(HarmlessOutputs, ANameCannotLeaveItsQuotesInJsonAndTraces) {
     EXPECT_FALSE(json::parse(line).contains("owned")) << line;
 }
 
-TEST_F(HarmlessOutputs, PathPartsInANameMakeNoFile) {
+TEST_F(EscapedOutputs, PathPartsInANameMakeNoFile) {
   // Where a name with "../" would lead to is a folder that is looked at too.
   std::filesystem::create_directories(path("inner"));
   workingFolder = path("inner");
@@ -145,17 +145,17 @@ TEST_F(HarmlessOutputs, PathPartsInANameMakeNoFile) {
   EXPECT_EQ(inner, (std::vector<std::string>{"out.json", "trace"}));
 }
 
-TEST_F(HarmlessOutputs, MessagesOfATranslationAreEscaped) {
+TEST_F(EscapedOutputs, MessagesOfATranslationAreEscaped) {
   write("translations", "$$$/QZ/Maya_Import/LStr/0004=\x1b[31mred\xff\n");
   write("cut.ma", sceneText("createNode camera -n \"cam"));
   const ToolResult shown = runOnTerminal({"import", "cut.ma", "--translations", "translations"});
   EXPECT_TRUE(contains(shown.out, "\\x1b[31mred\xef\xbf\xbd")) << shown.out;
-  expectHarmless(shown.out, "outline");
-  expectHarmless(runOnTerminal({"import", "--quiet", "cut.ma", "--translations", "translations"}).out,
-                 "quiet");
+  expectEscaped(shown.out, "outline");
+  expectEscaped(runOnTerminal({"import", "--quiet", "cut.ma", "--translations", "translations"}).out,
+                "quiet");
 }
 
-TEST_F(HarmlessOutputs, WhatIsNamedOnTheCommandLineIsEscapedWhereItIsShownAgain) {
+TEST_F(EscapedOutputs, WhatIsNamedOnTheCommandLineIsEscapedWhereItIsShownAgain) {
   const std::string odd = "a\x1b[31m\xff\n\xc2\x9b";
   write("named.ma", sceneText(""));
   // The preference store comes last: its folder is made.
@@ -163,11 +163,11 @@ TEST_F(HarmlessOutputs, WhatIsNamedOnTheCommandLineIsEscapedWhereItIsShownAgain)
                              "--during", "--linear-units", "--no-such-option", "--preferences"}) {
     const ToolResult result = runOnTerminal({"import", "named.ma", option, odd + "/missing"});
     EXPECT_EQ(result.status == 0, option == std::string("--preferences")) << option;
-    expectHarmless(result.out, option);
+    expectEscaped(result.out, option);
   }
-  expectHarmless(runOnTerminal({odd}).out, "verb");
-  expectHarmless(runOnTerminal({"prefs", "set", odd, "1"}).out, "prefs");
-  expectHarmless(runOnTerminal({"prefs", "--preferences", odd}).out, "prefs");
+  expectEscaped(runOnTerminal({odd}).out, "verb");
+  expectEscaped(runOnTerminal({"prefs", "set", odd, "1"}).out, "prefs");
+  expectEscaped(runOnTerminal({"prefs", "--preferences", odd}).out, "prefs");
 }
 
 }  // namespace
