@@ -92,7 +92,8 @@ void Baker::Differ(diag::Code code, const Item& item, const std::string& path, C
   report->differences.push_back(diag::SentenceOf({.code = code, .arguments = {path}}));
 }
 
-// Adds the channels that keep their stored values. Each is reported already, once for all cameras.
+// Adds the channels that keep their stored values. Their diagnostics are already reported, once for all
+// cameras.
 void Baker::ReportKept(const Item& item, CameraReport* report) const {
   std::vector<motion::Kept> kept = local_->KeptOfLens(item.lens, *kept_);
   if (item.method == Method::kWorld) {

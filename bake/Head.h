@@ -19,7 +19,7 @@ struct Head {
   std::optional<FrameSpan> playback;  // the scene's playback range, in frames of the bake
 };
 
-// Reports a time unit that is no rate, and values that cannot be read. What the scene does not set has the
+// Reports a time unit that is not a rate, and values that cannot be read. What the scene does not set has the
 // defaults of the version that wrote it.
 Head ReadHead(const scene::Scene& scene, diag::Collector* diagnostics);
 

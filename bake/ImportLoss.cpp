@@ -19,6 +19,7 @@
 #include "motion/SceneCamera.h"
 #include "scene/Attributes.h"
 #include "scene/SpecialNames.h"
+#include "text/Letters.h"
 #include "text/Numbers.h"
 
 namespace bake {
@@ -33,14 +34,6 @@ bool Differ(double a, double b) {
   return std::fabs(a - b) > kTolerance * std::fmax(1.0, std::fmax(std::fabs(a), std::fabs(b)));
 }
 
-std::string Lowered(std::string_view name) {
-  std::string lowered(name);
-  for (char& c : lowered) {
-    if (c >= 'A' && c <= 'Z') c = static_cast<char>(c - 'A' + 'a');
-  }
-  return lowered;
-}
-
 // Searches a scene, camera by camera, until it finds something that a bake would bring.
 class LossSearch {
  public:
@@ -53,15 +46,15 @@ class LossSearch {
         measures_(evaluator_.measures()) {}
 
   std::optional<Loss> Run() {
-    // Names that differ in case only are one for the importer, and all of its layers can have the last of
-    // them.
+    // For the importer, names that differ only in case are the same, and all its layers can have the last
+    // one.
     std::unordered_map<std::string, std::vector<const CameOver::Camera*>> byName;
     for (auto one = import_.cameras.rbegin(); one != import_.cameras.rend(); ++one) {
-      byName[Lowered(one->name)].push_back(&*one);
+      byName[text::Lowered(one->name)].push_back(&*one);
     }
     for (NodeId id = 0; id < scene_.nodes().size() && !found_; ++id) {
       if (!IsSetUp(scene_, id)) continue;
-      auto& layers = byName[Lowered(scene::ImportName(scene_, scene_.node(id)))];
+      auto& layers = byName[text::Lowered(scene::ImportName(scene_, scene_.node(id)))];
       if (layers.empty()) {
         Lose(scene_.node(id).place, "the camera {0} does not come over", {ShownNode(scene_, id)});
         continue;
@@ -110,7 +103,7 @@ class LossSearch {
     LookAtLens(camera, layer);
   }
 
-  // A layer above a camera has the name under which its child names it.
+  // A layer above a camera has the name that its child gives for its parent.
   bool IsNameOf(NodeId node, std::string_view layer) const {
     return layer == scene_.node(node).name || layer == scene::ImportName(scene_, scene_.node(node));
   }
@@ -142,9 +135,10 @@ class LossSearch {
     const diag::Range place = scene_.node(channel.node).place;
     if (came == 0) return Lose(place, "no key of {0} on {1} comes over", {name, attribute});
     if (first && !SameTimes(first->curve, channel.curve)) {
-      return Lose(place,
-                  "the keys of {0} on {1} stand at other times than those on {2}, and come over at theirs",
-                  {name, attribute, std::string(first->attribute)});
+      return Lose(
+          place,
+          "the keys of {0} on {1} stand at other times than those on {2}, and come over at the times of {2}",
+          {name, attribute, std::string(first->attribute)});
     }
     const double rate = measures_.framesPerSecond / motion::UnitsPerFrame(scene_);
     const double halfTurn = std::numbers::pi / measures_.radians;
@@ -299,7 +293,7 @@ class LossSearch {
       firstKey_ = seconds;
     } else if (Differ(*firstKey_, seconds)) {
       Lose(scene_.node(node).place,
-           "the keys of {0} begin at another frame than those below, and come over at the same",
+           "the keys of {0} begin at another frame than those below it, and come over from the same frame on",
            {ShownNode(scene_, node)});
     }
   }
@@ -327,7 +321,7 @@ class LossSearch {
          {RoundedNumber(rate), RoundedNumber(import_.framesPerSecond)});
   }
 
-  // Checks the locators of a scene of which nothing at all comes over.
+  // Checks the locators of a scene from which nothing comes over.
   void LookAtLocators() {
     for (NodeId id = 0; id < scene_.nodes().size(); ++id) {
       const scene::Node& node = scene_.node(id);
@@ -337,7 +331,7 @@ class LossSearch {
            marked ? "the locator {0} does not come over without a camera"
                   : "the locator {0} has no \"null\" in its name",
            {ShownNode(scene_, id)});
-      found_->comesWithBake = false;  // without a camera an import takes nothing of a bake either
+      found_->comesWithBake = false;  // without a camera an import of a bake makes nothing either
       return;
     }
   }

@@ -22,7 +22,7 @@ struct KeyedChannel {
 std::optional<KeyedChannel> FindKeys(const scene::Scene& scene, scene::NodeId node,
                                      std::string_view attribute, const motion::Measures& measures);
 
-// The node's own name between quotes, harmless on a terminal; of a very long one the beginning.
+// The node's own name between quotes, escaped for a terminal; of a very long one the beginning.
 std::string ShownNode(const scene::Scene& scene, scene::NodeId node);
 
 }  // namespace bake

@@ -1,4 +1,4 @@
-// What an import does not bring of a scene, and what stopped one.
+// The losses of an import, and what stopped one.
 #pragma once
 
 #include <cstddef>
@@ -13,7 +13,7 @@
 namespace bake {
 
 struct Loss {
-  std::string sentence;              // without a full stop; harmless on a terminal
+  std::string sentence;              // without a full stop; escaped for a terminal
   std::optional<diag::Range> place;  // none: it has no place in the file
   bool comesWithBake = true;         // a bake of the scene brings it
 };

@@ -25,8 +25,8 @@ diag::Range LineRange(std::string_view text, std::uint32_t line) {
   return {start, std::min(text.find_first_of("\r\n", start), text.size()) - start};
 }
 
-// The first byte of the line, outside of quotes, that stands where a word begins and can begin none; 0 where
-// there is none.
+// The first byte of the line, outside of quotes, that stands at the start of a word although no word can
+// begin with it. 0 where there is none.
 char StrangeByte(std::string_view line) {
   bool quoted = false;
   char before = ' ';

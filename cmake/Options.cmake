@@ -46,8 +46,8 @@ if(MAYASCENE_SANITIZE)
   set(MAYASCENE_SANITIZERS -fsanitize=address,undefined,float-cast-overflow -fno-sanitize-recover=all
                            $<$<CXX_COMPILER_ID:Clang>:-fno-sanitize=function>)
   target_compile_options(mayascene_options INTERFACE ${MAYASCENE_SANITIZERS} -fno-omit-frame-pointer)
-  # The tests' own code has only those that find bad reads and writes, and bad arithmetic in inline functions of the
-  # product; so it compiles faster.
+  # The tests' own code has only the checks that find bad reads and writes, and bad arithmetic in inline functions of
+  # the product. It compiles faster without the others.
   target_compile_options(
     mayascene_test_options
     INTERFACE -fsanitize=address,float-cast-overflow,signed-integer-overflow,shift,integer-divide-by-zero,bounds

@@ -1,6 +1,6 @@
 # The helper for the libraries of the product.
 
-# add_room(NAME KIND SOURCES ... [LINKS ...]): one library of the house. KIND is STATIC, SHARED or MODULE.
+# add_room(NAME KIND SOURCES ... [LINKS ...]): one library of the product. KIND is STATIC, SHARED or MODULE.
 function(add_room name kind)
   cmake_parse_arguments(ROOM "" "" "SOURCES;LINKS" ${ARGN})
   add_library(${name} ${kind} ${ROOM_SOURCES})

@@ -12,7 +12,7 @@ constexpr Entry kBakeCodes[] = {
      .meaning = "Orthographic cameras and the four cameras that every scene begins with do not come over. "
                 "The bake is a valid scene without a camera.",
      .example = "createNode camera -s -n \"perspShape\" -p \"persp\";",
-     .help = "Look whether the camera is in a referenced file, or export it with the scene."},
+     .help = "Check whether the camera is in a referenced file, or export it with the scene."},
     {.code = Code::TooManyFrames,
      .severity = Severity::Error,
      .symbol = "TooManyFrames",
@@ -33,8 +33,9 @@ constexpr Entry kBakeCodes[] = {
      .severity = Severity::Warning,
      .symbol = "CameraInWorldSpace",
      .sentence = "\"{0}\" comes without the transforms above it",
-     .meaning = "Null layers cannot show exactly what stands above the camera: it is scaled or "
-                "sheared, or it is in another file. The camera has its place in the world at every frame.",
+     .meaning =
+         "Null layers cannot show the transforms above the camera exactly: these are scaled or sheared, or "
+         "in another file. The camera has its place in the world at every frame.",
      .example = "createNode transform -n \"rig\";\nsetAttr \".s\" -type \"double3\" 2 2 2 ;",
      .help = "Nothing has to be done for the picture. Take the scale out of the rig where the null layers "
              "are wanted."},

@@ -20,8 +20,7 @@ constexpr Entry kCameraCodes[] = {
      .symbol = "FilmOffsetLost",
      .sentence = "the film offset of \"{0}\" is lost: the picture is shifted",
      .meaning = "The film back of the camera is moved off the centre of the lens, by an offset or a shake. A "
-                "camera of a composition "
-                "looks through the middle of the picture.",
+                "camera of a composition looks through the middle of the picture.",
      .example = "createNode camera -n \"shotCamShape\";\nsetAttr \".fio\" -type \"double2\" 0.1 0 ;",
      .help = "Shift the finished picture by the offset, as a part of the aperture."},
     {.code = Code::LensSqueezeInAperture,
@@ -62,14 +61,14 @@ constexpr Entry kCameraCodes[] = {
     {.code = Code::CameraWithoutLens,
      .severity = Severity::Error,
      .symbol = "CameraWithoutLens",
-     .sentence = "\"{0}\" has no usable lens: its focal length or aperture is 0, negative or no number",
+     .sentence = "\"{0}\" has no usable lens: its focal length or aperture is 0, negative or not a number",
      .meaning = "Such a camera has no picture. It is not written.",
      .example = "createNode camera -n \"shotCamShape\";\nsetAttr \".fl\" 0;",
      .help = "Give the camera a focal length and an aperture above 0."},
     {.code = Code::CameraNotFinite,
      .severity = Severity::Error,
      .symbol = "CameraNotFinite",
-     .sentence = "\"{0}\" has no place: a value of its transforms is no number",
+     .sentence = "\"{0}\" has no place: a value of its transforms is not a number",
      .meaning = "A value of the camera, or of what stands above it, is too large to be held. The camera is "
                 "not written.",
      .example = "createNode transform -n \"shotCam\";\nsetAttr \".tx\" 1e999;",

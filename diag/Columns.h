@@ -6,7 +6,7 @@
 
 namespace diag {
 
-// The columns that a harmless text takes in a font of one width: two for each wide character of East Asia and
+// The columns that an escaped text takes in a font of one width: two for each wide character of East Asia and
 // each emoji, none for a mark that stands over another character, one for every other one.
 std::size_t ColumnsOf(std::string_view shown);
 

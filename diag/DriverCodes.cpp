@@ -45,7 +45,7 @@ constexpr Entry kDriverCodes[] = {
                 "transform -n \"right\";\ncreateNode orientConstraint -n \"between\" -p "
                 "\"shotCam\";\nconnectAttr \"left.r\" \"between.tg[0].tr\";\nconnectAttr \"right.r\" "
                 "\"between.tg[1].tr\";\nconnectAttr \"between.crx\" \"shotCam.rx\";",
-     .help = "Nothing has to be done while only one of the weights is not 0. Otherwise look at the result."},
+     .help = "Nothing has to be done while all weights but one are 0. Otherwise look at the result."},
     {.code = Code::TwistSign,
      .severity = Severity::Warning,
      .symbol = "TwistSign",

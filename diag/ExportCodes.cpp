@@ -1,4 +1,4 @@
-// MA1101 to MA1199: what an export cannot say.
+// MA1101 to MA1199: what an export cannot write.
 #include "diag/TableInternal.h"
 
 namespace diag {
@@ -44,7 +44,7 @@ constexpr Entry kExportCodes[] = {
     {.code = Code::ExportTooManyFrames,
      .severity = Severity::Error,
      .symbol = "ExportTooManyFrames",
-     .sentence = "the keys go from frame {0} to frame {1}, more frames than are written unasked",
+     .sentence = "the keys go from frame {0} to frame {1}: these are too many frames",
      .meaning = "Files hold a value for each frame: up to 100000 frames, or up to 2000000 with --frames. "
                 "Nothing is written of the scene.",
      .example = "createNode animCurveTL -n \"moveX\";\n  setAttr -s 2 \".ktv[0:1]\" 1 0 5000000 10;",
@@ -64,21 +64,22 @@ constexpr Entry kExportCodes[] = {
      .severity = Severity::Note,
      .symbol = "ExportNullsLeftOut",
      .sentence = "{0} null layers are not written: the format holds cameras",
-     .meaning = "A .chan file is the motion of one camera in the world. What the nulls above it do is "
-                "part of that.",
+     .meaning =
+         "A .chan file is the motion of one camera in the world. The motion of the nulls above it is part "
+         "of that.",
      .example = "$ mayascene export rig.ma -o rig.chan",
-     .help = "Nothing has to be done. For the nulls themselves take glTF, USD or CSV."},
+     .help = "Nothing has to be done. For the nulls themselves choose glTF, USD or CSV."},
     {.code = Code::ExportWithoutCamera,
      .severity = Severity::Error,
      .symbol = "ExportWithoutCamera",
      .sentence = "there is no camera, and the format holds nothing else",
      .meaning = "A .chan file is the motion of one camera. Nothing is written of the scene.",
      .example = "$ mayascene export nulls.ma -o nulls.chan",
-     .help = "Take glTF, USD or CSV for a composition of nulls."},
+     .help = "Choose glTF, USD or CSV for a composition of nulls."},
     {.code = Code::ExportNameReplaced,
      .severity = Severity::Note,
      .symbol = "ExportNameReplaced",
-     .sentence = "{0}: bytes of its name are no text, and stand as U+FFFD in the file",
+     .sentence = "{0}: bytes of its name are not valid UTF-8, and become U+FFFD in the file",
      .meaning = "The format holds names in UTF-8 only. Two such names can look alike.",
      .example = "$ printf 'createNode camera -n \"cam\\377\" -p \"shotCam\";\\n' >> shot.ma",
      .help = "Rename {0} in the scene where another program has to find it by its name."},
@@ -159,10 +160,10 @@ constexpr Entry kExportCodes[] = {
      .symbol = "ExportPartLost",
      .sentence = "{0}: {1} is not written: the format has no place for it",
      .meaning =
-         "What is written is right without it: for square pixels, a film that is not shifted, and a camera "
-         "whose scale takes no part in its picture.",
+         "The file is right for square pixels, a film that is not shifted, and a camera whose scale does not "
+         "change its picture.",
      .example = "createNode camera -n \"shotCamShape\" -p \"shotCam\";\n  setAttr \".hfo\" 0.1;",
-     .help = "Set it by hand where the file is read, or take a format that holds it."},
+     .help = "Set it by hand where the file is read, or choose a format that holds it."},
     {.code = Code::ExportFramesRounded,
      .severity = Severity::Warning,
      .symbol = "ExportFramesRounded",
@@ -177,7 +178,7 @@ constexpr Entry kExportCodes[] = {
      .meaning = "Nothing came over for these frames. Each layer stays as it is at its own first or last key.",
      .example = "$ mayascene export --frames 1:500 shot.ma -o shot.glb",
      .help =
-         "Nothing has to be done where that is wanted. With --bake the scene itself says what they show."},
+         "Nothing has to be done where that is wanted. With --bake these frames show what the scene shows."},
 };
 
 }  // namespace

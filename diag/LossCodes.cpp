@@ -46,8 +46,7 @@ constexpr Entry kLossCodes[] = {
      .sentence =
          "\"{0}\" loses its place: the import does not take its parent \"{1}\", a node of the type {2}",
      .meaning = "A node above the camera or the marked locator is of a type that the importer does not know, "
-                "such as "
-                "a joint. The camera or locator comes over as if that node stood at the origin.",
+                "such as a joint. The camera or locator comes over as if that node stood at the origin.",
      .example = "createNode joint -n \"arm\";\ncreateNode transform -n \"shotCam\" -p \"arm\";\n"
                 "createNode camera -n \"shotCamShape\" -p \"shotCam\";",
      .help = "Write the scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
@@ -240,8 +239,7 @@ constexpr Entry kLossCodes[] = {
          "createNode transform -n \"shotCam\";\ncreateNode camera -n \"shotCamShape\" -p \"shotCam\";\n"
          "parent \"shotCam\" \"rig\";",
      .help = "Open the scene in Maya and save it again, which writes the parent with the node. Or write the "
-             "scene "
-             "anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
+             "scene anew: mayascene bake SCENE -o OUT, or mayascene import --bake."},
 };
 
 }  // namespace

@@ -80,7 +80,7 @@ constexpr Entry kNodeCodes[] = {
     {.code = Code::UnknownUnit,
      .severity = Severity::Warning,
      .symbol = "UnknownUnit",
-     .sentence = "\"{0}\" is no unit of {1}",
+     .sentence = "\"{0}\" is not a unit of {1}",
      .meaning = "The word of currentUnit is not known. The unit stays as it was: centimetres, degrees and 24 "
                 "frames a second, unless the file set another one before.",
      .example = "currentUnit -l league -a degree -t film;",

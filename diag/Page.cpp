@@ -26,8 +26,8 @@ constexpr std::array kTopics = {
     Topic{700, "What stops an import"},
     Topic{800, "What does not come over"},
     Topic{900, "Where the picture differs"},
-    Topic{1000, "What keeps a check from its end"},
-    Topic{1100, "What an export cannot say"},
+    Topic{1000, "What cuts a check short"},
+    Topic{1100, "What an export cannot write"},
 };
 
 constexpr std::string_view kIntroduction =
@@ -45,7 +45,7 @@ help: Close the string, or export the scene again.
 
 - An *error* means that something asked for could not be done.
 - A *warning* means that the result may differ from what the scene shows.
-- A *note* says what is good to know.
+- A *note* is for information.
 
 At most 20 diagnostics of one code are shown in full. The rest are counted.
 

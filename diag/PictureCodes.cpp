@@ -74,9 +74,10 @@ constexpr Entry kPictureCodes[] = {
     {.code = Code::InheritanceOff,
      .severity = Severity::Warning,
      .symbol = "InheritanceOff",
-     .sentence = "\"{0}\" does not inherit the transforms above it; the import lets it inherit",
-     .meaning = "The importer makes the layer of the node a child of the layers of what stands above it, "
-                "whatever the scene says.",
+     .sentence = "\"{0}\" does not inherit the transforms above it; in the import it inherits them",
+     .meaning =
+         "The importer makes the layer of the node a child of the layer of its parent, whatever the scene "
+         "says.",
      .example = "createNode transform -n \"rig\";\n"
                 "createNode transform -n \"shotCam\" -p \"rig\";\n"
                 "  setAttr \".it\" no;",
@@ -206,9 +207,9 @@ constexpr Entry kPictureCodes[] = {
      .example = "createNode animCurveTL -n \"moveX\";\n"
                 "  setAttr -s 2 \".ktv[0:1]\" 1 0 3000000 10;\n"
                 "connectAttr \"moveX.o\" \"shotCam.tx\";",
-     .help =
-         "Of too many frames write the shot alone: mayascene bake SCENE -o OUT --frames A:B. Bake a channel "
-         "that cannot be computed in Maya."},
+     .help = "Where there are too many frames, write only those of the shot: mayascene bake SCENE -o OUT "
+             "--frames "
+             "A:B. Where a channel cannot be computed, bake it in Maya."},
     {.code = Code::ApertureMotionLost,
      .severity = Severity::Warning,
      .symbol = "ApertureMotionLost",
@@ -271,10 +272,11 @@ constexpr Entry kPictureCodes[] = {
      .severity = Severity::Warning,
      .symbol = "RadiansLost",
      .sentence = "\"{0}\" hardly turns: {1} is {2} in radians, and comes over as {3} degrees",
-     .meaning =
-         "The scene's unit of angle is the radian. The importer multiplies such an angle by 0.01745, where "
-         "57.3 makes degrees of it, so that next to nothing is left of a rotation. The diagnostic names "
-         "the first angle of the node; it holds for all.",
+     .meaning = "The scene's unit of angle is the radian. The importer multiplies such an angle by 0.01745 "
+                "instead of "
+                "57.3, so almost nothing of a rotation is left. The diagnostic names the first angle of the "
+                "node; it "
+                "holds for all.",
      .example = "currentUnit -l centimeter -a radian -t film;\n"
                 "createNode transform -n \"shotCam\";\n"
                 "  setAttr \".r\" -type \"double3\" 0.5 0 0 ;",

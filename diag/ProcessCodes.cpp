@@ -1,4 +1,4 @@
-// MA1001 to MA1099: what keeps a check from coming to its end.
+// MA1001 to MA1099: what cuts a check short.
 #include "diag/TableInternal.h"
 
 namespace diag {

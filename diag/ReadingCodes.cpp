@@ -72,8 +72,8 @@ constexpr Entry kReadingCodes[] = {
      .meaning = "No command and no value begins with this byte. The command in which it stands is skipped.",
      .example = "currentUnit -l centimeter -a degree -t &film;",
      .help =
-         "Look at this line in a text editor. A file with many such bytes is damaged or no Maya ASCII scene: "
-         "export it again as Maya ASCII."},
+         "Look at this line in a text editor. A file with many such bytes is damaged, or is not a Maya ASCII "
+         "scene: export it again as Maya ASCII."},
     {.code = Code::IncompleteCommand,
      .severity = Severity::Warning,
      .symbol = "IncompleteCommand",

@@ -36,7 +36,7 @@ constexpr Entry kStopCodes[] = {
      .sentence = "this file is compressed ({0})",
      .meaning = "The file begins like a compressed file. There may be a scene in it.",
      .example = "$ printf '\\037\\213\\010' > shot.ma",
-     .help = "Unpack the file, and give the scene that comes out of it."},
+     .help = "Unpack the file, and use the scene in it."},
     {.code = Code::EmptyFile,
      .severity = Severity::Error,
      .symbol = "EmptyFile",
@@ -170,7 +170,7 @@ constexpr Entry kStopCodes[] = {
     {.code = Code::NumberUnreadable,
      .severity = Severity::Error,
      .symbol = "NumberUnreadable",
-     .sentence = "the import stops here: \"{0}\" is no number that it can read",
+     .sentence = "the import stops here: \"{0}\" is not a number that it can read",
      .meaning =
          "Where the importer needs a number, it takes decimal digits, which can have a sign, a fraction "
          "and an exponent. Nothing comes over.",

@@ -1,4 +1,4 @@
-// animBlendNodeAdditive and its kin of one number: two inputs, each times its weight.
+// animBlendNodeAdditive and its variants for one number: the sum of two inputs, each times its weight.
 #include "motion/NodeTypes.h"
 
 namespace motion {

@@ -5,22 +5,17 @@
 namespace motion {
 namespace {
 
-bool Normalised(const Vector& vector, Vector* direction) {
-  const double length = Length(vector);
-  if (!(length > 0.0) || !std::isfinite(length)) return false;
-  *direction = {vector.x / length, vector.y / length, vector.z / length};
-  return true;
-}
-
-// The direction of the part of a vector at right angles to a direction. False when that part is no more than
-// rounding.
-bool SquareTo(const Vector& direction, const Vector& vector, Vector* square) {
+// The direction of the part of a vector at right angles to a direction. False where that part comes only from
+// rounding. Done twice, because the first difference has the rounding of a long vector.
+bool SquareTo(const Vector& direction, Vector vector, Vector* square) {
   constexpr double kParallel = 1e-12;
-  Vector unit;
-  if (!Normalised(vector, &unit)) return false;
-  const Vector part = unit - direction * Dot(unit, direction);
-  if (Length(part) < kParallel || !Normalised(part, &unit)) return false;
-  return Normalised(unit - direction * Dot(unit, direction), square);
+  if (!Normalise(&vector)) return false;
+  vector = vector - direction * Dot(vector, direction);
+  if (Length(vector) < kParallel || !Normalise(&vector)) return false;
+  vector = vector - direction * Dot(vector, direction);
+  if (!Normalise(&vector)) return false;
+  *square = vector;
+  return true;
 }
 
 Vector AnySquare(const Vector& direction) {
@@ -80,9 +75,9 @@ bool MeanTarget(const std::vector<TargetPoint>& targets, Vector* mean) {
 
 bool TurnTo(const Vector& from, const Vector& fromUp, const Vector& to, const Vector& toUp,
             Matrix* rotation) {
-  Vector start;
-  Vector end;
-  if (!Normalised(from, &start) || !Normalised(to, &end)) return false;
+  Vector start = from;
+  Vector end = to;
+  if (!Normalise(&start) || !Normalise(&end)) return false;
   Vector startUp;
   Vector endUp;
   if (!SquareTo(start, fromUp, &startUp) || !SquareTo(end, toUp, &endUp)) {
@@ -105,8 +100,8 @@ bool AimAngles(const Aim& aim, const std::vector<TargetPoint>& targets, const Co
   if (!TurnTo(aim.aim, aim.up, direction, UpIn(aim, toParent, place), &turn)) return false;
   const bool twists = aim.upType == UpType::kScene || aim.upType == UpType::kVector;
   if (twists && aim.twist != 0.0) {
-    Vector axis;
-    Normalised(direction, &axis);
+    Vector axis = direction;
+    Normalise(&axis);
     turn = turn * RotationAboutDirection(axis, aim.twist);
   }
   const Matrix orient = RotationMatrix(node.jointOrient, RotateOrder::kXYZ);

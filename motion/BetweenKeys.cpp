@@ -9,7 +9,7 @@
 namespace motion {
 namespace {
 
-// Between two keys a curve is a cubic: where it meets a straight line at so many frames, it is the line.
+// Between two keys a curve is a cubic: if it meets the straight line at so many frames, it is the line.
 constexpr double kFramesOfSpan = 8.0;
 
 // Relative: scenes write values with limited digits.

@@ -1,4 +1,4 @@
-// animCurveTL and its kin: a curve at the frame, or at the number that drives it.
+// The types of animation curves: a curve at the frame, or at the number that drives it.
 #include "motion/Curve.h"
 #include "motion/CurveReader.h"
 #include "motion/NodeTypes.h"

@@ -75,8 +75,8 @@ void Evaluator::ReportFailures() {
   values_.failed.clear();
 }
 
-// Whether the plug is an input of a computing node and no channel with a stored value. An unknown value there
-// makes the node's outputs unknown, and the channels that they drive keep their values.
+// Whether the plug is an input of a computing node, and not a channel with a stored value. An unknown value
+// there makes the node's outputs unknown, and the channels that they drive keep their values.
 bool Evaluator::IsInput(const scene::Plug& plug) const {
   const bool channel = scene::FindAttribute("transform", plug.attribute) != nullptr;
   return !channel && FindNodeType(scene_.node(plug.node).type) != nullptr && std::isnan(StoredNumber(plug));

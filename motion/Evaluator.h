@@ -179,7 +179,7 @@ class Evaluator {
   std::vector<std::unique_ptr<Step>> steps_;
   std::vector<Written> written_;                   // by step
   std::vector<bool> moves_;                        // by step
-  std::vector<const LocalStep*> locals_;           // by matrix; null where it is no local one
+  std::vector<const LocalStep*> locals_;           // by matrix; null where it is not a local one
   std::vector<std::uint32_t> moving_;              // in the order in which they are run
   std::vector<std::vector<std::uint32_t>> parts_;  // the same by part
   std::vector<scene::NodeId> computingNodes_;

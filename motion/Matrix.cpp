@@ -5,14 +5,6 @@
 namespace motion {
 namespace {
 
-// Makes the vector one of length 1; false where it has no direction.
-bool Normalise(Vector* vector) {
-  const double length = Length(*vector);
-  if (!(length > 0.0) || !std::isfinite(length)) return false;
-  *vector = {vector->x / length, vector->y / length, vector->z / length};
-  return true;
-}
-
 // A direction at right angles to a unit vector.
 Vector AnySquare(const Vector& unit) {
   const bool awayFromX = std::fabs(unit.x) < 0.5;
@@ -34,6 +26,13 @@ bool NormaliseSquareTo(const Vector& unit, Vector* vector) {
 }
 
 }  // namespace
+
+bool Normalise(Vector* vector) {
+  const double length = Length(*vector);
+  if (!(length > 0.0) || !std::isfinite(length)) return false;
+  *vector = {vector->x / length, vector->y / length, vector->z / length};
+  return true;
+}
 
 bool IsFinite(const Vector& vector) {
   return std::isfinite(vector.x) && std::isfinite(vector.y) && std::isfinite(vector.z);

@@ -73,6 +73,9 @@ inline Matrix Transposed(const Matrix& m) {
   return {{m.x.x, m.y.x, m.z.x}, {m.x.y, m.y.y, m.z.y}, {m.x.z, m.y.z, m.z.z}, {}};
 }
 
+// Gives the vector length 1. False, and the vector is unchanged, where its length is 0 or not finite.
+bool Normalise(Vector* vector);
+
 bool IsFinite(const Vector& vector);
 bool IsFinite(const Matrix& matrix);
 

@@ -17,11 +17,10 @@ struct Measures {
 
 Measures MeasuresOf(const scene::Scene& scene);
 
-// Whether a word of a scene's unit of time is one that counts no frames: seconds, minutes …
+// Whether the word is a unit of time that does not count frames: seconds, minutes …
 bool IsClockUnit(std::string_view word);
 
-// One frame in the scene's unit of time. Where the unit counts no frames, a frame is one of film, 24 a
-// second.
+// One frame in the scene's unit of time. Where the unit does not count frames, there are 24 frames a second.
 double UnitsPerFrame(const scene::Scene& scene);
 
 // What a plug's number measures.

@@ -1,5 +1,5 @@
-// The attributes of what drives channels: curves and the nodes that stand between a curve and a channel; and
-// of what every scene has once: its time, resolution, render settings, scripts and references.
+// The attributes of nodes that drive channels (curves, and the nodes between a curve and a channel) and of a
+// scene's settings (time, resolution, render settings, scripts, references).
 #include "scene/AttributeRowsInternal.h"
 
 namespace scene {

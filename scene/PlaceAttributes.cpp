@@ -1,4 +1,4 @@
-// The attributes of what has a place: transforms, joints, constraints, cameras, locators.
+// The attributes of nodes with a place: transforms, joints, constraints, cameras, locators.
 #include "scene/AttributeRowsInternal.h"
 
 namespace scene {
@@ -158,7 +158,7 @@ constexpr AttributeRow kLocator[] = {
     Single("lsy", "localScaleY", 1),  Single("lsz", "localScaleZ", 1),
 };
 
-// Those of one target stand under "target[i]".
+// The attributes of one target stand under "target[i]".
 constexpr AttributeRow kConstraint[] = {
     Triple("tt", "targetTranslate", 0),
     Triple("tr", "targetRotate", 0),

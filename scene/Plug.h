@@ -10,7 +10,7 @@ namespace scene {
 using NodeId = std::uint32_t;
 inline constexpr NodeId kNoNode = 0xffffffff;
 
-// No index: an attribute that is no array, or the array as a whole.
+// No index: an attribute that is not an array, or the array as a whole.
 inline constexpr std::int32_t kNoIndex = -1;
 
 // The attribute has its long name, however the scene writes it: ".t.tx", ".tx" and ".translateX" are all

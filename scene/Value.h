@@ -29,7 +29,7 @@ class Value {
   // stands, and where the number is too large for a double.
   std::optional<double> Number() const;
 
-  // The numbers up to the first word that is none, at most `most`.
+  // The numbers up to the first word that is not a number, at most `most`.
   std::vector<double> Numbers(std::size_t most = static_cast<std::size_t>(-1)) const;
 
   // Whether there is a first number, and it is not 0.

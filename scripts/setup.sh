@@ -25,7 +25,7 @@ missing_packages() {
 # require_packages PACKAGE...: installs what is missing, and nothing where nothing is.
 require_packages() {
   command -v dpkg-query >/dev/null || {
-    say "this is no Debian system; the following are taken as installed: $*"
+    say "this is not a Debian system; these packages are assumed to be installed: $*"
     return 0
   }
   local missing

@@ -1,4 +1,4 @@
-// Bakes scenes given as text, and reads what comes of it.
+// Bakes scenes given as text, and reads the results.
 #pragma once
 
 #include <sstream>
@@ -75,7 +75,7 @@ class Baked {
   scene::Scene scene_;
 };
 
-// A camera "shotCam" with a shape, and what is said of both.
+// A camera "shotCam" with its shape, and further lines about both.
 inline std::string CameraScene(std::string_view transform, std::string_view shape = "",
                                std::string_view rest = "") {
   std::string text = "//Maya ASCII 2018 scene\ncurrentUnit -l centimeter -a degree -t film;\n";

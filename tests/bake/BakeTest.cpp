@@ -1,4 +1,4 @@
-// What is written of the transforms.
+// The transforms of a bake.
 #include "bake/Bake.h"
 
 #include <gmock/gmock.h>
@@ -216,7 +216,7 @@ TEST(Bake, NodesOfOneNameGetNumbersAndTheirPathsStandInComments) {
   EXPECT_THAT(baked.text(), HasSubstr("// |b|cam|camShape\n"));
 }
 
-TEST(Bake, ACameraSaysWhichChannelsKeepTheirStoredValues) {
+TEST(Bake, TheReportOfACameraNamesTheChannelsThatKeepTheirStoredValues) {
   const Baked baked(
       "createNode expression -n \"shake\";\ncreateNode transform -n \"rig\";\n"
       "connectAttr \"shake.out[0]\" \"rig.tx\";\n"

@@ -85,7 +85,7 @@ TEST(FrameRange, MoreThan100000FramesNeedTheOption) {
   EXPECT_EQ(more.text(), "");
 }
 
-TEST(FrameRange, NobodyGetsMoreFramesThanACompositionsTimeCanHold) {
+TEST(FrameRange, NoBakeHasMoreFramesThanACompositionsTimeCanHold) {
   bake::Options options;
   options.frames = bake::FrameSpan{0, 2'000'001};
   const Baked baked(CameraScene(""), options);

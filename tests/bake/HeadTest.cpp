@@ -18,14 +18,14 @@ struct Read {
   bake::Head head;
 };
 
-TEST(Head, UnitsThatAreSaidStay) {
+TEST(Head, UnitsThatAreSetStay) {
   const Read read("currentUnit -l inch -a radian -t 23.976fps;\n");
   EXPECT_EQ(read.head.linearUnit, "inch");
   EXPECT_EQ(read.head.timeUnit, "23.976fps");
   EXPECT_EQ(read.head.unitsPerFrame, 1.0);
 }
 
-TEST(Head, UnitsThatAreNotSaidHaveDefaults) {
+TEST(Head, UnitsThatAreNotSetHaveDefaults) {
   const Read read("");
   EXPECT_EQ(read.head.linearUnit, "centimeter");
   EXPECT_EQ(read.head.timeUnit, "film");
@@ -55,7 +55,7 @@ TEST(Head, AClockUnitBecomesFilmWithAWarning) {
   }
 }
 
-TEST(Head, TheResolutionIsReadAndDefaultsHoldWhereItIsSilent) {
+TEST(Head, TheResolutionIsReadAndDefaultsHoldWhereItIsNotSet) {
   const Read said(
       "select -ne :defaultResolution;\n\tsetAttr \".w\" 720.9;\n\tsetAttr \".h\" 486;\n"
       "\tsetAttr \".dar\" 1.333;\n\tsetAttr \".pa\" 0.5;\n");
@@ -68,7 +68,7 @@ TEST(Head, TheResolutionIsReadAndDefaultsHoldWhereItIsSilent) {
   EXPECT_EQ(motion::PixelAspect(silent.head.picture), 1);
 }
 
-TEST(Head, AResolutionThatIsNoneHasTheDefault) {
+TEST(Head, AResolutionThatIsNotPositiveHasTheDefault) {
   const Read read(
       "select -ne :defaultResolution;\n\tsetAttr \".w\" 0;\n\tsetAttr \".h\" -3;\n\tsetAttr \".dar\" no;\n");
   EXPECT_EQ(read.head.picture.width, 960);

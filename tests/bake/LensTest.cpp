@@ -19,7 +19,7 @@ constexpr const char* kPicture =
     "select -ne :defaultResolution;\n\tsetAttr \".w\" 1920;\n\tsetAttr \".h\" 1080;\n\tsetAttr \".dar\" "
     "1.7777777;\n";
 
-TEST(Lens, WhatASceneDoesNotSayIsWrittenOut) {
+TEST(Lens, DefaultsOfTheSceneAreWrittenOut) {
   const Baked baked(CameraScene(""));
   EXPECT_EQ(baked.Number("shotCamShape", "focalLength"), 35);
   EXPECT_EQ(baked.Number("shotCamShape", "horizontalFilmAperture"), 1.41732);

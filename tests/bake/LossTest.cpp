@@ -1,4 +1,4 @@
-// What a plain import lacks of a scene: each kind of it, and that nothing is said where all came over.
+// Each kind of loss in a plain import is found, and none where all came over.
 #include "bake/Loss.h"
 
 #include <gtest/gtest.h>
@@ -115,7 +115,7 @@ TEST(LossTest, KeysAtOtherTimesThanTheFirstChannelsAreLost) {
                            CurveOf("animCurveTL", "d", "1 0 12 5", "shotCam.ty")),
                  Whole()),
             "the keys of \"shotCam\" on translateY stand at other times than those on translateX, and come "
-            "over at theirs");
+            "over at the times of translateX");
 }
 
 TEST(LossTest, WhatOtherNodesMakeOfAChannelIsLost) {
@@ -137,7 +137,7 @@ TEST(LossTest, ADriverThatGivesTheStoredValueLosesNothing) {
   EXPECT_NE(Lost(Scene("\tsetAttr \".s\" -type \"double3\" 5 1 1 ;\n", "", driven), Whole(0)), "");
 }
 
-TEST(LossTest, WhatABakeCannotEvaluateEitherIsSaidLastAndWithoutIt) {
+TEST(LossTest, WhatABakeCannotEvaluateEitherIsReportedLastAndWithoutABake) {
   const std::string expression =
       "createNode expression -n \"e\";\nconnectAttr \"e.out[0]\" \"shotCam.tx\";\n";
   Reading reading(Scene("", "", expression));
@@ -174,7 +174,7 @@ TEST(LossTest, AFocalLengthThatIsPassedOnIsLost) {
   EXPECT_EQ(Lost(Scene("", "\tsetAttr \".fl\" 50;\n", passedOn), Whole(0)), "");
 }
 
-TEST(LossTest, TheFormsOfATransformThatTheImportDoesNotLookAtAreLost) {
+TEST(LossTest, TheFormsOfATransformThatTheImportDoesNotReadAreLost) {
   const std::string turned = "\tsetAttr \".r\" -type \"double3\" 10 20 0 ;\n";
   const auto lost = [](const std::string& text) { return Lost(Scene(text), Whole(0)); };
   EXPECT_EQ(lost(turned + "\tsetAttr \".ro\" 1;\n"), "the rotate order of \"shotCam\" does not come over");
@@ -231,7 +231,8 @@ TEST(LossTest, NodesThatAreKeyedFromDifferentFramesAreLost) {
   const std::string place = CurveOf("animCurveTL", "c", "1 0 11 5", "shotCam.tx");
   EXPECT_EQ(
       Lost(Scene("", "", place + lens), Whole(2, 2)),
-      "the keys of \"shotCamShape\" begin at another frame than those below, and come over at the same");
+      "the keys of \"shotCamShape\" begin at another frame than those below it, and come over from the same "
+      "frame on");
   EXPECT_EQ(Lost(Scene("", "", lens), Whole(0, 2)), "");
   std::string clock = Scene("", "", place + lens);
   clock.replace(clock.find("film"), 4, "game");
@@ -295,7 +296,7 @@ TEST(LossTest, OrthographicAndStartupCamerasAreNoLoss) {
   EXPECT_EQ(Lost(text, {}), "");
 }
 
-TEST(LossTest, LocatorsWithoutAMarkAreSaidWhereNothingElseComesOver) {
+TEST(LossTest, LocatorsWithoutAMarkAreReportedWhereNothingElseComesOver) {
   const std::string locator = "createNode transform -n \"l\";\ncreateNode locator -n \"lShape\" -p \"l\";\n";
   Reading reading(locator);
   EXPECT_EQ(reading.Lost({}), "the locator \"lShape\" has no \"null\" in its name");
@@ -305,7 +306,7 @@ TEST(LossTest, LocatorsWithoutAMarkAreSaidWhereNothingElseComesOver) {
             "the locator \"a_null\" does not come over without a camera");
 }
 
-TEST(LossTest, NamesAreHarmlessAndShort) {
+TEST(LossTest, NamesAreEscapedAndShort) {
   const std::string name = "\x1b[31m" + std::string(300, 'x');
   const std::string sentence = Lost("createNode camera -n \"" + name + "\";\n", {});
   EXPECT_EQ(sentence, "the camera \"\\x1b[31m" + std::string(95, 'x') + "...\" does not come over");

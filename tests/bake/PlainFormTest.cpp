@@ -8,7 +8,7 @@
 
 namespace {
 
-// A transform of the type, and what is said of it.
+// A transform of the type, with further lines about it.
 struct Read {
   Read(const std::string& type, const std::string& lines)
       : text("createNode " + type + " -n \"a\";\n" + lines),
@@ -46,7 +46,7 @@ TEST(PlainForm, AJointIsPlainWithoutItsOrientAndWithoutItsParentsScale) {
   EXPECT_FALSE(Read("joint", "setAttr \".ssc\" no;\nsetAttr \".joy\" 5;\n").IsPlain());
 }
 
-TEST(PlainForm, InheritanceIsSaidOrDriven) {
+TEST(PlainForm, InheritanceIsSetOrDriven) {
   const auto node = [](const Read& read) { return read.scene.Find("a"); };
   const Read silent("transform", "");
   const Read off("transform", "setAttr \".it\" no;\n");

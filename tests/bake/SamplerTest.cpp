@@ -60,7 +60,7 @@ TEST(Sampler, AVeryLongRangeOfWhatStandsStillTakesOneValue) {
   EXPECT_THAT(read.sampler.lens(lens).focalLength.values, ElementsAre(35));
 }
 
-TEST(Sampler, AValueThatIsNoNumberIsKnown) {
+TEST(Sampler, AMatrixThatIsNotFiniteIsNoticed) {
   Read read(
       "createNode transform -n \"a\";\n\tsetAttr \".tx\" 1e308;\ncreateNode transform -n \"b\" -p "
       "\"a\";\n\tsetAttr \".tx\" 1e308;\n");

@@ -33,7 +33,7 @@ TEST(DiagnosticTest, ThatOfTheWholeFileHasNoLine) {
   EXPECT_FALSE(IsOfWholeFile({.code = Code::NoCamera, .range = {0, 1}}));
 }
 
-TEST(DiagnosticTest, HostileNamesAreHarmless) {
+TEST(DiagnosticTest, HostileNamesAreEscaped) {
   const Diagnostic diagnostic{.code = Code::CommandCutOff, .arguments = {"a\n\x1b[2J\xff"}};
   EXPECT_EQ(SentenceOf(diagnostic), "the file ends inside the command \"a\\n\\x1b[2J\\xff\"");
   EXPECT_THAT(Render("x\ny", diagnostic), testing::StartsWith("x\\ny: "));

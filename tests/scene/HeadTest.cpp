@@ -78,9 +78,9 @@ TEST_F(HeadTest, AUnitThatIsNotKnownChangesNothing) {
       SettingsOf("currentUnit -l meter -t pal;\ncurrentUnit -l league -a turn -t 0fps;");
   EXPECT_EQ(settings.centimetersPerUnit.value, 100.0);
   EXPECT_EQ(settings.rate.value, (FrameRate{25, 1}));
-  EXPECT_THAT(Diagnostics(), ElementsAre("2:16: \"league\" is no unit of length [MA0209]",
-                                         "2:26: \"turn\" is no unit of angle [MA0209]",
-                                         "2:34: \"0fps\" is no unit of time [MA0209]"));
+  EXPECT_THAT(Diagnostics(), ElementsAre("2:16: \"league\" is not a unit of length [MA0209]",
+                                         "2:26: \"turn\" is not a unit of angle [MA0209]",
+                                         "2:34: \"0fps\" is not a unit of time [MA0209]"));
 }
 
 TEST_F(HeadTest, TheLastOfTwoUnitsHolds) {
@@ -112,7 +112,8 @@ TEST_F(HeadTest, RangesInLongOptionsAndUnreadableOnes) {
   ASSERT_TRUE(settings.playback);
   EXPECT_EQ(settings.playback->value, (FrameRange{1, 2}));
   EXPECT_FALSE(settings.animation);
-  EXPECT_THAT(Diagnostics(), ElementsAre("1:81: \"x\" is not a value that animationEndTime can have [MA0109]"));
+  EXPECT_THAT(Diagnostics(),
+              ElementsAre("1:81: \"x\" is not a value that animationEndTime can have [MA0109]"));
 }
 
 TEST_F(HeadTest, AScriptOfAnotherNameMaySetTheRange) {

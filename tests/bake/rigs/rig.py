@@ -2,7 +2,7 @@
 
 from dataclasses import dataclass, field
 
-# The three numbers of each compound, and what it holds where nobody wrote it.
+# The three numbers of each compound, and its default.
 CHILDREN = {
     **{name: tuple(name + axis for axis in "xyz") for name in ("t", "r", "s", "rp", "sp", "rpt", "spt", "ra", "jo", "is")},
     "sh": ("shxy", "shxz", "shyz"),

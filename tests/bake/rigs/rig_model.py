@@ -84,7 +84,7 @@ def vector_through(vector, matrix):
 
 
 class Moment:
-    """A rig at one time. What was worked out once is kept."""
+    """A rig at one time. Each value is computed once and kept."""
 
     def __init__(self, rig, frame):
         self.rig, self.seconds, self.kept = rig, frame / rig.rate, {}

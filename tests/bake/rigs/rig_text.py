@@ -74,7 +74,7 @@ class Writer:
                 self.link(f"{driver.node.name}.{self.name(driver.name)}", f"{node.name}.{self.name(name)}")
 
     def whole(self, node, compound, children, left):
-        """Three numbers that hang on three of one other node, as one connection."""
+        """Three numbers that three of another node drive, as one connection."""
         held = [left.get(child) for child in children]
         if not all(isinstance(driver, Plug) for driver in held) or self.likely(0.4):
             return
