@@ -8,7 +8,7 @@
 
 namespace secondreader {
 
-// Runs work(stream); the stream is given back whatever came of it.
+// Runs work(stream) and then gives the stream back, also where the work throws.
 template <typename Work>
 void Builder::withStream(Handle layer, std::int32_t id, Work work) {
   Handle stream = 0;

@@ -1,5 +1,5 @@
-// Every small scene cut at every byte, and with every byte replaced: what comes of it is what the second
-// reader says, nothing is left behind.
+// Every small scene cut at every byte, and with every byte replaced: the second reader predicts the result,
+// and nothing is left behind.
 #include <gtest/gtest.h>
 
 #include <algorithm>

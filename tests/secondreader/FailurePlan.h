@@ -47,7 +47,7 @@ class FailurePlan {
 // The word for a kind of exception in a trace.
 const char* wordOf(refhost::Failure::Kind kind);
 
-// A planned exception that is no standard one.
+// A planned exception that is not a standard one.
 struct UnknownException {};
 
 // Throws the exception of a planned failure; nothing when it is a code.

@@ -1,6 +1,6 @@
 // Every suite call and every call of a utility service is made to fail, one after the other and in every way,
-// in the imports of small scenes and of the examples, in the entry and in the header test: what comes of it
-// is what the second reader says.
+// in the imports of small scenes and of the examples, in the entry and in the header test. The second reader
+// predicts each result.
 #include <gtest/gtest.h>
 
 #include <algorithm>

@@ -1,5 +1,5 @@
-// What only large scenes hold: long spins, many nodes of few names, many connections, long commands that
-// nobody reads.
+// Parts that only large scenes have: long spins, many nodes of few names, many connections, long commands
+// that the importer skips.
 #include "tests/secondreader/SceneGenerator.h"
 
 namespace secondreader {

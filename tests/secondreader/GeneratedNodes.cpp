@@ -184,7 +184,7 @@ void SceneGenerator::animateFocalLength(const std::string& camera) {
   connect(driver + ".o", camera + (dice_.chance(60) ? ".fl" : ".focalLength"));
 }
 
-// An aim constraint, wired as it comes out of Maya but for what is left out.
+// An aim constraint, wired as Maya writes it, with some parts left out.
 void SceneGenerator::constraint(const std::string& turned, const std::string& target) {
   const std::string name = newName("aim");
   createNode(dice_.chance(50) ? "aimConstraint" : "lookAt", name, turned);

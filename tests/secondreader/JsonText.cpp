@@ -6,8 +6,8 @@
 namespace secondreader {
 namespace {
 
-// The character that the text begins with: how many bytes it takes and its number; no bytes where these are
-// no UTF-8.
+// The character that the text begins with: its length in bytes and its number; length 0 where the bytes are
+// not valid UTF-8.
 struct Character {
   std::size_t length = 0;
   unsigned long number = 0;

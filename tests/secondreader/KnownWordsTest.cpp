@@ -1,5 +1,5 @@
-// Every word that the second reader knows stands in the generated scenes, and in what the fuzzer makes scenes
-// of: a word that nobody writes is compared by nothing.
+// Every word that the second reader knows is in the generated scenes, and in the words of the fuzzer:
+// otherwise nothing would compare how the two readers take it.
 #include "tests/secondreader/KnownWords.h"
 
 #include <gtest/gtest.h>

@@ -98,7 +98,7 @@ TEST_P(ListSweepTest, AnExceptionOutOfAListGivesThePredictedTrace) {
   ExpectAsPredicted(Failure::Kind::Other, 0);
 }
 
-// What is built then depends on what the list holds, which nobody predicts.
+// What is built then depends on the content of the list, which is not predicted.
 TEST_P(ListSweepTest, AListThatDoesNothingAndSaysSuccessGivesNoUnknownCodeAndShowsNothingElse) {
   ForEachPoint([this](const std::string& service, std::size_t number, std::size_t) {
     refhost::HostOptions options = Options();

@@ -1,4 +1,4 @@
-// The second reader's own matrices, against turns that can be followed with the fingers of the right hand.
+// The second reader's own matrices, compared with turns that follow from the right-hand rule.
 #include "tests/secondreader/Matrices.h"
 
 #include <gmock/gmock.h>

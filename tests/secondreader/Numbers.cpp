@@ -36,7 +36,7 @@ struct Decimal {
   long power = 0;
 };
 
-// An exponent of more digits is as good as endless: no text has so many others.
+// An exponent of more digits counts as infinite: no text has enough digits to outweigh it.
 constexpr std::size_t kLongestExponent = 9;
 
 // Takes an exponent off the front, if a whole one stands there.

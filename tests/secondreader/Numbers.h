@@ -17,7 +17,7 @@ HostError readNumber(std::string_view text, double* value);
 // -1, 0 or 1 as the first ratio is smaller, equal or greater. The denominators are not 0.
 int compareRatios(const HostRatio& a, const HostRatio& b);
 
-// What is before the point, held at the ends of the type; 0 for what is no number.
+// The part before the point, clamped to the range of the type; 0 for NaN.
 std::int32_t wholePart(double value);
 std::uint32_t wholePartUnsigned(double value);
 

@@ -56,10 +56,10 @@ class PlayedHost {
   PlayedHost(const PlayedHost&) = delete;
   PlayedHost& operator=(const PlayedHost&) = delete;
 
-  // Shows what becomes of a standard exception; the code for it.
+  // Shows the message for a standard exception, and returns its code.
   HostError translateAndReport(const std::exception& exception);
 
-  // Runs the work; the code that it ended with, of an integer or of a standard exception.
+  // Runs the work, and returns its code: 0, a thrown integer, or that of a standard exception.
   template <typename Work>
   HostError guarded(Work work) {
     try {
@@ -72,7 +72,7 @@ class PlayedHost {
     }
   }
 
-  // The same where no exception passes; the code of an unknown one is that of any other failure.
+  // The same where no exception may leave: an unknown one has the code of any other failure.
   template <typename Work>
   HostError atBorder(Work work) {
     try {

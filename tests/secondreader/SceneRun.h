@@ -1,6 +1,6 @@
-// Runs a scene through the importer under the embedded host, and holds what came of it to the prediction.
-// Where the process is to end, that is a process of its own, which has to end by SIGABRT with the predicted
-// trace after it.
+// Runs a scene through the importer under the embedded host, and compares the result with the prediction.
+// Where the process is to end, the run has a process of its own, which must end by SIGABRT and leave the
+// predicted trace.
 #pragma once
 
 #include <cstdint>

@@ -1,5 +1,4 @@
-// A second reader of scenes: slow and plain, it predicts what the plug-in makes of one under the embedded
-// host.
+// A second reader of scenes: slow and plain, it predicts the calls of the plug-in under the embedded host.
 #pragma once
 
 #include <cstdint>
@@ -13,7 +12,7 @@
 
 namespace secondreader {
 
-// What a callback comes to.
+// The predicted result of a callback.
 struct PredictedCallback {
   HostError code = 0;
   bool canImport = false;
@@ -24,7 +23,7 @@ struct PredictedCallback {
   std::map<std::string, std::int64_t> counts;  // by call and service; only in the callback of the rehearsal
 };
 
-// What is there after all callbacks.
+// The predicted state after all callbacks.
 struct Made {
   std::string importerName;
   std::size_t extensions = 0;

@@ -1,5 +1,4 @@
-// Generated scenes: what the importer does with each is what the second reader says, also when the host
-// fails.
+// Generated scenes: the second reader predicts what the importer does with each, also when the host fails.
 #include <gtest/gtest.h>
 
 #include <map>

@@ -102,7 +102,7 @@ class SuiteUser {
   std::array<bool, kSuiteCount> held_{};
 };
 
-// Runs work(suites) and then gives the suites back, whatever comes out of it.
+// Runs work(suites) and then gives the suites back, also where the work throws.
 template <typename Work>
 void withSuites(PlayedHost& host, Work work) {
   SuiteUser suites(host);

@@ -9,7 +9,7 @@
 
 namespace secondreader {
 
-// How well the doubles of a line can be known by who works them out in another way.
+// The precision that the doubles of a line have for a reader that computes them in another way.
 enum class Rounding {
   None,      // bit for bit
   Last,      // they went through a sine or a cosine: to 1e-12 of their size

@@ -1,4 +1,4 @@
-// Scene texts in pieces: what a test of the composition builder says of a scene, and nothing else.
+// Scene texts in pieces: only the lines that a test of the composition builder needs.
 #pragma once
 
 #include <string>

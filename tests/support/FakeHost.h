@@ -1,4 +1,4 @@
-// A host that is nothing but a record of what it was asked for.
+// A host that only records what it is asked for.
 #pragma once
 
 #include <cstdint>

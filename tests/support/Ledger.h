@@ -1,4 +1,4 @@
-// What the host's utility library still holds, and its rehearsal of failures, in the forms that tests want.
+// The objects that the host's utility library still holds, and its rehearsal of failures, in forms for tests.
 #pragma once
 
 #include <cstdint>

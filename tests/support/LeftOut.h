@@ -1,5 +1,5 @@
-// The word with which a test begins the line that says what it leaves out, because this machine does not have
-// it. scripts/test repeats these lines where it ends.
+// The beginning of a line with which a test reports what it leaves out, because this machine does not have
+// it. scripts/test repeats these lines at its end.
 #pragma once
 
 namespace testsupport {

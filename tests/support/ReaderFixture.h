@@ -1,4 +1,4 @@
-// The reader over a text, with a host that keeps its messages; and the scene that came of it.
+// Runs the reader over a text, with a host that keeps its messages, and gives the resulting scene.
 #pragma once
 
 #include <gmock/gmock.h>

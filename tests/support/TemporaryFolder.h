@@ -1,4 +1,4 @@
-// A folder of a test's own, gone with all that is in it when the test is.
+// A folder of a test's own. It is removed, with all that is in it, at the end of the test.
 #pragma once
 
 #include <stdlib.h>

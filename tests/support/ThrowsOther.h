@@ -1,4 +1,4 @@
-// The exception that nobody knows by its type.
+// An exception that is neither an integer nor a standard exception.
 #pragma once
 
 #include <exception>

@@ -1,5 +1,5 @@
-// What the module's code asks the utility library for where nothing that comes back shows it: sizes, flags,
-// and the order in which lists go.
+// Records arguments of calls of the utility library that their results do not show: sizes, flags, and the
+// order in which lists are disposed of.
 //
 // A program that compiles UtilityCalls.cpp calls these services through it. Each call is noted and passed on.
 #pragma once

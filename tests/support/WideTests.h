@@ -1,4 +1,4 @@
-// How much the tests do that could go on for minutes. MAYASCENE_TESTS in the environment chooses:
+// The share of the long tests that runs. MAYASCENE_TESTS in the environment chooses it:
 //
 //   (not set)  a quick share, so that all tests together take about a minute
 //   wide       what scripts/test --all runs; under the sanitizers, which take ten times as long, a part of it
@@ -21,7 +21,7 @@ inline bool WideTestsWanted() {
   return AllTestsWanted() || (wanted != nullptr && std::string_view(wanted) == "wide");
 }
 
-// Of something that has no end, or that ends too late.
+// For work that has no end, or a late one.
 struct Share {
   std::size_t quick;
   std::size_t wide;
