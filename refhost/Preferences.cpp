@@ -1,13 +1,13 @@
 #include "refhost/Preferences.h"
 
-#include <unistd.h>
-
 #include <charconv>
 #include <cstdlib>
 #include <fstream>
 #include <string_view>
 #include <system_error>
 #include <utility>
+
+#include "text/FileBeside.h"
 
 namespace refhost {
 namespace {
@@ -67,27 +67,18 @@ bool Preferences::write(std::string* failure) const {
     *failure = "the preferences have no file";
     return false;
   }
-  std::error_code error;
-  // A link stays; the file that it points to is written.
-  fs::path target = fs::weakly_canonical(file_, error);
-  if (error) target = file_;
-  if (target.has_parent_path()) fs::create_directories(target.parent_path(), error);
-  fs::path beside = target;
-  beside += '.' + std::to_string(getpid()) + ".new";
-  std::ofstream out(beside, std::ios::binary | std::ios::trunc);
+  std::string lines;
   for (const auto& [section, entries] : sections_) {
     if (!fitsALine(section)) continue;
-    out << '[' << section << "]\n";
+    lines += '[' + section + "]\n";
     for (const auto& [key, value] : entries) {
-      if (fitsALine(key)) out << key << '=' << std::to_string(value) << '\n';
+      if (fitsALine(key)) lines += key + '=' + std::to_string(value) + '\n';
     }
   }
-  out.close();
-  if (out) {
-    fs::rename(beside, target, error);
-    if (!error) return true;
-  }
-  fs::remove(beside, error);
+  std::error_code ignored;
+  const fs::path place = fs::weakly_canonical(file_, ignored);
+  if (place.has_parent_path()) fs::create_directories(place.parent_path(), ignored);
+  if (text::ReplaceFile(file_.string(), lines)) return true;
   *failure = "the preferences cannot be written to " + file_.string();
   return false;
 }

@@ -7,12 +7,11 @@
 #include <cerrno>
 #include <cstdio>
 #include <cstring>
-#include <filesystem>
 #include <optional>
-#include <system_error>
 #include <utility>
 #include <vector>
 
+#include "text/FileBeside.h"
 #include "tools/mayascene/DescriptorBuffer.h"
 #include "tools/mayascene/Interruption.h"
 
@@ -20,32 +19,10 @@ namespace mayascene {
 namespace {
 
 constexpr mode_t kNewFileMode = 0666;  // reduced by the user's mask
-constexpr mode_t kPermissionBits = 07777;
-constexpr int kMostLinks = 40;  // the most symbolic links in a row, as in the system
 
 std::string cannotWrite(const std::string& target, int number) {
   const std::string name = target == kStandardOutput ? "standard output" : target;
   return name + " cannot be written: " + std::strerror(number);
-}
-
-// A name in the same folder that is not in use.
-std::string nameBeside(const std::filesystem::path& place) {
-  static int serial = 0;
-  const std::string name = ".mayascene-" + std::to_string(::getpid()) + '-' + std::to_string(++serial);
-  return (place.parent_path() / name).string();
-}
-
-// Where a file belongs. Symbolic links are followed, so that they stay links; the target of the last one need
-// not exist. Empty where they form a circle.
-std::filesystem::path placeOf(const std::string& target) {
-  std::filesystem::path place = target;
-  for (int links = 0; links < kMostLinks; ++links) {
-    std::error_code isNoLink;
-    const std::filesystem::path next = std::filesystem::read_symlink(place, isNoLink);
-    if (isNoLink) return place;
-    place = place.parent_path() / next;
-  }
-  return {};
 }
 
 }  // namespace
@@ -53,10 +30,10 @@ std::filesystem::path placeOf(const std::string& target) {
 struct OutputFile::State {
   explicit State(std::string shownName) : target(std::move(shownName)) {}
   ~State() {
-    if (!beside.empty()) {
-      ::unlink(beside.c_str());
-      forgetUnfinished(beside.c_str());
-    }
+    // A signal may come between the two.
+    const std::string beside = file.beside();
+    file.Remove();
+    if (!beside.empty()) forgetUnfinished(beside.c_str());
     if (log) flushWhenTerminated(nullptr);
     closeDescriptor();
   }
@@ -74,27 +51,24 @@ struct OutputFile::State {
     return held > STDERR_FILENO ? ::close(held) : 0;
   }
 
-  // Opens a new file beside the place of a regular file.
-  bool openBeside(const struct stat* existing) {
-    place = placeOf(target).string();
-    if (place.empty()) {
-      errno = ELOOP;
-      return false;
-    }
-    beside = nameBeside(place);
-    rememberUnfinished(beside.c_str());
-    const int opened = ::open(beside.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, kNewFileMode);
+  // Opens a new file beside the place of a regular file. Its name is known to the signals before it exists.
+  bool openBeside() {
+    if (!file.FindPlace(target)) return false;
+    rememberUnfinished(file.beside().c_str());
+    const int opened = file.Create();
     if (opened < 0) return false;
     attach(opened);
-    return existing == nullptr || ::fchmod(opened, existing->st_mode & kPermissionBits) == 0;
+    return true;
   }
 
   // Gives a file at the place a second name. It keeps the first one where the file system has hard links, so
   // that there is a whole file at any moment. Anything but a regular file stays, and place() reports it.
   bool keep() {
     struct stat existing {};
-    if (beside.empty() || ::lstat(place.c_str(), &existing) != 0 || !S_ISREG(existing.st_mode)) return true;
-    kept = nameBeside(place);
+    const std::string& place = file.place();
+    if (file.beside().empty() || ::lstat(place.c_str(), &existing) != 0 || !S_ISREG(existing.st_mode))
+      return true;
+    kept = text::NameBeside(place);
     if (::link(place.c_str(), kept.c_str()) == 0 || std::rename(place.c_str(), kept.c_str()) == 0)
       return true;
     kept.clear();
@@ -108,8 +82,9 @@ struct OutputFile::State {
   // Restores the state before keep(). A kept file that cannot take its place again stays under its second
   // name, which is reported.
   void putBack(std::string* failure) {
+    const std::string& place = file.place();
     if (kept.empty()) {
-      if (beside.empty() && !place.empty()) ::unlink(place.c_str());
+      if (file.beside().empty() && !place.empty()) ::unlink(place.c_str());
     } else if (std::rename(kept.c_str(), place.c_str()) == 0) {
       // rename keeps both names where they belong to the same file.
       ::unlink(kept.c_str());
@@ -118,10 +93,9 @@ struct OutputFile::State {
     }
   }
 
-  std::string target;  // as the user named it
-  std::string place;   // where the file belongs
-  std::string beside;  // where it is written until it is whole; empty: written in place, or already placed
-  std::string kept;    // the file that was at the place, until all outputs have theirs; empty: there was none
+  std::string target;     // as the user named it
+  text::FileBeside file;  // without a name beside its place: written in place, or already placed
+  std::string kept;  // the file that was at the place, until all outputs have theirs; empty: there was none
   int descriptor = -1;
   bool log = false;
   std::optional<DescriptorBuffer> buffer;
@@ -145,9 +119,7 @@ std::unique_ptr<OutputFile> OutputFile::open(const std::string& target, std::str
     opened = descriptor >= 0;
     if (opened) state->attach(descriptor);
   } else {
-    // A file that its owner has made read-only is not replaced, although the folder would allow it.
-    opened =
-        (!exists || ::access(target.c_str(), W_OK) == 0) && state->openBeside(exists ? &existing : nullptr);
+    opened = state->openBeside();
   }
   if (!opened) {
     *failure = cannotWrite(target, errno);
@@ -182,13 +154,13 @@ bool OutputFile::finish(std::string* failure) {
 
 bool OutputFile::place(std::string* failure) {
   State& state = *state_;
-  if (state.beside.empty()) return true;
-  if (std::rename(state.beside.c_str(), state.place.c_str()) != 0) {
+  const std::string beside = state.file.beside();
+  if (beside.empty()) return true;
+  if (!state.file.TakePlace()) {
     *failure = cannotWrite(state.target, errno);
     return false;
   }
-  forgetUnfinished(state.beside.c_str());
-  state.beside.clear();
+  forgetUnfinished(beside.c_str());
   return true;
 }
 
