@@ -3,6 +3,7 @@
 #include <algorithm>
 
 #include "text/Letters.h"
+#include "text/Utf8.h"
 
 namespace bake {
 namespace {
@@ -22,7 +23,7 @@ bool MayStand(char c) {
 std::string_view CutTo(std::string_view name, std::size_t longest) {
   if (name.size() <= longest) return name;
   std::size_t size = longest;
-  while (size > 0 && (static_cast<unsigned char>(name[size]) & 0xc0) == 0x80) --size;
+  while (size > 0 && text::IsContinuation(name[size])) --size;
   return name.substr(0, size != 0 ? size : longest);
 }
 

@@ -62,6 +62,8 @@ class TransformLookAts {
     } else if (target != nullptr && target->source.node == lookAt) {
       Say(Code::LookAtWeightLast, target->destinationPlace, lookAt, camera);
     } else {
+      // The import aims the camera, whether or not a bake can compute the look-at.
+      said_.insert(lookAt);
       ReportTurn(lookAt, camera);
     }
   }

@@ -151,7 +151,8 @@ void ReportNames(const Subject& subject) {
     if (list == List::None) continue;
     const std::string_view name = ImportName(subject.scene, node);
     if (name.empty()) {
-      ReportUnusableName(subject, node);
+      // What the file does not create has no name of its own.
+      if (node.origin == scene::Origin::Created) ReportUnusableName(subject, node);
     } else if (const std::string_view first = names.Meet(list, name); !first.empty()) {
       ReportNamesake(subject, node, name, first);
     }

@@ -20,7 +20,7 @@ namespace {
 
 // More frames of a scene, and more layers times frames of all cameras, are not looked at.
 constexpr double kMostFrames = 100'000;
-constexpr double kMostSteps = 2'000'000;
+constexpr double kMostSteps = 1'000'000;
 
 class Shifts {
  public:

@@ -2,7 +2,9 @@
 #include <cmath>
 #include <optional>
 #include <string>
+#include <string_view>
 
+#include "check/PointsPerUnit.h"
 #include "check/RulesInternal.h"
 #include "text/Numbers.h"
 
@@ -55,17 +57,26 @@ void CompareRate(const Subject& subject, double made) {
                              {text::RoundedNumber(meant), text::RoundedNumber(made)});
 }
 
+// Reports a unit in which lengths come over in another size than in centimetres.
+void CompareLengths(const Subject& subject) {
+  const auto& unit = subject.settings.centimetersPerUnit;
+  if (unit.value == 1.0) return;
+  const std::string_view word = subject.scene.linearUnit().word;
+  std::string what = "one unit becomes a point of the composition";
+  if (subject.cameOver.distancesConverted) {
+    const double times = PointsPerUnit(word) / (unit.value * PointsPerUnit("centimeter"));
+    if (std::fabs(times - 1.0) < 1e-6) return;
+    what = "distances come over " + text::RoundedNumber(times) + " times too large";
+  }
+  subject.diagnostics.Report(Code::OtherLengthUnit, unit.place.value_or(diag::Range{}), {word, what});
+}
+
 }  // namespace
 
 void ReportPicture(const Subject& subject) {
   // Without a layer nothing is shown that could look otherwise.
   if (!subject.cameOver.composition || subject.cameOver.layers.empty()) return;
-  const scene::Settings& settings = subject.settings;
-  if (settings.centimetersPerUnit.value != 1.0 && !subject.cameOver.distancesConverted) {
-    subject.diagnostics.Report(Code::OtherLengthUnit,
-                               settings.centimetersPerUnit.place.value_or(diag::Range{}),
-                               {subject.scene.linearUnit().word});
-  }
+  CompareLengths(subject);
   const CameOverComposition& composition = *subject.cameOver.composition;
   CompareSize(subject, composition);
   CompareRate(subject, composition.framesPerSecond);

@@ -5,6 +5,7 @@
 
 #include "diag/Columns.h"
 #include "diag/ShownText.h"
+#include "text/Utf8.h"
 
 namespace diag {
 namespace {
@@ -15,8 +16,6 @@ constexpr std::size_t kMost = 100;
 
 constexpr std::string_view kCut = "...";
 
-bool IsInsideCharacter(char c) { return (static_cast<unsigned char>(c) & 0xc0) == 0x80; }
-
 // Tabs are shown as single blanks, so that the mark stands under its text everywhere.
 std::string Shown(std::string_view bytes) {
   std::string blanks(bytes);
@@ -26,7 +25,8 @@ std::string Shown(std::string_view bytes) {
 
 // Moves a place to the beginning of the character that it is in, within a few bytes.
 std::size_t AtCharacter(std::string_view line, std::size_t at) {
-  for (int steps = 0; steps < 3 && at > 0 && at < line.size() && IsInsideCharacter(line[at]); ++steps) --at;
+  for (int steps = 0; steps < 3 && at > 0 && at < line.size() && text::IsContinuation(line[at]); ++steps)
+    --at;
   return at;
 }
 

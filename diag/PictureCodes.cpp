@@ -147,15 +147,17 @@ constexpr Entry kPictureCodes[] = {
     {.code = Code::OtherLengthUnit,
      .severity = Severity::Warning,
      .symbol = "OtherLengthUnit",
-     .sentence = "the scene's unit of length is \"{0}\": one unit becomes a point of the composition",
+     .sentence = "the scene's unit of length is \"{0}\": {1}",
      .meaning =
          "The importer takes distances as they stand in the file. A scene in another unit comes over in "
-         "another size than the same scene in centimetres.",
+         "another size than the same scene in centimetres. With --linear-units 1 distances are converted: "
+         "right "
+         "for most units, but metres come over 100 times and kilometres 2.54 times too large.",
      .example = "currentUnit -l meter -a degree -t film;",
      .help =
          "Nothing has to be done, unless cameras from several scenes have to fit together: then set the "
          "same unit in all of them, or import with --linear-units 1. Set centimetres in a scene in metres or "
-         "kilometres: with --linear-units 1 it comes over 100 or 2.54 times too large."},
+         "kilometres."},
     {.code = Code::BeyondCompositionTime,
      .severity = Severity::Warning,
      .symbol = "BeyondCompositionTime",

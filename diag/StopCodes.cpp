@@ -22,7 +22,9 @@ constexpr Entry kStopCodes[] = {
          "A Maya ASCII scene is a text that begins with \"//Maya\". This file begins differently, so the "
          "importer does not read it.",
      .example = "#usda 1.0",
-     .help = "Save the scene as Maya ASCII (.ma), and give that file."},
+     .help = "Save the scene as Maya ASCII (.ma), and give that file. If a line that begins with \"//Maya\" "
+             "stands "
+             "further down, remove what is above it."},
     {.code = Code::MayaBinary,
      .severity = Severity::Error,
      .symbol = "MayaBinary",

@@ -1,4 +1,4 @@
-// Text for output: bytes that others wrote become valid UTF-8, and JSON strings.
+// Text for output: bytes and units that others wrote become valid UTF-8.
 #pragma once
 
 #include <string>
@@ -13,9 +13,5 @@ std::string shownText(std::string_view bytes);
 
 // NUL-terminated units as UTF-8, each lone surrogate replaced by U+FFFD. Not for null.
 std::string shownUnits(const HostUTF16Unit* units);
-
-// Appends the bytes as a JSON string with its quotes: invalid UTF-8 as in shownText, quotes and backslashes
-// escaped, control characters (those from U+007F to U+009F too) as \u00xx.
-void appendJsonText(std::string& line, std::string_view bytes);
 
 }  // namespace refhost

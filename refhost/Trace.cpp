@@ -32,7 +32,7 @@ std::string extensionText(const HostImporterExtension& extension) {
 TraceLine::TraceLine(const HandleCodec& codec, const char* call, bool gave) : codec_(codec), gave_(gave) {
   line_.reserve(kTypicalLine);
   line_ += "{\"call\":";
-  appendJsonText(line_, call);
+  appendText(call);
 }
 
 void TraceLine::key(const char* name) {
@@ -64,14 +64,14 @@ TraceLine& TraceLine::text(const char* name, const char* bytes) {
   if (bytes == nullptr) {
     appendNull();
   } else {
-    appendJsonText(line_, bytes);
+    appendText(bytes);
   }
   return *this;
 }
 
 TraceLine& TraceLine::text(const char* name, const std::string& bytes) {
   key(name);
-  appendJsonText(line_, bytes);
+  appendText(bytes);
   return *this;
 }
 
@@ -173,9 +173,9 @@ TraceLine& TraceLine::types(const char* name, const HostImporterType* types, std
   line_ += '[';
   for (std::int32_t i = 0; i < count; ++i) {
     line_ += i == 0 ? "{\"type\":" : ",{\"type\":";
-    appendJsonText(line_, fourCharacters(types[i].type));
+    appendText(fourCharacters(types[i].type));
     line_ += ",\"creator\":";
-    appendJsonText(line_, fourCharacters(types[i].creator));
+    appendText(fourCharacters(types[i].creator));
     line_ += '}';
   }
   line_ += ']';
@@ -192,7 +192,7 @@ TraceLine& TraceLine::extensions(const char* name, const HostImporterExtension* 
   line_ += '[';
   for (std::int32_t i = 0; i < count; ++i) {
     if (i != 0) line_ += ',';
-    appendJsonText(line_, extensionText(extensions[i]));
+    appendText(extensionText(extensions[i]));
   }
   line_ += ']';
   return *this;

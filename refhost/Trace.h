@@ -11,6 +11,7 @@
 #include "hostapi/HostTypes.h"
 #include "hostapi/StreamSuite.h"
 #include "refhost/Handles.h"
+#include "text/JsonText.h"
 
 namespace refhost {
 
@@ -55,6 +56,7 @@ class TraceLine {
   void appendInteger(std::int64_t value);
   void appendNumber(double value);
   void appendNull() { line_ += "null"; }
+  void appendText(std::string_view bytes) { text::AppendJsonText(&line_, bytes, text::JsonForm::Utf8); }
 
   const HandleCodec& codec_;
   bool gave_;

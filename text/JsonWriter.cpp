@@ -5,46 +5,16 @@
 #include <cmath>
 #include <string>
 
-#include "text/Utf8.h"
+#include "text/JsonText.h"
 
 namespace text {
 namespace {
 
-void AppendUnit(std::string* text, unsigned unit) {
-  constexpr char kDigits[] = "0123456789abcdef";
-  *text += "\\u";
-  for (const unsigned shift : {12u, 8u, 4u, 0u}) *text += kDigits[(unit >> shift) & 0xfu];
-}
-
-void AppendCharacter(std::string* text, char32_t point) {
-  constexpr char32_t kFirstOfPairs = 0x10000;
-  constexpr std::string_view kShort = "\b\t\n\f\r\"\\";
-  constexpr std::string_view kLetters = "btnfr\"\\";
-  const std::size_t place = point < 0x80 ? kShort.find(static_cast<char>(point)) : std::string_view::npos;
-  if (place != std::string_view::npos) {
-    *text += '\\';
-    *text += kLetters[place];
-  } else if (point >= 0x20 && point < 0x7f) {
-    *text += static_cast<char>(point);
-  } else if (point < kFirstOfPairs) {
-    AppendUnit(text, point);
-  } else {
-    AppendUnit(text, 0xd800u + ((point - kFirstOfPairs) >> 10));
-    AppendUnit(text, 0xdc00u + ((point - kFirstOfPairs) & 0x3ffu));
-  }
-}
-
-// Writes ASCII only, and everything else as \uXXXX: so a name cannot control a terminal that shows the JSON.
 std::string Quoted(std::string_view bytes) {
-  constexpr char32_t kReplacement = 0xfffd;
-  std::string text = "\"";
+  std::string text;
   text.reserve(bytes.size() + 2);
-  for (std::size_t at = 0; at < bytes.size();) {
-    const Character character = CharacterAt(bytes, at);
-    AppendCharacter(&text, character.length == 0 ? kReplacement : character.point);
-    at += character.length == 0 ? 1 : character.length;
-  }
-  return text += '"';
+  AppendJsonText(&text, bytes, JsonForm::Ascii);
+  return text;
 }
 
 }  // namespace

@@ -19,7 +19,7 @@ Character CharacterAt(std::string_view bytes, std::size_t at) {
   char32_t point = first & (0x7fu >> length);
   for (std::size_t i = 1; i < length; ++i) {
     const std::uint8_t byte = ByteAt(bytes, at + i);
-    if ((byte & 0xc0) != 0x80) return kInvalid;
+    if (!IsContinuation(static_cast<char>(byte))) return kInvalid;
     point = (point << 6) | (byte & 0x3fu);
   }
   const bool surrogate = point >= 0xd800 && point < 0xe000;

@@ -19,6 +19,9 @@ Character CharacterAt(std::string_view bytes, std::size_t at);
 
 bool IsUtf8(std::string_view bytes);
 
+// Whether the byte stands inside a character, after its first byte.
+inline bool IsContinuation(char byte) { return (static_cast<unsigned char>(byte) & 0xc0) == 0x80; }
+
 // The bytes, with U+FFFD for each byte that is not part of valid UTF-8.
 std::string ValidUtf8(std::string_view bytes);
 

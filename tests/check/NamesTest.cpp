@@ -18,6 +18,12 @@ TEST(NamesTest, TwoNodesOfOneName) {
   EXPECT_EQ(checked.LineOf(Code::SameNames), 13u);
 }
 
+TEST(NamesTest, AParentThatIsNotInTheFileIsNotANodeWithoutAName) {
+  const Checked checked(CameraScene("") + "createNode camera -n \"otherShape\" -p \"nosuch\";\n");
+  EXPECT_EQ(checked.CountOf(Code::ParentElsewhere), 1u);
+  EXPECT_EQ(checked.CountOf(Code::NodeWithoutName), 0u);
+}
+
 TEST(NamesTest, NamesThatDifferInCase) {
   const Checked checked(CameraScene("") + "createNode transform -n \"SHOTCAM\";\n");
   EXPECT_EQ(checked.SentenceOf(Code::NamesDifferInCase),

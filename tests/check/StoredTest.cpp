@@ -190,5 +190,24 @@ TEST(StoredTest, ALookAtThatIsNotTakenIsSaidOnce) {
   EXPECT_GE(Checked(text, wanted).CountOf(Code::DriverWithoutAnswer), 1u);
 }
 
+TEST(StoredTest, ALookAtThatIsTakenIsNotSaidToKeepAStoredValue) {
+  // The import needs no weight; the evaluation does, and cannot compute what drives it.
+  std::string text = CameraScene(
+      "", "",
+      "createNode transform -n \"point\";\n\tsetAttr \".t\" -type \"double3\" 5 6 -7 ;\n"
+      "createNode aimConstraint -n \"aim\" -p \"shotCam\";\n\tsetAttr \".a\" -type \"double3\" 0 0 -1 ;\n"
+      "connectAttr \"shotCam.translate\" \"aim.constraintTranslate\";\n"
+      "connectAttr \"aim.w0\" \"aim.target[0].targetWeight\";\n"
+      "connectAttr \"point.translate\" \"aim.target[0].targetTranslate\";\n");
+  for (const char axis : {'X', 'Y', 'Z'}) {
+    text += std::string("connectAttr \"aim.constraintRotate") + axis + "\" \"shotCam.rotate" + axis + "\";\n";
+  }
+  const Checked checked(text);
+  ASSERT_EQ(checked.cameOver().layers.size(), 1u);
+  EXPECT_TRUE(checked.cameOver().layers[0].aimed);
+  EXPECT_EQ(checked.CountOf(Code::DriverWithoutAnswer), 0u) << checked.All();
+  EXPECT_EQ(checked.CountOf(Code::ShiftNotMeasured), 1u);
+}
+
 }  // namespace
 }  // namespace check_test

@@ -1,6 +1,7 @@
 """The documents themselves: links, names of files, and what README.md takes from the code."""
 
 import re
+import subprocess
 import unittest
 
 from project import ROOT, read
@@ -10,6 +11,10 @@ DOCUMENTS = ["README.md", "CHANGELOG.md", "CONTRIBUTING.md", "SECURITY.md", "exa
 )
 LINK = re.compile(r"\[[^\]]*\]\(([^)\s]+)\)")
 FENCED = re.compile(r"^```.*?^```$", re.MULTILINE | re.DOTALL)
+QUOTED_NAME = re.compile(r"`((?:\w+::)*[A-Za-z]\w*)(?:\(\))?`")
+ABOUT_CODE = ["CONTRIBUTING.md", "docs/architecture.md", "docs/host-interface.md", "docs/performance.md",
+              "docs/reliability.md", "tests/README.md"]
+SPELLINGS = {"camelCase", "camelCase_", "PascalCase", "UPPER_CASE", "kPascalCase"}  # rules for names, and no names
 QUOTED_FILE = re.compile(r"`((?:[\w.]+/)*[\w.]+\.(?:h|cpp|ma|md|json|txt))`")
 
 
@@ -53,6 +58,23 @@ class Documents(unittest.TestCase):
             for file in QUOTED_FILE.findall(read(name)):
                 if "/" in file:
                     self.assertTrue((ROOT / file).exists(), f"{name} names {file}")
+
+    def test_every_name_of_the_code_that_is_named_exists(self):
+        listed = subprocess.run(["git", "-C", ROOT, "ls-files", "-z", "*.cpp", "*.h", "*.py", "*.txt", "*.cmake", "*.ma"],
+                                check=True, capture_output=True, text=True).stdout
+        words = set()
+        for name in listed.split("\0"):
+            if name and (ROOT / name).is_file():
+                words.update(re.findall(r"\w+", (ROOT / name).read_text(encoding="utf-8", errors="replace")))
+        looked = 0
+        for name in ABOUT_CODE:
+            for quoted in QUOTED_NAME.findall(read(name)):
+                if not re.search(r"::|[a-z][A-Z]|_", quoted):
+                    continue
+                for word in quoted.split("::"):
+                    self.assertTrue(word in words or word in SPELLINGS, f"{name} names {quoted}")
+                looked += 1
+        self.assertGreater(looked, 100)
 
     def test_the_exit_statuses_are_those_of_the_help(self):
         table = re.findall(r"^\| (\d) \| (.+) \|$", read("README.md"), re.MULTILINE)

@@ -5,12 +5,6 @@
 namespace refhost {
 namespace {
 
-std::string json(std::string_view bytes) {
-  std::string line;
-  appendJsonText(line, bytes);
-  return line;
-}
-
 struct Case {
   const char* name;
   std::string bytes;
@@ -39,17 +33,7 @@ const Case kCases[] = {
 TEST(ShownText, EachByteThatIsNotValidUtf8IsReplaced) {
   for (const Case& c : kCases) {
     EXPECT_EQ(shownText(c.bytes), c.shown) << c.name;
-    EXPECT_EQ(json(c.bytes), "\"" + c.shown + "\"") << c.name;
   }
-}
-
-TEST(ShownText, JsonEscapesQuotesAndBackslashes) { EXPECT_EQ(json("a\"b\\c/"), "\"a\\\"b\\\\c/\""); }
-
-TEST(ShownText, JsonEscapesEveryControlCharacterByItsNumber) {
-  EXPECT_EQ(json(std::string("\0\t\n\x1b\x1f ", 6)), "\"\\u0000\\u0009\\u000a\\u001b\\u001f \"");
-  EXPECT_EQ(json("\x7f"), "\"\\u007f\"");
-  EXPECT_EQ(json("\xC2\x80\xC2\x9B\xC2\x9F"), "\"\\u0080\\u009b\\u009f\"");
-  EXPECT_EQ(json("\xC2\xA0"), "\"\xC2\xA0\"");
 }
 
 TEST(ShownText, LoneSurrogatesOfUnitsAreReplaced) {
