@@ -162,9 +162,9 @@ FAULTS = (
           "if (value == 0.0 && std::signbit(value)) return literal(\"0\");"),
     Fault("the status of several scenes is that of the last", "tools/mayascene/ImportCommand.cpp",
           "status = worse(status, report.status);", "status = report.status;"),
-    Fault("an output replaces the link that leads to it", "tools/mayascene/OutputFile.cpp",
-          "place = placeOf(target).string();",
-          "place = placeOf(target).empty() ? std::string() : target;"),
+    Fault("an output replaces the link that leads to it", "text/FileBeside.cpp",
+          "place_ = WithoutLinks(target).string();",
+          "place_ = WithoutLinks(target).empty() ? std::string() : target;"),
     Fault("characters that turn the direction of text reach the terminal", "diag/ShownText.cpp",
           "(point >= 0x2028 && point <= 0x202e)", "(point >= 0x2028 && point <= 0x2029)"),
 )
