@@ -8,6 +8,8 @@
 #include "maya/Words.h"
 #include "plugin/ErrorCodes.h"
 
+namespace mayaimport {
+
 namespace {
 
 constexpr HostRatio kSquarePixels{1, 1};
@@ -77,3 +79,5 @@ VOR_CompItem* MAYA_Parse::CreateCompositions(VOR_Item* folder, const UTF16String
   ThrowOnError(LayerSuite10().AddLayerFromItem(item, display, &nested));
   return square;
 }
+
+}  // namespace mayaimport

@@ -8,6 +8,8 @@
 #include "maya/MAYA_Parse.h"
 #include "plugin/Globals.h"
 
+namespace mayaimport {
+
 void MAYA_Parse::SetCamera(VOR_Layer* layer, const MAYA_Camera* camera) {
   constexpr std::uint8_t kOff = 0;
   ThrowOnError(LayerSuite10().SetLayerFlag(layer, HOST_LAYER_FLAG_AIMED, kOff));
@@ -44,3 +46,5 @@ double MAYA_Parse::CalculateZoom(const MAYA_Camera* camera, double filmSize,
                                                 : static_cast<double>(resolutionWidth) * CalculateHSF();
   return imageSize * focal / filmSize;
 }
+
+}  // namespace mayaimport

@@ -7,6 +7,8 @@
 #include "plugin/Globals.h"
 #include "plugin/Guarded.h"
 
+namespace mayaimport {
+
 void MAYA_Parse::ApplyCameraAnimation(VOR_Layer* layer, const MAYA_Camera* camera) {
   ApplyZoomAnimation(layer, camera);
   const std::int32_t parent = transformNames_.Find(camera->parent);
@@ -51,3 +53,5 @@ void MAYA_Parse::InsertZoomKeys(VOR_AddKeyframesInfo* batch, VOR_Stream* stream,
     ThrowOnError(KeyframeSuite4().SetBatchKeyframeValue(batch, index, &value));
   }
 }
+
+}  // namespace mayaimport

@@ -8,6 +8,8 @@
 #include "maya/MAYA_Parse.h"
 #include "plugin/ErrorCodes.h"
 
+namespace mayaimport {
+
 namespace {
 
 // Deliberate: these three spellings alone mark a locator. "nULL" does not.
@@ -103,3 +105,5 @@ void MAYA_Parse::CollectConstraints() {
   }
   constraintOfTransform_ = std::move(constraints);
 }
+
+}  // namespace mayaimport

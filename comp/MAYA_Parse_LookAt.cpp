@@ -10,6 +10,8 @@
 #include "maya/Words.h"
 #include "plugin/Guarded.h"
 
+namespace mayaimport {
+
 bool MAYA_Parse::SetCameraLookAt(VOR_Layer* layer, const MAYA_Camera* camera,
                                  const MAYA_Transform* constraint) {
   const auto turned = FetchRecord<MAYA_Transform>(transforms, constraint->curve[kConstrainedSlot]);
@@ -46,3 +48,5 @@ void MAYA_Parse::SetAnchorPoint(VOR_Layer* layer, const MAYA_Transform* node) {
   SetThreeDStream(layer, HOST_STREAM_ANCHOR_POINT, ConvertDist(node->translate[0]),
                   -ConvertDist(node->translate[1]), -ConvertDist(node->translate[2]));
 }
+
+}  // namespace mayaimport

@@ -7,6 +7,8 @@
 #include "maya/MAYA_Parse.h"
 #include "maya/NodeChannels.h"
 
+namespace mayaimport {
+
 std::int32_t MAYA_Parse::VerifyAnimInfo(const MAYA_Transform* node) {
   channels_ = NodeChannels();
   NodeChannels found;
@@ -45,3 +47,5 @@ void MAYA_Parse::FetchAnimInfo(const MAYA_Transform& node, std::int32_t group, s
     values[axis] = FetchRecord<MAYA_Key>(channel.keys, channel.step == 0 ? 0 : n).value;
   }
 }
+
+}  // namespace mayaimport

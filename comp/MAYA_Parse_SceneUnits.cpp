@@ -4,6 +4,8 @@
 #include "maya/SceneUnits.h"
 #include "plugin/Globals.h"
 
+namespace mayaimport {
+
 double MAYA_Parse::ConvertDist(double distance) const {
   if (G_use_linear_unitsL == 0) return distance;
   switch (linearUnit) {
@@ -33,3 +35,5 @@ double MAYA_Parse::ConvertDist(double distance) const {
 double MAYA_Parse::ConvertRot(double angle) const {
   return angleUnit == kRadian ? angle * kDegreesToRadians : angle;
 }
+
+}  // namespace mayaimport

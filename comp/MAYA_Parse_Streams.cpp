@@ -7,6 +7,8 @@
 #include "plugin/Globals.h"
 #include "plugin/Guarded.h"
 
+namespace mayaimport {
+
 namespace {
 
 // Releases the stream at the end of its life, unless Release was called before.
@@ -88,3 +90,5 @@ void MAYA_Parse::EndAddingKeyframes(VOR_AddKeyframesInfo* batch) {
   constexpr std::int32_t kCommit = 1;
   KeyframeSuite3().EndKeyframeBatch(kCommit, batch);
 }
+
+}  // namespace mayaimport

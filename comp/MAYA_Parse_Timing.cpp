@@ -9,6 +9,8 @@
 #include "maya/SceneUnits.h"
 #include "plugin/Globals.h"
 
+namespace mayaimport {
+
 namespace {
 
 // One row per time unit, one column per use.
@@ -94,3 +96,5 @@ HostRatio MAYA_Parse::FindPixelAspectRatio() const {
 }
 
 double MAYA_Parse::CalculateHSF() const { return pixelAspect; }
+
+}  // namespace mayaimport

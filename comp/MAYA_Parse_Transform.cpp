@@ -6,6 +6,8 @@
 #include "maya/MAYA_Parse.h"
 #include "plugin/ErrorCodes.h"
 
+namespace mayaimport {
+
 void MAYA_Parse::ConvertPoint(const double* point, double (&host)[kAxisCount]) const {
   host[0] = ConvertDist(point[0]);
   host[1] = -ConvertDist(point[1]);
@@ -55,3 +57,5 @@ void MAYA_Parse::SetTransform(VOR_Layer* layer, const MAYA_Transform* node) {
   SetOneDStream(layer, HOST_STREAM_ROTATION_Z, at.rotation[2] * kRadiansToDegrees);
   SetThreeDStream(layer, HOST_STREAM_POSITION, at.translation[0], at.translation[1], at.translation[2]);
 }
+
+}  // namespace mayaimport

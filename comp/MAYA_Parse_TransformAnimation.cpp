@@ -8,6 +8,8 @@
 #include "maya/MAYA_Parse.h"
 #include "plugin/Guarded.h"
 
+namespace mayaimport {
+
 namespace {
 
 // The animated streams, in the order in which their batches are opened, filled and closed.
@@ -61,3 +63,5 @@ void MAYA_Parse::InsertTransformKeys(VOR_Layer* layer, const MAYA_Transform& nod
                          at.translation[1], at.translation[2]);
   }
 }
+
+}  // namespace mayaimport

@@ -3,6 +3,8 @@
 #include <algorithm>
 #include <cmath>
 
+namespace mayaimport {
+
 namespace {
 
 constexpr double kTurn = 6.283185307179586;
@@ -44,3 +46,5 @@ double UnwrapTurns(double angle, double previous) {
   while (angle - previous <= -kHalfTurn) angle += kTurn;
   return angle;
 }
+
+}  // namespace mayaimport

@@ -3,6 +3,8 @@
 
 #include <cmath>
 
+namespace mayaimport {
+
 inline constexpr double kHalfTurn = 3.141592653589793;
 
 // As UnwrapAngle, for angles that lie half a turn apart or more.
@@ -15,3 +17,5 @@ inline double UnwrapAngle(double angle, double previous) {
   // So for nearly every key.
   return std::fabs(angle - previous) < kHalfTurn ? angle : UnwrapTurns(angle, previous);
 }
+
+}  // namespace mayaimport

@@ -12,6 +12,8 @@
 #include "scan/SkipText.h"
 #include "tests/support/GuardedMemory.h"
 
+using namespace mayaimport;
+
 namespace {
 
 using fuzz::Require;

@@ -13,6 +13,8 @@
 #include "maya/MAYA_Parse.h"
 #include "tests/support/GuardedMemory.h"
 
+using namespace mayaimport;
+
 namespace {
 
 using fuzz::Require;

@@ -10,6 +10,8 @@
 #include "plugin/Globals.h"
 #include "plugin/Messages.h"
 
+using namespace mayaimport;
+
 namespace fuzz {
 namespace {
 

@@ -4,6 +4,8 @@
 
 #include "maya/SceneRecords.h"
 
+namespace mayaimport {
+
 namespace {
 
 constexpr std::string_view kCommand = "connectAttr \"";
@@ -62,3 +64,5 @@ bool ConnectionScout::ReadCommand(const char* end, Ends* ends) {
   next_ = line;
   return true;
 }
+
+}  // namespace mayaimport

@@ -7,6 +7,8 @@
 
 #include "maya/NameIndex.h"
 
+namespace mayaimport {
+
 class ConnectionScout {
  public:
   // Called once for every "connectAttr", with the place after the keyword. Reads nothing from `end` on.
@@ -29,3 +31,5 @@ class ConnectionScout {
   std::size_t reached_ = 0;     // commands whose turn has come
   Ends ends_[kFar];
 };
+
+}  // namespace mayaimport

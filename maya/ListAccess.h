@@ -6,6 +6,8 @@
 #include "hostutil/RecordList.h"
 #include "plugin/ErrorCodes.h"
 
+namespace mayaimport {
+
 // A copy of a record; zero-filled where the host hands nothing out.
 template <typename Record>
 Record FetchRecord(const RecordList* list, std::int64_t index) {
@@ -44,3 +46,5 @@ void ChangeRecord(RecordList* list, std::int64_t index, Change&& change) {
   change(*static_cast<Record*>(record));
   ThrowOnError(RecordListUnlock(list, index));
 }
+
+}  // namespace mayaimport

@@ -15,6 +15,8 @@
 #include "scan/FindEnd.h"
 #include "scan/SkipText.h"
 
+namespace mayaimport {
+
 namespace {
 
 struct Keyword {
@@ -256,3 +258,5 @@ void MAYA_Lex::NoteLine(std::int32_t code, const char* at) const {
   }
   HostNoteLine(code, number);
 }
+
+}  // namespace mayaimport

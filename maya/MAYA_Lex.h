@@ -7,6 +7,8 @@
 #include "plugin/Messages.h"
 #include "plugin/QZGP_SuiteHandler.h"
 
+namespace mayaimport {
+
 // The kinds of token. The numbers are fixed.
 enum MayaToken : std::int32_t {
   Unknown = 0,  // "-" before a byte that is no letter, digit, "-" or "."
@@ -97,3 +99,5 @@ class MAYA_Lex : public QZGP_SuiteHandler {
 
   const char* end_;  // the terminating NUL
 };
+
+}  // namespace mayaimport

@@ -8,6 +8,8 @@
 #include "maya/TokenText.h"
 #include "scan/LineFeeds.h"
 
+namespace mayaimport {
+
 MAYA_Parse::MAYA_Parse(const WNBasicSuite* basicSuite, const char* text, const char* end)
     : MAYA_Lex(basicSuite, text, end) {
   ClearCurrent();
@@ -149,3 +151,5 @@ void MAYA_Parse::ClearCurrent() {
   currentRecord_ = kNoIndex;
   std::memset(static_cast<void*>(&current), 0, sizeof current);
 }
+
+}  // namespace mayaimport

@@ -19,6 +19,8 @@
 #include "maya/SceneRecords.h"
 #include "maya/SceneUnits.h"
 
+namespace mayaimport {
+
 class MAYA_Parse : public MAYA_Lex {
  public:
   // ---- maya/MAYA_Parse.cpp: lifetime and the main loop ----
@@ -315,3 +317,5 @@ class MAYA_Parse : public MAYA_Lex {
   std::vector<std::int32_t> constraintOfTransform_;  // the first complete constraint that turns it
   NodeChannels channels_;                            // of the node that VerifyAnimInfo found in order last
 };
+
+}  // namespace mayaimport

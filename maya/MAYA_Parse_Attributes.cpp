@@ -9,6 +9,8 @@
 #include "maya/TokenText.h"
 #include "maya/Words.h"
 
+namespace mayaimport {
+
 namespace {
 
 // The triples of a transform.
@@ -186,3 +188,5 @@ bool MAYA_Parse::ReadLastNumber(double* value) {
   }
   return found;
 }
+
+}  // namespace mayaimport

@@ -5,6 +5,8 @@
 #include "maya/TokenText.h"
 #include "maya/Words.h"
 
+namespace mayaimport {
+
 namespace {
 
 constexpr std::string_view kOutputs[] = {"output", "o"};
@@ -104,3 +106,5 @@ void MAYA_Parse::SetLink(std::int32_t transform, int slot, std::int32_t index) {
   ChangeRecord<MAYA_Transform>(transforms, transform,
                                [&](MAYA_Transform& record) { record.curve[slot] = index; });
 }
+
+}  // namespace mayaimport

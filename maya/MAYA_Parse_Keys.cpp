@@ -10,6 +10,8 @@
 #include "maya/TokenText.h"
 #include "maya/Words.h"
 
+namespace mayaimport {
+
 namespace {
 
 // Deliberate: the attribute's name is looked for with its case, anywhere in the text. ".KTV[0]" is no key
@@ -129,3 +131,5 @@ void MAYA_Parse::AppendKeys(const void* keys, std::int64_t count, std::int64_t r
   }
   ThrowOnError(RecordListAppendRun(*list, keys, count));
 }
+
+}  // namespace mayaimport

@@ -7,6 +7,8 @@
 #include "maya/TokenText.h"
 #include "maya/Words.h"
 
+namespace mayaimport {
+
 namespace {
 
 struct NodeType {
@@ -108,3 +110,5 @@ bool MAYA_Parse::TakeName(char (&name)[kNameCapacity]) {
   }
   return kind == Semicolon;
 }
+
+}  // namespace mayaimport

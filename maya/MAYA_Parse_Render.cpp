@@ -5,6 +5,8 @@
 #include "maya/TokenText.h"
 #include "maya/Words.h"
 
+namespace mayaimport {
+
 namespace {
 
 constexpr std::string_view kRenderNode = "defaultResolution";
@@ -72,3 +74,5 @@ void MAYA_Parse::ParseRenderSetAttr() {
     if (attribute == RenderAttribute::PixelAspect) pixelAspect = value;
   }
 }
+
+}  // namespace mayaimport

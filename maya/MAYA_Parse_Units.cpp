@@ -7,6 +7,8 @@
 #include "maya/TokenText.h"
 #include "maya/Words.h"
 
+namespace mayaimport {
+
 namespace {
 
 struct UnitName {
@@ -74,3 +76,5 @@ void MAYA_Parse::ParseCurrentUnit() {
     if (option == UnitOption::Time) SetUnit(name, kTimeUnits, &timeUnit);
   }
 }
+
+}  // namespace mayaimport

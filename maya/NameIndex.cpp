@@ -9,6 +9,8 @@
 #include "maya/SceneRecords.h"
 #include "plugin/Guarded.h"
 
+namespace mayaimport {
+
 namespace {
 
 constexpr std::size_t kFirstCapacity = 64;
@@ -161,3 +163,5 @@ void NameIndex::Grow() {
     entries_[at] = entry;
   }
 }
+
+}  // namespace mayaimport

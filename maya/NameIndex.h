@@ -5,6 +5,8 @@
 #include <string_view>
 #include <vector>
 
+namespace mayaimport {
+
 // Knows, for one list of named records, the first record of every name. Names are shorter than a record's
 // name field, and are compared without regard to case. The index keeps copies, close together: reading them
 // from the records, half a kilobyte each, would miss the processor's caches for every name.
@@ -39,3 +41,5 @@ class NameIndex {
   std::vector<std::uint64_t> words_;  // the names in lower case, each filled up with NULs
   std::size_t used_ = 0;
 };
+
+}  // namespace mayaimport

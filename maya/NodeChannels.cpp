@@ -2,6 +2,8 @@
 
 #include "maya/ListAccess.h"
 
+namespace mayaimport {
+
 namespace {
 
 // A curve with fewer keys is a constant.
@@ -37,3 +39,5 @@ void NodeChannels::FetchRuns() {
   }
   fetchedSamples_ = static_cast<std::uint32_t>(sharedCount_);
 }
+
+}  // namespace mayaimport

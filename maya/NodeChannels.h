@@ -11,6 +11,8 @@
 
 #include "maya/SceneRecords.h"
 
+namespace mayaimport {
+
 class NodeChannels {
  public:
   // The keys of one channel's curve.
@@ -79,3 +81,5 @@ class NodeChannels {
   std::size_t taken_ = 0;  // channels
   std::int64_t sharedCount_ = 0;
 };
+
+}  // namespace mayaimport

@@ -3,6 +3,8 @@
 #include <algorithm>
 #include <iterator>
 
+namespace mayaimport {
+
 MAYA_Transform DefaultTransform() {
   MAYA_Transform transform{};
   std::fill(std::begin(transform.scale), std::end(transform.scale), 1.0);
@@ -18,3 +20,5 @@ MAYA_Camera DefaultCamera() {
   camera.focalLengthCurve = kNoIndex;
   return camera;
 }
+
+}  // namespace mayaimport

@@ -10,6 +10,8 @@
 
 #include "hostutil/RecordList.h"
 
+namespace mayaimport {
+
 inline constexpr std::size_t kNameCapacity = 256;
 inline constexpr std::int32_t kNoIndex = -1;
 
@@ -82,3 +84,5 @@ enum NodeKind : std::int32_t {
   kRenderSettings = 4,
   kLocatorNode = 5,
 };
+
+}  // namespace mayaimport

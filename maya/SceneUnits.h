@@ -4,6 +4,8 @@
 
 #include <cstdint>
 
+namespace mayaimport {
+
 enum LinearUnit : std::int32_t {
   kMillimeter = 1,
   kCentimeter = 2,
@@ -31,3 +33,5 @@ enum TimeUnit : std::int32_t {
   kNtscField = 11,  // 60
   kCustomRate = 12,
 };
+
+}  // namespace mayaimport

@@ -7,6 +7,8 @@
 
 #include "maya/SceneRecords.h"
 
+namespace mayaimport {
+
 // The longest token whose text is taken, in bytes. A longer one reads as empty.
 inline constexpr std::size_t kLongestToken = 254;
 
@@ -31,3 +33,5 @@ inline std::string_view QuotedText(const char* first, const char* last) {
   const std::size_t length = TakenLength(first, last);
   return length != 0 ? std::string_view(first + 1, length - kQuoteCount) : std::string_view();
 }
+
+}  // namespace mayaimport

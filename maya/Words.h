@@ -7,6 +7,8 @@
 
 #include "hostutil/HostCompare.h"
 
+namespace mayaimport {
+
 inline bool SameLetter(char a, char b) {
   return FoldCase(static_cast<unsigned char>(a)) == FoldCase(static_cast<unsigned char>(b));
 }
@@ -27,3 +29,5 @@ bool IsOneOf(std::string_view word, const List& list) {
   }
   return false;
 }
+
+}  // namespace mayaimport

@@ -6,6 +6,8 @@
 #include "plugin/Messages.h"
 #include "plugin/QZGP_SuiteHandler.h"
 
+namespace mayaimport {
+
 namespace {
 
 constexpr std::uint32_t FourCharacters(const char (&code)[5]) {
@@ -55,3 +57,5 @@ HostError MayaImportEntry(const WNBasicSuite* basicSuite, std::int32_t, std::int
 HostError DeathHook(std::intptr_t) {
   return GuardedAtBorder([] { UnregisterMessages(); });
 }
+
+}  // namespace mayaimport

@@ -6,6 +6,8 @@
 #include "hostapi/HostTypes.h"
 #include "hostapi/WNBasicSuite.h"
 
+namespace mayaimport {
+
 // Remembers the host, registers the localised strings and the death hook, reads the preference, and registers
 // the importer. Returns the string table's code when that could not be registered, else the first failure in
 // registering the importer, 13 for a missing suite, or 0.
@@ -14,3 +16,5 @@ HostError MayaImportEntry(const WNBasicSuite* basicSuite, std::int32_t hostMajor
 
 // Gives the localised strings back. Returns 0.
 HostError DeathHook(std::intptr_t refcon);
+
+}  // namespace mayaimport

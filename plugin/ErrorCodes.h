@@ -7,6 +7,8 @@
 #include "hostapi/ErrorCodes.h"
 #include "hostapi/HostTypes.h"
 
+namespace mayaimport {
+
 inline constexpr HostError kNoError = HOST_ERR_NONE;
 inline constexpr HostError kNullArgument = HOST_ERR_NULL_ARGUMENT;
 inline constexpr HostError kMissingSuite = HOST_ERR_MISSING_SUITE;
@@ -21,3 +23,5 @@ inline constexpr HostError kInconsistentKeys = HOST_ERR_MAYA_KEY_COUNTS;
 inline void ThrowOnError(HostError code) {
   if (code != kNoError) ThrowCode(code);
 }
+
+}  // namespace mayaimport

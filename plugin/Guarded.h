@@ -7,6 +7,8 @@
 #include "hostutil/HostReport.h"
 #include "plugin/ErrorCodes.h"
 
+namespace mayaimport {
+
 // Runs the work, which returns a code or nothing, and returns the code that it ended with: its own or 0, an
 // integer exception's value, or what the host's translate-and-report makes of a standard exception. Any other
 // exception passes through.
@@ -53,3 +55,5 @@ void Unreported(Work&& work) {
 inline void KeepFirst(HostError* kept, HostError code) {
   if (*kept == kNoError) *kept = code;
 }
+
+}  // namespace mayaimport

@@ -9,6 +9,8 @@
 #include "plugin/Guarded.h"
 #include "plugin/ReportError.h"
 
+namespace mayaimport {
+
 namespace {
 
 constexpr std::string_view kHeader = "//Maya";
@@ -168,3 +170,5 @@ HostError CheckMayaHeader(HostFile* file, QZGP_SuiteHandler& suites, bool quiet,
   if (*isMaya == 0 && !quiet) ReportError(suites, nullptr, kOnlyMayaAscii);
   return kNoError;
 }
+
+}  // namespace mayaimport

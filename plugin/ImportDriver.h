@@ -7,6 +7,8 @@
 #include "hostutil/HostFile.h"
 #include "plugin/QZGP_SuiteHandler.h"
 
+namespace mayaimport {
+
 // Reads the file and builds its composition in the folder. The path is NUL-terminated UTF-16; null counts as
 // empty. Returns the code of the first failure in parsing or building, else of the first one in reading, else
 // 0; what was built before a failure stays. For a file that is no Maya ASCII scene the user sees a message;
@@ -22,3 +24,5 @@ HostError VerifyFileCallback(const HostUTF16Unit* path, void* ignored, std::uint
 // message for a file that does not. Returns 3 when the file or the flag is null, else the first failure of
 // opening, reading 10 bytes or closing.
 HostError CheckMayaHeader(HostFile* file, QZGP_SuiteHandler& suites, bool quiet, std::uint8_t* isMaya);
+
+}  // namespace mayaimport

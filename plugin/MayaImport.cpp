@@ -7,5 +7,5 @@ extern "C" __attribute__((visibility("default"))) HostError GPMain_MayaImport(co
                                                                               std::int32_t hostMinor,
                                                                               std::int32_t pluginId,
                                                                               void* reserved) {
-  return MayaImportEntry(basicSuite, hostMajor, hostMinor, pluginId, reserved);
+  return mayaimport::MayaImportEntry(basicSuite, hostMajor, hostMinor, pluginId, reserved);
 }

@@ -2,6 +2,8 @@
 
 #include <iterator>
 
+namespace mayaimport {
+
 namespace {
 
 constexpr const char* kEntries[] = {
@@ -27,3 +29,5 @@ void UnregisterMessages() {
   HostUnregisterStringTable(Maya_Import_G_zref);
   Maya_Import_G_zref = nullptr;
 }
+
+}  // namespace mayaimport

@@ -7,6 +7,8 @@
 #include "hostutil/HostStrings.h"
 #include "plugin/Globals.h"
 
+namespace mayaimport {
+
 // The entries of the table, by number.
 enum MessageId : std::int32_t {
   kImporterName = 0,             // "Maya Scene"
@@ -31,3 +33,5 @@ void UnregisterMessages();
 
 // The text of an entry in the user's language. Never null; "" when the table is not registered.
 inline const char* LocalizedText(MessageId id) { return HostLocalizedString(Maya_Import_G_zref, id); }
+
+}  // namespace mayaimport

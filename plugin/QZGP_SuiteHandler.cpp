@@ -2,6 +2,8 @@
 
 #include "plugin/ErrorCodes.h"
 
+namespace mayaimport {
+
 namespace {
 
 struct SuiteName {
@@ -51,3 +53,5 @@ void QZGP_SuiteHandler::Acquire(Slot slot) {
 void QZGP_SuiteHandler::ReleaseSuite(const char* name, std::int32_t version) {
   basicSuite_->ReleaseSuiteByName(name, version);
 }
+
+}  // namespace mayaimport

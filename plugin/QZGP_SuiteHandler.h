@@ -17,6 +17,8 @@
 #include "hostapi/UtilitySuite.h"
 #include "hostapi/WNBasicSuite.h"
 
+namespace mayaimport {
+
 class QZGP_SuiteHandler {
  public:
   // The basic suite outlives the handler. Throws 13 when it is null.
@@ -83,3 +85,5 @@ class QZGP_SuiteHandler {
   const WNBasicSuite* basicSuite_;
   std::array<const void*, kSlotCount> suites_{};
 };
+
+}  // namespace mayaimport

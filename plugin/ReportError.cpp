@@ -2,6 +2,8 @@
 
 #include "plugin/ErrorCodes.h"
 
+namespace mayaimport {
+
 void ReportError(QZGP_SuiteHandler& suites, const char* context, MessageId id) {
   char message[kMessageCapacity] = "";
   const HostError code = context != nullptr
@@ -10,3 +12,5 @@ void ReportError(QZGP_SuiteHandler& suites, const char* context, MessageId id) {
                              : HostStringCopy(message, kMessageCapacity, LocalizedText(id));
   if (code == kNoError) suites.UtilitySuite7().ShowMessage(G_plugin_idL, message);
 }
+
+}  // namespace mayaimport

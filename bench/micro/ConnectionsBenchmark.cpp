@@ -4,6 +4,8 @@
 #include "maya/MAYA_Parse.h"
 #include "refhost/Host.h"
 
+using namespace mayaimport;
+
 namespace bench {
 namespace {
 

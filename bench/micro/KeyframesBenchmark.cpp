@@ -12,6 +12,8 @@
 #include "plugin/Globals.h"
 #include "refhost/Host.h"
 
+using namespace mayaimport;
+
 namespace bench {
 namespace {
 

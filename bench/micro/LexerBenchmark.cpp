@@ -5,6 +5,8 @@
 #include "refhost/Host.h"
 #include "scan/SkipText.h"
 
+using namespace mayaimport;
+
 namespace bench {
 namespace {
 

@@ -4,6 +4,8 @@
 #include "tests/support/BuilderRun.h"
 #include "tests/support/BuilderScene.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

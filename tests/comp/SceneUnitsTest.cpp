@@ -5,6 +5,8 @@
 #include "plugin/Globals.h"
 #include "tests/support/BuilderFixture.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

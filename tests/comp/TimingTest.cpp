@@ -2,6 +2,8 @@
 #include "tests/support/BuilderFixture.h"
 #include "tests/support/BuilderScene.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

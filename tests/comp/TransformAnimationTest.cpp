@@ -5,6 +5,8 @@
 #include "tests/support/BuilderRun.h"
 #include "tests/support/BuilderScene.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

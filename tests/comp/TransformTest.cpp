@@ -4,6 +4,8 @@
 #include "tests/support/BuilderFixture.h"
 #include "tests/support/BuilderRun.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

@@ -9,6 +9,8 @@
 #include <limits>
 #include <random>
 
+using namespace mayaimport;
+
 namespace {
 
 constexpr double kPi = 3.141592653589793;

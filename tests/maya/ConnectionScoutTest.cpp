@@ -10,6 +10,8 @@
 #include "tests/scan/HostileTexts.h"
 #include "tests/support/GuardedMemory.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

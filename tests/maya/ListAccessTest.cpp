@@ -4,6 +4,8 @@
 #include "tests/support/ReaderFixture.h"
 #include "tests/support/UtilityCalls.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

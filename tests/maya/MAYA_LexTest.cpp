@@ -3,6 +3,8 @@
 
 #include "tests/maya/LexFixture.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

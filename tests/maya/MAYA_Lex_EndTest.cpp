@@ -4,6 +4,8 @@
 #include "maya/MAYA_Lex.h"
 #include "tests/maya/LexFixture.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

@@ -5,6 +5,8 @@
 
 #include "tests/support/ReaderFixture.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

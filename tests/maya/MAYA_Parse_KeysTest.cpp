@@ -6,6 +6,8 @@
 #include "plugin/ErrorCodes.h"
 #include "tests/support/ReaderFixture.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

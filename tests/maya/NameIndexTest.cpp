@@ -9,6 +9,8 @@
 
 #include "maya/SceneRecords.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

@@ -4,6 +4,8 @@
 #include "hostutil/HostSetup.h"
 #include "tests/support/ReaderFixture.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

@@ -7,6 +7,8 @@
 
 #include "tests/support/ReaderFixture.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

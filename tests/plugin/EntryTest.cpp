@@ -4,6 +4,8 @@
 #include "plugin/Globals.h"
 #include "tests/plugin/PluginRun.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

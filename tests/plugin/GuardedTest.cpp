@@ -11,6 +11,8 @@
 
 #include "hostutil/HostSetup.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

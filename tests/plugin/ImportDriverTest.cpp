@@ -6,6 +6,8 @@
 #include "tests/plugin/PluginRun.h"
 #include "tests/support/UtilityCalls.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

@@ -2,6 +2,8 @@
 #include "plugin/ImportDriver.h"
 #include "tests/plugin/PluginRun.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

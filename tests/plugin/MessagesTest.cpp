@@ -6,6 +6,8 @@
 #include "hostutil/HostSetup.h"
 #include "tests/support/Ledger.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

@@ -15,6 +15,8 @@
 #include "tests/support/LeftOut.h"
 #include "tests/support/WideTests.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

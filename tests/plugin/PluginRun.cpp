@@ -3,6 +3,8 @@
 #include "plugin/Entry.h"
 #include "plugin/Globals.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

@@ -8,6 +8,8 @@
 
 #include "tests/support/FakeHost.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

@@ -5,6 +5,8 @@
 #include "plugin/Entry.h"
 #include "tests/plugin/PluginRun.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

@@ -6,6 +6,8 @@
 #include "plugin/ImportDriver.h"
 #include "tests/plugin/PluginRun.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

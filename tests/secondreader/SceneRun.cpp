@@ -12,6 +12,8 @@
 #include "tests/secondreader/TraceComparison.h"
 #include "tests/support/OwnProcess.h"
 
+using namespace mayaimport;
+
 namespace secondreader {
 namespace {
 

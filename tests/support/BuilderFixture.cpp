@@ -6,6 +6,8 @@
 #include "plugin/Messages.h"
 #include "tests/support/BuilderRun.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

@@ -15,6 +15,8 @@
 #include "maya/MAYA_Parse.h"
 #include "refhost/Host.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 
 inline constexpr std::int32_t kBuilderPluginId = 7;

@@ -8,6 +8,8 @@
 
 #include "plugin/Entry.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 namespace {
 

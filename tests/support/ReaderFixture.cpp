@@ -7,6 +7,8 @@
 #include "plugin/Globals.h"
 #include "plugin/Messages.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 
 ReaderTest::ReaderTest() {

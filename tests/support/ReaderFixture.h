@@ -16,6 +16,8 @@
 #include "tests/support/GuardedMemory.h"
 #include "tests/support/Ledger.h"
 
+using namespace mayaimport;
+
 namespace testsupport {
 
 inline constexpr std::int32_t kTestPluginId = 4711;
