@@ -6,8 +6,7 @@
 #include <string>
 
 #include "bench/SceneGenerator.h"
-#include "refhost/Host.h"
-#include "tests/support/TemporaryFolder.h"
+#include "tests/support/LoadedHost.h"
 
 namespace bench {
 
@@ -34,15 +33,9 @@ Built BuiltIn(const refhost::Project& project) {
 }
 
 Imported Import(const std::string& text) {
-  const testsupport::TemporaryFolder folder;
-  refhost::HostOptions options;
-  options.module = MAYASCENE_MODULE;
-  refhost::Host host(options);
-  refhost::CallbackResult entry;
-  std::string failure;
-  EXPECT_TRUE(host.load(&entry, &failure)) << failure;
+  testsupport::LoadedHost host;
   Imported imported;
-  imported.result = host.importScene(folder.write("scene.ma", text));
+  imported.result = host.Import(text);
   imported.built = BuiltIn(host.project());
   return imported;
 }

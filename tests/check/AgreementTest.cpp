@@ -11,13 +11,12 @@
 #include <string>
 #include <vector>
 
-#include "refhost/Host.h"
 #include "tests/check/ChannelJudge.h"
 #include "tests/check/GeneratedScene.h"
 #include "tests/check/StopContradictions.h"
 #include "tests/support/LeftOut.h"
+#include "tests/support/LoadedHost.h"
 #include "tests/support/SplitMix.h"
-#include "tests/support/TemporaryFolder.h"
 #include "tests/support/WideTests.h"
 #include "tools/mayascene/ImportedLayers.h"
 
@@ -29,12 +28,7 @@ namespace fs = std::filesystem;
 // One host for many imports.
 class Agreement {
  public:
-  Agreement() : host_(Options()) {
-    refhost::CallbackResult loaded;
-    std::string failure;
-    EXPECT_TRUE(host_.load(&loaded, &failure)) << failure;
-  }
-
+  Agreement() = default;
   ~Agreement() {
     std::cout << compared_.scenes << " scenes, " << compared_.stops << " stops, " << compared_.layers
               << " layers, " << compared_.channels << " channels, " << compared_.keys << " keys, "
@@ -45,10 +39,9 @@ class Agreement {
 
   // What is contradicted; empty where nothing is.
   std::string Of(const std::string& text, bool wellFormed) {
-    const fs::path path = folder_.path() / "shot.ma";
-    std::ofstream(path, std::ios::binary | std::ios::trunc) << text;
-    const refhost::CallbackResult result = host_.importScene(path);
-    const check::CameOver cameOver = mayascene::whatCameOver(mayascene::lookAtScene(path), result, false);
+    const refhost::CallbackResult result = host_.Import(text);
+    const check::CameOver cameOver =
+        mayascene::whatCameOver(mayascene::lookAtScene(host_.ScenePath()), result, false);
     const check::Report report = check::Check(text, cameOver, {.all = true, .only = {}});
     ++compared_.scenes;
     compared_.stops += cameOver.stop == check::Stop::None ? 0 : 1;
@@ -59,15 +52,7 @@ class Agreement {
   }
 
  private:
-  static refhost::HostOptions Options() {
-    refhost::HostOptions options;
-    options.module = MAYASCENE_MODULE;
-    options.linearUnits = 0;
-    return options;
-  }
-
-  testsupport::TemporaryFolder folder_;
-  refhost::Host host_;
+  testsupport::LoadedHost host_{testsupport::WithUnits(false)};
   Compared compared_;
 };
 

@@ -4,15 +4,13 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
-#include <fstream>
 #include <string>
 #include <string_view>
 #include <utility>
 #include <vector>
 
 #include "check/Check.h"
-#include "refhost/Host.h"
-#include "tests/support/TemporaryFolder.h"
+#include "tests/support/LoadedHost.h"
 #include "tools/mayascene/ImportedLayers.h"
 
 namespace check_test {
@@ -21,18 +19,9 @@ class Checked {
  public:
   explicit Checked(std::string text, const check::Options& options = {}, bool linearUnits = false)
       : text_(std::move(text)) {
-    const testsupport::TemporaryFolder folder;
-    const std::filesystem::path path = folder.path() / "shot.ma";
-    std::ofstream(path, std::ios::binary) << text_;
-    refhost::HostOptions host;
-    host.module = MAYASCENE_MODULE;
-    host.linearUnits = linearUnits ? 1 : 0;
-    refhost::Host imported(std::move(host));
-    refhost::CallbackResult loaded;
-    std::string failure;
-    EXPECT_TRUE(imported.load(&loaded, &failure)) << failure;
-    const refhost::CallbackResult result = imported.importScene(path);
-    cameOver_ = mayascene::whatCameOver(mayascene::lookAtScene(path), result, linearUnits);
+    testsupport::LoadedHost host(testsupport::WithUnits(linearUnits));
+    const refhost::CallbackResult result = host.Import(text_);
+    cameOver_ = mayascene::whatCameOver(mayascene::lookAtScene(host.ScenePath()), result, linearUnits);
     report_ = check::Check(text_, cameOver_, options);
   }
 

@@ -13,9 +13,8 @@
 
 #include "bake/Selection.h"
 #include "check/Check.h"
-#include "refhost/Host.h"
 #include "tests/check/GeneratedScene.h"
-#include "tests/support/TemporaryFolder.h"
+#include "tests/support/LoadedHost.h"
 #include "tests/support/WideTests.h"
 #include "tools/mayascene/ClosingLine.h"
 #include "tools/mayascene/ImportedLayers.h"
@@ -87,18 +86,11 @@ std::vector<Code> CodesOf(std::string_view sentence) {
 // One host for many imports.
 class Both {
  public:
-  Both() : host_(Options()) {
-    refhost::CallbackResult loaded;
-    std::string failure;
-    EXPECT_TRUE(host_.load(&loaded, &failure)) << failure;
-  }
-
   // What only one of them says; empty where they agree.
   std::string DisagreeOver(const std::string& text) {
-    const fs::path path = folder_.path() / "shot.ma";
-    std::ofstream(path, std::ios::binary | std::ios::trunc) << text;
-    const refhost::CallbackResult result = host_.importScene(path);
-    const check::CameOver cameOver = mayascene::whatCameOver(mayascene::lookAtScene(path), result, false);
+    const refhost::CallbackResult result = host_.Import(text);
+    const check::CameOver cameOver =
+        mayascene::whatCameOver(mayascene::lookAtScene(host_.ScenePath()), result, false);
     if (cameOver.stop == check::Stop::NotAScene) return {};  // no closing line
     const check::Report report = check::Check(text, cameOver, {.all = true, .only = {}});
     diag::Collector collector(text);
@@ -116,13 +108,6 @@ class Both {
   int said() const { return said_; }
 
  private:
-  static refhost::HostOptions Options() {
-    refhost::HostOptions options;
-    options.module = MAYASCENE_MODULE;
-    options.linearUnits = 0;
-    return options;
-  }
-
   // The closing line speaks of cameras, of what stands above them, and of the picture, but not of locators.
   static bool IsOfTheClosingLine(const check::Finding& finding, const std::set<std::string>& names) {
     const diag::Diagnostic& one = finding.diagnostic;
@@ -153,8 +138,7 @@ class Both {
     return {};
   }
 
-  testsupport::TemporaryFolder folder_;
-  refhost::Host host_;
+  testsupport::LoadedHost host_{testsupport::WithUnits(false)};
   int said_ = 0;
 };
 

@@ -2,35 +2,11 @@
 
 #include <gtest/gtest.h>
 
-#include <filesystem>
 #include <utility>
 
-#include "tests/support/TemporaryFolder.h"
-
 namespace docs_test {
-namespace {
-
-refhost::HostOptions WithModule(refhost::HostOptions options) {
-  options.module = MAYASCENE_MODULE;
-  return options;
-}
-
-// Of the process: one that it forks and that is killed leaves nothing.
-const testsupport::TemporaryFolder kFolder;
-
-}  // namespace
-
 SceneImport::SceneImport(const std::string& text, refhost::HostOptions options)
-    : host_(WithModule(std::move(options))) {
-  refhost::CallbackResult entry;
-  std::string failure;
-  if (!host_.load(&entry, &failure)) {
-    ADD_FAILURE() << failure;
-    return;
-  }
-  EXPECT_EQ(entry.code, 0);
-  result_ = host_.importScene(kFolder.write("shot.ma", text));
-}
+    : host_(std::move(options)), result_(host_.Import(text)) {}
 
 const refhost::Layer* SceneImport::Layer(const std::string& name) const {
   for (const refhost::Layer& layer : project().layers()) {

@@ -4,7 +4,7 @@
 #include <string>
 
 #include "hostapi/LayerStreams.h"
-#include "refhost/Host.h"
+#include "tests/support/LoadedHost.h"
 
 namespace docs_test {
 
@@ -29,7 +29,7 @@ class SceneImport {
  private:
   const refhost::Stream* Stream(const std::string& layer, std::int32_t streamId) const;
 
-  refhost::Host host_;
+  testsupport::LoadedHost host_;
   refhost::CallbackResult result_;
 };
 

@@ -6,15 +6,12 @@
 #include <cmath>
 #include <cstdint>
 #include <cstdlib>
-#include <filesystem>
-#include <fstream>
 #include <string>
 
 #include "hostapi/LayerStreams.h"
-#include "refhost/Host.h"
 #include "tests/examples/CompositionView.h"
 #include "tests/examples/ConversionScene.h"
-#include "tests/support/TemporaryFolder.h"
+#include "tests/support/LoadedHost.h"
 
 namespace {
 
@@ -31,13 +28,7 @@ constexpr double kPointsPerCentimetre = 72.0 / 2.54;
 class Conversion : public testing::Test {
  protected:
   void expectTheSamePicture(const SceneTraits& traits, bool linearUnits = false) {
-    refhost::HostOptions options;
-    options.module = MAYASCENE_MODULE;
-    options.linearUnits = linearUnits ? 1 : 0;
-    refhost::Host host(options);
-    refhost::CallbackResult loaded;
-    std::string failure;
-    ASSERT_TRUE(host.load(&loaded, &failure)) << failure;
+    testsupport::LoadedHost host(testsupport::WithUnits(linearUnits));
     for (std::uint64_t seed = 1; seed <= kScenesOfAKind && !HasFatalFailure(); ++seed) {
       SCOPED_TRACE(seed);
       const ConversionScene scene(traits, seed);
@@ -47,10 +38,8 @@ class Conversion : public testing::Test {
 
  private:
   // The composition that receives the layers; null when the import failed.
-  const refhost::Composition* import(refhost::Host& host, const ConversionScene& scene) {
-    const std::filesystem::path path = folder_.path() / "scene.ma";
-    std::ofstream(path, std::ios::binary) << scene.text();
-    const refhost::CallbackResult result = host.importScene(path);
+  static const refhost::Composition* import(testsupport::LoadedHost& host, const ConversionScene& scene) {
+    const refhost::CallbackResult result = host.Import(scene.text());
     EXPECT_EQ(result.code, 0);
     EXPECT_TRUE(result.ledgerClean());
     const bool made = result.folder != nullptr && !result.folder->compositions.empty();
@@ -87,8 +76,6 @@ class Conversion : public testing::Test {
       EXPECT_NEAR(found.y, expected.y, kPixelTolerance) << "point " << point << " key " << key;
     }
   }
-
-  testsupport::TemporaryFolder folder_;
 };
 
 TEST_F(Conversion, ShowsTheSamePictureWithoutPivotsAndScale) { expectTheSamePicture({}); }

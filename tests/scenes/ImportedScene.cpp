@@ -6,17 +6,10 @@
 namespace scenes {
 
 ImportedScene::ImportedScene(const std::filesystem::path& path, bool linearUnits)
-    : ImportedScene(path, refhost::HostOptions(), linearUnits) {}
+    : ImportedScene(path, testsupport::WithUnits(linearUnits)) {}
 
-ImportedScene::ImportedScene(const std::filesystem::path& path, refhost::HostOptions options,
-                             bool linearUnits) {
-  options.module = MAYASCENE_MODULE;
-  options.linearUnits = linearUnits ? 1 : 0;
-  host_ = std::make_unique<refhost::Host>(std::move(options));
-  std::string failure;
-  loaded_ = host_->load(&loadResult_, &failure) && loadResult_.code == 0;
-  if (loaded_) result_ = host_->importScene(path);
-}
+ImportedScene::ImportedScene(const std::filesystem::path& path, refhost::HostOptions options)
+    : host_(std::move(options)), result_(host_.Import(path)) {}
 
 const refhost::Layer* ImportedScene::layer(const std::string& name) const {
   const refhost::Layer* found = nullptr;

@@ -2,40 +2,36 @@
 #pragma once
 
 #include <filesystem>
-#include <memory>
 #include <set>
 #include <string>
 
-#include "refhost/Host.h"
+#include "tests/support/LoadedHost.h"
 
 namespace scenes {
 
 class ImportedScene {
  public:
   explicit ImportedScene(const std::filesystem::path& path, bool linearUnits = false);
-  // The options' module and units are the scene's own.
-  ImportedScene(const std::filesystem::path& path, refhost::HostOptions options, bool linearUnits = false);
+  ImportedScene(const std::filesystem::path& path, refhost::HostOptions options);
 
   // False when the module could not be loaded; then nothing else may be asked.
-  bool loaded() const { return loaded_; }
+  bool loaded() const { return host_.loaded(); }
   const refhost::CallbackResult& result() const { return result_; }
-  const refhost::CallbackResult& loadResult() const { return loadResult_; }
-  refhost::CallbackResult unload() { return host_->unload(); }
+  const refhost::CallbackResult& loadResult() const { return host_.entry(); }
+  refhost::CallbackResult unload() { return host_.Unload(); }
 
   // The only layer of that name; null when there is none, or more than one.
   const refhost::Layer* layer(const std::string& name) const;
 
-  std::size_t compositions() const { return host_->project().compositions().size(); }
+  std::size_t compositions() const { return host_.project().compositions().size(); }
   std::size_t layers(refhost::LayerKind kind) const;
   std::size_t aimedCameras() const;
   std::size_t keys() const;  // of all streams of all layers
   std::multiset<std::string> names(refhost::LayerKind kind) const;
-  const refhost::Project& project() const { return host_->project(); }
+  const refhost::Project& project() const { return host_.project(); }
 
  private:
-  std::unique_ptr<refhost::Host> host_;
-  bool loaded_ = false;
-  refhost::CallbackResult loadResult_;
+  testsupport::LoadedHost host_;
   refhost::CallbackResult result_;
 };
 
