@@ -6,6 +6,8 @@
 #include <deque>
 #include <unordered_map>
 
+#include "text/Letters.h"
+
 namespace check {
 namespace {
 
@@ -14,12 +16,6 @@ constexpr std::array<std::string_view, 4> kTransformTypes = {"transform", "stere
                                                              "aimConstraint"};
 
 char Lower(char c) { return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c; }
-
-std::string Lowered(std::string_view name) {
-  std::string lowered(name);
-  std::transform(lowered.begin(), lowered.end(), lowered.begin(), Lower);
-  return lowered;
-}
 
 bool IsCamera(const scene::Node& node) {
   return node.origin == scene::Origin::Created &&
@@ -50,10 +46,10 @@ std::vector<Camera> FindCameras(const scene::Scene& scene, const CameOver& cameO
   // names differ in case alone, all their layers can have the same one.
   std::unordered_map<std::string, std::deque<const CameOverLayer*>> layersOf;
   for (const CameOverLayer& layer : cameOver.layers) {
-    if (layer.kind == LayerKind::Camera) layersOf[Lowered(layer.name)].push_back(&layer);
+    if (layer.kind == LayerKind::Camera) layersOf[text::Lowered(layer.name)].push_back(&layer);
   }
   const auto takeLayer = [&](Camera* camera) {
-    const auto known = layersOf.find(Lowered(ImportName(scene, scene.node(camera->shape))));
+    const auto known = layersOf.find(text::Lowered(ImportName(scene, scene.node(camera->shape))));
     if (known == layersOf.end() || known->second.empty()) return;
     camera->layer = known->second.front();
     known->second.pop_front();

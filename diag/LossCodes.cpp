@@ -64,7 +64,7 @@ constexpr Entry kLossCodes[] = {
     {.code = Code::DrivenByNoCurve,
      .severity = Severity::Warning,
      .symbol = "DrivenByNoCurve",
-     .sentence = "\"{0}\" stands still in {1}: \"{2}\" ({3}) drives it, which is no curve",
+     .sentence = "\"{0}\" stands still in {1}: \"{2}\" ({3}) drives it, which is not a curve",
      .meaning = "A constraint, an expression or another node computes the channels. The importer follows "
                 "animation curves alone, and takes the values that the scene stores.",
      .example = "createNode pointConstraint -n \"hold\" -p \"shotCam\";\n"
