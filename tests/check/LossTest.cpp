@@ -129,10 +129,10 @@ TEST(LossTest, ChannelsThatAConstraintDrivesAreNamedTogether) {
                                     "createNode pointConstraint -n \"hold\" -p \"shotCam\";\n"
                                     "connectAttr \"hold.ctx\" \"shotCam.tx\";\n"
                                     "connectAttr \"hold.cty\" \"shotCam.ty\";\n"));
-  EXPECT_EQ(
-      checked.SentenceOf(Code::DrivenByNoCurve),
-      "\"shotCam\" stands still in translateX, translateY: \"hold\" (pointConstraint) drives it, which is no "
-      "curve");
+  EXPECT_EQ(checked.SentenceOf(Code::DrivenByNoCurve),
+            "\"shotCam\" stands still in translateX, translateY: \"hold\" (pointConstraint) drives it, which "
+            "is not a "
+            "curve");
 }
 
 // The import holds the value, and the evaluation cannot compute it: the first is said, once for each driver.
