@@ -125,8 +125,8 @@ TEST(BuilderFailuresTest, EveryTransformIsOneMatrixCall) {
   }
 }
 
-// Each read of a list that fails after the batches were opened and before they have a key, which is when the
-// runs of keys are fetched: the batches that were closed.
+// For each failing list read between the opening of the batches and their first key, when the runs of keys
+// are fetched: the batches that were closed.
 std::vector<std::size_t> BatchesClosedAfterAFailedRun(const std::string& scene) {
   std::vector<std::size_t> closed;
   const std::int64_t reads = ImportText(scene, {}).host->callCount("ListGet");

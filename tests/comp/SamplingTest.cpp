@@ -199,7 +199,7 @@ TEST_F(SamplingTest, ExtractingAGroupLooksAtNoOtherGroup) {
   EXPECT_THAT(Extracted(0, 1), ElementsAre(2.0, -102.0, -103.0));
 }
 
-// What VerifyAnimInfo found is distinguished from what is fetched anew by the lists that are read.
+// The lists that are read show whether a value is what VerifyAnimInfo found or is fetched anew.
 class RememberedSamplingTest : public SamplingTest {
  protected:
   // Two nodes of different curves and key times, "a" and "b".

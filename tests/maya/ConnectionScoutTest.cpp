@@ -1,4 +1,4 @@
-// The scout reads ahead in a text that nobody has checked yet: it stays within the text, and within a bound.
+// The scout reads ahead in a text that is not checked yet: it stays within the text, and within a bound.
 #include "maya/ConnectionScout.h"
 
 #include <gtest/gtest.h>

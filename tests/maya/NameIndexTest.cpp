@@ -103,8 +103,8 @@ TEST_F(NameIndexTest, AnEmbeddedNulIsPartOfAName) {
   EXPECT_EQ(Find("RIG"), 0);
 }
 
-// The hash is drawn anew in each run, and once in some hundred thousand draws one difference between names is
-// none between hashes, so that all names which differ by just that meet. Hence the limits are not 0.
+// The hash is drawn anew in each run. Once in some hundred thousand draws it does not see one difference
+// between names: all names with just that difference then meet. So the limits are not 0.
 void ExpectMeetings(const std::vector<std::string>& names, std::size_t atMost) {
   std::set<std::uint32_t> hashes;
   for (const std::string& name : names) hashes.insert(NameIndex::Hash(name));

@@ -1,5 +1,5 @@
-// A scene that uses every command, cut into pieces of which it is known how the end of the text is taken
-// there.
+// A scene that uses every command, in pieces. For each piece it is known what an end of the text inside it
+// gives.
 #pragma once
 
 #include <string>
@@ -11,7 +11,7 @@ inline constexpr int kNeverOpen = 1000;
 
 struct ScenePiece {
   const char* text;
-  // After how many of its tokens the command is one that is read up to its ";", so that the end of the text
+  // The number of tokens after which the command is read up to its ";", so that the end of the text
   // is an error in it; kNeverOpen for what the main loop passes over.
   int openFrom;
 };

@@ -1,5 +1,5 @@
-// What is out of the ordinary about a call is that call's alone, whether anybody looks on or not. The
-// operations that an import makes for every key are looked at, since they are the ones that are kept short.
+// A failure, an exception or a refusal of one call does not reach the next call, with or without a trace.
+// Tried on the operations that an import makes for every key: they take a short way.
 #include <cmath>
 #include <new>
 

@@ -1,4 +1,4 @@
-// What an import of a scene comes to, and the check that it does.
+// The expected outcome of an import of a scene, and the check against it.
 #pragma once
 
 #include <cstddef>
